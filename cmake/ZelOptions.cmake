@@ -1,0 +1,33 @@
+# The language, the warnings and the switches of the build.
+
+option(ZEL_WERROR "Treat warnings as errors" OFF)
+option(ZEL_BENCH "Build the benches" ON)
+option(ZEL_FUZZ "Build the fuzzers (needs Clang)" OFF)
+
+if(NOT CMAKE_BUILD_TYPE AND NOT CMAKE_CONFIGURATION_TYPES)
+    set(CMAKE_BUILD_TYPE Release CACHE STRING "Kind of build" FORCE)
+endif()
+
+set(CMAKE_CXX_STANDARD 20)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+
+find_program(ZEL_CCACHE ccache)
+mark_as_advanced(ZEL_CCACHE)
+if(ZEL_CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
+    set(CMAKE_CXX_COMPILER_LAUNCHER "${ZEL_CCACHE}")
+endif()
+
+add_compile_options(-Wall -Wextra -Wpedantic -Wshadow)
+if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
+    # GCC 12 sees overlapping copies in plain string concatenations.
+    add_compile_options(-Wno-restrict)
+endif()
+if(ZEL_WERROR)
+    add_compile_options(-Werror)
+endif()
+
+if(ZEL_FUZZ AND NOT CMAKE_CXX_COMPILER_ID MATCHES "Clang")
+    message(FATAL_ERROR "ZEL_FUZZ needs Clang: -DCMAKE_CXX_COMPILER=clang++")
+endif()

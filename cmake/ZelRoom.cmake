@@ -1,0 +1,69 @@
+# The helpers that make targets out of folders.
+
+# The libraries of all rooms that have been made so far.
+set_property(GLOBAL PROPERTY ZEL_ROOMS "")
+
+# zel_room(NAME [SUBFOLDERS folders...] [DEPENDS rooms...])
+#
+# Makes the library zel_NAME of the sources in the folder NAME and the named subfolders: a static
+# one, or an interface when there are headers only. Nothing when the folder is empty; rooms it
+# depends on that do not exist are left out.
+function(zel_room name)
+    cmake_parse_arguments(room "" "" "SUBFOLDERS;DEPENDS" ${ARGN})
+    set(folders "${PROJECT_SOURCE_DIR}/${name}")
+    foreach(subfolder IN LISTS room_SUBFOLDERS)
+        list(APPEND folders "${PROJECT_SOURCE_DIR}/${name}/${subfolder}")
+    endforeach()
+    set(sources "")
+    set(headers "")
+    foreach(folder IN LISTS folders)
+        file(GLOB found CONFIGURE_DEPENDS "${folder}/*.cpp")
+        list(APPEND sources ${found})
+        file(GLOB found CONFIGURE_DEPENDS "${folder}/*.h")
+        list(APPEND headers ${found})
+    endforeach()
+
+    if(sources)
+        set(visibility PUBLIC)
+        add_library(zel_${name} STATIC ${sources} ${headers})
+    elseif(headers)
+        set(visibility INTERFACE)
+        add_library(zel_${name} INTERFACE)
+    else()
+        return()
+    endif()
+    target_include_directories(zel_${name} ${visibility} "${PROJECT_SOURCE_DIR}")
+    foreach(other IN LISTS room_DEPENDS)
+        if(TARGET zel_${other})
+            target_link_libraries(zel_${name} ${visibility} zel_${other})
+        endif()
+    endforeach()
+    set_property(GLOBAL APPEND PROPERTY ZEL_ROOMS zel_${name})
+endfunction()
+
+# zel_link_core(TARGET VISIBILITY)
+#
+# Links a target to every room of the core that exists.
+function(zel_link_core target visibility)
+    get_property(rooms GLOBAL PROPERTY ZEL_ROOMS)
+    list(REVERSE rooms)
+    target_link_libraries(${target} ${visibility} ${rooms})
+endfunction()
+
+# zel_link_existing(TARGET VISIBILITY libraries...)
+#
+# Links a target to those of the named libraries that exist.
+function(zel_link_existing target visibility)
+    foreach(library IN LISTS ARGN)
+        if(TARGET ${library})
+            target_link_libraries(${target} ${visibility} ${library})
+        endif()
+    endforeach()
+endfunction()
+
+# zel_subdirectory(NAME): add_subdirectory where the folder has a CMakeLists.txt.
+macro(zel_subdirectory name)
+    if(EXISTS "${PROJECT_SOURCE_DIR}/${name}/CMakeLists.txt")
+        add_subdirectory(${name})
+    endif()
+endmacro()

@@ -1,0 +1,187 @@
+// The reader of the tables and the checks, on small trees that break the rules.
+
+#include <gtest/gtest.h>
+
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "tests/house/House.h"
+
+namespace zel::house {
+namespace {
+
+using Breaches = std::vector<std::string>;
+
+const char* const kTables =
+    "# The house\n"
+    "## Allowed arrows\n\nWords.\n\n"
+    "| room | may include | standard C++ only |\n"
+    "| --- | --- | --- |\n"
+    "| `low` | nothing | yes |\n"
+    "| `low/deep` | `low` | yes |\n"
+    "| `high` | `low` | no |\n"
+    "| `tests` | everything | no |\n"
+    "## Exceptions\n\n"
+    "| file | includes | why |\n"
+    "| --- | --- | --- |\n"
+    "| `low/Odd.h` | `high/H.h` | until it moves |\n"
+    "## The system and its clock\n\n"
+    "| place | why |\n"
+    "| --- | --- |\n"
+    "| `low/Port` | the port |\n";
+
+SourceFile including(const std::string& path, const std::string& included) {
+    return {path, "#include \"" + included + "\"\n"};
+}
+
+TEST(ReadHouse, Row_GivesNameArrowsAndKind) {
+    const House house = readHouse(kTables);
+    ASSERT_EQ(house.rooms.size(), 4u);
+    EXPECT_EQ(house.rooms[2].name, "high");
+    EXPECT_EQ(house.rooms[2].mayInclude, Breaches{"low"});
+    EXPECT_FALSE(house.rooms[2].standardOnly);
+    EXPECT_TRUE(house.rooms[0].standardOnly);
+    EXPECT_FALSE(house.rooms[2].mayIncludeAll);
+    EXPECT_TRUE(house.rooms[3].mayIncludeAll);
+    ASSERT_EQ(house.exceptions.size(), 1u);
+    EXPECT_EQ(house.exceptions[0].included, "high/H.h");
+    EXPECT_EQ(house.systemPlaces, Breaches{"low/Port"});
+}
+
+TEST(ReadHouse, MissingTable_Throws) {
+    EXPECT_THROW(readHouse("## Allowed arrows\n"), std::runtime_error);
+}
+
+TEST(ReadHouse, ArrowToNoRoom_Throws) {
+    std::string tables = kTables;
+    tables.replace(tables.find("| `low` | no |"), 14, "| `law` | no |");
+    EXPECT_THROW(readHouse(tables), std::runtime_error);
+}
+
+TEST(RoomOf, PathInASubroom_GivesTheSubroom) {
+    const House house = readHouse(kTables);
+    EXPECT_EQ(house.roomOf("low/deep/A.h")->name, "low/deep");
+    EXPECT_EQ(house.roomOf("low/deeper/A.h")->name, "low");
+    EXPECT_EQ(house.roomOf("lower/A.h"), nullptr);
+}
+
+TEST(HomelessFiles, FileOutsideOfAllRooms_IsNamed) {
+    EXPECT_EQ(homelessFiles(readHouse(kTables), {{"attic/A.h", ""}, {"low/A.h", ""}}),
+              Breaches{"attic/A.h"});
+}
+
+TEST(UnknownIncludes, PathFromTheOwnFolder_IsNamed) {
+    EXPECT_EQ(unknownIncludes({including("low/A.cpp", "A.h"), {"low/A.h", ""}}),
+              Breaches{"low/A.cpp includes \"A.h\""});
+}
+
+TEST(UnknownIncludes, PathFromTheRootAndMadeFile_AreInOrder) {
+    EXPECT_EQ(
+        unknownIncludes(
+            {including("low/A.cpp", "low/A.h"), including("low/B.cpp", "B.moc"), {"low/A.h", ""}}),
+        Breaches{});
+}
+
+TEST(ForbiddenArrows, ArrowUp_IsNamed) {
+    EXPECT_EQ(forbiddenArrows(readHouse(kTables), {including("low/A.h", "high/H.h")}),
+              Breaches{"low/A.h includes \"high/H.h\": low may not include high"});
+}
+
+TEST(ForbiddenArrows, ArrowIntoASubroom_NeedsARowOfItsOwn) {
+    EXPECT_EQ(forbiddenArrows(readHouse(kTables), {including("high/H.h", "low/deep/D.h")}).size(),
+              1u);
+}
+
+TEST(ForbiddenArrows, AllowedArrowOwnRoomAndException_AreInOrder) {
+    EXPECT_EQ(forbiddenArrows(readHouse(kTables), {including("high/H.h", "low/A.h"),
+                                                   including("high/H.cpp", "high/H.h"),
+                                                   including("low/Odd.h", "high/H.h"),
+                                                   including("tests/low/T.cpp", "low/deep/D.h")}),
+              Breaches{});
+}
+
+TEST(IdleExceptions, NoIncludeNeedsIt_IsNamed) {
+    EXPECT_EQ(idleExceptions(readHouse(kTables), {including("low/Odd.h", "low/A.h")}),
+              Breaches{"low/Odd.h -> high/H.h"});
+}
+
+TEST(IdleExceptions, IncludeNeedsIt_IsInOrder) {
+    EXPECT_EQ(idleExceptions(readHouse(kTables), {including("low/Odd.h", "high/H.h")}), Breaches{});
+}
+
+TEST(CirclesOfIncludes, TwoRoomsThatIncludeEachOther_AreNamed) {
+    EXPECT_EQ(circlesOfIncludes(readHouse(kTables), {including("low/Odd.h", "high/H.h"),
+                                                     including("high/H.h", "low/A.h")}),
+              Breaches{"high -> low -> high"});
+}
+
+TEST(CirclesOfTable, RowsThatAllowEachOther_AreNamed) {
+    House house = readHouse(kTables);
+    EXPECT_EQ(circlesOfTable(house), Breaches{});
+    house.rooms[0].mayInclude = {"high"};
+    EXPECT_EQ(circlesOfTable(house), Breaches{"high -> low -> high"});
+}
+
+class RealTimeWord : public ::testing::TestWithParam<const char*> {};
+
+TEST_P(RealTimeWord, InCode_IsNamed) {
+    const std::string text = std::string("void f() {\n    ") + GetParam() + ";\n}\n";
+    const Breaches breaches = realTimeUses(readHouse(kTables), {{"low/A.cpp", text}});
+    ASSERT_EQ(breaches.size(), 1u);
+    EXPECT_EQ(breaches[0].rfind("low/A.cpp:2: ", 0), 0u);
+}
+
+TEST_P(RealTimeWord, InItsPlace_IsInOrder) {
+    EXPECT_EQ(realTimeUses(readHouse(kTables), {{"low/PortA.cpp", GetParam()}}), Breaches{});
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    RealTimeUses, RealTimeWord,
+    ::testing::Values("auto t = std::chrono::steady_clock::now()", "system_clock::now()",
+                      "std::this_thread::sleep_for(ms)", "usleep(10)", "nanosleep(&t, nullptr)",
+                      "QThread::msleep(5)", "QThread::sleep(5)", "QElapsedTimer timer",
+                      "QTime::currentTime()", "QDateTime::currentMSecsSinceEpoch()",
+                      "std::time(nullptr)", "::time(&t)", "x = time(nullptr)", "::sleep(1)",
+                      "clock_gettime(CLOCK_MONOTONIC, &t)", "std::clock()"));
+
+TEST(RealTimeUses, TimeOfTheProgramAndTalkOfClocks_AreInOrder) {
+    const std::string text =
+        "// steady_clock would be wrong here\n"
+        "/* usleep(1) */ events.sleep(5); clock.now(); const char* t = \"usleep\";\n"
+        "void VirtualEvents::sleep(int ms) {}\n";
+    EXPECT_EQ(realTimeUses(readHouse(kTables), {{"low/A.cpp", text}}), Breaches{});
+}
+
+TEST(ForeignHeaders, HeaderOfAToolkitOrTheSystem_IsNamed) {
+    const SourceFile file{"low/A.cpp", "#include <QString>\n#include <unistd.h>\n#include <map>\n"};
+    EXPECT_EQ(foreignHeaders(readHouse(kTables), {file}),
+              (Breaches{"low/A.cpp includes <QString>", "low/A.cpp includes <unistd.h>"}));
+}
+
+TEST(ForeignHeaders, OtherRoomsAndPlacesOfTheSystem_AreFree) {
+    EXPECT_EQ(foreignHeaders(readHouse(kTables), {{"high/A.cpp", "#include <QString>\n"},
+                                                  {"low/Port.cpp", "#include <poll.h>\n"}}),
+              Breaches{});
+}
+
+TEST(LongFiles, LineAboveTheLimit_IsNamed) {
+    EXPECT_EQ(longFiles({{"low/A.h", "1\n2\n"}, {"low/B.h", "1\n2\n3\n"}}, 2),
+              Breaches{"low/B.h: 3 lines"});
+}
+
+TEST(Includes, IncludeInAComment_DoesNotCount) {
+    const SourceFile file{"low/A.h",
+                          "// #include \"x/A.h\"\n/*\n#include \"x/B.h\"\n*/\n"
+                          "#  include \"low/C.h\"  // \"x/D.h\"\n#include <map>\n"};
+    EXPECT_EQ(includes(file, IncludeKind::Quoted), Breaches{"low/C.h"});
+    EXPECT_EQ(includes(file, IncludeKind::Angled), Breaches{"map"});
+}
+
+TEST(CodeOnly, LiteralsAndComments_AreEmptied) {
+    EXPECT_EQ(codeOnly("a(\"b\\\"c\", 'd', 1'000); // e\nf"), "a(\"\", '', 1'000);     \nf");
+    EXPECT_EQ(codeOnly("x = R\"t(usleep\n\")t\"; y"), "x = R\"\n\"; y");
+}
+
+}  // namespace
+}  // namespace zel::house
