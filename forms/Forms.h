@@ -1,0 +1,143 @@
+#pragma once
+// All forms of the program, each of which exists once.
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "forms/ControllerForm.h"
+#include "forms/MainForm.h"
+#include "platform/Controls.h"
+#include "platform/Graph.h"
+
+namespace zel {
+
+/// The server's window.
+class ServerForm : public Form {
+  public:
+    ServerForm() : Form("ServerForm") {
+        Caption = "Server Mode";
+        addVariables({{"doBinaryData", &doBinaryData}});
+    }
+    std::vector<std::string> CommPorts;
+    bool doBinaryData = false;
+    TextBox localPortTextBox{*this, "localPortTextBox", "2277"};
+    TextBox txtDebug{*this, "txtDebug"};
+};
+
+class TCPConnectionForm : public Form {
+  public:
+    TCPConnectionForm() : Form("TCPConnectionForm") { Caption = "TCP/IP Connection"; }
+    TextBox IPAdressTextBox{*this, "IPAdressTextBox"};
+    TextBox RemotePortTextBox{*this, "RemotePortTextBox"};
+    TextBox IDTextBox{*this, "IDTextBox"};
+    Button ConnectTCPButton{*this, "ConnectTCPButton", "Connect"};
+    Button QuitTCPButton{*this, "QuitTCPButton", "Close"};
+};
+
+class DevicesChoiceForm : public Form {
+  public:
+    DevicesChoiceForm() : Form("DevicesChoiceForm") { Caption = "Communication Device"; }
+};
+
+/// The recording's dialog.
+class TimeForm : public Form {
+  public:
+    TimeForm() : Form("TimeForm") {
+        Caption = "Record Data";
+        addVariables(
+            {{"ContinuousRecording", &ContinuousRecording}, {"RecordedCount", &RecordedCount}});
+    }
+    bool ContinuousRecording = false;
+    double RecordedCount = 0;
+};
+
+/// The waterfall's window. Its row calls are events that the waterfall's room handles.
+class WaterfallForm : public Form {
+  public:
+    WaterfallForm() : Form("WaterfallForm") { Caption = "Waterfall"; }
+    zel::Graph3D Graph3D{*this, "Graph3D"};
+    Label lblMin{*this, "lblMin"};
+    Label lblMAX{*this, "lblMAX"};
+    Event<> resetRowCount;
+    Event<int> limitRows;                ///< keeps at most so many rows
+    Event<const std::string&> stampRow;  ///< counts a row; the text is the time of day
+    Event<> styleLastRow;
+    Event<> saveGraphView;
+};
+
+class SpecialMeasForm : public Form {
+  public:
+    SpecialMeasForm() : Form("SpecialMeasForm") { Caption = "Special Measurements"; }
+    CheckBox chkWaterfall{*this, "chkWaterfall", "Waterfall"};
+};
+
+class ScriptEditor : public Form {
+  public:
+    ScriptEditor() : Form("ScriptEditor") { Caption = "Script Editor"; }
+};
+
+class STDForm : public Form {
+  public:
+    STDForm() : Form("STDForm") { Caption = "Level and Phase"; }
+};
+
+class AboutForm : public Form {
+  public:
+    AboutForm() : Form("AboutForm") { Caption = "About ZELRemote"; }
+};
+
+class ErrorForm : public Form {
+  public:
+    ErrorForm() : Form("ErrorForm") { Caption = "ZELRemote Error"; }
+};
+
+/// What the power sensor's readings bring: the power alone, or the reflection as well.
+class PowerAndReflForm : public Form {
+  public:
+    PowerAndReflForm() : Form("PowerAndReflForm") {
+        Caption = "Power Sensor";
+        addVariables({{"ReadPowerOnly", &ReadPowerOnly}, {"ReadPowerAndRefl", &ReadPowerAndRefl}});
+    }
+    bool ReadPowerOnly = true;
+    bool ReadPowerAndRefl = false;
+    OptionButton PowerOnlyOption{*this, "PowerOnlyOption", "reading", "Read Power Only"};
+    OptionButton PowerAndLeflOption{*this, "PowerAndLeflOption", "reading",
+                                    "Read Power and Reflection"};
+    Button ClosePwrForm{*this, "ClosePwrForm", "Close"};
+};
+
+/// The manual scale of the y axis.
+class ManualScaleForm : public Form {
+  public:
+    ManualScaleForm() : Form("ManualScaleForm") { Caption = "Graph Settings"; }
+    TextBox manualSizeMax{*this, "manualSizeMax"};
+    TextBox manualSizeMin{*this, "manualSizeMin"};
+    Button cmdAccept{*this, "cmdAccept", "Accept"};
+    Button cmdCancel{*this, "cmdCancel", "Cancel"};
+};
+
+struct Forms {
+    ControllerForm controller;
+    MainForm main;
+    ServerForm server;
+    TCPConnectionForm tcpConnection;
+    DevicesChoiceForm devicesChoice;
+    TimeForm time;
+    WaterfallForm waterfall;
+    SpecialMeasForm specialMeas;
+    ScriptEditor scriptEditor;
+    STDForm std;
+    AboutForm about;
+    ErrorForm error;
+    PowerAndReflForm powerAndRefl;
+    ManualScaleForm manualScale;
+
+    std::vector<Form*> all();
+    /// By the form's name; null if there is none.
+    Form* form(std::string_view name);
+    /// "MainForm.ZELButton"; a control of the panel needs no prefix. Null if there is none.
+    Control* control(std::string_view path);
+};
+
+}  // namespace zel
