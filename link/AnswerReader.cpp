@@ -1,0 +1,132 @@
+#include "link/AnswerReader.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr double kDirectTimeoutS = 9;
+constexpr double kOtherTimeoutS = 16;
+constexpr double kLongestTimeoutS = 86400;  // a sweep time that makes no sense ends as well
+constexpr int kPollMs = 20;
+constexpr int kSettledMs = 20;  // a text that grew later than this is not judged yet
+// An answer line is far shorter; noise without a CR must not grow for ever.
+constexpr std::size_t kLongestAnswer = 65536;
+
+}  // namespace
+
+bool IsPrintableAnswer(const std::string& text) {
+    const bool isShort = text.size() < 3;
+    return std::none_of(text.begin(), text.end(), [isShort](char character) {
+        const auto code = static_cast<unsigned char>(character);
+        return code >= 128 || (code >= 58 && isShort);
+    });
+}
+
+AnswerReader::AnswerReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
+                           const double& SweepTime, const Clock& clock, Events& events,
+                           MessageBoxes& boxes)
+    : panel_(panel),
+      dialog_(dialog),
+      state_(state),
+      link_(link),
+      SweepTime_(SweepTime),
+      events_(events),
+      boxes_(boxes),
+      StopwatchA_(clock),
+      sinceGrowth_(clock) {}
+
+std::string AnswerReader::ReadAnswer() {
+    double timeout =
+        panel_.ConnectionState == ControllerForm::DIRECTCON ? kDirectTimeoutS : kOtherTimeoutS;
+    if (state_.WaitCommandActive) timeout = std::nearbyint(timeout + 2 * SweepTime_);
+    timeout = std::clamp(timeout, 0.0, kLongestTimeoutS);
+    return read(static_cast<std::int64_t>(timeout * 1000), "No response received!", true);
+}
+
+std::string AnswerReader::ReadAnswerTriggered(std::int32_t timeoutSeconds) {
+    return read(std::int64_t{timeoutSeconds} * 1000, "External trigger timed out!", false);
+}
+
+std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
+                               bool quietWhenFailed) {
+    answered_ = absenceTold_ = noiseTold_ = false;
+    if (link_.isTcp()) state_.InputBuffer.clear();
+    StopwatchA_.Reset();
+    sinceGrowth_.Reset();
+    for (;;) {
+        if (!link_.usable()) {
+            if (!state_.DialCancelled) {
+                std::string text = "Port not open!";
+                if (!link_.problem().empty()) text += kCrLf + link_.problem();
+                boxes_.show({BoxIcon::Critical, text});
+            }
+            state_.ExchangeFailed = true;
+            return "";
+        }
+        const std::string arrived = link_.ReadFromLink(true);
+        if (!arrived.empty()) {
+            state_.InputBuffer += arrived;
+            sinceGrowth_.Reset();
+        }
+        judgeNoise();
+        const auto end = state_.InputBuffer.find('\r');
+        if (end != std::string::npos) {
+            events_.pump();
+            std::string answer = state_.InputBuffer.substr(0, end);
+            state_.InputBuffer.erase(0, end + 1);
+            state_.ExchangeFailed = false;
+            answered_ = true;
+            return answer;
+        }
+        if (state_.InputBuffer.size() > kLongestAnswer) state_.InputBuffer.clear();
+        if (StopwatchA_.Elapsed() > timeoutMs) break;
+        events_.wait(kPollMs);
+    }
+    if (panel_.isConnected) {
+        const bool told = quietWhenFailed && state_.ExchangeFailed;
+        state_.ExchangeFailed = true;
+        if (!told) boxes_.show({BoxIcon::Warning, silenceText});
+    } else {
+        giveUpConnecting();
+    }
+    return "";
+}
+
+void AnswerReader::judgeNoise() {
+    if (panel_.BinaryModeActive || panel_.ErrorFlag || state_.InputBuffer.empty()) return;
+    // The first letter of an answer that is still growing is no noise.
+    const bool settled =
+        state_.InputBuffer.find('\r') != std::string::npos || sinceGrowth_.Elapsed() >= kSettledMs;
+    if (!settled || IsPrintableAnswer(state_.InputBuffer)) return;
+    boxes_.show({BoxIcon::Information,
+                 "Incorrect baud rate for the connection!" + std::string(kCrLf) +
+                     "Received: " + wireToUtf8(state_.InputBuffer),
+                 "Incorrect baud rate"});
+    panel_.ErrorFlag = true;
+    noiseTold_ = true;
+}
+
+void AnswerReader::giveUpConnecting() {
+    if (!panel_.ErrorFlag || noiseTold_) {
+        if (!state_.DialCancelled) {
+            boxes_.show({BoxIcon::Critical, "No ZEL3 found at the specified address!"});
+            absenceTold_ = true;
+        }
+        panel_.ErrorFlag = false;
+    }
+    if (panel_.ConnectionState == ControllerForm::DIRECTCON) link_.CloseComPort();
+    // One message is enough: the disconnection behind it stays silent.
+    const bool flag = panel_.ErrorFlag;
+    panel_.ErrorFlag = true;
+    dialog_.DisconnectButton.Click();
+    panel_.ErrorFlag = flag;
+    dialog_.OnPic.Visible = false;
+    dialog_.MousePointer = 0;
+    events_.pump();
+}
+
+}  // namespace zel

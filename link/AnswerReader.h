@@ -1,0 +1,57 @@
+#pragma once
+// Reads the instrument's answer lines, with the time-outs of the line and what they lead to.
+
+#include <cstdint>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "forms/MainForm.h"
+#include "link/ByteLink.h"
+#include "link/ZELBas.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+
+namespace zel {
+
+/// True for a text that can be an answer: below three characters only digits and the punctuation
+/// below them, and never a character with the top bit set, which is noise of a wrong baud rate.
+bool IsPrintableAnswer(const std::string& text);
+
+class AnswerReader {
+  public:
+    /// `SweepTime` is the mirror's sweep time, in seconds.
+    AnswerReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
+                 const double& SweepTime, const Clock& clock, Events& events, MessageBoxes& boxes);
+
+    /// One line without its CR, or the empty text. A silence in session sets `ExchangeFailed`
+    /// and tells "No response received!" once; while connecting it takes the connection down.
+    std::string ReadAnswer();
+    /// The same with the caller's time-out in seconds, for an exchange that a trigger ends.
+    std::string ReadAnswerTriggered(std::int32_t timeoutSeconds);
+
+    /// The last read found a line, be it an empty one.
+    bool answered() const { return answered_; }
+    /// The last read told the user that no instrument was found.
+    bool absenceTold() const { return absenceTold_; }
+
+  private:
+    std::string read(std::int64_t timeoutMs, const char* silenceText, bool quietWhenFailed);
+    void judgeNoise();
+    void giveUpConnecting();
+
+    ControllerForm& panel_;
+    MainForm& dialog_;
+    ZELBas& state_;
+    ByteLink& link_;
+    const double& SweepTime_;
+    Events& events_;
+    MessageBoxes& boxes_;
+    Stopwatch StopwatchA_;
+    Stopwatch sinceGrowth_;
+    bool answered_ = false;
+    bool absenceTold_ = false;
+    bool noiseTold_ = false;
+};
+
+}  // namespace zel

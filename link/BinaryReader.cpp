@@ -1,0 +1,133 @@
+#include "link/BinaryReader.h"
+
+#include "link/DebugLine.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr std::int16_t kChunkSeconds = 5;
+constexpr int kStallMs = 5000;
+constexpr int kPollMs = 20;
+constexpr int kTailMs = 200;  // for the last bytes of a slow line
+constexpr std::size_t kStatusBytes = 2;
+
+/// A status digit and CR with nothing behind it.
+bool isBareStatus(const std::string& bytes) {
+    return bytes.size() == kStatusBytes && bytes[1] == '\r' && bytes[0] >= '0' && bytes[0] <= '7';
+}
+
+}  // namespace
+
+void PrependBytes(std::string& bytes, std::size_t count, char byte) {
+    if (count == 0) return;
+    std::string head(count, '\0');
+    head.front() = byte;
+    bytes.insert(0, head);
+}
+
+BinaryReader::BinaryReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
+                           const Socket& TCPSocket, const Clock& clock, Events& events,
+                           MessageBoxes& boxes)
+    : panel_(panel),
+      dialog_(dialog),
+      state_(state),
+      link_(link),
+      socket_(TCPSocket),
+      events_(events),
+      boxes_(boxes),
+      StopwatchB_(clock),
+      tail_(clock) {}
+
+bool BinaryReader::linkLost() const {
+    if (!link_.isTcp()) return !link_.portOpen();
+    return socket_.state() != SocketState::Connected;
+}
+
+std::string BinaryReader::ReadBinaryBuffer(std::int16_t length) {
+    std::string bytes;
+    if (link_.usable()) {
+        bytes = ReadBinaryBytes(length);
+    } else {
+        boxes_.show({BoxIcon::Critical, "Port is not open!"});
+    }
+    events_.pump();
+    DebugLine(panel_, "BIN-BUFFER-LEN: " + numberText(static_cast<double>(bytes.size()) - 1));
+    return bytes;
+}
+
+std::string BinaryReader::ReadBinaryChunk(std::int16_t seconds) {
+    StopwatchB_.Reset();
+    std::string chunk = link_.takeBytes();
+    while (chunk.empty() && StopwatchB_.Elapsed() <= seconds * 1000 && !linkLost()) {
+        events_.wait(kPollMs);
+        chunk = link_.takeBytes();
+    }
+    return chunk;
+}
+
+std::string BinaryReader::takeTail(std::size_t missing) {
+    std::string tail;
+    tail_.Reset();
+    while (tail.size() < missing && tail_.Elapsed() <= kTailMs && !linkLost()) {
+        events_.wait(kPollMs);
+        tail += link_.takeBytes();
+    }
+    return tail;
+}
+
+std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
+    const auto wanted = static_cast<std::size_t>(length);
+    std::string result;
+    const bool serialUsable = dialog_.IsConnectedToPort && link_.portOpen();
+    if (!link_.isTcp() && !serialUsable) {
+        if (!panel_.ErrorFlag) {
+            boxes_.show({BoxIcon::Critical, "Not Connected To Port!"});
+            panel_.ErrorFlag = true;
+        }
+        state_.TCPDataArrived = false;
+        return result;
+    }
+    std::string chunk = ReadBinaryChunk(kChunkSeconds);
+    if (chunk.size() == 1) {
+        const char status = chunk.front();
+        chunk = ReadBinaryChunk(kChunkSeconds);
+        PrependBytes(chunk, 1, status);
+    }
+    StopwatchB_.Reset();
+    if (isBareStatus(chunk) && chunk[0] != '0') {
+        state_.TCPDataArrived = false;
+        return chunk;
+    }
+    if (!chunk.empty()) {
+        chunk.erase(0, kStatusBytes);
+        for (;;) {
+            result += chunk;
+            if (result.size() > wanted) result.resize(wanted);
+            chunk = link_.takeBytes();
+            if (chunk.empty() && result.size() + 3 < wanted) chunk = ReadBinaryChunk(kChunkSeconds);
+            events_.pump();
+            if (StopwatchB_.Elapsed() > kStallMs) break;
+            if (result.size() + 2 >= wanted) break;
+            if (chunk.empty() && linkLost()) break;
+            if (chunk.empty()) events_.wait(kPollMs);
+        }
+        // The end of the block is near or the instrument has stopped: the chunk at hand and the
+        // last bytes still belong to the samples.
+        result += chunk;
+        if (result.size() + 2 >= wanted && result.size() < wanted)
+            result += takeTail(wanted - result.size());
+        if (result.size() > wanted) result.resize(wanted);
+    }
+    state_.TCPDataArrived = false;
+    if (link_.isTcp() && linkLost() && result.size() < wanted) {
+        if (panel_.ErrorFlag)
+            boxes_.show({BoxIcon::Critical, std::string("TCP/IP Socket error") + kCrLf +
+                                                "Please make a new connection."});
+        return "";
+    }
+    return result;
+}
+
+}  // namespace zel

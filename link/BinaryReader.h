@@ -1,0 +1,48 @@
+#pragma once
+// Reads the bytes of a binary transfer: knows where the status ends and the samples begin.
+
+#include <cstdint>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "link/ByteLink.h"
+#include "link/ZELBas.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "platform/Socket.h"
+
+namespace zel {
+
+/// Puts `count` places at the head of the bytes, `byte` in the first and zeros in the others.
+void PrependBytes(std::string& bytes, std::size_t count, char byte);
+
+class BinaryReader {
+  public:
+    BinaryReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
+                 const Socket& TCPSocket, const Clock& clock, Events& events, MessageBoxes& boxes);
+
+    /// The checked entry to `ReadBinaryBytes`; tells a closed port.
+    std::string ReadBinaryBuffer(std::int16_t length);
+    /// The bytes behind the status, at most `length`; fewer when the instrument stops. A refusal
+    /// gives its digit and CR, two bytes; a silence of 5 s gives nothing.
+    std::string ReadBinaryBytes(std::int16_t length);
+    /// One timed read: what has come as soon as something has, else nothing.
+    std::string ReadBinaryChunk(std::int16_t seconds);
+
+  private:
+    bool linkLost() const;
+    std::string takeTail(std::size_t missing);
+
+    ControllerForm& panel_;
+    MainForm& dialog_;
+    ZELBas& state_;
+    ByteLink& link_;
+    const Socket& socket_;
+    Events& events_;
+    MessageBoxes& boxes_;
+    Stopwatch StopwatchB_;
+    Stopwatch tail_;
+};
+
+}  // namespace zel

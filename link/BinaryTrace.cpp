@@ -1,0 +1,210 @@
+#include "link/BinaryTrace.h"
+
+#include "link/CommandExchange.h"
+#include "link/DebugLine.h"
+#include "link/InstrumentErrors.h"
+#include "support/ByteCast.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr std::size_t kBlockBytes = 1204;  // 301 samples, without the separator
+constexpr int kReRequestMs = 10000;
+constexpr int kPollMs = 20;
+
+}  // namespace
+
+BinaryTrace::BinaryTrace(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
+                         BinaryReader& bytes, const Clock& clock, Events& events,
+                         MessageBoxes& boxes)
+    : panel_(panel),
+      state_(state),
+      link_(link),
+      reader_(reader),
+      bytes_(bytes),
+      clock_(clock),
+      events_(events),
+      boxes_(boxes),
+      StopwatchA_(clock) {}
+
+void BinaryTrace::delay(DelayPlace place) {
+    const int ms = linkDelay(place, panel_.ConnectionState);
+    if (ms > 0) events_.sleep(ms);
+}
+
+void BinaryTrace::startingError(int status, const char* keyword) {
+    boxes_.show({BoxIcon::Information, "GET error" + numberText(status) + " for command <" +
+                                           keyword + "> (while starting)"});
+}
+
+BinaryTrace::Round BinaryTrace::beginRound() const {
+    return {panel_.ContinuosLoopActive, panel_.RecordDataFlag, panel_.isConnected};
+}
+
+bool BinaryTrace::mayAskAgain(const Round& round) const {
+    const bool stopped = (round.looping && !panel_.ContinuosLoopActive) ||
+                         (round.recording && !panel_.RecordDataFlag);
+    const bool disconnected = round.connected && !panel_.isConnected;
+    return !stopped && !disconnected && link_.usable();
+}
+
+bool BinaryTrace::GetTraceBinary(std::vector<double>& values, bool doubleBlock) {
+    const Round round = beginRound();
+    for (;;) {
+        DebugLine(panel_, "Binary trace transfer starting");
+        const auto t0 = static_cast<float>(clock_.secondsOfDay());
+        bool success = false;
+        switch (readOnce(values, doubleBlock, success)) {
+            case Outcome::AskAgain:
+                if (mayAskAgain(round)) continue;
+                return false;
+            case Outcome::Failed:
+                return false;
+            case Outcome::Done:
+                break;
+        }
+        if (success) DebugLine(panel_, "Trace complete");
+        DebugLine(panel_,
+                  "Binary trace transfer finished (" + elapsedSecondsText(clock_, t0) + " s)");
+        return success;
+    }
+}
+
+BinaryTrace::Outcome BinaryTrace::readOnce(std::vector<double>& values, bool doubleBlock,
+                                           bool& success) {
+    state_.InputBuffer.clear();
+    link_.WriteToLink("GET\r");
+    delay(DelayPlace::AfterTraceGet);
+    int status = statusNumber(reader_.ReadAnswer());
+    if (state_.ExchangeFailed || !reader_.answered()) return Outcome::Failed;
+    if (status != 0) {
+        startingError(status, "TRACEBIN");
+        return Outcome::Done;
+    }
+    panel_.BinaryModeActive = true;
+    link_.WriteToLink("TRACEBIN\r");
+    delay(DelayPlace::AfterTraceKeyword);
+    const std::string bytes = bytes_.ReadBinaryBuffer(doubleBlock ? kDoubleBytes : kSingleBytes);
+    if (bytes.size() == 2) {
+        status = bytes[0] - '0';
+        if (status == 1) return Outcome::AskAgain;
+        if (status > 1 && status <= 7) {
+            ReportInstrumentError(state_, boxes_, status, "TRACEBIN");
+            return Outcome::Done;
+        }
+    }
+    if (!link_.usable()) return Outcome::Failed;  // the device has gone in the middle
+    decode(bytes, doubleBlock, values);
+    success = true;
+    return Outcome::Done;
+}
+
+void BinaryTrace::decode(const std::string& bytes, bool doubleBlock, std::vector<double>& values) {
+    values.resize(doubleBlock ? kDoubleSamples : kSingleSamples);
+    std::size_t output = 0;
+    std::int16_t& index = state_.BinaryDecodeIndex;
+    const int last = static_cast<int>(bytes.size()) - 1 - 4;
+    for (index = 0; index <= last && output < values.size();
+         index = static_cast<std::int16_t>(index + 4)) {
+        if (doubleBlock && index == static_cast<std::int16_t>(kBlockBytes)) ++index;
+        if (static_cast<std::size_t>(index) + 4 > bytes.size()) break;
+        values[output++] =
+            int32FromLittleEndian(reinterpret_cast<const unsigned char*>(bytes.data()) + index);
+    }
+}
+
+bool BinaryTrace::GetCTraceBinary(std::vector<double>& values) {
+    const Round round = beginRound();
+    DebugLine(panel_, "Binary ctrace transfer starting");
+    for (;;) {
+        state_.ComplexTraceActive = true;
+        const auto t0 = static_cast<float>(clock_.secondsOfDay());
+        bool success = false;
+        const Outcome outcome = readComplexOnce(values, success);
+        if (outcome == Outcome::Failed) return false;
+        if (outcome == Outcome::AskAgain || state_.ComplexTraceRequested) {
+            state_.ComplexTraceRequested = false;
+            if (mayAskAgain(round)) continue;
+            return false;
+        }
+        DebugLine(panel_,
+                  "Binary trace transfer finished (" + elapsedSecondsText(clock_, t0) + " s)");
+        state_.ComplexTraceActive = false;
+        return success;
+    }
+}
+
+BinaryTrace::Outcome BinaryTrace::readComplexOnce(std::vector<double>& values, bool& success) {
+    state_.InputBuffer.clear();
+    link_.WriteToLink("GET\r");
+    delay(DelayPlace::AfterComplexGet);
+    int status = statusNumber(reader_.ReadAnswer());
+    if (state_.ExchangeFailed || !reader_.answered()) return Outcome::Failed;
+    if (status != 0) {
+        startingError(status, "CTRACEBIN");
+        return Outcome::Done;
+    }
+    panel_.BinaryModeActive = true;
+    link_.WriteToLink("CTRACEBIN\r");
+    delay(DelayPlace::AfterComplexKeyword);
+    status = statusNumber(reader_.ReadAnswer());
+    if (!reader_.answered()) return Outcome::Failed;
+    if (status != 0) {
+        std::string text =
+            "CMD error" + numberText(status) + " for command <CTRACEBIN> (while executing)";
+        if (status == 2) text += std::string(kCrLf) + "Command not allowed in currend mode";
+        boxes_.show({BoxIcon::Information, text});
+        ReportInstrumentError(state_, boxes_, status, panel_.CommandLine);
+        return Outcome::Done;
+    }
+    std::string bytes = ReadLiteralBytes(kDoubleBytes);
+    if (bytes.size() < static_cast<std::size_t>(kDoubleBytes)) return Outcome::AskAgain;
+    bytes.erase(kBlockBytes, 1);  // the separator of the first block
+    values.resize(kDoubleSamples);
+    for (std::size_t i = 0; i < kDoubleSamples; ++i)
+        values[i] =
+            int32FromLittleEndian(reinterpret_cast<const unsigned char*>(bytes.data()) + 4 * i);
+    success = true;
+    DebugLine(panel_, "Trace complete");
+    return Outcome::Done;
+}
+
+std::string BinaryTrace::ReadLiteralBytes(std::int32_t count) {
+    const Round round = beginRound();
+    const auto wanted = static_cast<std::size_t>(count);
+    StopwatchA_.Reset();
+    state_.ComplexTraceRequested = false;
+    for (;;) {
+        if (!link_.usable()) {
+            boxes_.show({BoxIcon::Critical, "Port is not open!"});
+            return "";
+        }
+        if (!mayAskAgain(round)) return "";
+        state_.InputBuffer += link_.ReadFromLink(true);
+        events_.pump();
+        const auto length = static_cast<double>(state_.InputBuffer.size());
+        DebugLine(panel_, "BIN-BUFFER-LEN: " + numberText(length));
+        if (state_.InputBuffer.size() >= wanted) break;
+        if (StopwatchA_.Elapsed() > kReRequestMs) {
+            link_.WriteToLink("get\r");
+            delay(DelayPlace::ReRequestAfterGet);
+            link_.ReadFromLink(true);
+            link_.WriteToLink(state_.ComplexTraceActive ? "CTRACEBIN\r" : "TRACEBIN\r");
+            if (state_.ComplexTraceActive) state_.ComplexTraceRequested = true;
+            delay(DelayPlace::ReRequestAfterKeyword);
+            StopwatchA_.Reset();
+            state_.InputBuffer.clear();
+            continue;
+        }
+        if (link_.isTcp()) continue;  // its read waits by itself
+        events_.wait(kPollMs);
+    }
+    std::string result = state_.InputBuffer.substr(0, wanted);
+    state_.InputBuffer.erase(0, wanted);
+    DebugLine(panel_, "MY INBUFFER LEN IS: " + numberText(static_cast<double>(result.size())));
+    return result;
+}
+
+}  // namespace zel

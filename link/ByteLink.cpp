@@ -1,0 +1,143 @@
+#include "link/ByteLink.h"
+
+#include <algorithm>
+
+#include "support/NumberText.h"
+#include "support/StringOp.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr int kSocketWaitMs = 100;
+constexpr int kSocketPollMs = 10;
+constexpr int kInBufferSize = 12000;  // holds the largest binary transfer
+constexpr int kOutBufferSize = 2048;
+constexpr long kFastestBaud = 10'000'000;
+constexpr double kHighestPort = 32767;
+
+}  // namespace
+
+ByteLink::ByteLink(ControllerForm& panel, MainForm& dialog, ZELBas& state, SerialPort& ZELCommC,
+                   Socket& TCPSocket, const Clock& clock, Events& events, MessageBoxes& boxes,
+                   DebugChannel& debug)
+    : panel_(panel),
+      dialog_(dialog),
+      state_(state),
+      port_(ZELCommC),
+      socket_(TCPSocket),
+      events_(events),
+      boxes_(boxes),
+      debug_(debug),
+      StopwatchB_(clock) {
+    socket_.DataArrival.connect([this] { state_.TCPDataArrived = true; });
+}
+
+bool ByteLink::isTcp() const { return panel_.ConnectionState == ControllerForm::TCPCON; }
+
+bool ByteLink::OpenSerialPort(const std::string& port, long baud) {
+    SerialSetup setup;
+    setup.CommPort = port;
+    setup.InBufferSize = kInBufferSize;
+    setup.OutBufferSize = kOutBufferSize;
+    setup.Settings = std::to_string(baud) + ",N,8,1";
+    if (!port_.open(setup)) return false;
+    dialog_.IsConnectedToPort = true;
+    state_.InputBuffer.clear();
+    return true;
+}
+
+void ByteLink::OpenPortFromDialog() {
+    const auto pointer = [this](int shape) {
+        dialog_.MousePointer = shape;
+        events_.pump();
+    };
+    pointer(11);
+    const std::string device = serialDeviceName(dialog_.COMList.Text(), dialog_.CommPorts);
+    if (device.empty()) {
+        dialog_.MousePointer = 0;
+        boxes_.show({BoxIcon::Plain, "Please enter a valid COM port!"});
+        return;
+    }
+    const std::string baudText = dialog_.BaudList.Text();
+    if (!IsNumericText(baudText)) {
+        pointer(0);
+        boxes_.show({BoxIcon::Plain, "Please enter a valid baud rate!"});
+        return;
+    }
+    if (port_.isOpen()) {
+        boxes_.show({BoxIcon::Plain, "Port is already open!"});
+        pointer(0);
+        return;
+    }
+    const double baud = leadingNumber(replaceAll(baudText, ",", ""));
+    const bool opened = baud >= 1 && baud <= static_cast<double>(kFastestBaud) &&
+                        OpenSerialPort(device, static_cast<long>(baud));
+    if (opened) dialog_.OnPic.Visible = true;
+    pointer(0);
+    if (opened) return;
+    std::string text = "Could not connect to the specified port!";
+    if (!port_.problem().empty()) text += kCrLf + port_.problem();
+    boxes_.show({BoxIcon::Warning, text});
+}
+
+void ByteLink::WriteToLink(const std::string& text) {
+    if (isTcp()) {
+        socket_.sendData(text);
+    } else if (dialog_.IsConnectedToPort) {
+        port_.output(text);
+        debug_.output("-> " + text);
+    }
+}
+
+std::string ByteLink::takeFromSocket() {
+    StopwatchB_.Reset();
+    while (socket_.peekData().empty() && StopwatchB_.Elapsed() <= kSocketWaitMs) {
+        if (socket_.state() != SocketState::Connected && socket_.state() != SocketState::Connecting)
+            break;  // nothing can come any more
+        events_.wait(kSocketPollMs);
+    }
+    return socket_.getData();
+}
+
+std::string ByteLink::ReadFromLink(bool wait) {
+    std::string result;
+    if (isTcp()) {
+        if (wait) result = takeFromSocket();
+    } else if (dialog_.IsConnectedToPort && port_.isOpen()) {
+        result = port_.input();
+    } else if (!panel_.ErrorFlag) {
+        boxes_.show({BoxIcon::Critical, "Not Connected To Port!"});
+        panel_.ErrorFlag = true;
+    }
+    if (!result.empty()) debug_.output("<-" + result);
+    state_.TCPDataArrived = false;
+    return result;
+}
+
+void ByteLink::drain(int times) {
+    // No event runs between the reads, so that the first empty one says all.
+    for (int i = 0; i < times && !ReadFromLink(false).empty(); ++i) {
+    }
+}
+
+void ByteLink::CloseComPort() { port_.close(); }
+
+void ByteLink::CloseTCPSocket() { socket_.close(); }
+
+std::string ByteLink::takeBytes() { return isTcp() ? socket_.getData() : port_.input(); }
+
+std::string serialDeviceName(const std::string& text, const std::vector<std::string>& known) {
+    const std::string name = trimmed(text);
+    if (name.empty()) return "";
+    if (std::find(known.begin(), known.end(), name) != known.end()) return name;
+    if (name.front() == '/') return name;
+    const std::string number = trimmed(replaceAll(upperCase(name), "COM", ""));
+    if (!IsNumericText(number)) return "";
+    const double port = leadingNumber(number);
+    if (port < 1 || port > kHighestPort || port != static_cast<double>(static_cast<int>(port)))
+        return "";
+    return "COM" + std::to_string(static_cast<int>(port));
+}
+
+}  // namespace zel

@@ -1,0 +1,68 @@
+#pragma once
+// The lowest layer of the instrument's connection: one serial port or one socket, text in and out.
+
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "forms/MainForm.h"
+#include "link/ZELBas.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "platform/SerialPort.h"
+#include "platform/Services.h"
+#include "platform/Socket.h"
+
+namespace zel {
+
+/// `ConnectionState` chooses the link: the socket for TCPCON, the serial port for any other kind.
+class ByteLink {
+  public:
+    ByteLink(ControllerForm& panel, MainForm& dialog, ZELBas& state, SerialPort& ZELCommC,
+             Socket& TCPSocket, const Clock& clock, Events& events, MessageBoxes& boxes,
+             DebugChannel& debug);
+
+    /// Opens the port at 8 data bits, no parity, 1 stop bit, no flow control; `port` is a device
+    /// name. False when it cannot be had; nothing is told.
+    bool OpenSerialPort(const std::string& port, long baud);
+    /// Takes port and baud rate from the dialog's lists and tells what is wrong with them.
+    void OpenPortFromDialog();
+    /// Sends the text as it stands; dropped silently when the port was not opened.
+    void WriteToLink(const std::string& text);
+    /// What has arrived, possibly nothing. Serial never waits; TCP waits up to 0.1 s with `wait`
+    /// and reads nothing without.
+    std::string ReadFromLink(bool wait);
+    /// Throws away what waits: up to `times` reads without waiting.
+    void drain(int times);
+    void CloseComPort();
+    void CloseTCPSocket();
+
+    bool isTcp() const;
+    bool portOpen() const { return port_.isOpen(); }
+    /// A line can be expected: the serial port is open, or the link is a socket.
+    bool usable() const { return isTcp() || portOpen(); }
+    /// Why the port was lost or could not be opened, for a user; empty when nothing is known.
+    std::string problem() const { return port_.problem(); }
+    /// Binary reads: takes what has arrived on either link, without waiting.
+    std::string takeBytes();
+
+  private:
+    std::string takeFromSocket();
+
+    ControllerForm& panel_;
+    MainForm& dialog_;
+    ZELBas& state_;
+    SerialPort& port_;
+    Socket& socket_;
+    Events& events_;
+    MessageBoxes& boxes_;
+    DebugChannel& debug_;
+    Stopwatch StopwatchB_;
+};
+
+/// The device that a port name of the dialog means: "COM" and a number in either case becomes
+/// "COMn"; a name that the platform listed or that is a path stands as it is. Empty when the
+/// name is no port.
+std::string serialDeviceName(const std::string& text, const std::vector<std::string>& known);
+
+}  // namespace zel

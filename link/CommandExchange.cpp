@@ -1,0 +1,215 @@
+#include "link/CommandExchange.h"
+
+#include "link/DebugLine.h"
+#include "link/InstrumentErrors.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr int kDrainReads = 5;
+constexpr int kLongDrainReads = 1001;  // throws away a line that came in late
+constexpr int kFirstAnswerMs = 5000;
+constexpr int kRetryPauseMs = 50;
+constexpr int kValueWaitMs = 250;
+constexpr int kValuePollMs = 20;
+
+}  // namespace
+
+int statusNumber(const std::string& answer) {
+    const double number = leadingNumber(answer);
+    return number > -32768 && number < 32768 ? static_cast<int>(number) : 0;
+}
+
+std::string elapsedSecondsText(const Clock& clock, float t0) {
+    const float seconds = static_cast<float>(clock.secondsOfDay()) - t0;
+    return formatPattern(static_cast<double>(seconds), "0.00");
+}
+
+CommandExchange::CommandExchange(ControllerForm& panel, ZELBas& state, ByteLink& link,
+                                 AnswerReader& reader, const Clock& clock, Events& events,
+                                 MessageBoxes& boxes)
+    : panel_(panel),
+      state_(state),
+      link_(link),
+      reader_(reader),
+      clock_(clock),
+      events_(events),
+      boxes_(boxes) {}
+
+void CommandExchange::beginLine(const char* kind, const std::string& text, float& t0) {
+    DebugLine(panel_, std::string(kind) + " <" + text + "> starting");
+    t0 = static_cast<float>(clock_.secondsOfDay());
+    state_.InputBuffer.clear();
+}
+
+void CommandExchange::finishLine(const char* kind, const std::string& text, float t0) {
+    DebugLine(panel_, std::string(kind) + " <" + text + "> finished (" +
+                          elapsedSecondsText(clock_, t0) + " s)");
+}
+
+void CommandExchange::delay(DelayPlace place) {
+    const int ms = linkDelay(place, panel_.ConnectionState);
+    if (ms > 0) events_.sleep(ms);
+}
+
+void CommandExchange::report(int status, const std::string& keyword) {
+    ReportInstrumentError(state_, boxes_, status, keyword);
+}
+
+bool CommandExchange::CmdInstrument(const std::string& keyword) {
+    float t0 = 0;
+    beginLine("CMD", keyword, t0);
+    link_.drain(kDrainReads);
+    link_.WriteToLink("cmd\r");
+    delay(DelayPlace::AfterModeWord);
+    state_.InputBuffer.clear();
+    Stopwatch firstAnswer(clock_);
+    std::string answer = reader_.ReadAnswer();
+    while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs) {
+        events_.wait(kRetryPauseMs);
+        answer = reader_.ReadAnswer();
+    }
+    int status = statusNumber(answer);
+    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    if (status != 0) {
+        report(status, keyword);
+        finishLine("CMD", keyword, t0);
+        return false;
+    }
+    link_.WriteToLink(keyword + "\r");
+    state_.WaitCommandActive = keyword == "WAIT";
+    delay(DelayPlace::AfterCmdKeyword);
+    status = statusNumber(reader_.ReadAnswer());
+    if (!reader_.answered()) return false;
+    DebugLine(panel_, "<" + keyword + "> response: " + wireToUtf8(answer));
+    if (status == 2) {
+        report(status, keyword);
+    } else if (status != 0) {
+        DebugLine(panel_, "CMD error" + numberText(status) + " for command <" + keyword +
+                              "> (while executing)");
+    }
+    finishLine("CMD", keyword, t0);
+    return status == 0;
+}
+
+bool CommandExchange::CmdInstrumentTriggered(const std::string& keyword,
+                                             std::int32_t timeoutSeconds) {
+    const auto pointer = [this](int shape) {
+        panel_.MousePointer = shape;
+        events_.pump();
+    };
+    float t0 = 0;
+    pointer(11);
+    beginLine("CMD", keyword, t0);
+    link_.WriteToLink("cmd\r");
+    delay(DelayPlace::AfterModeWord);
+    state_.InputBuffer.clear();
+    const std::string answer = reader_.ReadAnswerTriggered(timeoutSeconds);
+    int status = answer.empty() ? -1 : statusNumber(answer);
+    bool success = false;
+    if (state_.ExchangeFailed || !reader_.answered()) {
+        pointer(0);
+        return false;
+    }
+    if (status != 0) {
+        report(status, keyword);
+    } else {
+        link_.WriteToLink(keyword + "\r");
+        delay(DelayPlace::AfterCmdKeyword);
+        status = statusNumber(reader_.ReadAnswerTriggered(timeoutSeconds));
+        if (!reader_.answered()) {
+            pointer(0);
+            return false;
+        }
+        DebugLine(panel_, "<" + keyword + "> response: " + wireToUtf8(answer));
+        success = status == 0 && !state_.ExchangeFailed;
+        if (status == 2) {
+            report(status, keyword);
+        } else if (status != 0) {
+            DebugLine(panel_, "CMD error" + numberText(status) + " for command <" + keyword +
+                                  "> (while executing)");
+        }
+    }
+    finishLine("CMD", keyword, t0);
+    pointer(0);
+    return success;
+}
+
+bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
+    float t0 = 0;
+    beginLine("SET", keywordAndValue, t0);
+    link_.drain(kDrainReads);
+    link_.WriteToLink("set\r");
+    delay(DelayPlace::AfterModeWord);
+    int status = statusNumber(reader_.ReadAnswer());
+    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    if (status != 0) {
+        report(status, keywordAndValue);
+        finishLine("SET", keywordAndValue, t0);
+        return false;
+    }
+    link_.WriteToLink(keywordAndValue + "\r");
+    delay(DelayPlace::AfterSetKeyword);
+    status = statusNumber(reader_.ReadAnswer());
+    if (!reader_.answered()) return false;
+    DebugLine(panel_, "<" + keywordAndValue + "> response: " + numberText(status));
+    if (status != 0) report(status, keywordAndValue);
+    finishLine("SET", keywordAndValue, t0);
+    return status == 0;
+}
+
+bool CommandExchange::GetInstrument(const std::string& keyword, std::string& value) {
+    float t0 = 0;
+    beginLine("GET", keyword, t0);
+    link_.drain(kDrainReads);
+    link_.WriteToLink("GET\r");
+    delay(DelayPlace::AfterModeWord);
+    int status = statusNumber(reader_.ReadAnswer());
+    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    if (status != 0) {
+        boxes_.show({BoxIcon::Information, "GET error" + numberText(status) + " for command <" +
+                                               keyword + "> (while starting)"});
+        report(status, keyword);
+        finishLine("GET", keyword, t0);
+        return false;
+    }
+    if (!link_.isTcp()) link_.drain(kLongDrainReads);
+    link_.WriteToLink(keyword + "\r");
+    delay(DelayPlace::AfterGetKeyword);
+    status = statusNumber(reader_.ReadAnswer().substr(0, 1));
+    if (!reader_.answered()) return false;
+    if (status != 0) {
+        report(status, keyword);
+        finishLine("GET", keyword, t0);
+        return false;
+    }
+    delay(DelayPlace::BetweenStatusAndValue);
+    std::string answer;
+    if (!readValue(answer)) return false;
+    value = wireToUtf8(answer);
+    DebugLine(panel_, "<" + keyword + "> response: " + value);
+    finishLine("GET", keyword, t0);
+    return true;
+}
+
+bool CommandExchange::readValue(std::string& value) {
+    if (!link_.isTcp()) {
+        value = reader_.ReadAnswer();
+        return reader_.answered();
+    }
+    // On TCP the value came in one packet with the status line, and a read would throw it away.
+    Stopwatch waited(clock_);
+    auto end = state_.InputBuffer.find('\r');
+    while (end == std::string::npos && waited.Elapsed() <= kValueWaitMs) {
+        events_.wait(kValuePollMs);
+        state_.InputBuffer += link_.takeBytes();
+        end = state_.InputBuffer.find('\r');
+    }
+    if (end == std::string::npos) return false;
+    value = state_.InputBuffer.substr(0, end);
+    return true;
+}
+
+}  // namespace zel

@@ -1,0 +1,59 @@
+#pragma once
+// The instrument's line protocol: commands, settings and queries, each a dialogue of two steps.
+
+#include <cstdint>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "link/AnswerReader.h"
+#include "link/ByteLink.h"
+#include "link/LinkDelays.h"
+#include "link/ZELBas.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+
+namespace zel {
+
+/// A line ends with CR. The mode word goes first ("cmd", "set", "GET"), the instrument answers a
+/// status digit, then the keyword goes, and a second status comes; a query's value follows it.
+/// All results are true on success. Failures are told to the user here, nobody else has to.
+class CommandExchange {
+  public:
+    CommandExchange(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
+                    const Clock& clock, Events& events, MessageBoxes& boxes);
+
+    /// Carries out a keyword that needs no value. After "WAIT" the time-out of every read follows
+    /// the sweep time, until the next command.
+    bool CmdInstrument(const std::string& keyword);
+    /// The same, for an exchange that ends when an external trigger fires.
+    bool CmdInstrumentTriggered(const std::string& keyword, std::int32_t timeoutSeconds);
+    /// Changes a setting: keyword, comma, value.
+    bool SetInstrument(const std::string& keywordAndValue);
+    /// Reads a value; left as it was on failure. An empty answer is a success.
+    bool GetInstrument(const std::string& keyword, std::string& value);
+    /// The last read of a line failed, or the link is gone: loops end.
+    bool ExchangeFailed() const { return state_.ExchangeFailed; }
+
+  private:
+    void beginLine(const char* kind, const std::string& text, float& t0);
+    void finishLine(const char* kind, const std::string& text, float t0);
+    void delay(DelayPlace place);
+    void report(int status, const std::string& keyword);
+    bool readValue(std::string& value);
+
+    ControllerForm& panel_;
+    ZELBas& state_;
+    ByteLink& link_;
+    AnswerReader& reader_;
+    const Clock& clock_;
+    Events& events_;
+    MessageBoxes& boxes_;
+};
+
+/// The number that a status line starts with; junk gives 0.
+int statusNumber(const std::string& answer);
+/// "0.02": the seconds of the day since `t0`, negative when midnight lies between.
+std::string elapsedSecondsText(const Clock& clock, float t0);
+
+}  // namespace zel

@@ -1,0 +1,114 @@
+#include "support/Text.h"
+
+#include <cstdint>
+
+namespace zel {
+namespace {
+
+// Windows-1252 from 0x80 to 0x9F; 0 where nothing is assigned.
+constexpr std::uint16_t kWindows1252[32] = {
+    0x20AC, 0,      0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021, 0x02C6, 0x2030, 0x0160,
+    0x2039, 0x0152, 0,      0x017D, 0,      0,      0x2018, 0x2019, 0x201C, 0x201D, 0x2022,
+    0x2013, 0x2014, 0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0,      0x017E, 0x0178};
+
+void append(std::string& text, std::uint32_t code) {
+    if (code < 0x80) {
+        text += static_cast<char>(code);
+    } else if (code < 0x800) {
+        text += static_cast<char>(0xC0 | (code >> 6));
+        text += static_cast<char>(0x80 | (code & 0x3F));
+    } else {
+        text += static_cast<char>(0xE0 | (code >> 12));
+        text += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
+        text += static_cast<char>(0x80 | (code & 0x3F));
+    }
+}
+
+/// Length of the UTF-8 sequence at the position; 0 where none begins.
+std::size_t sequenceLength(std::string_view bytes, std::size_t at) {
+    const auto byte = [&](std::size_t i) { return static_cast<unsigned char>(bytes[i]); };
+    const unsigned lead = byte(at);
+    if (lead < 0x80) return 1;
+    const std::size_t length = lead >= 0xC2 && lead < 0xE0   ? 2
+                               : lead >= 0xE0 && lead < 0xF0 ? 3
+                               : lead >= 0xF0 && lead < 0xF5 ? 4
+                                                             : 0;
+    if (length == 0 || at + length > bytes.size()) return 0;
+    for (std::size_t i = 1; i < length; ++i)
+        if ((byte(at + i) & 0xC0) != 0x80) return 0;
+    const unsigned second = byte(at + 1);
+    const bool outside = (lead == 0xE0 && second < 0xA0) || (lead == 0xED && second >= 0xA0) ||
+                         (lead == 0xF0 && second < 0x90) || (lead == 0xF4 && second >= 0x90);
+    return outside ? 0 : length;
+}
+
+}  // namespace
+
+std::string upperCase(std::string_view text) {
+    std::string result(text);
+    for (char& c : result)
+        if (c >= 'a' && c <= 'z') c = static_cast<char>(c - 'a' + 'A');
+    return result;
+}
+
+std::string lowerCase(std::string_view text) {
+    std::string result(text);
+    for (char& c : result)
+        if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
+    return result;
+}
+
+std::string trimmed(std::string_view text) {
+    const auto first = text.find_first_not_of(' ');
+    if (first == std::string_view::npos) return "";
+    return std::string(text.substr(first, text.find_last_not_of(' ') - first + 1));
+}
+
+std::vector<std::string> split(std::string_view text, char separator) {
+    std::vector<std::string> pieces;
+    for (;;) {
+        const auto end = text.find(separator);
+        pieces.emplace_back(text.substr(0, end));
+        if (end == std::string_view::npos) return pieces;
+        text.remove_prefix(end + 1);
+    }
+}
+
+std::string replaceAll(std::string_view text, std::string_view what, std::string_view with) {
+    if (what.empty()) return std::string(text);
+    std::string result;
+    for (;;) {
+        const auto found = text.find(what);
+        result += text.substr(0, found);
+        if (found == std::string_view::npos) return result;
+        result += with;
+        text.remove_prefix(found + what.size());
+    }
+}
+
+bool startsWith(std::string_view text, std::string_view head) {
+    return text.substr(0, head.size()) == head;
+}
+
+bool isValidUtf8(std::string_view bytes) {
+    for (std::size_t at = 0; at < bytes.size();) {
+        const std::size_t length = sequenceLength(bytes, at);
+        if (length == 0) return false;
+        at += length;
+    }
+    return true;
+}
+
+std::string wireToUtf8(std::string_view bytes) {
+    if (isValidUtf8(bytes)) return std::string(bytes);
+    std::string text;
+    for (const char c : bytes) {
+        const auto code = static_cast<unsigned char>(c);
+        const bool special = code >= 0x80 && code < 0xA0;
+        const std::uint32_t mapped = special ? kWindows1252[code - 0x80] : code;
+        append(text, mapped == 0 ? 0xFFFD : mapped);
+    }
+    return text;
+}
+
+}  // namespace zel
