@@ -1,0 +1,170 @@
+#include "trace/GraphScaling.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "model/CodeTables.h"
+#include "model/Numeric.h"
+#include "support/NumberText.h"
+#include "support/TimeText.h"
+
+namespace zel {
+namespace {
+
+constexpr double kDivisions = 10;
+constexpr int kWaterfallRows = 100;
+constexpr int kVectorLast = 601;
+
+struct UnitFormat {
+    int unit;
+    const char* format;
+};
+
+constexpr UnitFormat kUnitFormats[] = {
+    {UNITDBM, "k\"dBm\""},
+    {UNITDBMV, "k\"dBmV\""},
+    {UNITDBUV, "k\"dBuV\""},
+    {UNITDBUVM, "k\"dBuV/m\""},
+    {UNITDBUAM, "k\"dBuA/m\""},
+    {UNITDB, "k\"dB\""},
+    {UNITV, "%"},
+    {UNITW, "%"},
+    {8, "k\"V/m\""},
+};
+
+/// The unit in a format: without its first two characters and its last.
+std::string formatUnit(const std::string& format) {
+    return format.size() <= 3 ? "" : format.substr(2, format.size() - 3);
+}
+
+}  // namespace
+
+std::string GetDimension(const ControllerForm& panel, const ZEL3Variables& mirror) {
+    if (panel.InstrumentMode == ControllerForm::DISTTOFAULTMEASURE) return "m";
+    return mirror.Span == 0 ? "s" : "Hz";
+}
+
+void GraphScaling::setGraphAxes(double xStart, double xStop, double level, int rangeByte,
+                                bool useRangeCode) {
+    setGraphXAxis(xStart, xStop);
+    setGraphYAxis(level, rangeByte, useRangeCode);
+    addWaterfallRowLimit();
+    waterfall_.stampRow(timeOfDayText(clock_.date()));
+    waterfall_.saveGraphView();
+}
+
+void GraphScaling::addWaterfallRowLimit() { waterfall_.limitRows(kWaterfallRows); }
+
+void GraphScaling::setGraphXAxis(double xStart, double xStop) {
+    panel_.ViewStart = xStart;
+    panel_.ViewStop = xStop;
+    if (!panel_.GraphZoomed) {
+        panel_.CWGraph1.setXRange(xStart, xStop);
+        waterfall_.Graph3D.setRange(2, xStart, xStop);
+    }
+    waterfall_.Graph3D.setFormat(2, mirror_.Span != 0 ? "k\"Hz\"" : "k\"s\"");
+}
+
+void GraphScaling::setLevelRange(double minimum, double maximum) {
+    panel_.CWGraph1.setYRange(minimum, maximum);
+    waterfall_.Graph3D.setRange(3, minimum, maximum);
+}
+
+void GraphScaling::setGraphYAxis(double level, int rangeByte, bool useRangeCode) {
+    Graph3D& graph3D = waterfall_.Graph3D;
+    graph3D.setLabelColor(3, graph3D.axis(2).LabelColor);
+    const double perDivision = useRangeCode ? decibelsPerDivision(rangeByte) : rangeByte;
+    if (!useRangeCode) {
+        for (int code = RANGE10DB; code <= RANGE1DB; ++code)
+            if (decibelsPerDivision(code) == rangeByte) mirror_.ReferenceRange = code;
+    }
+    const double unit = mirror_.ReferenceUnit;
+    if (unit != UNITV && unit != UNITW) level = std::nearbyint(level);
+    const double range = mirror_.ReferenceRange;
+    const bool logarithmic =
+        range == RANGE10DB || range == RANGE5DB || range == RANGE2DB || range == RANGE1DB;
+    if (!logarithmic) {
+        panel_.CWGraph1.showYLabels(true);
+        setLevelRange(0, 100);
+    } else if (unit > UNITDB) {
+        // The numbers are dBm there and not the unit: the labels are hidden.
+        panel_.CWGraph1.showYLabels(false);
+        graph3D.setLabelColor(3, graph3D.BackColor);
+        if (unit == UNITV) level = VoltsToDbm(level);
+        if (unit == UNITW) level = WattsToDbm(level);
+        setLevelRange(level - kDivisions * perDivision, level);
+    } else {
+        panel_.CWGraph1.showYLabels(true);
+        setLevelRange(level - kDivisions * perDivision, level);
+        panel_.isZELViewLinFile = false;
+    }
+    SetYAxisFormat();
+    if (!useRangeCode) mirror_.ReferenceRange = perDivision;
+    const GraphAxis& axis = graph3D.axis(3);
+    const std::string unitText = formatUnit(axis.Format);
+    waterfall_.lblMin.Caption = generalNumber(axis.Minimum) + " " + unitText;
+    waterfall_.lblMAX.Caption = generalNumber(axis.Maximum) + " " + unitText;
+}
+
+void GraphScaling::SetYAxisFormat() {
+    for (const UnitFormat& row : kUnitFormats)
+        if (row.unit == mirror_.ReferenceUnit) waterfall_.Graph3D.setFormat(3, row.format);
+    if (mirror_.ReferenceRange > RANGE1DB) waterfall_.Graph3D.setFormat(3, "%");
+}
+
+void GraphScaling::DisplayDataOnGraph(double xStart, double xStop, double intervals,
+                                      const std::vector<double>& peakData,
+                                      const std::vector<double>& traceData) {
+    const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
+    const bool zeroSpan = mirror_.Span == 0;
+    const std::vector<double>& data = autoPeak ? peakData : traceData;
+    const double pairs = autoPeak ? 2 : 1;
+    // At zero span the last points lie beyond the sweep time by two steps: as the instrument's
+    // own display has it.
+    const double first = zeroSpan ? 0 : xStart;
+    const double increment = zeroSpan ? mirror_.SweepTime / (pairs * (intervals - 2))
+                                      : (xStop - xStart) / (pairs * intervals);
+    panel_.CWGraph1.plotY(data, first, increment);
+    if (autoPeak || zeroSpan) BuildXYVectors(increment);
+    waterfall_.Graph3D.plotCurve(panel_.YVector, panel_.XVector, data, panel_.TraceColours);
+}
+
+void GraphScaling::SetAnnotation(double percent) {
+    const double perDivision = decibelsPerDivision(mirror_.ReferenceRange);
+    const bool logarithmic = mirror_.ReferenceRange < RANGELIN;
+    double top = mirror_.ReferenceLevel;
+    if (logarithmic && mirror_.ReferenceUnit == UNITV) top = VoltsToDbm(top);
+    if (logarithmic && mirror_.ReferenceUnit == UNITW) top = WattsToDbm(top);
+    double height = percent / 100 * kDivisions * perDivision;
+    if (logarithmic) height += 100 - top;
+    mirror_.TriggerLevelValue = -height;
+    panel_.CWGraph1.setTrigger({"T", -height, true});
+}
+
+void GraphScaling::showAnnotation() {
+    panel_.CWGraph1.setTrigger({"T", mirror_.TriggerLevelValue, true});
+}
+
+void GraphScaling::hideAnnotation() {
+    GraphAnnotation annotation = panel_.CWGraph1.trigger();
+    annotation.Visible = false;
+    panel_.CWGraph1.setTrigger(annotation);
+}
+
+void GraphScaling::SizeXYVectors(int count) {
+    const auto size = static_cast<std::size_t>(std::max(count, -1) + 1);
+    panel_.XVector.resize(size);
+    panel_.YVector.resize(size);
+}
+
+void GraphScaling::BuildXYVectors(double step) {
+    SizeXYVectors(kVectorLast);
+    double x = panel_.ViewStart;
+    for (double& value : panel_.XVector) {
+        value = x;
+        x += step;
+    }
+    std::fill(panel_.YVector.begin(), panel_.YVector.end(), panel_.YVectorVal);
+}
+
+}  // namespace zel

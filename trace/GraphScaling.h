@@ -1,0 +1,57 @@
+#pragma once
+// Which range and format the axes take, and how a trace comes onto the graphs.
+
+#include <string>
+#include <vector>
+
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Clock.h"
+
+namespace zel {
+
+/// Unit of the x axis: "m" in distance to fault, else "s" at zero span, else "Hz".
+std::string GetDimension(const ControllerForm& panel, const ZEL3Variables& mirror);
+
+class GraphScaling {
+  public:
+    GraphScaling(ControllerForm& panel, WaterfallForm& waterfall, ZEL3Variables& mirror,
+                 const Clock& clock)
+        : panel_(panel), waterfall_(waterfall), mirror_(mirror), clock_(clock) {}
+
+    /// Scales both graphs and stamps a row of the waterfall. `level` is in the reference unit;
+    /// `rangeByte` is a range code, or dB a division without `useRangeCode`.
+    void setGraphAxes(double xStart, double xStop, double level, int rangeByte, bool useRangeCode);
+    /// Leaves the x axis alone while the user's zoom is on.
+    void setGraphXAxis(double xStart, double xStop);
+    void setGraphYAxis(double level, int rangeByte, bool useRangeCode);
+    void SetYAxisFormat();
+    void addWaterfallRowLimit();
+    /// Plots the data of the detector in use: a value every `(xStop - xStart) / intervals`, half
+    /// of that for the pairs of the auto peak detector; at zero span the sweep time spreads over
+    /// two intervals less.
+    void DisplayDataOnGraph(double xStart, double xStop, double intervals,
+                            const std::vector<double>& peakData,
+                            const std::vector<double>& traceData);
+    /// The trigger line at `percent` of the display's height.
+    void SetAnnotation(double percent);
+    /// Switches the trigger line on where it last stood, or off.
+    void showAnnotation();
+    void hideAnnotation();
+
+    /// Resizes the waterfall's vectors to the indices 0 to `count`.
+    void SizeXYVectors(int count);
+    /// 602 x values from `ViewStart` on, `step` apart, and the row number for each.
+    void BuildXYVectors(double step);
+
+  private:
+    void setLevelRange(double minimum, double maximum);
+
+    ControllerForm& panel_;
+    WaterfallForm& waterfall_;
+    ZEL3Variables& mirror_;
+    const Clock& clock_;
+};
+
+}  // namespace zel

@@ -1,0 +1,41 @@
+#include "trace/ManualScale.h"
+
+#include <cmath>
+
+#include "model/Numeric.h"
+#include "support/NumberText.h"
+
+namespace zel {
+namespace {
+
+constexpr double kLargest = 1e15;
+
+}  // namespace
+
+ManualScale::ManualScale(ControllerForm& panel, ManualScaleForm& dialog, MessageBoxes& boxes)
+    : panel_(panel), dialog_(dialog), boxes_(boxes) {
+    panel_.UtilityGraphSettings.Clicked.connect([this] { dialog_.Show(); });
+    dialog_.Load.connect([this] { Form_Load(); });
+    dialog_.cmdAccept.Clicked.connect([this] { cmdAccept_Click(); });
+    dialog_.cmdCancel.Clicked.connect([this] { dialog_.unload(1); });
+}
+
+void ManualScale::Form_Load() {
+    const GraphAxis& axis = panel_.CWGraph1.yAxis();
+    dialog_.manualSizeMin.Text = generalNumber(axis.Minimum);
+    dialog_.manualSizeMax.Text = generalNumber(axis.Maximum);
+}
+
+void ManualScale::cmdAccept_Click() {
+    const double minimum = ParseNumberInvariant(dialog_.manualSizeMin.Text);
+    const double maximum = ParseNumberInvariant(dialog_.manualSizeMax.Text);
+    // An axis of no height, upside down or past all bounds cannot be drawn; the entry stays.
+    if (!(minimum < maximum) || std::fabs(minimum) > kLargest || std::fabs(maximum) > kLargest) {
+        boxes_.show({BoxIcon::Exclamation, "The maximum must be greater than the minimum."});
+        return;
+    }
+    panel_.CWGraph1.setYRange(minimum, maximum);
+    dialog_.unload(1);
+}
+
+}  // namespace zel

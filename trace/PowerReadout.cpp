@@ -1,0 +1,59 @@
+#include "trace/PowerReadout.h"
+
+#include "model/Numeric.h"
+
+namespace zel {
+namespace {
+
+constexpr int kReflectionBox = 4;
+constexpr const char* kUnit = "dBm";  // of every reading: the answers name none
+
+}  // namespace
+
+PowerReadout::PowerReadout(Forms& forms, CommandExchange& exchange, Events& events)
+    : forms_(forms), panel_(forms.controller), exchange_(exchange), events_(events) {
+    PowerAndReflForm& dialog = forms_.powerAndRefl;
+    dialog.Load.connect([&dialog] {
+        dialog.ReadPowerOnly = true;
+        dialog.ReadPowerAndRefl = false;
+        dialog.PowerOnlyOption.setValue(true);
+    });
+    dialog.PowerOnlyOption.Clicked.connect([&dialog] {
+        dialog.ReadPowerOnly = true;
+        dialog.ReadPowerAndRefl = false;
+    });
+    dialog.PowerAndLeflOption.Clicked.connect([&dialog] {
+        dialog.ReadPowerOnly = false;
+        dialog.ReadPowerAndRefl = true;
+    });
+    dialog.ClosePwrForm.Clicked.connect([&dialog] { dialog.unload(1); });
+}
+
+void PowerReadout::ReadPowerValue(const std::string& query, int boxIndex, const std::string& unit) {
+    events_.pump();
+    std::string answer;
+    if (!exchange_.GetInstrument(query, answer)) return;
+    if (query == "PWR") panel_.LastPowerText = answer;
+    if (query == "REFL") panel_.LastReflectionText = answer;
+    events_.pump();
+    panel_.LastReadingText = answer;
+    panel_.SoftTextBox(boxIndex).Text = FormatValue(answer, unit);
+}
+
+void PowerReadout::readPowerSensor(int boxIndex) {
+    ReadPowerValue("PWR", boxIndex, kUnit);
+    if (forms_.powerAndRefl.ReadPowerAndRefl) ReadPowerValue("REFL", kReflectionBox, kUnit);
+}
+
+void PowerReadout::ReadPowerReadings(std::string_view modeName, int boxIndex) {
+    panel_.MousePointer = 11;
+    events_.pump();
+    panel_.PlaySingleButton.Enabled = false;
+    if (modeName == "PowerSensor") readPowerSensor(boxIndex);
+    if (modeName == "TDMAPower") ReadPowerValue("TDMAPWR", boxIndex, kUnit);
+    panel_.PlaySingleButton.Enabled = true;
+    panel_.MousePointer = 0;
+    events_.pump();
+}
+
+}  // namespace zel

@@ -1,0 +1,32 @@
+#pragma once
+// Power readings take the sweep's place where the instrument gives single numbers.
+
+#include <string>
+#include <string_view>
+
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
+#include "platform/Events.h"
+
+namespace zel {
+
+class PowerReadout {
+  public:
+    /// Connects the dialog's options and its close.
+    PowerReadout(Forms& forms, CommandExchange& exchange, Events& events);
+
+    /// Asks one reading ("PWR", "REFL", "TDMAPWR") and shows it in the soft box of that index.
+    void ReadPowerValue(const std::string& query, int boxIndex, const std::string& unit);
+    /// One round of the continuous view, for "PowerSensor" or "TDMAPower".
+    void ReadPowerReadings(std::string_view modeName, int boxIndex);
+    /// The power, and the reflection where the dialog says so.
+    void readPowerSensor(int boxIndex);
+
+  private:
+    Forms& forms_;
+    ControllerForm& panel_;
+    CommandExchange& exchange_;
+    Events& events_;
+};
+
+}  // namespace zel

@@ -1,0 +1,157 @@
+#include "trace/SweepControl.h"
+
+#include "platform/ModalForm.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr int kPowerBox = 0;
+constexpr int kPassFillStyle = 3;
+constexpr std::int16_t kLastRow = 32767;
+
+/// Says that an acquisition is under way for as long as it lives.
+class Running {
+  public:
+    explicit Running(ControllerForm& panel) : panel_(panel), before_(panel.AcquisitionRunning) {
+        panel_.AcquisitionRunning = true;
+    }
+    ~Running() { panel_.AcquisitionRunning = before_; }
+    Running(const Running&) = delete;
+    Running& operator=(const Running&) = delete;
+
+  private:
+    ControllerForm& panel_;
+    bool before_;
+};
+
+}  // namespace
+
+SweepControl::SweepControl(Forms& forms, const CommandExchange& exchange, TraceReader& traces,
+                           PowerReadout& power, Events& events, MessageBoxes& boxes)
+    : forms_(forms),
+      panel_(forms.controller),
+      exchange_(exchange),
+      traces_(traces),
+      power_(power),
+      events_(events),
+      boxes_(boxes) {
+    panel_.PlaySingleButton.Clicked.connect([this] { PlaySingleButton_Click(); });
+    panel_.PlayContinuousButton.Clicked.connect([this] { PlayContinuousButton_Click(); });
+    panel_.StopButton.Clicked.connect([this] { StopButton_Click(); });
+}
+
+SweepControl::Pass SweepControl::passKind() const {
+    if (panel_.State == CF::POWER || panel_.InstrumentMode == CF::POWERSENSOR)
+        return Pass::PowerSensor;
+    return panel_.State == CF::TDMA ? Pass::TDMAPower : Pass::Trace;
+}
+
+void SweepControl::PlaySingleButton_Click() {
+    const Running running(panel_);
+    if (!panel_.ContinuosLoopActive && panel_.State != CF::POWER &&
+        panel_.InstrumentMode != CF::POWERSENSOR) {
+        if (!forms_.time.ContinuousRecording && !forms_.specialMeas.chkWaterfall.Value())
+            panel_.YVectorVal = 0;
+        bool success = false;
+        traces_.ReadSingleTrace(success);
+        return;
+    }
+    power_.readPowerSensor(kPowerBox);
+    if (panel_.RecordDataFlag) panel_.SaveView("power");
+}
+
+void SweepControl::PlayContinuousButton_Click() {
+    panel_.RecordData.Visible = false;
+    if (passKind() == Pass::PowerSensor) showModalForm(forms_.powerAndRefl, events_);
+    RunContinuousView();
+}
+
+void SweepControl::RunContinuousView() {
+    const Running running(panel_);
+    if (!panel_.isConnected) {
+        boxes_.show({BoxIcon::Information, "Please connect to the intrument first."});
+        panel_.RecordData.Visible = true;
+        panel_.ContinuosLoopActive = false;
+        return;
+    }
+    panel_.Connection.Enabled = false;
+    panel_.Utility.Enabled = false;
+    panel_.PlayContinuousButton.Visible = false;
+    panel_.StopButton.Visible = true;
+    SetStopFlag(true);
+    panel_.ContinuosLoopActive = true;
+    bool good = firstPass();
+    while (good && panel_.STOPFlag) {
+        forms_.waterfall.styleLastRow();
+        if (exchange_.ExchangeFailed()) return;  // no clean-up: Stop is the way back
+        panel_.ContinuosLoopActive = true;
+        good = laterPass();
+        if (good) panel_.ContinuosLoopActive = false;
+        events_.pump();
+    }
+    if (good) {
+        panel_.Connection.Enabled = true;
+        panel_.Utility.Enabled = true;
+    }
+    panel_.RecordData.Visible = true;
+    panel_.ContinuosLoopActive = false;
+}
+
+bool SweepControl::firstPass() {
+    bool success = true;
+    switch (passKind()) {
+        case Pass::Trace:
+            if (panel_.SingleSweepModeActive) {
+                traces_.ReadSingleTrace2({true, true, true, true, true}, success);
+            } else {
+                traces_.ReadSingleTrace(success);
+            }
+            break;
+        case Pass::PowerSensor:
+            power_.ReadPowerReadings("PowerSensor", kPowerBox);
+            break;
+        case Pass::TDMAPower:
+            power_.ReadPowerReadings("TDMAPower", kPowerBox);
+            break;
+    }
+    return success;
+}
+
+bool SweepControl::laterPass() {
+    bool success = true;
+    switch (passKind()) {
+        case Pass::Trace:
+            if (!forms_.waterfall.Graph3D.plots().empty()) {
+                forms_.waterfall.Graph3D.plots().back().lineVisible = false;
+                forms_.waterfall.Graph3D.plots().back().fillStyle = kPassFillStyle;
+            }
+            if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
+            traces_.ReadSingleTrace2({}, success);
+            break;
+        case Pass::PowerSensor:
+            power_.ReadPowerReadings("PowerSensor", kPowerBox);
+            break;
+        case Pass::TDMAPower:
+            power_.ReadPowerReadings("TDMAPower", kPowerBox);
+            break;
+    }
+    return success;
+}
+
+void SweepControl::StopButton_Click() {
+    SetStopFlag(false);
+    panel_.ContinuosLoopActive = false;
+    if (panel_.State == CF::POWER) forms_.powerAndRefl.unload(1);
+    panel_.StopButton.Visible = false;
+    panel_.RecordData.Checked = false;
+    panel_.PlayContinuousButton.Visible = true;
+    panel_.PlayContinuousButton.Enabled = true;
+    panel_.RecordDataFlag = false;
+    panel_.RecordData.Visible = true;
+    panel_.MousePointer = 0;
+    events_.pump();
+}
+
+}  // namespace zel

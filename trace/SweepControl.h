@@ -1,0 +1,43 @@
+#pragma once
+// The three play keys: one sweep, sweep after sweep, stop.
+
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "trace/PowerReadout.h"
+#include "trace/TraceReader.h"
+
+namespace zel {
+
+class SweepControl {
+  public:
+    /// Connects the keys.
+    SweepControl(Forms& forms, const CommandExchange& exchange, TraceReader& traces,
+                 PowerReadout& power, Events& events, MessageBoxes& boxes);
+
+    void PlaySingleButton_Click();
+    void PlayContinuousButton_Click();
+    void StopButton_Click();
+    /// Sweep after sweep until `STOPFlag` is cleared or a pass fails; the sweep and the transfer
+    /// set the pace.
+    void RunContinuousView();
+    void SetStopFlag(bool value) { panel_.STOPFlag = value; }
+
+  private:
+    enum class Pass { Trace, PowerSensor, TDMAPower };
+    Pass passKind() const;
+    bool firstPass();
+    bool laterPass();
+
+    Forms& forms_;
+    ControllerForm& panel_;
+    const CommandExchange& exchange_;
+    TraceReader& traces_;
+    PowerReadout& power_;
+    Events& events_;
+    MessageBoxes& boxes_;
+};
+
+}  // namespace zel

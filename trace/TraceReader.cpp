@@ -1,0 +1,247 @@
+#include "trace/TraceReader.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "model/CodeTables.h"
+#include "model/FrequencyLabels.h"
+#include "support/NumberText.h"
+
+namespace zel {
+namespace {
+
+constexpr std::size_t kBlock = 301;
+constexpr std::size_t kSecondBlock = 300;  // the pair of point i is (sample i, sample i - 1)
+constexpr double kIntervals = 300;
+
+std::uint8_t byteOf(double number) {
+    return static_cast<std::uint8_t>(static_cast<int>(std::clamp(number, 0.0, 255.0)));
+}
+
+}  // namespace
+
+TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, ZELBas& state,
+                         CommandExchange& exchange, BinaryTrace& binary,
+                         TraceConversion& conversion, GraphScaling& scaling, Events& events,
+                         MessageBoxes& boxes)
+    : forms_(forms),
+      panel_(forms.controller),
+      mirror_(mirror),
+      state_(state),
+      exchange_(exchange),
+      binary_(binary),
+      conversion_(conversion),
+      scaling_(scaling),
+      events_(events),
+      boxes_(boxes) {}
+
+void TraceReader::pointer(int shape) {
+    panel_.MousePointer = shape;
+    events_.pump();
+}
+
+TraceReader::Step TraceReader::query(const char* word, double& field) {
+    if (!exchange_.GetInstrument(word, panel_.InstrumentAnswer))
+        return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Refused;
+    field = leadingNumber(panel_.InstrumentAnswer);
+    return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Ok;
+}
+
+TraceReader::Step TraceReader::queryCode(const char* word, std::uint8_t& field) {
+    double number = 0;
+    const Step step = query(word, number);
+    if (step == Step::Ok) field = byteOf(number);
+    return step;
+}
+
+TraceReader::Step TraceReader::queryFrequency() {
+    const Step step = query("FREQ", mirror_.CenterFrequency);
+    if (step != Step::Ok) return step;
+    panel_.ViewCenter = mirror_.CenterFrequency;
+    panel_.CFLabel.Caption = centerLabelText(panel_.InstrumentAnswer);
+    return step;
+}
+
+TraceReader::Step TraceReader::querySpan() {
+    const Step step = query("SPAN", mirror_.Span);
+    if (step != Step::Ok) return step;
+    panel_.ViewSpan = mirror_.Span;
+    panel_.SpanLabel.Caption = spanLabelText(panel_.InstrumentAnswer);
+    return step;
+}
+
+TraceReader::Step TraceReader::askSettings() {
+    Step step = queryFrequency();
+    if (step == Step::Ok) step = querySpan();
+    if (step == Step::Ok) step = query("REFLVL", mirror_.ReferenceLevel);
+    if (step == Step::Ok) step = query("UNIT", mirror_.ReferenceUnit);
+    if (step == Step::Ok) step = query("RANGE", mirror_.ReferenceRange);
+    if (step == Step::Ok) step = queryCode("DYNRANGE", mirror_.DynamicRangeMode);
+    if (step == Step::Ok) step = queryCode("TRACEDET", mirror_.TraceDetector);
+    if (step == Step::Ok) step = query("SWPTIME", mirror_.SweepTime);
+    return step;
+}
+
+TraceReader::Step TraceReader::askAgain(const ReadAgain& again) {
+    Step step = Step::Ok;
+    if (again.freq) step = queryFrequency();
+    if (step == Step::Ok && again.span) step = querySpan();
+    if (step == Step::Ok && again.refLvl) step = query("REFLVL", mirror_.ReferenceLevel);
+    if (step == Step::Ok && again.range) step = query("RANGE", mirror_.ReferenceRange);
+    if (step == Step::Ok && again.detector) step = queryCode("TRACEDET", mirror_.TraceDetector);
+    return step;
+}
+
+TraceReader::Step TraceReader::wait() {
+    if (panel_.InstrumentMode == ControllerForm::DISTTOFAULTMEASURE && mirror_.CableLength == 0) {
+        // The x range needs the length; a refusal leaves it unknown.
+        query("CABLELEN", mirror_.CableLength);
+        if (exchange_.ExchangeFailed()) return Step::LinkFailed;
+    }
+    exchange_.CmdInstrument("WAIT");
+    panel_.TraceIntervals = kIntervals;
+    return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Ok;
+}
+
+void TraceReader::begin() {
+    panel_.RecordData.Visible = false;
+    pointer(11);
+    panel_.PlaySingleButton.Enabled = false;
+}
+
+void TraceReader::viewRange() {
+    panel_.ViewCenter = mirror_.CenterFrequency;
+    panel_.ViewSpan = mirror_.Span;
+    const bool distance = panel_.InstrumentMode == ControllerForm::DISTTOFAULTMEASURE;
+    if (panel_.ViewSpan != 0 && !distance) {
+        panel_.ViewStart = panel_.ViewCenter - panel_.ViewSpan / 2;
+        panel_.ViewStop = panel_.ViewCenter + panel_.ViewSpan / 2;
+    } else {
+        panel_.ViewStart = 0;
+        panel_.ViewStop = distance ? mirror_.CableLength : mirror_.SweepTime;
+    }
+}
+
+bool TraceReader::ReadTraceData(double& /*xFirstRef*/, double& /*xLastRef*/) {
+    if (mirror_.TraceDetector == DETAUTOPEAK) {
+        std::vector<double>& peak = panel_.PeakTraceData;
+        if (!binary_.GetTraceBinary(peak, true)) return false;
+        // The second block is taken from one sample too early, on purpose: its first value is the
+        // first block's last, and its own last one is dropped.
+        const std::vector<double> first(peak.begin(), peak.begin() + kBlock);
+        const std::vector<double> second(peak.begin() + kSecondBlock,
+                                         peak.begin() + kSecondBlock + kBlock);
+        for (std::size_t i = 0; i < kBlock; ++i) {
+            peak[2 * i] = first[i];
+            peak[2 * i + 1] = second[i];
+        }
+        return true;
+    }
+    panel_.TraceIntervals = kIntervals;
+    scaling_.SizeXYVectors(static_cast<int>(kIntervals));
+    const double step = (panel_.ViewStop - panel_.ViewStart) / panel_.TraceIntervals;
+    double x = panel_.ViewStart;
+    for (double& value : panel_.XVector) {
+        value = x;
+        x += step;
+    }
+    std::fill(panel_.YVector.begin(), panel_.YVector.end(), panel_.YVectorVal);
+    return binary_.GetTraceBinary(panel_.TraceData, false);
+}
+
+void TraceReader::scaleAndConvert() {
+    conversion_.SelectRawScale();
+    panel_.ViewXOffset = panel_.ViewSpan == 0 ? 0 : panel_.ViewStart;
+    scaling_.setGraphAxes(panel_.ViewStart, panel_.ViewStop, mirror_.ReferenceLevel,
+                          byteOf(std::nearbyint(mirror_.ReferenceRange)), true);
+    conversion_.ConvertTrace();
+    if (panel_.RecordDataFlag) panel_.SaveView("trace");
+}
+
+void TraceReader::waterfallRow() {
+    const bool timed = forms_.time.ContinuousRecording;
+    const bool checked = forms_.specialMeas.chkWaterfall.Value();
+    if (panel_.ContinuosLoopActive) return;
+    if (!timed && !checked) {
+        forms_.waterfall.Graph3D.removePlots();
+        forms_.waterfall.Graph3D.addPlot();
+    } else if (checked && !timed) {
+        forms_.waterfall.styleLastRow();
+    }
+}
+
+void TraceReader::abortView(bool& success) {
+    panel_.PlaySingleButton.Enabled = true;
+    if (!state_.DialCancelled) boxes_.show({BoxIcon::Information, "Unsuccessful View"});
+    pointer(0);
+    success = false;
+}
+
+void TraceReader::ReadSingleTrace(bool& success) {
+    success = false;
+    if (!panel_.isConnected) {
+        boxes_.show({BoxIcon::Information, "Please connect to the intrument first."});
+        return;
+    }
+    begin();
+    // A refused INIT leaves pointer, button and menu entry as they are.
+    if (panel_.SingleSweepModeActive && !exchange_.CmdInstrument("INIT")) return;
+    Step step = askSettings();
+    if (step == Step::Ok) step = wait();
+    if (step == Step::LinkFailed) return abortView(success);
+    double first = panel_.ViewStart;
+    double last = panel_.ViewStop;
+    if (step == Step::Refused || !ReadTraceData(first, last)) {
+        panel_.MousePointer = 0;
+        return;
+    }
+    viewRange();
+    if (!panel_.ContinuosLoopActive) {
+        forms_.waterfall.resetRowCount();
+        forms_.waterfall.Graph3D.clearValueLabels(1);
+    }
+    scaleAndConvert();
+    waterfallRow();
+    scaling_.DisplayDataOnGraph(panel_.ViewStart, panel_.ViewStop, panel_.TraceIntervals,
+                                panel_.PeakTraceData, panel_.TraceData);
+    panel_.RecordData.Visible = true;
+    success = true;
+    pointer(0);
+    panel_.PlaySingleButton.Enabled = true;
+    panel_.RecordData.Visible = true;
+}
+
+void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
+    success = false;
+    if (state_.ExchangeFailed) return abortView(success);
+    const auto close = [this] {
+        pointer(0);
+        panel_.PlaySingleButton.Enabled = true;
+        panel_.PlayContinuousButton.Enabled = true;
+        panel_.RecordData.Visible = true;
+    };
+    if (!panel_.isConnected) {
+        if (!panel_.ErrorFlag)
+            boxes_.show({BoxIcon::Information, "Please connect to the intrument first."});
+        panel_.ErrorFlag = true;
+        return close();
+    }
+    begin();
+    if (panel_.RecordDataFlag && !exchange_.CmdInstrument("INIT")) return close();
+    Step step = askAgain(again);
+    if (step == Step::Ok) step = wait();
+    if (step == Step::LinkFailed) return abortView(success);
+    if (step == Step::Refused) return close();
+    viewRange();
+    double first = panel_.ViewStart;
+    double last = panel_.ViewStop;
+    if (!ReadTraceData(first, last)) return close();
+    scaleAndConvert();
+    scaling_.DisplayDataOnGraph(panel_.ViewStart, panel_.ViewStop, panel_.TraceIntervals,
+                                panel_.PeakTraceData, panel_.TraceData);
+    panel_.RecordData.Visible = true;
+    success = true;
+    close();
+}
+
+}  // namespace zel

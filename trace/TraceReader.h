@@ -1,0 +1,67 @@
+#pragma once
+// One read cycle: settings, wait for the sweep, samples, conversion, file, graph.
+
+#include <string>
+
+#include "forms/Forms.h"
+#include "link/BinaryTrace.h"
+#include "link/CommandExchange.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "trace/GraphScaling.h"
+#include "trace/TraceConversion.h"
+
+namespace zel {
+
+/// Which settings a selective cycle reads again.
+struct ReadAgain {
+    bool freq = false;
+    bool span = false;
+    bool refLvl = false;
+    bool range = false;
+    bool detector = false;
+};
+
+class TraceReader {
+  public:
+    TraceReader(Forms& forms, ZEL3Variables& mirror, ZELBas& state, CommandExchange& exchange,
+                BinaryTrace& binary, TraceConversion& conversion, GraphScaling& scaling,
+                Events& events, MessageBoxes& boxes);
+
+    /// The full cycle. True in `success` when a trace was read and drawn.
+    void ReadSingleTrace(bool& success);
+    /// The selective cycle: only the settings that are asked for.
+    void ReadSingleTrace2(const ReadAgain& again, bool& success);
+
+  private:
+    enum class Step { Ok, Refused, LinkFailed };
+
+    Step query(const char* word, double& field);
+    Step queryCode(const char* word, std::uint8_t& field);
+    Step queryFrequency();
+    Step querySpan();
+    Step askSettings();
+    Step askAgain(const ReadAgain& again);
+    Step wait();
+    void begin();
+    void viewRange();
+    bool ReadTraceData(double& xFirstRef, double& xLastRef);
+    void scaleAndConvert();
+    void waterfallRow();
+    void abortView(bool& success);
+    void pointer(int shape);
+
+    Forms& forms_;
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    ZELBas& state_;
+    CommandExchange& exchange_;
+    BinaryTrace& binary_;
+    TraceConversion& conversion_;
+    GraphScaling& scaling_;
+    Events& events_;
+    MessageBoxes& boxes_;
+};
+
+}  // namespace zel

@@ -1,0 +1,30 @@
+#pragma once
+// The texts that stand around the graph, as an analyser writes them.
+
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "model/ZEL3Variables.h"
+
+namespace zel {
+
+struct ViewAnnotations {
+    bool ok = false;       ///< there is a trace that the texts speak of
+    std::string refLevel;  ///< "Ref -20 dBm"
+    std::string range;     ///< "10dB/DIV"
+    std::string rbw;       ///< "RBW 100 kHz", "RBW Auto"
+    std::string vbw;
+    std::string sweepTime;  ///< "SWT 20 ms"
+    std::string detector;   ///< "Det Auto Peak"
+    std::string mode;       ///< "Analyzer"
+    std::string unit;       ///< of the y axis: "dBm", "%"
+    std::string xUnit;      ///< "Hz", "s", "m"
+    std::string left;       ///< x at the left edge: "Start 0 Hz"
+    std::string center;
+    std::string right;
+};
+
+/// From the mirror and from the axes as they are shown, zoomed or not.
+ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror);
+
+}  // namespace zel
