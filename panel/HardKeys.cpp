@@ -1,0 +1,65 @@
+#include "panel/HardKeys.h"
+
+#include "panel/Interlock.h"
+#include "panel/MenuTables.h"
+#include "support/NumberText.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+struct HardKey {
+    Button CF::*key;
+    std::int16_t menu;
+};
+const HardKey kHardKeys[] = {
+    {&CF::FrequencyButton, CF::Freq}, {&CF::SpanButton, CF::SPAN},
+    {&CF::AmplitudeButton, CF::AMPT}, {&CF::BWButton, CF::BW},
+    {&CF::SweepButton, CF::SWEEP},    {&CF::TraceButton, CF::TRACE},
+    {&CF::MeasButton, CF::MEAS},      {&CF::MarkerButton, CF::Marker},
+};
+
+}  // namespace
+
+HardKeys::HardKeys(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
+                   SoftPanel& softPanel, MenuFill& fill, MessageBoxes& boxes)
+    : panel_(panel),
+      mirror_(mirror),
+      exchange_(exchange),
+      softPanel_(softPanel),
+      fill_(fill),
+      boxes_(boxes) {
+    for (const HardKey& row : kHardKeys)
+        (panel_.*row.key).Clicked.connect([this, menu = row.menu] { press(menu); });
+    // The tracking generator has a key in both rows.
+    panel_.TrackButton1.Clicked.connect([this] { panel_.TrackButton.Click(); });
+}
+
+void HardKeys::press(std::int16_t menu) {
+    const bool leaving = menu == CF::Freq && mirror_.PowerSensorExitRequested;
+    if (!leaving && refusedByPowerSensor(panel_, boxes_)) return;
+    if (menu == CF::Freq) mirror_.PowerSensorExitRequested = false;
+    if (menu == CF::Marker && refusedByContinuousView(panel_, boxes_)) return;
+    softPanel_.InitForm(menu);
+    const HardKeyMenu* captions = hardKeyMenu(menu);
+    softPanel_.setKeyCaptions(captions->captions);
+    softPanel_.SetTextFieldsAndFrames(panel_.State);
+    softPanel_.SetButtonsStatus(panel_.State);
+    if (panel_.ContinuosLoopActive || !panel_.isConnected) return;
+    if (menu == CF::Marker) readMarkers();
+    std::string answer;
+    if (menu == CF::SWEEP && exchange_.GetInstrument("SWPTIME", answer))
+        mirror_.SweepTime = leadingNumber(answer);
+    fill_.FillTextFields(captions->word);
+}
+
+void HardKeys::readMarkers() {
+    std::string answer;
+    if (exchange_.GetInstrument("MARK1ON", answer))
+        panel_.MarkerCheckBox.setValue(leadingNumber(answer) != 0);
+    if (exchange_.GetInstrument("DELTA1ON", answer))
+        panel_.DeltaCheckBox.setValue(leadingNumber(answer) != 0);
+}
+
+}  // namespace zel

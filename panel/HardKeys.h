@@ -1,0 +1,33 @@
+#pragma once
+// The hard keys: each lays out its menu and fills it.
+
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MenuFill.h"
+#include "panel/SoftPanel.h"
+#include "platform/MessageBox.h"
+
+namespace zel {
+
+class HardKeys {
+  public:
+    /// Connects the keys.
+    HardKeys(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
+             SoftPanel& softPanel, MenuFill& fill, MessageBoxes& boxes);
+
+    /// In power sensor mode only the frequency key opens its menu, when the analyzer key asked.
+    void press(std::int16_t menu);
+
+  private:
+    void readMarkers();
+
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    CommandExchange& exchange_;
+    SoftPanel& softPanel_;
+    MenuFill& fill_;
+    MessageBoxes& boxes_;
+};
+
+}  // namespace zel

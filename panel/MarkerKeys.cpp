@@ -1,0 +1,183 @@
+#include "panel/MarkerKeys.h"
+
+#include "model/Numeric.h"
+#include "panel/Interlock.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr int kMoveMs = 700;  // the instrument needs it before the marker can be read
+constexpr int kSwitchMs = 1000;
+
+struct MarkerKeyRow {
+    const char* command;
+    Button CF::*key;
+    const char* failure;
+};
+const MarkerKeyRow kKeys[] = {
+    {"MARKPK", &CF::MarkPkButton, "Could not set marker to peak!"},
+    {"MARKNXTPK", &CF::NextPeakButton, "Could not set marker to the next peak!"},
+    {"MARKTOCENT", &CF::MarkToCentButton, "Could not set the current marker as center frequency!"},
+    {"MARKTOLVL", &CF::MarkToRefButton, "Could not set the current marker to the Reference Level!"},
+    {"MARKMIN", &CF::MinPeakButton, "Could not set marker to minimum!"},
+};
+
+const MarkerKeyRow& rowOf(const char* command) {
+    for (const MarkerKeyRow& row : kKeys)
+        if (std::string_view(row.command) == command) return row;
+    return kKeys[0];
+}
+
+}  // namespace
+
+MarkerKeys::MarkerKeys(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
+                       MarkerReadout& readout, TraceReader& traces, Events& events,
+                       MessageBoxes& boxes)
+    : panel_(panel),
+      mirror_(mirror),
+      exchange_(exchange),
+      readout_(readout),
+      traces_(traces),
+      events_(events),
+      boxes_(boxes) {
+    panel_.MarkPkButton.Clicked.connect([this] { peak("MARKPK"); });
+    panel_.NextPeakButton.Clicked.connect([this] { peak("MARKNXTPK"); });
+    panel_.MinPeakButton.Clicked.connect([this] { peak("MARKMIN"); });
+    panel_.MarkToCentButton.Clicked.connect([this] { MarkToCentButton_Click(); });
+    panel_.MarkToRefButton.Clicked.connect([this] { MarkToRefButton_Click(); });
+    panel_.MarkerCheckBox.Clicked.connect([this] { MarkerCheckBox_Click(); });
+    panel_.DeltaCheckBox.Clicked.connect([this] { DeltaCheckBox_Click(); });
+}
+
+bool MarkerKeys::refused() {
+    return refusedUnconnected(panel_, boxes_) || refusedByContinuousView(panel_, boxes_);
+}
+
+void MarkerKeys::paint(const char* command) {
+    Button& pressed = panel_.*rowOf(command).key;
+    const bool minimum = &pressed == &panel_.MinPeakButton;
+    for (const MarkerKeyRow& row : kKeys) {
+        Button& key = panel_.*row.key;
+        if (&key == &pressed) {
+            key.BackColor = kRed;
+            continue;
+        }
+        // The minimum key is painted by itself alone, and leaves the peak key as it is.
+        const bool left =
+            &key == &panel_.MinPeakButton || (minimum && &key == &panel_.MarkPkButton);
+        if (!left) key.BackColor = kButtonFace;
+    }
+}
+
+bool MarkerKeys::command(const char* word) {
+    if (exchange_.CmdInstrument(word)) {
+        paint(word);
+        return true;
+    }
+    boxes_.show({BoxIcon::Exclamation, rowOf(word).failure});
+    return false;
+}
+
+void MarkerKeys::peak(const char* word) {
+    if (refused()) return;
+    const Hourglass busy(panel_, events_);
+    if (command(word)) readout_.MakeMarkerReadout();
+}
+
+void MarkerKeys::MarkToCentButton_Click() {
+    if (refused()) return;
+    const Hourglass busy(panel_, events_);
+    if (!command("MARKTOCENT")) return;
+    events_.sleep(kMoveMs);
+    std::string answer;
+    if (exchange_.GetInstrument("MARK1", answer)) {
+        panel_.CFLabel.Caption = "Center: " + FormatValue(split(answer, ',').front(), "Hz");
+        mirror_.CenterFrequency = leadingNumber(answer);
+    }
+    readout_.MakeMarkerReadout();
+    bool success = false;
+    traces_.ReadSingleTrace2({}, success);
+}
+
+void MarkerKeys::MarkToRefButton_Click() {
+    if (refused()) return;
+    const Hourglass busy(panel_, events_);
+    if (!command("MARKTOLVL")) return;
+    events_.sleep(kMoveMs);
+    std::string answer;
+    if (exchange_.GetInstrument("MARK1", answer)) {
+        panel_.MarkerValue = leadingNumber(answer);
+        const std::vector<std::string> pieces = split(answer, ',');
+        // The centre did not move: the label takes the marker's x all the same.
+        panel_.CFLabel.Caption = "Center: " + FormatValue(pieces.front(), "Hz");
+        if (pieces.size() > 1)
+            mirror_.ReferenceLevel =
+                leadingNumber(replaceAll(formatPattern(leadingNumber(pieces[1]), "00,0"), ",", ""));
+    }
+    readout_.MakeMarkerReadout();
+    bool success = false;
+    traces_.ReadSingleTrace2({}, success);
+}
+
+bool MarkerKeys::checkRefused(CheckBox& box) {
+    if (refusedByPowerSensor(panel_, boxes_)) return true;
+    if (!panel_.isConnected) {
+        if (!box.Value()) return true;
+        boxes_.show({BoxIcon::Information, "Please connect to the instrument first."});
+        box.setValue(false);
+        return true;
+    }
+    return refusedByContinuousView(panel_, boxes_);
+}
+
+void MarkerKeys::deltaOff() {
+    mirror_.DeltaOn = false;
+    readout_.clear(MarkerKind::Delta);
+}
+
+void MarkerKeys::markerOff() {
+    exchange_.SetInstrument("MARK1ON,0");
+    mirror_.MarkerOn = false;
+    readout_.clear(MarkerKind::Marker);
+    if (!mirror_.DeltaOn) return;
+    // The delta goes off in the program; nothing is sent about it.
+    deltaOff();
+    panel_.DeltaCheckBox.setValue(false);
+}
+
+void MarkerKeys::MarkerCheckBox_Click() {
+    if (checkRefused(panel_.MarkerCheckBox)) return;
+    const Hourglass busy(panel_, events_);
+    if (!panel_.MarkerCheckBox.Value()) return markerOff();
+    exchange_.SetInstrument("MARK1ON,1");
+    mirror_.MarkerOn = true;
+    events_.sleep(kSwitchMs);
+    bool success = false;
+    traces_.ReadSingleTrace2({}, success);
+    if (!success) return;
+    readout_.MakeMarkerReadout();
+    readout_.showCursor(MarkerKind::Marker, true);
+    panel_.CWGraph1.TrackMode = static_cast<int>(TrackMode::DragCursors);
+}
+
+void MarkerKeys::DeltaCheckBox_Click() {
+    // Switched off together with the marker, the box has nothing left to do.
+    if (!panel_.DeltaCheckBox.Value() && panel_.isConnected && !mirror_.DeltaOn) return;
+    if (checkRefused(panel_.DeltaCheckBox)) return;
+    const Hourglass busy(panel_, events_);
+    if (!panel_.DeltaCheckBox.Value()) {
+        exchange_.SetInstrument("DELTA1ON,0");
+        return deltaOff();
+    }
+    exchange_.SetInstrument("DELTA1ON,1");
+    mirror_.DeltaOn = true;
+    events_.sleep(kSwitchMs);
+    readout_.readDelta();
+    readout_.showCursor(MarkerKind::Delta, true);
+}
+
+}  // namespace zel

@@ -1,0 +1,55 @@
+#pragma once
+// Fills the boxes of a menu from the mirror, asking the instrument on the menu's first visit.
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
+#include "model/CodeTables.h"
+#include "model/ZEL3Variables.h"
+
+namespace zel {
+
+class MenuFill {
+  public:
+    MenuFill(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange)
+        : panel_(panel), mirror_(mirror), exchange_(exchange) {}
+
+    /// Takes a menu word. A word without boxes to fill only counts its visit.
+    void FillTextFields(std::string_view menuWord);
+
+    /// Unit of the channel power readout.
+    std::string ChannelPowerUnitName = "dBm";
+    /// Last answer to "PWR" of a soft key.
+    std::string LastPowerAnswer;
+
+  private:
+    void fillFrequency();
+    void fillSpan();
+    void fillAmplitude();
+    void fillBandwidth();
+    void fillSweep();
+    void fillTrace();
+    void fillMarker();
+    void fillMeasurement();
+    void fillChannelPower();
+    void fillOccupiedBandwidth();
+    void fillTDMAPower();
+    void fillDistanceToFault();
+
+    /// Asks the instrument unless the menu's values are known; a failure leaves the field.
+    void ask(const char* word, double& field);
+    void ask(const char* word, std::int16_t& field);
+    void ask(const char* word, std::string& field);
+    void show(int index, double value, const std::string& unit);
+    void choose(int index, double code);
+
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    CommandExchange& exchange_;
+    bool known_ = false;
+};
+
+}  // namespace zel

@@ -1,0 +1,187 @@
+#include "panel/ModeKeys.h"
+
+#include "model/Numeric.h"
+#include "panel/Interlock.h"
+#include "panel/MenuTables.h"
+#include "panel/ModeOptions.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+struct ModeRow {
+    std::int16_t mode;
+    std::int16_t menu;
+    KeyCaptions captions;  // an empty one hides its key
+    int waitMs;            // the instrument needs it to change its mode
+    const char* failure;
+    const char* word;      // for FillTextFields; null where the menu is not filled
+    bool whileConnecting;  // works while the handshake runs
+    bool alwaysTakesOver;  // scale and option also when the mode is on already
+};
+const ModeRow kModes[] = {
+    {CF::TRACKINGGENERATOR,
+     CF::TRACKINGGEN,
+     {"TRANS\r\nCAL", "REFLECT\r\nCAL", "TRANSM\r\nVECT CAL", "REFLECT\r\nVECT CAL",
+      "TRACGEN\r\nLEVEL"},
+     0,
+     "Tracking Generator Mode unsuccessful",
+     nullptr,
+     false,
+     false},
+    {CF::POWERSENSOR,
+     CF::POWER,
+     {"POWER", "FREQ", "POWER-\r\nREF", "MEAS\r\nTIME", "REFL\r\nLEVEL"},
+     2500,
+     "Power Sensor Mode unsuccessful",
+     nullptr,
+     false,
+     false},
+    {CF::CHANNELPOWER,
+     CF::CHNPOWER,
+     {"CHN\r\nPOWER", "CHN\r\nPWRSTD", "CHN\r\nPWRUNIT", "CHN\r\nPWRBW", "LEVEL\r\nADJ"},
+     0,
+     "Channer Power Mode unsuccessful",
+     "CHANNELPOWER",
+     true,
+     true},
+    {CF::OCCBANDWIDTH,
+     CF::OCCBW,
+     {"OCCUP\r\nBW", "OCCBW\r\nSTD", "OCCBW\r\nCHNBW", "LVL\r\nADJ", ""},
+     2000,
+     "Occupied Bandwidth Mode unsuccessful",
+     "OCCBANDWIDTH",
+     true,
+     true},
+    {CF::TDMAPOWERMODE,
+     CF::TDMA,
+     {"TDMA\r\nPOWER", "TDMA\r\nPWRSTD", "MEAS\r\nTIME", "LVL\r\nADJ", ""},
+     0,
+     "TDMA Power unsuccessful",
+     "TDMAPOWER",
+     true,
+     true},
+    {CF::DISTTOFAULTMEASURE,
+     CF::DISTFAULT,
+     {"CABLE\r\nMODEL", "CABLE\r\nLEN", "DTF\r\nMODE", "LEN\r\nUNIT", ""},
+     0,
+     "Distance to Fault Mode unsuccessful",
+     "DTF",
+     true,
+     true},
+};
+
+}  // namespace
+
+ModeKeys::ModeKeys(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
+                   SoftPanel& softPanel, MenuFill& fill, GraphScaling& scaling, Events& events,
+                   MessageBoxes& boxes)
+    : panel_(forms.controller),
+      dialog_(forms.main),
+      mirror_(mirror),
+      exchange_(exchange),
+      softPanel_(softPanel),
+      fill_(fill),
+      scaling_(scaling),
+      events_(events),
+      boxes_(boxes) {
+    panel_.AnalyzerButton.Clicked.connect([this] { AnalyzerButton_Click(); });
+    panel_.ResetButton.Clicked.connect([this] { ResetButton_Click(); });
+    for (const ModeRow& row : kModes)
+        modeButton(panel_, row.mode).Clicked.connect([this, mode = row.mode] { enterMode(mode); });
+    for (std::int16_t mode = CF::ANALYZER; mode <= CF::DISTTOFAULTMEASURE; ++mode) {
+        OptionButton& option = modeOption(panel_, mode);
+        option.Clicked.connect([this, &option, mode] {
+            if (option.Value()) modeButton(panel_, mode).Click();
+        });
+    }
+}
+
+void ModeKeys::enterMode(std::int16_t mode) {
+    const ModeRow* row = nullptr;
+    for (const ModeRow& candidate : kModes)
+        if (candidate.mode == mode) row = &candidate;
+    if (row == nullptr || refusedByContinuousView(panel_, boxes_)) return;
+    softPanel_.InitForm(row->menu);
+    softPanel_.setKeyCaptions(row->captions);
+    softPanel_.SetTextFieldsAndFrames(row->menu);
+    const bool on = panel_.InstrumentMode == mode;
+    if (!on || row->alwaysTakesOver) {
+        const bool connecting = row->whileConnecting && dialog_.IsConnecting;
+        if (!connecting && refusedUnconnected(panel_, boxes_)) return;
+        const Hourglass busy(panel_, events_);
+        if (!on) {
+            if (!exchange_.SetInstrument("MEAS," + std::to_string(mode))) {
+                boxes_.show({BoxIcon::Exclamation, row->failure});
+                return;
+            }
+            if (row->waitMs > 0) events_.sleep(row->waitMs);
+        }
+        panel_.InstrumentMode = mode;
+        mirror_.ReferenceRange = 0;
+        mirror_.ReferenceUnit = 0;
+        modeOption(panel_, mode).setValue(true);
+        if (row->word != nullptr && panel_.isConnected) fill_.FillTextFields(row->word);
+    }
+}
+
+void ModeKeys::AnalyzerButton_Click() {
+    if (panel_.InstrumentMode == CF::ANALYZER || refusedByContinuousView(panel_, boxes_)) return;
+    mirror_.PowerSensorExitRequested = true;
+    panel_.FrequencyButton.Click();
+    if (refusedUnconnected(panel_, boxes_)) {
+        panel_.State = 0;
+        return;
+    }
+    const Hourglass busy(panel_, events_);
+    if (exchange_.SetInstrument("MEAS,1")) {
+        panel_.InstrumentMode = CF::ANALYZER;
+        panel_.AnalyzerCheck.setValue(true);
+    } else {
+        boxes_.show({BoxIcon::Exclamation, "Analyzer Mode unsuccessful"});
+    }
+}
+
+void ModeKeys::presetMirror() {
+    mirror_.CenterFrequency = 1.5e9;
+    mirror_.Span = 3e9;
+    mirror_.FrequencyOffset = 0.1;  // the box shows 0 Hz: both are meant
+    mirror_.MarkerModeText = "0";
+    mirror_.MeasModeText = "0";
+    mirror_.ReferenceOffset = 0;
+    mirror_.RFInputImpedance = 0;
+    mirror_.ResolutionBandwidth = 0;
+    mirror_.VideoBandwidth = 0;
+    mirror_.SweepContinuous = 1;
+    mirror_.TraceMode = 0;
+    mirror_.TriggerSource = 0;
+    mirror_.TraceDetector = 0;
+    mirror_.ReferenceLevel = -20;
+    mirror_.ReferenceRange = 0;
+    mirror_.ReferenceUnit = 0;
+    panel_.SingleSweepModeActive = false;
+}
+
+void ModeKeys::ResetButton_Click() {
+    if (refusedByContinuousView(panel_, boxes_)) return;
+    const Hourglass busy(panel_, events_);
+    exchange_.CmdInstrument("PRESET");
+    presetMirror();
+    panel_.MarkerCheckBox.setValue(false);
+    panel_.DeltaCheckBox.setValue(false);
+    panel_.PowerSensorCheck.setValue(false);
+    panel_.ChannelPowerCheck.setValue(false);
+    scaling_.hideAnnotation();
+    AnalyzerButton_Click();
+    panel_.FrequencyButton.Click();
+    const double half = mirror_.Span / 2;
+    const double shown[] = {mirror_.CenterFrequency, mirror_.Span, mirror_.CenterFrequency - half,
+                            mirror_.CenterFrequency + half, 0};
+    for (int i = 0; i < panel_.SoftTextBox.count(); ++i)
+        panel_.SoftTextBox(i).Text = FormatValue(shown[i], "Hz");
+    panel_.CFLabel.Caption = "Center: " + FormatValue(mirror_.CenterFrequency, "Hz");
+    panel_.SpanLabel.Caption = "Span: " + FormatValue(mirror_.Span, "Hz");
+}
+
+}  // namespace zel

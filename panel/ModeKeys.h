@@ -1,0 +1,41 @@
+#pragma once
+// The measurement modes, and the preset.
+
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MenuFill.h"
+#include "panel/SoftPanel.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "trace/GraphScaling.h"
+
+namespace zel {
+
+class ModeKeys {
+  public:
+    /// Connects the mode keys, their options and the preset key.
+    ModeKeys(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange, SoftPanel& softPanel,
+             MenuFill& fill, GraphScaling& scaling, Events& events, MessageBoxes& boxes);
+
+    /// Enters the mode of that MEAS number, 2 to 7, and shows its menu.
+    void enterMode(std::int16_t mode);
+    void AnalyzerButton_Click();
+    /// Writes the preset's values into the mirror by hand: the instrument is asked nothing.
+    void ResetButton_Click();
+
+  private:
+    void presetMirror();
+
+    ControllerForm& panel_;
+    MainForm& dialog_;
+    ZEL3Variables& mirror_;
+    CommandExchange& exchange_;
+    SoftPanel& softPanel_;
+    MenuFill& fill_;
+    GraphScaling& scaling_;
+    Events& events_;
+    MessageBoxes& boxes_;
+};
+
+}  // namespace zel

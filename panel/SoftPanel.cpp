@@ -1,0 +1,186 @@
+#include "panel/SoftPanel.h"
+
+#include <string>
+#include <vector>
+
+namespace zel {
+namespace {
+
+struct KeyColor {
+    std::string_view word;
+    Color color;
+};
+constexpr KeyColor kKeyColors[] = {{"gray", kButtonFace}, {"red", kRed}, {"green", kGreen}};
+
+struct HardKeyPicture {
+    Button ControllerForm::*key;
+    const char* picture;  // without "_y" and "_b"
+    std::int16_t state;
+};
+// In the order in which the pictures are set.
+const HardKeyPicture kHardKeyPictures[] = {
+    {&ControllerForm::FrequencyButton, "freq", ControllerForm::Freq},
+    {&ControllerForm::BWButton, "band", ControllerForm::BW},
+    {&ControllerForm::SweepButton, "sweep", ControllerForm::SWEEP},
+    {&ControllerForm::TraceButton, "trace", ControllerForm::TRACE},
+    {&ControllerForm::MeasButton, "meas", ControllerForm::MEAS},
+    {&ControllerForm::TrackButton1, "track", ControllerForm::TRACKINGGEN},
+    {&ControllerForm::SpanButton, "span", ControllerForm::SPAN},
+    {&ControllerForm::AmplitudeButton, "ampl", ControllerForm::AMPT},
+    {&ControllerForm::MarkerButton, "marker", ControllerForm::Marker},
+};
+
+std::vector<std::string> choicesOf(CodeTable table) {
+    std::vector<std::string> items;
+    for (const CodeRow& row : codeTable(table))
+        if (!row.choice.empty()) items.emplace_back(row.choice);
+    return items;
+}
+
+}  // namespace
+
+void SoftPanel::SetStates(std::int16_t oldState, std::int16_t newState) {
+    panel_.LastState = oldState;
+    panel_.State = newState;
+}
+
+void SoftPanel::InitForm(std::int16_t newState) {
+    for (TextBox& box : panel_.SoftTextBox) box.Text = "";
+    SetStates(panel_.State, newState);
+    SetSoftButtonsColor(0);
+    ShowAllSoftKeys();
+}
+
+void SoftPanel::SetSoftButtonsColor(int index) {
+    for (int i = 0; i < panel_.SoftKey.count(); ++i)
+        panel_.SoftKey(i).BackColor = i == index ? kRed : kButtonFace;
+}
+
+void SoftPanel::SetButtonColor(int index, std::string_view word) {
+    for (const KeyColor& row : kKeyColors)
+        if (row.word == word) panel_.SoftKey(index).BackColor = row.color;
+}
+
+void SoftPanel::ShowAllSoftKeys() {
+    for (Button& key : panel_.SoftKey) key.Visible = true;
+}
+
+void SoftPanel::HideChoiceBoxes() {
+    for (DropDownList& list : panel_.ChoiceBox) {
+        list.Visible = false;
+        list.Clear();
+    }
+    for (TextBox& box : panel_.SoftTextBox) box.Visible = true;
+}
+
+void SoftPanel::UnlockChoiceBoxes() {
+    for (DropDownList& list : panel_.ChoiceBox) list.Locked = false;
+}
+
+void SoftPanel::UnlockTextFields() {
+    for (TextBox& box : panel_.SoftTextBox) box.Locked = false;
+}
+
+void SoftPanel::SetSoftBoxesToEditable() { UnlockTextFields(); }
+
+void SoftPanel::SetButtonsActive() {
+    for (Button& key : panel_.SoftKey) key.Enabled = true;
+}
+
+void SoftPanel::SetTextFieldsAndFrames(std::int16_t state) {
+    HideChoiceBoxes();
+    UnlockChoiceBoxes();
+    UnlockTextFields();
+    SetSoftBoxesToEditable();
+    SetButtonsActive();
+    const MenuLayout* layout = menuLayout(state);
+    if (layout == nullptr) return;
+    for (int i = 0; i < panel_.SoftKey.count(); ++i)
+        layPosition(i, layout->positions.at(static_cast<std::size_t>(i)));
+}
+
+void SoftPanel::layPosition(int index, const MenuPosition& position) {
+    Frame& frame = panel_.SoftFrame(index);
+    TextBox& box = panel_.SoftTextBox(index);
+    DropDownList& list = panel_.ChoiceBox(index);
+    Button& key = panel_.SoftKey(index);
+    if (!position.frame.empty()) frame.Caption = std::string(position.frame);
+    const bool isChoice =
+        position.kind == PositionKind::Choice || position.kind == PositionKind::LockedChoice;
+    if (position.kind != PositionKind::HiddenBox)
+        frame.Visible = position.kind != PositionKind::None;
+    box.Visible = position.kind == PositionKind::Box || position.kind == PositionKind::LockedBox;
+    box.Locked = position.kind == PositionKind::LockedBox;
+    if (position.choices) list.setItems(choicesOf(*position.choices));
+    list.Visible = isChoice || position.listAboveBox;
+    list.Locked = position.kind == PositionKind::LockedChoice;
+    switch (position.key) {
+        case KeyAction::Leave:
+            break;
+        case KeyAction::Enable:
+            key.Enabled = true;
+            break;
+        case KeyAction::Disable:
+            key.Enabled = false;
+            break;
+        case KeyAction::Hide:
+            key.Visible = false;
+            break;
+        case KeyAction::PaintGreen:
+            SetButtonColor(index, "green");
+            break;
+    }
+}
+
+void SoftPanel::laySubMenu(std::int16_t state, const KeyCaptions& captions,
+                           const std::array<std::string_view, 3>& frames) {
+    SetButtonsActive();
+    setKeyCaptions(captions);
+    for (int i = 0; i < panel_.SoftFrame.count(); ++i) {
+        const bool used =
+            i < static_cast<int>(frames.size()) && !frames.at(static_cast<std::size_t>(i)).empty();
+        panel_.SoftFrame(i).Visible = used;
+        if (used) panel_.SoftFrame(i).Caption = std::string(frames.at(static_cast<std::size_t>(i)));
+        // The names of transducers and limit lines are typed.
+        const bool typed = used && i < 2;
+        panel_.SoftTextBox(i).Visible = typed;
+        panel_.SoftTextBox(i).Locked = false;
+        if (typed) panel_.SoftTextBox(i).Text = "";
+        panel_.ChoiceBox(i).Visible = false;
+    }
+    SetStates(panel_.State, state);
+}
+
+void SoftPanel::layTransducerMenu() {
+    laySubMenu(ControllerForm::MEAS_TRD,
+               {"TRANSD", "TRANSD\r\ndB", "TRANSD1\r\nOff", "TRANSD2\r\nOff", "EXIT"},
+               {"Transducer", "Transducer Db", ""});
+}
+
+void SoftPanel::layLimitMenu() {
+    laySubMenu(ControllerForm::MEAS_LLINES,
+               {"LOWER\r\nLIMIT", "UPPER\r\nLIMIT", "LIMITS\r\nPASSED", "EXIT", ""},
+               {"Lower Limit", "Upper Limit", "Limits Passed"});
+    panel_.ChoiceBox(2).setItems(choicesOf(CodeTable::LimitPass));
+    panel_.ChoiceBox(2).Visible = true;
+    panel_.ChoiceBox(2).Locked = true;
+}
+
+void SoftPanel::SetButtonsStatus(std::int16_t state) {
+    const HardKeyPicture* current = &kHardKeyPictures[8];  // the marker key stands for the rest
+    for (const HardKeyPicture& row : kHardKeyPictures) {
+        (panel_.*row.key).Picture = std::string(row.picture) + "_y";
+        if (row.state == state) current = &row;
+    }
+    (panel_.*current->key).Picture = std::string(current->picture) + "_b";
+}
+
+void SoftPanel::setKeyCaptions(const KeyCaptions& captions) {
+    for (int i = 0; i < panel_.SoftKey.count(); ++i) {
+        const std::string_view caption = captions.at(static_cast<std::size_t>(i));
+        panel_.SoftKey(i).Caption = std::string(caption);
+        panel_.SoftKey(i).Visible = !caption.empty();
+    }
+}
+
+}  // namespace zel

@@ -1,0 +1,97 @@
+#pragma once
+// The press of a soft key: asks the instrument for one value, or carries out an action.
+
+#include <functional>
+#include <optional>
+#include <string>
+#include <variant>
+#include <vector>
+
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
+#include "model/CodeTables.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MarkerReadout.h"
+#include "panel/MenuFill.h"
+#include "panel/SoftPanel.h"
+#include "platform/MessageBox.h"
+#include "trace/GraphScaling.h"
+#include "trace/TraceReader.h"
+
+namespace zel {
+
+class Z9GetCommands {
+  public:
+    Z9GetCommands(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
+                  SoftPanel& softPanel, MenuFill& fill, MarkerReadout& markers, TraceReader& traces,
+                  GraphScaling& scaling, MessageBoxes& boxes);
+
+    /// Runs the operations of all menus in their order for the key of that index; each clause
+    /// looks at the state as the clauses ahead of it left it.
+    void press(int index);
+    /// Asks the word and shows the answer in the soft box: a number with prefix and unit, but for
+    /// LENUNIT, which is a text. False when the instrument gave no answer; the box stays.
+    bool QueryToSoftBox(const std::string& word, int index, const std::string& unit);
+
+    std::string LastReflAnswer;
+    std::string LastQueryAnswer;
+
+  private:
+    using Field =
+        std::variant<std::monostate, double ZEL3Variables::*, std::int16_t ZEL3Variables::*,
+                     std::uint8_t ZEL3Variables::*, std::string ZEL3Variables::*>;
+    struct Query {
+        const char* word;
+        const char* unit = "";
+        Field field{};
+        std::optional<CodeTable> captions = std::nullopt;
+        bool leadingNumber = false;  ///< the field takes the answer, not the shown text
+    };
+    struct Clause {
+        std::int16_t state;
+        int key;
+        std::variant<Query, void (Z9GetCommands::*)(int)> does;
+    };
+    static const std::vector<Clause>& clauses();
+
+    void runQuery(const Query& query, int index);
+    void store(const Field& field, double number);
+    void decode(CodeTable table, double code, int index);
+
+    void startFrequency(int index);
+    void edgeFrequency(int index, double direction);
+    void stopFrequency(int index);
+    void fullSpan(int index);
+    void zeroSpan(int index);
+    void lastSpan(int index);
+    void referenceLevel(int index);
+    void bandwidth(int index);
+    void autoBandwidth(int index);
+    void autoSweepTime(int index);
+    void triggerSource(int index);
+    void triggerValue(int index);
+    void singleTrace(int index);
+    void transducerMenu(int index);
+    void limitMenu(int index);
+    void transducerOff(int index);
+    void leaveSubMenu(int index);
+    void channelPower(int index);
+    void channelPowerUnit(int index);
+    void levelAdjust(int index);
+    void marker(int index);
+
+    bool getSelected() const { return panel_.GetOption.Value(); }
+    void readTrace();
+
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    CommandExchange& exchange_;
+    SoftPanel& softPanel_;
+    MenuFill& fill_;  ///< holds the readouts that the menus share
+    MarkerReadout& markers_;
+    TraceReader& traces_;
+    GraphScaling& scaling_;
+    MessageBoxes& boxes_;
+};
+
+}  // namespace zel

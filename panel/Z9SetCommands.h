@@ -1,0 +1,98 @@
+#pragma once
+// The Enter key in a soft box and a pick in its list: sends the value to the instrument.
+
+#include <string>
+#include <variant>
+#include <vector>
+
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
+#include "model/FrequencyLabels.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MarkerReadout.h"
+#include "panel/SoftPanel.h"
+#include "panel/Z9GetCommands.h"
+#include "platform/Events.h"
+#include "trace/GraphScaling.h"
+#include "trace/TraceReader.h"
+
+namespace zel {
+
+/// The mirror takes what was asked for, whatever the instrument makes of it; a refusal is told by
+/// the exchange. A text that is no number goes out as 0.
+class Z9SetCommands {
+  public:
+    Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
+                  SoftPanel& softPanel, Z9GetCommands& queries, MarkerReadout& markers,
+                  FrequencyLabels& labels, TraceReader& traces, GraphScaling& scaling,
+                  Events& events);
+
+    /// Runs the operations of all menus in their order for the position of that index; each
+    /// clause looks at the state as the clauses ahead of it left it.
+    void enter(int index);
+
+  private:
+    using Field =
+        std::variant<std::monostate, double ZEL3Variables::*, std::int16_t ZEL3Variables::*,
+                     std::uint8_t ZEL3Variables::*, std::string ZEL3Variables::*>;
+    enum class Source {
+        Value,   ///< the box, a number with prefix
+        Whole,   ///< the same, cut to a whole number of 32 bits
+        Word,    ///< the same, as a 16-bit number: too large an entry ends the operation
+        Choice,  ///< index of the list
+        Text,    ///< the box, trimmed
+    };
+    using Action = void (Z9SetCommands::*)(int);
+    struct Setting {
+        const char* word;  ///< with its comma
+        Source source = Source::Value;
+        Field field{};
+        Action after = nullptr;
+    };
+    struct Clause {
+        std::int16_t state;
+        int key;
+        std::variant<Setting, Action> does;
+    };
+    static const std::vector<Clause>& clauses();
+
+    void send(const Setting& setting, int index);
+    bool valueText(Source source, int index, std::string& text, double& number) const;
+    void store(const Field& field, double number, const std::string& text);
+
+    void afterCentre(int index);
+    void manualSpan(int index);
+    void startFrequency(int index);
+    void stopFrequency(int index);
+    void edgeFrequency(double span, double centre);
+    void afterOffset(int index);
+    void zeroSpan(int index);
+    void afterBandwidth(int index);
+    void afterSweepTime(int index);
+    void autoSweepTime(int index);
+    void sweepMode(int index);
+    void triggerSource(int index);
+    void triggerValue(int index);
+    void measurementMode(int index);
+    void marker(int index);
+
+    double boxValue(int index) const;
+    void showEdges();
+    void showSpan();
+    void readTrace();
+    void pointer(int shape);
+
+    Forms& forms_;
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    CommandExchange& exchange_;
+    SoftPanel& softPanel_;
+    Z9GetCommands& queries_;
+    MarkerReadout& markers_;
+    FrequencyLabels& labels_;
+    TraceReader& traces_;
+    GraphScaling& scaling_;
+    Events& events_;
+};
+
+}  // namespace zel
