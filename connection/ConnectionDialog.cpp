@@ -1,0 +1,133 @@
+#include "connection/ConnectionDialog.h"
+
+#include "link/RS232Ops.h"
+#include "platform/ModalForm.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr std::size_t kManyPorts = 1000;
+constexpr int kFallbackPorts = 10;
+
+}  // namespace
+
+ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, Handshake& handshake,
+                                   Profiles& profiles, SessionClock& sessionClock,
+                                   SoftPanel& softPanel, TraceReader& traces, SerialPortList& ports,
+                                   Events& events)
+    : forms_(forms),
+      panel_(forms.controller),
+      dialog_(forms.main),
+      link_(link),
+      handshake_(handshake),
+      profiles_(profiles),
+      sessionClock_(sessionClock),
+      softPanel_(softPanel),
+      traces_(traces),
+      ports_(ports),
+      events_(events) {
+    dialog_.Load.connect([this] { Form_Load(); });
+    panel_.Direct.Clicked.connect([this] { Direct_Click(); });
+    panel_.ImmConnect.Clicked.connect([this] { ImmConnect_Click(); });
+    dialog_.ZELButton.Clicked.connect([this] { ZELButton_Click(); });
+    dialog_.LoadSettingsButton.Clicked.connect([this] { profiles_.LoadSettings_Click(); });
+    dialog_.SaveSettingsButton.Clicked.connect([this] { profiles_.SaveSettings_Click(); });
+    for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1})
+        close->Clicked.connect([this] {
+            dialog_.Hide();
+            panel_.ErrorFlag = false;
+        });
+}
+
+void ConnectionDialog::EnumerateComPorts() {
+    dialog_.CommPorts.clear();
+    ReadSerialPortNames(ports_, dialog_.CommPorts);
+}
+
+void ConnectionDialog::Form_Load() {
+    EnumerateComPorts();
+    dialog_.COMList.Clear();
+    if (dialog_.CommPorts.size() < kManyPorts) {
+        for (const std::string& name : dialog_.CommPorts) dialog_.COMList.AddItem(name);
+    } else {
+        for (int i = 1; i <= kFallbackPorts; ++i)
+            dialog_.COMList.AddItem("COM" + std::to_string(i));
+    }
+    dialog_.COMList.setListIndex(0);
+    if (dialog_.BaudList.ListCount() == 0)
+        for (const char* baud : {"19200", "38400", "57600", "115200"})
+            dialog_.BaudList.AddItem(baud);
+    dialog_.BaudList.setListIndex(0);
+    dialog_.ModemConnected = false;
+    if (panel_.ConnectionState != CF::DIRECTCON) {
+        dialog_.DialButton.Visible = true;
+        dialog_.CancelButton.Visible = false;
+    }
+}
+
+void ConnectionDialog::SetAllFramesInvisible() {
+    dialog_.DirectConnectionFrame.Visible = false;
+    dialog_.ModemConnectionFrame.Visible = false;
+}
+
+void ConnectionDialog::SetConnectionKind(std::int16_t kind) {
+    panel_.ConnectionState = kind;
+    // Ports come and go: the list is made anew while nothing is connected.
+    if (!panel_.isConnected) dialog_.unload(1);
+    dialog_.load();
+    SetAllFramesInvisible();
+    dialog_.DirectConnectionFrame.Visible = true;
+    const bool direct = kind == CF::DIRECTCON;
+    dialog_.CancelConnButton1.Visible = direct;
+    dialog_.ZELButton.Visible = direct;
+    dialog_.DisconnectButton.Visible = direct;
+    dialog_.ModemConnectionFrame.Visible = !direct;
+    dialog_.DisconnectButton2.Visible = !direct;
+    dialog_.CancelConnButton.Visible = !direct;
+    if (!direct) dialog_.CancelButton.Visible = false;
+    profiles_.LoadSettings_Click();
+    if (!panel_.immConnectState) showModal();
+}
+
+void ConnectionDialog::showModal() { showModalForm(dialog_, events_); }
+
+void ConnectionDialog::Direct_Click() {
+    panel_.immConnectState = false;
+    SetConnectionKind(CF::DIRECTCON);
+    dialog_.ModemConnectionFrame.Visible = false;
+    // The direct link stores its fields by itself.
+    dialog_.LoadSettingsButton.Visible = false;
+    dialog_.SaveSettingsButton.Visible = false;
+    dialog_.CancelConnButton.Visible = false;
+    dialog_.DisconnectButton.Visible = true;
+    dialog_.CancelConnButton1.Visible = true;
+    if (!panel_.isConnected) dialog_.ZELButton.Visible = true;
+}
+
+void ConnectionDialog::ImmConnect_Click() {
+    panel_.immConnectState = true;
+    panel_.ImmConnect.Visible = false;
+    SetConnectionKind(CF::DIRECTCON);
+    ZELButton_Click();
+}
+
+void ConnectionDialog::ZELButton_Click() {
+    connectDirect(true);
+    softPanel_.SetButtonsStatus(CF::Freq);
+}
+
+void ConnectionDialog::connectDirect(bool readTrace) {
+    link_.OpenPortFromDialog();
+    if (panel_.ConnectionState != CF::DIRECTCON || !dialog_.IsConnectedToPort) return;
+    sessionClock_.InitTimer("start");
+    handshake_.InitConnection();
+    profiles_.SaveSettings_Click();
+    panel_.State = CF::Freq;
+    if (!readTrace || !panel_.isConnected || panel_.InstrumentMode == CF::POWERSENSOR) return;
+    bool success = false;
+    traces_.ReadSingleTrace2({}, success);
+}
+
+}  // namespace zel

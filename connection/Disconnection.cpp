@@ -1,0 +1,173 @@
+#include "connection/Disconnection.h"
+
+#include "connection/Handshake.h"
+#include "link/DebugLine.h"
+#include "panel/Interlock.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr int kModemAnswerMs = 5001;
+constexpr int kModemPauseMs = 500;
+constexpr int kPollMs = 20;
+constexpr std::size_t kLongestModemAnswer = 4096;
+
+}  // namespace
+
+Disconnection::Disconnection(Forms& forms, ByteLink& link, CommandExchange& exchange,
+                             Socket& TCPSocket, SessionClock& sessionClock, GraphInteraction& graph,
+                             const Clock& clock, Events& events, MessageBoxes& boxes)
+    : forms_(forms),
+      panel_(forms.controller),
+      dialog_(forms.main),
+      link_(link),
+      exchange_(exchange),
+      socket_(TCPSocket),
+      sessionClock_(sessionClock),
+      graph_(graph),
+      events_(events),
+      boxes_(boxes),
+      StopwatchA_(clock) {
+    dialog_.DisconnectButton.Clicked.connect([this] { DisconnectButton_Click(); });
+    dialog_.DisconnectButton2.Clicked.connect([this] { DisconnectButton_Click(); });
+    panel_.Disconnect.Clicked.connect([this] { DisconnectButton_Click(); });
+}
+
+void Disconnection::pointer(int shape) {
+    panel_.MousePointer = shape;
+    events_.pump();
+}
+
+void Disconnection::DisconnectButton_Click() {
+    if (panel_.ContinuosLoopActive) {
+        boxes_.show({BoxIcon::Warning, std::string("Please exit the Continunous View Mode first") +
+                                           kCrLf +
+                                           "Use the red stop button in the upper right corner."});
+        return;
+    }
+    if (!panel_.isConnected) return attemptOver();
+    const BoxAnswer answer =
+        boxes_.show({BoxIcon::Question, "Are you sure you want to close the connection?",
+                     "Disconnect", BoxButtons::OkCancel});
+    if (answer != BoxAnswer::Ok) {
+        pointer(11);
+        exchange_.CmdInstrument("REMOTE");
+        panel_.MousePointer = 0;
+        return;
+    }
+    endSession();
+}
+
+void Disconnection::attemptOver() {
+    if (!panel_.ErrorFlag && !link_.portOpen()) {
+        boxes_.show({BoxIcon::Information, "Not Connected"});
+        panel_.ErrorFlag = true;
+    }
+    pointer(0);
+    if (link_.portOpen()) link_.CloseComPort();
+    DebugLine(panel_, " ");
+}
+
+void Disconnection::endSession() {
+    const bool tcp = panel_.ConnectionState == CF::TCPCON;
+    const bool direct = panel_.ConnectionState == CF::DIRECTCON;
+    if (link_.portOpen() || tcp) {
+        pointer(11);
+        exchange_.CmdInstrument("LOCAL");
+        socket_.close();
+        pointer(0);
+    }
+    if (!direct && !tcp && link_.portOpen()) HangUpModem();
+    if (link_.portOpen()) ClosePortAndClearIdentity();
+    if (tcp) {
+        link_.CloseTCPSocket();
+        forms_.tcpConnection.IDTextBox.Text = "";
+    }
+    notConnectedLook();
+}
+
+void Disconnection::notConnectedLook() {
+    dialog_.AirBaudRateText.Text = "";
+    dialog_.ModemConnected = false;
+    dialog_.Hide();
+    dialog_.ZELButton.Visible = true;
+    dialog_.DisconnectButton2.Visible = false;
+    dialog_.DialButton.Visible = true;
+    dialog_.CancelButton.Visible = false;
+    panel_.Disconnect.Enabled = false;
+    panel_.RecordData.Enabled = false;
+    sessionClock_.InitTimer("stop");
+    panel_.State = 0;
+    panel_.SetDevice.Enabled = true;
+    dialog_.unload(1);
+    for (MenuItem* item : {&panel_.Direct, &panel_.Modem, &panel_.GSM, &panel_.GSMToModem,
+                           &panel_.ModemToGSM, &panel_.TCPConnection})
+        item->Enabled = true;
+    panel_.ConnectedPic.Visible = false;
+    panel_.Picture3.Visible = false;
+    panel_.isConnected = false;
+    if (link_.portOpen()) link_.CloseComPort();
+    dialog_.OnPic.Visible = false;
+    dialog_.AirBaudRateText.Text = "";
+    if (testCommandWord(panel_, "BUTTON")) panel_.ImmConnect.Visible = true;
+    panel_.Connection.Enabled = true;
+    panel_.Utility.Enabled = true;
+    if (panel_.StopButton.Visible) panel_.StopButton.Click();
+    graph_.finishCursors();
+    panel_.MousePointer = 0;
+}
+
+void Disconnection::HangUpModem() {
+    // The answers make no difference: the hang-up goes on in any case.
+    link_.WriteToLink("+++");
+    awaitModemAnswer();
+    events_.sleep(kModemPauseMs);
+    link_.WriteToLink("ATH0\r");
+    awaitModemAnswer();
+}
+
+void Disconnection::awaitModemAnswer() {
+    std::string answer;
+    StopwatchA_.Reset();
+    while (StopwatchA_.Elapsed() < kModemAnswerMs && link_.portOpen()) {
+        answer += link_.ReadFromLink(true);
+        if (answer.find('\r') != std::string::npos || answer.size() > kLongestModemAnswer) return;
+        events_.wait(kPollMs);
+    }
+}
+
+void Disconnection::ClosePortAndClearIdentity() {
+    link_.CloseComPort();
+    dialog_.OnPic.Visible = false;
+    dialog_.IDText.Text = "";
+    dialog_.IsConnectedToPort = false;
+    panel_.isConnected = false;
+}
+
+RemoteToggle::RemoteToggle(ControllerForm& panel, CommandExchange& exchange, Events& events,
+                           MessageBoxes& boxes)
+    : panel_(panel), exchange_(exchange), events_(events), boxes_(boxes) {
+    panel_.OnOffButton.Clicked.connect([this] { OnOffButton_Click(); });
+    panel_.LocalButton.Clicked.connect([this] { LocalButton_Click(); });
+}
+
+bool RemoteToggle::mayAct() {
+    return !refusedUnconnected(panel_, boxes_) && !refusedByContinuousView(panel_, boxes_);
+}
+
+void RemoteToggle::OnOffButton_Click() {
+    if (!mayAct()) return;
+    const Hourglass busy(panel_, events_);
+    const bool toRemote = panel_.OnOffButton.Caption.get() == "R";
+    exchange_.CmdInstrument(toRemote ? "REMOTE" : "LOCAL");
+    panel_.OnOffButton.Caption = toRemote ? "L" : "R";
+}
+
+void RemoteToggle::LocalButton_Click() {
+    if (mayAct()) exchange_.CmdInstrument("LOCAL");
+}
+
+}  // namespace zel

@@ -1,0 +1,202 @@
+#include "connection/Handshake.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "link/DebugLine.h"
+#include "panel/MenuTables.h"
+#include "panel/ModeOptions.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr int kRadioSettleMs = 3000;
+constexpr int kBeforeFirstCrMs = 500;
+constexpr std::size_t kIdentityShown = 13;  // characters
+
+}  // namespace
+
+bool testCommandWord(ControllerForm& panel, const char* word) {
+    panel.STAT = upperCase(panel.CommandLine).find(word) != std::string::npos;
+    return panel.STAT;
+}
+
+Handshake::Handshake(Forms& forms, ZEL3Variables& mirror, ZELBas& state, ByteLink& link,
+                     AnswerReader& reader, CommandExchange& exchange, FrequencyLabels& labels,
+                     SoftPanel& softPanel, MenuFill& fill, Events& events, MessageBoxes& boxes)
+    : forms_(forms),
+      panel_(forms.controller),
+      dialog_(forms.main),
+      mirror_(mirror),
+      state_(state),
+      link_(link),
+      reader_(reader),
+      exchange_(exchange),
+      labels_(labels),
+      softPanel_(softPanel),
+      fill_(fill),
+      events_(events),
+      boxes_(boxes) {}
+
+void Handshake::mouse(int shape) {
+    dialog_.MousePointer = shape;
+    events_.pump();
+}
+
+void Handshake::InitConnection() {
+    mouse(11);
+    DeselectOptionBoxes(panel_);
+    dialog_.IsConnecting = true;
+    if (!wakeInstrument()) return noInstrument(reader_.absenceTold());
+    acceptRemote();
+    if (!identify()) return;
+    if (!readDetector()) return;
+    readMode();
+    bool ok = false;
+    labels_.GetFreqForLabel(ok);
+    if (!ok) return;
+    if (panel_.InstrumentMode != CF::POWERSENSOR && !readState()) return;
+    dialog_.IsConnecting = false;
+    panel_.isConnected = true;
+    connectedLook();
+    fill_.FillTextFields("FREQ");
+    mouse(0);
+}
+
+bool Handshake::wakeInstrument() {
+    const std::int16_t kind = panel_.ConnectionState;
+    if (kind == CF::GSMCON || kind == CF::MODEMGSMCON || kind == CF::GSMMODEMCON) {
+        DebugLine(panel_, "...");
+        events_.sleep(kRadioSettleMs);
+    }
+    DebugLine(panel_, "Sending initializing <CR> ...");
+    events_.sleep(kBeforeFirstCrMs);
+    link_.WriteToLink("\r");
+    DebugLine(panel_, "Reading the first response...");
+    if (reader_.ReadAnswer().empty()) return false;
+    DebugLine(panel_, "Successful");
+    mouse(11);
+    return true;
+}
+
+void Handshake::acceptRemote() {
+    // While REMOTE is not accepted, the exchange shows no box of the instrument.
+    state_.RemoteAccepted = false;
+    state_.RemoteAccepted = exchange_.CmdInstrument("REMOTE");
+    if (state_.RemoteAccepted || !link_.usable()) return;
+    exchange_.SetInstrument("MEAS,1");
+    if (link_.usable()) state_.RemoteAccepted = exchange_.CmdInstrument("REMOTE");
+}
+
+bool Handshake::identify() {
+    std::string id;
+    if (!link_.usable() || !exchange_.GetInstrument("IDN?", id)) return false;
+    const std::string head = id.substr(0, kIdentityShown);
+    DebugLine(panel_, head);
+    const std::vector<std::string> fields = split(id, ',');
+    if (fields.size() > 1)
+        mirror_.InstrumentModel =
+            static_cast<std::int16_t>(std::clamp(leadingNumber(fields[1]), -32768.0, 32767.0));
+    if (fields.size() > 2) mirror_.InstrumentSerial = leadingNumber(fields[2]);
+    if (trimmed(head).find("Marlow") == std::string::npos) {
+        noInstrument(panel_.ErrorFlag);
+        return false;
+    }
+    const bool tcp = panel_.ConnectionState == CF::TCPCON;
+    (tcp ? forms_.tcpConnection.IDTextBox : dialog_.IDText).Text = id;
+    mouse(0);
+    return true;
+}
+
+bool Handshake::readDetector() {
+    std::string answer;
+    if (!exchange_.GetInstrument("TRACEDET", answer)) return false;
+    if (answer == "-2") {  // a mode without a trace
+        if (!exchange_.SetInstrument("MEAS,1")) return false;
+        if (!exchange_.GetInstrument("TRACEDET", answer)) return false;
+    }
+    const auto number = static_cast<int>(std::clamp(leadingNumber(answer), -255.0, 255.0));
+    mirror_.TraceDetector = static_cast<std::uint8_t>(number);
+    return true;
+}
+
+void Handshake::readMode() {
+    std::string answer;
+    if (!exchange_.GetInstrument("MEAS", answer)) return;
+    const double number = leadingNumber(answer);
+    // Any number but those of the other modes stands for the analyzer.
+    const bool other = number >= CF::TRACKINGGENERATOR && number <= CF::DISTTOFAULTMEASURE &&
+                       number == std::floor(number);
+    panel_.InstrumentMode = other ? static_cast<std::int16_t>(number) : CF::ANALYZER;
+    modeOption(panel_, panel_.InstrumentMode).setValue(true);
+}
+
+bool Handshake::query(const char* word, double& field) {
+    std::string answer;
+    if (!exchange_.GetInstrument(word, answer)) return false;
+    field = leadingNumber(answer);
+    return true;
+}
+
+bool Handshake::readState() {
+    bool ok = false;
+    labels_.GetSpanForLabel(ok);
+    double dynamicRange = 0;
+    if (!ok || !query("UNIT", mirror_.ReferenceUnit) || !query("REFLVL", mirror_.ReferenceLevel) ||
+        !query("RANGE", mirror_.ReferenceRange) || !query("DYNRANGE", dynamicRange))
+        return false;
+    mirror_.DynamicRangeMode = static_cast<std::uint8_t>(std::clamp(dynamicRange, 0.0, 255.0));
+    if (!query("SWPTIME", mirror_.SweepTime) || !query("SWPCONT", mirror_.SweepContinuous))
+        return false;
+    if (mirror_.SweepContinuous != 0) {
+        if (!exchange_.CmdInstrument("INIT")) return false;
+    } else {
+        panel_.SingleSweepModeActive = true;
+    }
+    return query("RBW", mirror_.ResolutionBandwidth) && query("VBW", mirror_.VideoBandwidth);
+}
+
+void Handshake::connectedLook() {
+    panel_.SetDevice.Enabled = false;
+    panel_.ConnectedPic.Visible = true;
+    softPanel_.setKeyCaptions(hardKeyMenu(CF::Freq)->captions);
+    softPanel_.SetTextFieldsAndFrames(CF::Freq);
+    panel_.State = CF::Freq;
+    panel_.Picture3.Visible = true;
+    if (testCommandWord(panel_, "BUTTON")) panel_.ImmConnect.Visible = false;
+    dialog_.CancelButton.Visible = false;
+    dialog_.Hide();
+    panel_.Disconnect.Enabled = true;
+    dialog_.ZELButton.Visible = false;
+    dialog_.DisconnectButton.Visible = true;
+    panel_.SaveCurrentView.Enabled = true;
+    for (MenuItem* item : {&panel_.Direct, &panel_.Modem, &panel_.GSM, &panel_.GSMToModem,
+                           &panel_.ModemToGSM, &panel_.TCPConnection})
+        item->Enabled = false;
+    panel_.RecordData.Enabled = true;
+}
+
+void Handshake::noInstrument(bool told) {
+    dialog_.MousePointer = 0;
+    panel_.isConnected = false;
+    panel_.Picture3.Visible = false;
+    if (!told) {
+        if (!state_.DialCancelled)
+            boxes_.show({BoxIcon::Critical, "No ZEL3 found at the specified address!"});
+        panel_.ErrorFlag = false;
+    }
+    // What was opened for this attempt is given back, so that the next one can begin.
+    if (panel_.ConnectionState == CF::DIRECTCON) {
+        link_.CloseComPort();
+        dialog_.IsConnectedToPort = false;
+        dialog_.OnPic.Visible = false;
+    }
+    dialog_.DialButton.Visible = true;
+    dialog_.CancelButton.Visible = false;
+}
+
+}  // namespace zel

@@ -1,0 +1,189 @@
+#include "shell/Program.h"
+
+#include <utility>
+
+#include "connection/ConnectionDialog.h"
+#include "connection/Disconnection.h"
+#include "connection/Handshake.h"
+#include "connection/Profiles.h"
+#include "connection/SessionClock.h"
+#include "connection/TcpDialog.h"
+#include "link/AnswerReader.h"
+#include "link/BinaryReader.h"
+#include "link/BinaryTrace.h"
+#include "link/ByteLink.h"
+#include "link/CommandExchange.h"
+#include "model/FrequencyLabels.h"
+#include "panel/HardKeys.h"
+#include "panel/ManualCommand.h"
+#include "panel/MarkerKeys.h"
+#include "panel/MarkerReadout.h"
+#include "panel/MenuFill.h"
+#include "panel/ModeKeys.h"
+#include "panel/SoftKeys.h"
+#include "panel/SoftPanel.h"
+#include "panel/Z9GetCommands.h"
+#include "panel/Z9SetCommands.h"
+#include "platform/TimerDriver.h"
+#include "shell/ProgramEnd.h"
+#include "shell/ServerMode.h"
+#include "shell/StartUp.h"
+#include "trace/GraphInteraction.h"
+#include "trace/GraphScaling.h"
+#include "trace/ManualScale.h"
+#include "trace/PowerReadout.h"
+#include "trace/SweepControl.h"
+#include "trace/TraceConversion.h"
+#include "trace/TraceReader.h"
+
+namespace zel {
+
+// In the order of the house: a room below stands ahead of those that use it.
+struct Program::Rooms {
+    Rooms(const Platform& p, std::string commandLine)
+        : platform(p),
+          timers(p.events),
+          link(panel, forms.main, line, p.serialPort, p.tcpSocket, p.clock, p.events, p.boxes,
+               p.debug),
+          reader(panel, forms.main, line, link, mirror.SweepTime, p.clock, p.events, p.boxes),
+          exchange(panel, line, link, reader, p.clock, p.events, p.boxes),
+          bytes(panel, forms.main, line, link, p.tcpSocket, p.clock, p.events, p.boxes),
+          binary(panel, line, link, reader, bytes, p.clock, p.events, p.boxes),
+          labels(panel, forms.main, mirror, exchange, p.events),
+          conversion(panel, mirror, forms.waterfall.Graph3D),
+          scaling(panel, forms.waterfall, mirror, p.clock),
+          graph(panel, mirror),
+          manualScale(panel, forms.manualScale, p.boxes),
+          traces(forms, mirror, line, exchange, binary, conversion, scaling, p.events, p.boxes),
+          power(forms, exchange, p.events),
+          sweeps(forms, exchange, traces, power, p.events, p.boxes),
+          softPanel(panel),
+          fill(panel, mirror, exchange),
+          markerReadout(panel, mirror, exchange),
+          queries(panel, mirror, exchange, softPanel, fill, markerReadout, traces, scaling,
+                  p.boxes),
+          settings(forms, mirror, exchange, softPanel, queries, markerReadout, labels, traces,
+                   scaling, p.events),
+          hardKeys(panel, mirror, exchange, softPanel, fill, p.boxes),
+          softKeys(panel, softPanel, queries, settings, p.events, p.boxes),
+          modeKeys(forms, mirror, exchange, softPanel, fill, scaling, p.events, p.boxes),
+          markerKeys(panel, mirror, exchange, markerReadout, traces, p.events, p.boxes),
+          manualCommand(panel, line, link, reader, p.events, p.boxes),
+          sessionClock(panel, p.clock),
+          profiles(panel, forms.main, p.settings),
+          handshake(forms, mirror, line, link, reader, exchange, labels, softPanel, fill, p.events,
+                    p.boxes),
+          dialog(forms, link, handshake, profiles, sessionClock, softPanel, traces, p.serialPorts,
+                 p.events),
+          tcpDialog(forms, link, handshake, sessionClock, traces, p.tcpSocket, p.settings, p.clock,
+                    p.events, p.boxes),
+          disconnection(forms, link, exchange, p.tcpSocket, sessionClock, graph, p.clock, p.events,
+                        p.boxes),
+          remote(panel, exchange, p.events, p.boxes),
+          serverMode(forms, p.startup, p.events),
+          startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
+          second(forms, p.serverSocket, sessionClock),
+          end(forms, p.boxes) {
+        panel.CommandLine = std::move(commandLine);
+        timers.attach(panel.UpNow);
+        panel.UtilityTrouble.Clicked.connect([this] {
+            // It is a help on the side: a simulator that is not installed is no error.
+            platform.launcher.start(platform.folder.programPath() + "/ZELSim/ZELSim", {"--pty"});
+        });
+    }
+
+    Platform platform;
+    Forms forms;
+    ControllerForm& panel = forms.controller;
+    ZEL3Variables mirror;
+    ZELBas line;
+    TimerDriver timers;
+    ByteLink link;
+    AnswerReader reader;
+    CommandExchange exchange;
+    BinaryReader bytes;
+    BinaryTrace binary;
+    FrequencyLabels labels;
+    TraceConversion conversion;
+    GraphScaling scaling;
+    GraphInteraction graph;
+    ManualScale manualScale;
+    TraceReader traces;
+    PowerReadout power;
+    SweepControl sweeps;
+    SoftPanel softPanel;
+    MenuFill fill;
+    MarkerReadout markerReadout;
+    Z9GetCommands queries;
+    Z9SetCommands settings;
+    HardKeys hardKeys;
+    SoftKeys softKeys;
+    ModeKeys modeKeys;
+    MarkerKeys markerKeys;
+    ManualCommand manualCommand;
+    SessionClock sessionClock;
+    Profiles profiles;
+    Handshake handshake;
+    ConnectionDialog dialog;
+    TcpDialog tcpDialog;
+    Disconnection disconnection;
+    RemoteToggle remote;
+    ServerMode serverMode;
+    StartUp startUp;
+    SecondTimer second;
+    ProgramEnd end;
+};
+
+Program::Program(const Platform& platform, std::string commandLine)
+    : rooms_(std::make_unique<Rooms>(platform, std::move(commandLine))) {
+    rooms_->end.Ended.connect([this] { Ended(); });
+}
+
+Program::~Program() = default;
+
+Forms& Program::forms() { return rooms_->forms; }
+ZEL3Variables& Program::variables() { return rooms_->mirror; }
+ZELBas& Program::link() { return rooms_->line; }
+CommandExchange& Program::exchange() { return rooms_->exchange; }
+TraceReader& Program::traces() { return rooms_->traces; }
+
+void Program::start() {
+    if (!rooms_->startUp.Form_Load(kVersion)) rooms_->end.end();
+}
+
+bool Program::connect(const LinkAddress& address, bool readTrace) {
+    ControllerForm& panel = rooms_->panel;
+    if (address.kind == LinkAddress::Kind::Tcp) {
+        TCPConnectionForm& dialog = rooms_->forms.tcpConnection;
+        panel.ConnectionState = ControllerForm::TCPCON;
+        dialog.load();
+        dialog.IPAdressTextBox.Text = address.port;
+        dialog.RemotePortTextBox.Text = std::to_string(address.number);
+        rooms_->tcpDialog.connect(readTrace);
+        return panel.isConnected;
+    }
+    const bool quick = panel.immConnectState;
+    panel.immConnectState = true;
+    rooms_->dialog.SetConnectionKind(ControllerForm::DIRECTCON);
+    panel.immConnectState = quick;
+    MainForm& dialog = rooms_->forms.main;
+    dialog.COMList.setText(address.port);
+    dialog.BaudList.setText(std::to_string(address.number));
+    rooms_->dialog.connectDirect(readTrace);
+    rooms_->softPanel.SetButtonsStatus(ControllerForm::Freq);
+    return panel.isConnected;
+}
+
+void Program::disconnect() {
+    if (rooms_->panel.isConnected) rooms_->disconnection.endSession();
+}
+
+bool Program::requestClose() {
+    int cancel = 0;
+    rooms_->panel.QueryUnload(cancel);
+    return cancel == 0;
+}
+
+bool Program::ended() const { return rooms_->end.ended(); }
+
+}  // namespace zel

@@ -1,0 +1,60 @@
+#pragma once
+// The composition root: owns the forms, the mirror and the rooms, and wires them together.
+
+#include <memory>
+#include <string>
+
+#include "forms/Forms.h"
+#include "link/ZELBas.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Platform.h"
+
+namespace zel {
+
+class CommandExchange;
+class TraceReader;
+
+/// Where an instrument is to be found.
+struct LinkAddress {
+    enum class Kind { Serial, Tcp };
+    Kind kind = Kind::Serial;
+    std::string port;  ///< device name, or host
+    int number = 0;    ///< baud rate, or TCP port
+};
+
+class Program {
+  public:
+    /// `commandLine` holds the words that the program was started with.
+    Program(const Platform& platform, std::string commandLine);
+    ~Program();
+    Program(const Program&) = delete;
+    Program& operator=(const Program&) = delete;
+
+    Forms& forms();
+    ZEL3Variables& variables();
+    ZELBas& link();
+    CommandExchange& exchange();
+    TraceReader& traces();
+
+    /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
+    /// the server's window is closed; `ended` is then true.
+    void start();
+    /// Opens the link and does the handshake, through the connection dialog's routines, without
+    /// showing the dialog. With `readTrace` one sweep is read and drawn as the dialog does. True
+    /// when an instrument is connected.
+    bool connect(const LinkAddress& address, bool readTrace);
+    /// LOCAL and the close, without the question; nothing when not connected.
+    void disconnect();
+
+    /// The user closes the panel's window. False when the user chose to stay.
+    bool requestClose();
+    /// The program has come to its end; the front leaves its event loop.
+    bool ended() const;
+    Event<> Ended;
+
+  private:
+    struct Rooms;
+    std::unique_ptr<Rooms> rooms_;
+};
+
+}  // namespace zel

@@ -1,0 +1,52 @@
+#include "shell/ProgramEnd.h"
+
+namespace zel {
+namespace {
+
+constexpr int kUnloadArgument = 1;
+
+}  // namespace
+
+ProgramEnd::ProgramEnd(Forms& forms, MessageBoxes& boxes)
+    : forms_(forms), panel_(forms.controller), boxes_(boxes) {
+    panel_.ExitObject.Clicked.connect([this] { ExitObject_Click(); });
+    panel_.QueryUnload.connect([this](int& cancel) { Form_QueryUnload(cancel); });
+    panel_.Unload.connect([this](int /*argument*/) { forms_.waterfall.unload(kUnloadArgument); });
+}
+
+bool ProgramEnd::confirmed() {
+    return boxes_.show({BoxIcon::Question, "Are you sure you want to close ZELRemote?",
+                        panel_.Caption, BoxButtons::YesNo}) != BoxAnswer::No;
+}
+
+void ProgramEnd::ExitObject_Click() {
+    if (confirmed()) leave(true);
+}
+
+void ProgramEnd::Form_QueryUnload(int& cancel) {
+    if (!confirmed()) {
+        cancel = -1;
+        return;
+    }
+    leave(false);
+}
+
+void ProgramEnd::leave(bool byMenu) {
+    if (panel_.isConnected) forms_.main.DisconnectButton.Click();
+    if (byMenu) panel_.isConnected = false;
+    for (Form* form :
+         {static_cast<Form*>(&forms_.main), static_cast<Form*>(&forms_.about),
+          static_cast<Form*>(&forms_.devicesChoice), static_cast<Form*>(&forms_.time),
+          static_cast<Form*>(&forms_.scriptEditor), static_cast<Form*>(&forms_.controller)})
+        form->unload(kUnloadArgument);
+    if (byMenu) forms_.waterfall.unload(kUnloadArgument);
+    end();
+}
+
+void ProgramEnd::end() {
+    if (ended_) return;
+    ended_ = true;
+    Ended();
+}
+
+}  // namespace zel

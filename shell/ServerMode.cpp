@@ -1,0 +1,33 @@
+#include "shell/ServerMode.h"
+
+#include "platform/ModalForm.h"
+
+namespace zel {
+namespace {
+
+constexpr const char* kLinkName = "ZELRemote.lnk";
+
+}  // namespace
+
+ServerMode::ServerMode(Forms& forms, StartupFolder& startup, Events& events)
+    : forms_(forms), panel_(forms.controller), startup_(startup), events_(events) {
+    panel_.UtilityStartup.Clicked.connect([this] { UtilityStartup_Click(); });
+}
+
+void ServerMode::UtilityServer_Click() {
+    panel_.StartT = 0;
+    panel_.UpNow.Enabled = true;
+    showModalForm(forms_.server, events_);
+}
+
+void ServerMode::UtilityStartup_Click() {
+    if (!panel_.UtilityStartup.Checked) {
+        startup_.createLink(kLinkName, "server");
+        panel_.UtilityStartup.Checked = true;
+    } else {
+        panel_.UtilityStartup.Checked = false;
+        startup_.removeLink(kLinkName);
+    }
+}
+
+}  // namespace zel

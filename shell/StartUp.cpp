@@ -1,0 +1,90 @@
+#include "shell/StartUp.h"
+
+#include "connection/Handshake.h"
+#include "connection/Profiles.h"
+#include "link/TCPIPOps.h"
+#include "panel/MenuTables.h"
+#include "support/TimeText.h"
+
+namespace zel {
+namespace {
+
+constexpr Color k3DKey = 0xE0E0E0;
+
+}  // namespace
+
+StartUp::StartUp(Forms& forms, ZEL3Variables& mirror, SoftPanel& softPanel, GraphInteraction& graph,
+                 ServerMode& server, const Clock& clock, SettingsStore& settings)
+    : forms_(forms),
+      panel_(forms.controller),
+      mirror_(mirror),
+      softPanel_(softPanel),
+      graph_(graph),
+      server_(server),
+      clock_(clock),
+      settings_(settings) {}
+
+bool StartUp::Form_Load(const VersionInfo& version) {
+    panel_.TimeLabel.Caption = timeOfDayText(clock_.date());
+    panel_.UpNow.Enabled = true;
+    panel_.State = 0;
+    panel_.InstrumentMode = ControllerForm::ANALYZER;
+    panel_.YVectorVal = 0;
+    panel_.LastSpan = mirror_.Span;
+    panel_.GetOption.setValue(true);
+    panel_.mLoadOption = settings_.get(kProgramName, "Properties", "Option", "");
+    if (panel_.mLoadOption.empty()) panel_.mLoadOption = "R";
+    panel_.ConnectedPic.Visible = false;
+    graph_.setUpCursors();
+    softPanel_.setKeyCaptions(hardKeyMenu(ControllerForm::Freq)->captions);
+    softPanel_.SetTextFieldsAndFrames(ControllerForm::Freq);
+    softPanel_.SetSoftButtonsColor(0);
+    softPanel_.SetButtonsStatus(ControllerForm::Freq);
+    panel_.SaveCurrentView.Enabled = false;
+    panel_.RecordData.Enabled = false;
+    panel_.cmd3D.BackColor = k3DKey;
+    hideUnused();
+    if (testCommandWord(panel_, "BUTTON")) panel_.ImmConnect.Visible = true;
+    panel_.Caption = "Marlow & Tenby ZELRemote v" + versionText(version);
+    const bool serverMode = testCommandWord(panel_, "SERVER");
+    panel_.UtilityStartup.Checked = serverMode;
+    if (serverMode) {
+        server_.UtilityServer_Click();
+        return false;
+    }
+    graph_.finishCursors();
+    panel_.Show();
+    return true;
+}
+
+void StartUp::hideUnused() {
+    panel_.ImmConnect.Visible = false;
+    panel_.Picture3.Visible = false;
+    panel_.StopButton.Visible = false;
+    panel_.Disconnect.Enabled = false;
+    panel_.DebugTextBox.Locked = true;
+    panel_.ManualCommandTextAnsw.Locked = true;
+    MainForm& dialog = forms_.main;
+    dialog.OnPic.Visible = false;
+    dialog.CancelButton.Visible = false;
+    dialog.IDText.Locked = true;
+    dialog.AirBaudRateText.Locked = true;
+    forms_.tcpConnection.IDTextBox.Locked = true;
+    forms_.server.txtDebug.Locked = true;
+}
+
+SecondTimer::SecondTimer(Forms& forms, Socket& serverSocket, SessionClock& sessionClock)
+    : forms_(forms), socket_(serverSocket), sessionClock_(sessionClock) {
+    forms_.controller.UpNow.Tick.connect([this] { UpNow_Timer(); });
+}
+
+void SecondTimer::UpNow_Timer() {
+    if (socket_.state() == SocketState::Error) {
+        socket_.close();
+        ListenOnPort(socket_, forms_.server.localPortTextBox.Text);
+        forms_.server.txtDebug.Text = "Connection broken";
+    }
+    sessionClock_.show();
+}
+
+}  // namespace zel

@@ -1,0 +1,52 @@
+#pragma once
+// What happens from the start of the program until the panel waits for the user.
+
+#include "connection/SessionClock.h"
+#include "forms/Forms.h"
+#include "model/ZEL3Variables.h"
+#include "panel/SoftPanel.h"
+#include "platform/Clock.h"
+#include "platform/Services.h"
+#include "platform/Socket.h"
+#include "shell/ServerMode.h"
+#include "shell/VersionInfo.h"
+#include "trace/GraphInteraction.h"
+
+namespace zel {
+
+class StartUp {
+  public:
+    StartUp(Forms& forms, ZEL3Variables& mirror, SoftPanel& softPanel, GraphInteraction& graph,
+            ServerMode& server, const Clock& clock, SettingsStore& settings);
+
+    /// With the word "SERVER" it returns when the server's window is closed, and false: the
+    /// program is at its end.
+    bool Form_Load(const VersionInfo& version);
+
+  private:
+    void hideUnused();
+
+    Forms& forms_;
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    SoftPanel& softPanel_;
+    GraphInteraction& graph_;
+    ServerMode& server_;
+    const Clock& clock_;
+    SettingsStore& settings_;
+};
+
+/// The one second timer: a server whose socket is in error goes back to listening, and the
+/// session's time is shown.
+class SecondTimer {
+  public:
+    SecondTimer(Forms& forms, Socket& serverSocket, SessionClock& sessionClock);
+    void UpNow_Timer();
+
+  private:
+    Forms& forms_;
+    Socket& socket_;
+    SessionClock& sessionClock_;
+};
+
+}  // namespace zel
