@@ -58,32 +58,9 @@ void CommandExchange::report(int status, const std::string& keyword) {
     ReportInstrumentError(state_, boxes_, status, keyword);
 }
 
-bool CommandExchange::CmdInstrument(const std::string& keyword) {
-    float t0 = 0;
-    beginLine("CMD", keyword, t0);
-    link_.drain(kDrainReads);
-    link_.WriteToLink("cmd\r");
-    delay(DelayPlace::AfterModeWord);
-    state_.InputBuffer.clear();
-    Stopwatch firstAnswer(clock_);
-    std::string answer = reader_.ReadAnswer();
-    while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs) {
-        events_.wait(kRetryPauseMs);
-        answer = reader_.ReadAnswer();
-    }
-    int status = statusNumber(answer);
-    if (state_.ExchangeFailed || !reader_.answered()) return false;
-    if (status != 0) {
-        report(status, keyword);
-        finishLine("CMD", keyword, t0);
-        return false;
-    }
-    link_.WriteToLink(keyword + "\r");
-    state_.WaitCommandActive = keyword == "WAIT";
-    delay(DelayPlace::AfterCmdKeyword);
-    status = statusNumber(reader_.ReadAnswer());
-    if (!reader_.answered()) return false;
-    DebugLine(panel_, "<" + keyword + "> response: " + wireToUtf8(answer));
+bool CommandExchange::finishCommand(const std::string& keyword, const std::string& firstAnswer,
+                                    int status, float t0) {
+    DebugLine(panel_, "<" + keyword + "> response: " + wireToUtf8(firstAnswer));
     if (status == 2) {
         report(status, keyword);
     } else if (status != 0) {
@@ -94,47 +71,60 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
     return status == 0;
 }
 
+bool CommandExchange::refuseCommand(const std::string& keyword, int status, float t0) {
+    report(status, keyword);
+    finishLine("CMD", keyword, t0);
+    return false;
+}
+
+bool CommandExchange::CmdInstrument(const std::string& keyword) {
+    float t0 = 0;
+    beginLine("CMD", keyword, t0);
+    link_.drain(kDrainReads);
+    link_.WriteToLink("cmd\r");
+    delay(DelayPlace::AfterModeWord);
+    state_.InputBuffer.clear();
+    const Stopwatch firstAnswer(clock_);
+    std::string answer = reader_.ReadAnswer();
+    while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs) {
+        events_.wait(kRetryPauseMs);
+        answer = reader_.ReadAnswer();
+    }
+    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    const int status = statusNumber(answer);
+    if (status != 0) return refuseCommand(keyword, status, t0);
+    link_.WriteToLink(keyword + "\r");
+    state_.WaitCommandActive = keyword == "WAIT";
+    delay(DelayPlace::AfterCmdKeyword);
+    const int result = statusNumber(reader_.ReadAnswer());
+    return reader_.answered() && finishCommand(keyword, answer, result, t0);
+}
+
 bool CommandExchange::CmdInstrumentTriggered(const std::string& keyword,
                                              std::int32_t timeoutSeconds) {
-    const auto pointer = [this](int shape) {
-        panel_.MousePointer = shape;
-        events_.pump();
-    };
+    panel_.MousePointer = 11;
+    events_.pump();
+    const bool success = triggeredDialogue(keyword, timeoutSeconds);
+    panel_.MousePointer = 0;
+    events_.pump();
+    return success;
+}
+
+bool CommandExchange::triggeredDialogue(const std::string& keyword, std::int32_t timeoutSeconds) {
     float t0 = 0;
-    pointer(11);
     beginLine("CMD", keyword, t0);
     link_.WriteToLink("cmd\r");
     delay(DelayPlace::AfterModeWord);
     state_.InputBuffer.clear();
     const std::string answer = reader_.ReadAnswerTriggered(timeoutSeconds);
-    int status = answer.empty() ? -1 : statusNumber(answer);
-    bool success = false;
-    if (state_.ExchangeFailed || !reader_.answered()) {
-        pointer(0);
-        return false;
-    }
-    if (status != 0) {
-        report(status, keyword);
-    } else {
-        link_.WriteToLink(keyword + "\r");
-        delay(DelayPlace::AfterCmdKeyword);
-        status = statusNumber(reader_.ReadAnswerTriggered(timeoutSeconds));
-        if (!reader_.answered()) {
-            pointer(0);
-            return false;
-        }
-        DebugLine(panel_, "<" + keyword + "> response: " + wireToUtf8(answer));
-        success = status == 0 && !state_.ExchangeFailed;
-        if (status == 2) {
-            report(status, keyword);
-        } else if (status != 0) {
-            DebugLine(panel_, "CMD error" + numberText(status) + " for command <" + keyword +
-                                  "> (while executing)");
-        }
-    }
-    finishLine("CMD", keyword, t0);
-    pointer(0);
-    return success;
+    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    const int status = answer.empty() ? -1 : statusNumber(answer);
+    if (status != 0) return refuseCommand(keyword, status, t0);
+    link_.WriteToLink(keyword + "\r");
+    delay(DelayPlace::AfterCmdKeyword);
+    const int result = statusNumber(reader_.ReadAnswerTriggered(timeoutSeconds));
+    return reader_.answered() && finishCommand(keyword, answer, result, t0) &&
+           !state_.ExchangeFailed;
 }
 
 bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {

@@ -40,6 +40,10 @@ class CommandExchange {
     void finishLine(const char* kind, const std::string& text, float t0);
     void delay(DelayPlace place);
     void report(int status, const std::string& keyword);
+    bool triggeredDialogue(const std::string& keyword, std::int32_t timeoutSeconds);
+    bool refuseCommand(const std::string& keyword, int status, float t0);
+    bool finishCommand(const std::string& keyword, const std::string& firstAnswer, int status,
+                       float t0);
     bool readValue(std::string& value);
 
     ControllerForm& panel_;

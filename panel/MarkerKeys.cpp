@@ -143,6 +143,8 @@ void MarkerKeys::markerOff() {
     exchange_.SetInstrument("MARK1ON,0");
     mirror_.MarkerOn = false;
     readout_.clear(MarkerKind::Marker);
+    if (panel_.CWGraph1.TrackMode == static_cast<int>(TrackMode::DragCursors))
+        panel_.CWGraph1.TrackMode = static_cast<int>(TrackMode::Plain);
     if (!mirror_.DeltaOn) return;
     // The delta goes off in the program; nothing is sent about it.
     deltaOff();

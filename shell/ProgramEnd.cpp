@@ -46,6 +46,9 @@ void ProgramEnd::leave(bool byMenu) {
 void ProgramEnd::end() {
     if (ended_) return;
     ended_ = true;
+    // A view that is still on the stack must not hold the end up.
+    panel_.STOPFlag = false;
+    panel_.ContinuosLoopActive = false;
     Ended();
 }
 

@@ -57,8 +57,12 @@ void GraphInteraction::cmdZoom_Click() {
         panel_.GraphZoomed = true;
     } else {
         graph.TrackMode = restingTrackMode();
-        graph.setXRange(mirror_.CenterFrequency - mirror_.Span / 2,
-                        mirror_.CenterFrequency + mirror_.Span / 2);
+        if (GetDimension(panel_, mirror_) == "Hz") {
+            graph.setXRange(mirror_.CenterFrequency - mirror_.Span / 2,
+                            mirror_.CenterFrequency + mirror_.Span / 2);
+        } else {
+            graph.setXRange(panel_.ViewStart, panel_.ViewStop);  // seconds or metres
+        }
         panel_.cmdZoom.Caption = "Zoom";
         panel_.cmdZoom.BackColor = kPlainButton;
         panel_.GraphZoomed = false;

@@ -89,7 +89,6 @@ void SweepControl::RunContinuousView() {
         panel_.ContinuosLoopActive = true;
         good = laterPass();
         if (good) panel_.ContinuosLoopActive = false;
-        events_.pump();
     }
     if (good) {
         panel_.Connection.Enabled = true;
