@@ -1,0 +1,144 @@
+#include "desktop/platform/QtDialogs.h"
+
+#include <QApplication>
+#include <QClipboard>
+#include <QFileDialog>
+#include <QGuiApplication>
+#include <QInputDialog>
+#include <QMessageBox>
+
+namespace zel {
+namespace {
+
+QMessageBox::Icon iconOf(BoxIcon icon) {
+    switch (icon) {
+        case BoxIcon::Plain:
+            return QMessageBox::NoIcon;
+        case BoxIcon::Critical:
+            return QMessageBox::Critical;
+        case BoxIcon::Question:
+            return QMessageBox::Question;
+        case BoxIcon::Warning:
+        case BoxIcon::Exclamation:
+            return QMessageBox::Warning;
+        case BoxIcon::Information:
+            return QMessageBox::Information;
+    }
+    return QMessageBox::NoIcon;
+}
+
+struct ButtonSet {
+    BoxButtons set;
+    QMessageBox::StandardButtons buttons;
+    QMessageBox::StandardButton escape;
+};
+const ButtonSet kButtonSets[] = {
+    {BoxButtons::Ok, QMessageBox::Ok, QMessageBox::Ok},
+    {BoxButtons::OkCancel, QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Cancel},
+    {BoxButtons::YesNo, QMessageBox::Yes | QMessageBox::No, QMessageBox::No},
+};
+
+BoxAnswer answerOf(int button) {
+    switch (button) {
+        case QMessageBox::Cancel:
+            return BoxAnswer::Cancel;
+        case QMessageBox::Yes:
+            return BoxAnswer::Yes;
+        case QMessageBox::No:
+            return BoxAnswer::No;
+        default:
+            return BoxAnswer::Ok;
+    }
+}
+
+/// "Text (*.txt)|*.txt|All (*.*)|*.*" as Qt writes filters.
+QStringList filtersOf(const std::string& filter) {
+    QStringList result;
+    const QStringList pieces = QString::fromStdString(filter).split('|');
+    for (int i = 0; i + 1 < pieces.size(); i += 2) {
+        QString name = pieces[i];
+        const auto bracket = name.lastIndexOf('(');
+        if (bracket >= 0) name.truncate(bracket);
+        const QString pattern = pieces[i + 1] == "*.*" ? QString("*") : pieces[i + 1];
+        result << name.trimmed() + " (" + pattern + ")";
+    }
+    return result;
+}
+
+std::optional<std::string> chosen(const FileDialogRequest& request, bool save) {
+    QFileDialog dialog(QApplication::activeWindow(), QString::fromStdString(request.title),
+                       QString::fromStdString(request.folder));
+    dialog.setAcceptMode(save ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
+    dialog.setFileMode(save ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
+    dialog.setOption(QFileDialog::DontConfirmOverwrite, !request.promptOverwrite);
+    const QStringList filters = filtersOf(request.filter);
+    if (!filters.isEmpty()) {
+        dialog.setNameFilters(filters);
+        const int index = request.filterIndex - 1;
+        if (index >= 0 && index < filters.size()) dialog.selectNameFilter(filters[index]);
+    }
+    if (!request.fileName.empty()) dialog.selectFile(QString::fromStdString(request.fileName));
+    if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty()) return std::nullopt;
+    return dialog.selectedFiles().first().toStdString();
+}
+
+/// The wait cursor says that work goes on; a question is not work.
+class NormalPointer {
+  public:
+    NormalPointer() : overridden_(QGuiApplication::overrideCursor() != nullptr) {
+        if (overridden_) QGuiApplication::setOverrideCursor(Qt::ArrowCursor);
+    }
+    ~NormalPointer() {
+        if (overridden_) QGuiApplication::restoreOverrideCursor();
+    }
+    NormalPointer(const NormalPointer&) = delete;
+    NormalPointer& operator=(const NormalPointer&) = delete;
+
+  private:
+    bool overridden_;
+};
+
+}  // namespace
+
+BoxAnswer QtMessageBoxes::show(const Box& box) {
+    const NormalPointer pointer;
+    QMessageBox window(QApplication::activeWindow());
+    window.setIcon(iconOf(box.icon));
+    window.setWindowTitle(QString::fromStdString(box.title));
+    window.setTextFormat(Qt::PlainText);
+    window.setText(QString::fromStdString(box.text).replace("\r\n", "\n"));
+    for (const ButtonSet& row : kButtonSets) {
+        if (row.set != box.buttons) continue;
+        window.setStandardButtons(row.buttons);
+        window.setEscapeButton(row.escape);
+    }
+    window.setDefaultButton(box.buttons == BoxButtons::YesNo ? QMessageBox::Yes : QMessageBox::Ok);
+    return answerOf(window.exec());
+}
+
+std::optional<std::string> QtMessageBoxes::prompt(const std::string& text, const std::string& title,
+                                                  const std::string& preset) {
+    const NormalPointer pointer;
+    bool accepted = false;
+    const QString reply = QInputDialog::getText(
+        QApplication::activeWindow(), QString::fromStdString(title), QString::fromStdString(text),
+        QLineEdit::Normal, QString::fromStdString(preset), &accepted);
+    if (!accepted) return std::nullopt;
+    return reply.toStdString();
+}
+
+std::optional<std::string> QtFileDialogs::save(const FileDialogRequest& request) {
+    return chosen(request, true);
+}
+
+std::optional<std::string> QtFileDialogs::open(const FileDialogRequest& request) {
+    return chosen(request, false);
+}
+
+void QtClipboard::setText(const std::string& text) {
+    QGuiApplication::clipboard()->setText(QString::fromStdString(text));
+}
+
+std::string QtClipboard::text() { return QGuiApplication::clipboard()->text().toStdString(); }
+
+}  // namespace zel

@@ -1,0 +1,122 @@
+#include "desktop/platform/QtEvents.h"
+
+#include <poll.h>
+
+#include <QAbstractEventDispatcher>
+#include <QCoreApplication>
+#include <QThread>
+#include <algorithm>
+#include <cmath>
+
+namespace zel {
+namespace {
+
+// An answer of a fast line comes within this time; events need not run meanwhile.
+constexpr int kShortWayMs = 2;
+constexpr std::int64_t kPumpEveryMicros = 2000;
+
+}  // namespace
+
+QtEvents::QtEvents(const Clock& clock) : clock_(clock), waitTimer_(std::make_unique<QTimer>()) {
+    waitTimer_->setSingleShot(true);
+    waitTimer_->setTimerType(Qt::PreciseTimer);
+}
+
+QtEvents::~QtEvents() = default;
+
+int QtEvents::addSource(Source source) {
+    sources_[++lastSource_] = std::move(source);
+    return lastSource_;
+}
+
+void QtEvents::removeSource(int id) { sources_.erase(id); }
+
+bool QtEvents::bytesWait() const {
+    return std::any_of(sources_.begin(), sources_.end(),
+                       [](const auto& entry) { return entry.second.bytesWait(); });
+}
+
+bool QtEvents::pollSources(int ms) const {
+    std::vector<pollfd> descriptors;
+    for (const auto& [id, source] : sources_)
+        if (const int fd = source.descriptor(); fd >= 0) descriptors.push_back({fd, POLLIN, 0});
+    if (descriptors.empty()) return false;
+    return ::poll(descriptors.data(), descriptors.size(), ms) > 0;
+}
+
+bool QtEvents::processEvents() {
+    QAbstractEventDispatcher* dispatcher = QAbstractEventDispatcher::instance();
+    bool any = false;
+    if (dispatcher != nullptr) {
+        any = dispatcher->processEvents(QEventLoop::AllEvents);
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    }
+    lastProcessed_ = clock_.micros();
+    return any;
+}
+
+void QtEvents::pump() {
+    // The loops above pump at every turn; running the events so often would cost more than the
+    // line itself.
+    if (clock_.micros() - lastProcessed_ >= kPumpEveryMicros) processEvents();
+}
+
+void QtEvents::wait(int ms) {
+    if (bytesWait()) return pump();
+    const bool overdue = clock_.micros() - lastProcessed_ >= kPumpEveryMicros;
+    if (overdue && processEvents()) return;
+    if (bytesWait()) return;
+    const int shortWay = std::min(ms, kShortWayMs);
+    if (pollSources(shortWay)) return;
+    if (ms > shortWay) {
+        processAndWait(ms - shortWay);
+    } else {
+        processEvents();
+    }
+}
+
+void QtEvents::processAndWait(int ms) {
+    if (processEvents() || bytesWait()) return;
+    waitTimer_->start(ms);
+    if (QAbstractEventDispatcher* dispatcher = QAbstractEventDispatcher::instance())
+        dispatcher->processEvents(QEventLoop::AllEvents | QEventLoop::WaitForMoreEvents);
+    waitTimer_->stop();
+    lastProcessed_ = clock_.micros();
+}
+
+void QtEvents::sleep(int ms) {
+    const std::int64_t end = clock_.micros() + std::int64_t{ms} * 1000;
+    for (;;) {
+        const std::int64_t left = end - clock_.micros();
+        if (left <= 0) return;
+        // The windows go on being painted; what a user does waits.
+        waitTimer_->start(static_cast<int>(std::max<std::int64_t>(left / 1000, 1)));
+        if (QAbstractEventDispatcher* dispatcher = QAbstractEventDispatcher::instance())
+            dispatcher->processEvents(QEventLoop::ExcludeUserInputEvents |
+                                      QEventLoop::WaitForMoreEvents);
+        waitTimer_->stop();
+        lastProcessed_ = clock_.micros();
+    }
+}
+
+TaskId QtEvents::schedule(double ms, std::function<void()> task) {
+    const TaskId id = ++lastTask_;
+    auto timer = std::make_unique<QTimer>();
+    timer->setSingleShot(true);
+    timer->setTimerType(Qt::PreciseTimer);
+    QObject::connect(timer.get(), &QTimer::timeout, timer.get(), [this, id, task] {
+        const std::function<void()> run = task;  // the timer goes ahead of the task
+        if (const auto found = tasks_.find(id); found != tasks_.end()) {
+            found->second.release()->deleteLater();
+            tasks_.erase(found);
+        }
+        run();
+    });
+    timer->start(static_cast<int>(std::ceil(std::clamp(ms, 0.0, 2e9))));
+    tasks_[id] = std::move(timer);
+    return id;
+}
+
+void QtEvents::cancel(TaskId id) { tasks_.erase(id); }
+
+}  // namespace zel

@@ -1,0 +1,50 @@
+#pragma once
+// The event loop over Qt's, with a short way for answers that come within microseconds.
+
+#include <QTimer>
+#include <functional>
+#include <map>
+#include <memory>
+#include <vector>
+
+#include "platform/Clock.h"
+#include "platform/Events.h"
+
+namespace zel {
+
+class QtEvents : public Events {
+  public:
+    explicit QtEvents(const Clock& clock);
+    ~QtEvents() override;
+
+    void pump() override;
+    void wait(int ms) override;
+    void sleep(int ms) override;
+    TaskId schedule(double ms, std::function<void()> task) override;
+    void cancel(TaskId id) override;
+
+    /// A port or socket whose bytes end a wait: its file descriptor (-1 while closed), and
+    /// whether bytes wait in its buffer already.
+    struct Source {
+        std::function<int()> descriptor;
+        std::function<bool()> bytesWait;
+    };
+    int addSource(Source source);
+    void removeSource(int id);
+
+  private:
+    bool bytesWait() const;
+    bool pollSources(int ms) const;
+    bool processEvents();
+    void processAndWait(int ms);
+
+    const Clock& clock_;
+    std::map<int, Source> sources_;
+    int lastSource_ = 0;
+    std::map<TaskId, std::unique_ptr<QTimer>> tasks_;
+    TaskId lastTask_ = 0;
+    std::unique_ptr<QTimer> waitTimer_;
+    std::int64_t lastProcessed_ = 0;  // microseconds
+};
+
+}  // namespace zel

@@ -1,0 +1,43 @@
+#pragma once
+// The whole platform on Qt, in one bundle.
+
+#include <QString>
+
+#include "desktop/platform/QtClock.h"
+#include "desktop/platform/QtDialogs.h"
+#include "desktop/platform/QtEvents.h"
+#include "desktop/platform/QtSerialPort.h"
+#include "desktop/platform/QtServices.h"
+#include "desktop/platform/QtSocket.h"
+#include "platform/Platform.h"
+
+namespace zel {
+
+/// Needs a QCoreApplication; the windows of boxes and dialogs need a QApplication.
+struct QtPlatform {
+    explicit QtPlatform(const QString& home = {}) : folder(home) {}
+
+    QtClock clock;
+    QtEvents events{clock};
+    QtMessageBoxes boxes;
+    QtSerialPort serialPort{events};
+    QtSerialPortList serialPorts;
+    QtSocket tcpSocket{events};
+    QtSocket serverSocket{events};
+    QtApplicationFolder folder;
+    QtSettingsStore settings{folder};
+    QtDebugChannel debug;
+    QtClipboard clipboard;
+    QtLauncher launcher;
+    QtStartupFolder startup;
+    QtFileDialogs fileDialogs;
+
+    Platform bundle() { return bundle(boxes, fileDialogs); }
+    /// With boxes and file dialogs of another front.
+    Platform bundle(MessageBoxes& otherBoxes, FileDialogs& otherDialogs) {
+        return {clock,    events, otherBoxes, serialPort, serialPorts, tcpSocket, serverSocket,
+                settings, debug,  clipboard,  launcher,   startup,     folder,    otherDialogs};
+    }
+};
+
+}  // namespace zel

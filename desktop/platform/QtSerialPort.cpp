@@ -1,0 +1,130 @@
+#include "desktop/platform/QtSerialPort.h"
+
+#include <poll.h>
+#include <unistd.h>
+
+#include <QFileInfo>
+#include <QSerialPortInfo>
+#include <QTimer>
+
+namespace zel {
+namespace {
+
+constexpr qint64 kMostBuffered = 1 << 20;  // bytes that nobody takes
+constexpr int kDataReceived = 2;
+
+/// "COM3" is the third port of the mainboard here; any other name stands for itself.
+QString deviceOf(const std::string& name) {
+    const QString text = QString::fromStdString(name);
+#ifndef Q_OS_WIN
+    if (text.startsWith("COM")) {
+        bool number = false;
+        const int port = text.mid(3).toInt(&number);
+        if (number && port > 0) return QString("/dev/ttyS%1").arg(port - 1);
+    }
+#endif
+    return text;
+}
+
+}  // namespace
+
+QtSerialPort::QtSerialPort(QtEvents& events) : events_(events) {
+    port_.setReadBufferSize(kMostBuffered);
+    QObject::connect(&port_, &QSerialPort::readyRead, &port_, [this] { OnComm(kDataReceived); });
+    QObject::connect(&port_, &QSerialPort::errorOccurred, &port_,
+                     [this](QSerialPort::SerialPortError error) {
+                         // A time-out is none, and pseudo terminals have no control lines.
+                         if (error == QSerialPort::ResourceError ||
+                             error == QSerialPort::ReadError || error == QSerialPort::WriteError)
+                             lost();
+                     });
+    source_ = events_.addSource(
+        {[this] { return port_.isOpen() ? static_cast<int>(port_.handle()) : -1; },
+         [this] { return port_.isOpen() && port_.bytesAvailable() > 0; }});
+}
+
+QtSerialPort::~QtSerialPort() {
+    events_.removeSource(source_);
+    port_.disconnect();
+}
+
+std::string QtSerialPort::openProblem() const {
+    const QString device = QString::fromStdString(name_);
+    if (!QFileInfo::exists(device))
+        return name_ + " is not there. Check the cable and the name of the port.";
+    if (::access(name_.c_str(), R_OK | W_OK) != 0)
+        return "No rights to use " + name_ +
+               ". Add yourself to the group \"dialout\" and log in again.";
+    if (port_.error() == QSerialPort::PermissionError)
+        return name_ + " is held by another program. Close it there and try again.";
+    return name_ + ": " + port_.errorString().toStdString();
+}
+
+bool QtSerialPort::open(const SerialSetup& setup) {
+    const QString device = deviceOf(setup.CommPort);
+    name_ = device.toStdString();
+    problem_.clear();
+    port_.setPortName(device);
+    bool isNumber = false;
+    const int baud = QString::fromStdString(setup.Settings).section(',', 0, 0).toInt(&isNumber);
+    if (!port_.open(QIODevice::ReadWrite)) {
+        problem_ = openProblem();
+        return false;
+    }
+    port_.setDataBits(QSerialPort::Data8);
+    port_.setParity(QSerialPort::NoParity);
+    port_.setStopBits(QSerialPort::OneStop);
+    port_.setFlowControl(setup.Handshaking == 0 ? QSerialPort::NoFlowControl
+                                                : QSerialPort::HardwareControl);
+    if (!isNumber || !port_.setBaudRate(baud)) {
+        port_.close();
+        problem_ = name_ + " does not take the baud rate " + setup.Settings.substr(0, 20) + ".";
+        return false;
+    }
+    port_.setDataTerminalReady(setup.DTREnable);
+    if (setup.Handshaking == 0) port_.setRequestToSend(setup.RTSEnable);
+    port_.clearError();
+    return true;
+}
+
+void QtSerialPort::close() {
+    problem_.clear();
+    if (port_.isOpen()) port_.close();
+}
+
+void QtSerialPort::lost() {
+    if (!port_.isOpen()) return;
+    problem_ = name_ + " has gone. Check the cable, then disconnect and connect again.";
+    // The port is still on the stack: it is closed when its own work is done.
+    QSerialPort* port = &port_;
+    if (port->isOpen()) port->close();
+}
+
+bool QtSerialPort::readable() const {
+    pollfd descriptor{static_cast<int>(port_.handle()), POLLIN, 0};
+    return ::poll(&descriptor, 1, 0) > 0;
+}
+
+std::string QtSerialPort::input() {
+    if (!port_.isOpen()) return {};
+    // What the line has, without the detour through the event loop.
+    if (port_.bytesAvailable() == 0 && readable()) port_.waitForReadyRead(1);
+    if (!port_.isOpen()) return {};
+    const QByteArray bytes = port_.readAll();
+    return bytes.toStdString();
+}
+
+void QtSerialPort::output(std::string_view bytes) {
+    if (!port_.isOpen()) return;
+    port_.write(bytes.data(), static_cast<qint64>(bytes.size()));
+    port_.flush();
+}
+
+std::vector<std::string> QtSerialPortList::names() {
+    std::vector<std::string> names;
+    for (const QSerialPortInfo& info : QSerialPortInfo::availablePorts())
+        names.push_back(info.systemLocation().toStdString());
+    return names;
+}
+
+}  // namespace zel

@@ -1,0 +1,89 @@
+#include "desktop/platform/QtServices.h"
+
+#include <QCoreApplication>
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QLoggingCategory>
+#include <QProcess>
+#include <QSaveFile>
+#include <QSettings>
+#include <QStandardPaths>
+
+namespace zel {
+namespace {
+
+Q_LOGGING_CATEGORY(linkLog, "zelremote.link", QtWarningMsg)
+
+QString settingsKey(const std::string& application, const std::string& section,
+                    const std::string& key) {
+    return QString::fromStdString(application + "/" + section + "/" + key);
+}
+
+QString autostartEntry(const std::string& linkName) {
+    const QString name = QFileInfo(QString::fromStdString(linkName)).completeBaseName();
+    const QString folder =
+        QStandardPaths::writableLocation(QStandardPaths::ConfigLocation) + "/autostart";
+    return folder + "/" + name + ".desktop";
+}
+
+}  // namespace
+
+QtApplicationFolder::QtApplicationFolder(const QString& home) {
+    QString folder = home;
+    if (folder.isEmpty()) folder = qEnvironmentVariable("ZELREMOTE_HOME");
+    if (folder.isEmpty())
+        folder =
+            QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) + "/ZELRemote";
+    QDir().mkpath(folder);
+    path_ = QDir(folder).absolutePath().toStdString();
+}
+
+std::string QtApplicationFolder::programPath() {
+    return QCoreApplication::applicationDirPath().toStdString();
+}
+
+QtSettingsStore::QtSettingsStore(ApplicationFolder& folder)
+    : file_(QString::fromStdString(folder.path()) + "/user.ini") {}
+
+std::string QtSettingsStore::get(const std::string& application, const std::string& section,
+                                 const std::string& key, const std::string& fallback) {
+    const QSettings settings(file_, QSettings::IniFormat);
+    const QVariant value = settings.value(settingsKey(application, section, key));
+    return value.isValid() ? value.toString().toStdString() : fallback;
+}
+
+void QtSettingsStore::set(const std::string& application, const std::string& section,
+                          const std::string& key, const std::string& value) {
+    QSettings settings(file_, QSettings::IniFormat);
+    settings.setValue(settingsKey(application, section, key), QString::fromStdString(value));
+}
+
+void QtDebugChannel::output(const std::string& text) {
+    if (linkLog().isDebugEnabled())
+        qCDebug(linkLog).noquote() << QString::fromStdString(text).trimmed();
+}
+
+bool QtLauncher::start(const std::string& path, const std::vector<std::string>& arguments) {
+    QStringList list;
+    for (const std::string& argument : arguments) list << QString::fromStdString(argument);
+    return QProcess::startDetached(QString::fromStdString(path), list);
+}
+
+bool QtStartupFolder::createLink(const std::string& linkName, const std::string& argument) {
+    const QString entry = autostartEntry(linkName);
+    QDir().mkpath(QFileInfo(entry).absolutePath());
+    QSaveFile file(entry);
+    if (!file.open(QIODevice::WriteOnly)) return false;
+    const QString text =
+        QString("[Desktop Entry]\nType=Application\nName=ZELRemote\nExec=\"%1\" %2\n")
+            .arg(QCoreApplication::applicationFilePath(), QString::fromStdString(argument));
+    file.write(text.toUtf8());
+    return file.commit();
+}
+
+bool QtStartupFolder::removeLink(const std::string& linkName) {
+    return QFile::remove(autostartEntry(linkName));
+}
+
+}  // namespace zel

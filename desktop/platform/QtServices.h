@@ -1,0 +1,54 @@
+#pragma once
+// The small services of the platform that need no window.
+
+#include <QString>
+#include <string>
+
+#include "platform/Services.h"
+
+namespace zel {
+
+/// `home` when it is not empty, else $ZELREMOTE_HOME, else the user's application data folder. It
+/// is made when it is missing.
+class QtApplicationFolder : public ApplicationFolder {
+  public:
+    explicit QtApplicationFolder(const QString& home = {});
+    std::string path() override { return path_; }
+    std::string programPath() override;
+
+  private:
+    std::string path_;
+};
+
+/// One ini file in the application's folder.
+class QtSettingsStore : public SettingsStore {
+  public:
+    explicit QtSettingsStore(ApplicationFolder& folder);
+    std::string get(const std::string& application, const std::string& section,
+                    const std::string& key, const std::string& fallback) override;
+    void set(const std::string& application, const std::string& section, const std::string& key,
+             const std::string& value) override;
+
+  private:
+    QString file_;
+};
+
+/// The logging category "zelremote.link", silent unless QT_LOGGING_RULES switches it on.
+class QtDebugChannel : public DebugChannel {
+  public:
+    void output(const std::string& text) override;
+};
+
+class QtLauncher : public Launcher {
+  public:
+    bool start(const std::string& path, const std::vector<std::string>& arguments) override;
+};
+
+/// Desktop entries in the user's autostart folder.
+class QtStartupFolder : public StartupFolder {
+  public:
+    bool createLink(const std::string& linkName, const std::string& argument) override;
+    bool removeLink(const std::string& linkName) override;
+};
+
+}  // namespace zel
