@@ -1,0 +1,18 @@
+#pragma once
+// A picture of the graph as the desktop draws it, in a file.
+
+#include <QSize>
+#include <QString>
+
+#include "platform/Graph.h"
+#include "trace/ViewAnnotations.h"
+
+namespace zel {
+
+/// The file's ending chooses the kind: png, svg. False with a text in `error` when the kind is
+/// unknown or the file cannot be written; an older file of that name is then left as it was.
+/// Needs a QApplication.
+bool saveGraphImage(const Graph& graph, const ViewAnnotations& view, const QString& path,
+                    QString* error, QSize size = {1000, 620}, bool dark = true);
+
+}  // namespace zel

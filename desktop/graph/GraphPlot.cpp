@@ -1,0 +1,198 @@
+#include "desktop/graph/GraphPlot.h"
+
+#include <cmath>
+
+#include "desktop/graph/DivisionTicker.h"
+
+namespace zel {
+namespace {
+
+constexpr double kCursorReach = 8;  // pixels
+constexpr int kFontPoints = 9;
+
+QFont plotFont() {
+    QFont font;
+    font.setPointSize(kFontPoints);
+    return font;
+}
+
+QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
+
+QString joined(const QStringList& parts) {
+    QStringList kept;
+    for (const QString& part : parts)
+        if (!part.isEmpty()) kept << part;
+    return kept.join("    ");
+}
+
+}  // namespace
+
+GraphColors darkGraph() { return {}; }
+
+GraphColors lightGraph() {
+    GraphColors colors;
+    colors.background = Qt::white;
+    colors.plotArea = Qt::white;
+    colors.grid = QColor(0xc8, 0xce, 0xd4);
+    colors.frame = QColor(0x40, 0x48, 0x50);
+    colors.text = QColor(0x10, 0x14, 0x18);
+    colors.trace = QColor(0x0b, 0x4f, 0xa8);
+    colors.trigger = QColor(0xb0, 0x20, 0x20);
+    return colors;
+}
+
+QColor colorOf(Color color) {
+    return {static_cast<int>(color & 0xFF), static_cast<int>(color >> 8 & 0xFF),
+            static_cast<int>(color >> 16 & 0xFF)};
+}
+
+GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot), colors_(colors) {
+    plot_.setBackground(colors_.background);
+    plot_.setPlottingHints(QCP::phFastPolylines | QCP::phCacheLabels);
+    plot_.setNoAntialiasingOnDrag(true);
+    axisRect_ = plot_.axisRect();
+    axisRect_->setBackground(colors_.plotArea);
+    axisRect_->setMinimumMargins(QMargins(8, 4, 22, 4));
+
+    QCPLayoutGrid* layout = plot_.plotLayout();
+    layout->insertRow(0);
+    auto* top = new QCPLayoutGrid;
+    layout->addElement(0, 0, top);
+    top->setMargins(QMargins(10, 8, 22, 0));
+    top_ = {addText(*top, 0, Qt::AlignLeft), addText(*top, 1, Qt::AlignLeft),
+            addText(*top, 2, Qt::AlignRight), addText(*top, 3, Qt::AlignRight)};
+    auto* bottom = new QCPLayoutGrid;
+    layout->addElement(2, 0, bottom);
+    bottom->setMargins(QMargins(10, 0, 22, 6));
+    bottom_ = {addText(*bottom, 0, Qt::AlignLeft), addText(*bottom, 1, Qt::AlignHCenter),
+               addText(*bottom, 2, Qt::AlignRight)};
+    layout->setRowSpacing(2);
+    layout->setRowStretchFactor(0, 0.001);
+    layout->setRowStretchFactor(2, 0.001);
+
+    styleAxes();
+    trace_ = plot_.addGraph();
+    trace_->setPen(QPen(colors_.trace, 1));
+    trace_->setAdaptiveSampling(false);
+    for (CursorItems& cursor : cursors_) {
+        cursor.line = new QCPItemStraightLine(&plot_);
+        cursor.point = new QCPItemTracer(&plot_);
+        cursor.point->setStyle(QCPItemTracer::tsCircle);
+        cursor.point->setSize(9);
+        cursor.line->setVisible(false);
+        cursor.point->setVisible(false);
+    }
+    trigger_ = new QCPItemStraightLine(&plot_);
+    trigger_->setPen(QPen(colors_.trigger, 1, Qt::DashLine));
+    trigger_->setVisible(false);
+    triggerText_ = new QCPItemText(&plot_);
+    triggerText_->setColor(colors_.trigger);
+    triggerText_->setFont(plotFont());
+    triggerText_->setPositionAlignment(Qt::AlignLeft | Qt::AlignBottom);
+    triggerText_->setVisible(false);
+}
+
+QCPTextElement* GraphPlot::addText(QCPLayoutGrid& row, int column, Qt::Alignment alignment) {
+    auto* element = new QCPTextElement(&plot_, " ", plotFont());
+    element->setTextColor(colors_.text);
+    element->setTextFlags(static_cast<int>((alignment | Qt::AlignVCenter).toInt()));
+    row.addElement(0, column, element);
+    return element;
+}
+
+void GraphPlot::styleAxes() {
+    plot_.xAxis->setTicker(QSharedPointer<DivisionTicker>(new DivisionTicker(2)));
+    plot_.yAxis->setTicker(QSharedPointer<DivisionTicker>(new DivisionTicker(1)));
+    axisRect_->setupFullAxesBox(false);
+    for (QCPAxis* axis : axisRect_->axes()) {
+        axis->setBasePen(QPen(colors_.frame, 1));
+        axis->setTickPen(QPen(colors_.frame, 1));
+        axis->setSubTicks(false);
+        axis->setTickLength(0, 4);
+        axis->setTickLabelColor(colors_.text);
+        axis->setTickLabelFont(plotFont());
+        axis->setLabelColor(colors_.text);
+        axis->setLabelFont(plotFont());
+        axis->grid()->setPen(QPen(colors_.grid, 1));
+        axis->grid()->setZeroLinePen(Qt::NoPen);
+    }
+    plot_.xAxis2->setTicks(false);
+    plot_.yAxis2->setTicks(false);
+}
+
+void GraphPlot::setRanges(const Graph& graph) {
+    const auto set = [](QCPAxis* axis, const GraphAxis& range) {
+        const bool usable = std::isfinite(range.Minimum) && std::isfinite(range.Maximum) &&
+                            range.Maximum > range.Minimum;
+        if (usable) axis->setRange(range.Minimum, range.Maximum);
+    };
+    set(plot_.xAxis, graph.xAxis());
+    set(plot_.yAxis, graph.yAxis());
+}
+
+void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
+    setRanges(graph);
+    qSharedPointerCast<DivisionTicker>(plot_.xAxis->ticker())->setUnit(view.xUnit);
+    plot_.yAxis->setTickLabels(graph.yAxis().ShowLabels);
+    plot_.yAxis->setLabel(graph.yAxis().ShowLabels ? text(view.unit) : QString());
+    if (!drawn_ || serial_ != graph.plotSerial()) {
+        const auto count = static_cast<int>(graph.values().size());
+        QVector<double> keys(count);
+        for (int i = 0; i < count; ++i) keys[i] = graph.firstX() + i * graph.increment();
+        trace_->setData(keys, QVector<double>(graph.values().begin(), graph.values().end()), true);
+        serial_ = graph.plotSerial();
+        drawn_ = true;
+    }
+    for (int i = 0; i < 2; ++i) {
+        CursorItems& items = cursors_.at(static_cast<std::size_t>(i));
+        const GraphCursor& cursor = graph.cursor(i + 1);
+        items.visible = cursor.Visible;
+        items.x = cursor.X;
+        items.line->setVisible(cursor.Visible);
+        items.point->setVisible(cursor.Visible);
+        if (!cursor.Visible) continue;
+        const QPen pen(colorOf(cursor.color), 1);
+        items.line->setPen(pen);
+        items.line->point1->setCoords(cursor.X, 0);
+        items.line->point2->setCoords(cursor.X, 1);
+        items.point->setPen(QPen(colorOf(cursor.color), 2));
+        items.point->position->setCoords(cursor.X, cursor.Y);
+    }
+    const GraphAnnotation& trigger = graph.trigger();
+    trigger_->setVisible(trigger.Visible);
+    triggerText_->setVisible(trigger.Visible);
+    trigger_->point1->setCoords(plot_.xAxis->range().lower, trigger.Height);
+    trigger_->point2->setCoords(plot_.xAxis->range().upper, trigger.Height);
+    triggerText_->position->setCoords(plot_.xAxis->range().lower, trigger.Height);
+    triggerText_->setText(text(trigger.Caption));
+    top_[0]->setText(joined({text(view.refLevel), text(view.range)}));
+    top_[1]->setText(text(view.mode));
+    top_[2]->setText(text(view.detector));
+    top_[3]->setText(joined({text(view.rbw), text(view.vbw), text(view.sweepTime)}));
+    bottom_[0]->setText(text(view.left));
+    bottom_[1]->setText(text(view.center));
+    bottom_[2]->setText(text(view.right));
+}
+
+int GraphPlot::cursorAt(const QPointF& pixel) const {
+    for (int i = 1; i >= 0; --i) {
+        const CursorItems& cursor = cursors_.at(static_cast<std::size_t>(i));
+        if (!cursor.visible) continue;
+        if (std::fabs(plot_.xAxis->coordToPixel(cursor.x) - pixel.x()) <= kCursorReach)
+            return i + 1;
+    }
+    return 0;
+}
+
+double GraphPlot::valueAt(double x) const {
+    const auto found = trace_->findBegin(x, true);
+    const auto data = trace_->data();
+    if (data->isEmpty()) return 0;
+    auto at = data->at(found);
+    if (at == data->constEnd()) --at;
+    const auto next = at + 1;
+    if (next != data->constEnd() && std::fabs(next->key - x) < std::fabs(at->key - x)) at = next;
+    return at->value;
+}
+
+}  // namespace zel

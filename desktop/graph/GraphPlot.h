@@ -1,0 +1,63 @@
+#pragma once
+// Draws a graph with its annotations on a plot: the one look for the screen and for pictures.
+
+#include <qcustomplot.h>
+
+#include <array>
+
+#include "platform/Graph.h"
+#include "trace/ViewAnnotations.h"
+
+namespace zel {
+
+struct GraphColors {
+    QColor background{0x0d, 0x12, 0x18};
+    QColor plotArea{0x06, 0x09, 0x0d};
+    QColor grid{0x35, 0x42, 0x50};
+    QColor frame{0x7a, 0x8a, 0x9a};
+    QColor text{0xd8, 0xe0, 0xe8};
+    QColor trace{0xff, 0xd8, 0x4d};
+    QColor trigger{0xff, 0x6b, 0x6b};
+};
+GraphColors darkGraph();
+GraphColors lightGraph();  ///< for paper
+
+/// Owns the items of the plot; the plot itself belongs to the caller.
+class GraphPlot {
+  public:
+    explicit GraphPlot(QCustomPlot& plot, const GraphColors& colors = {});
+
+    /// Takes the data and the texts over; the caller replots.
+    void update(const Graph& graph, const ViewAnnotations& view);
+    QCPAxisRect& axisRect() { return *axisRect_; }
+    /// The 1-based index of the cursor within reach of a pixel, or 0.
+    int cursorAt(const QPointF& pixel) const;
+    double valueAt(double x) const;
+
+  private:
+    struct CursorItems {
+        QCPItemStraightLine* line;
+        QCPItemTracer* point;
+        bool visible = false;
+        double x = 0;
+    };
+    QCPTextElement* addText(QCPLayoutGrid& row, int column, Qt::Alignment alignment);
+    void styleAxes();
+    void setRanges(const Graph& graph);
+
+    QCustomPlot& plot_;
+    GraphColors colors_;
+    QCPAxisRect* axisRect_ = nullptr;
+    QCPGraph* trace_ = nullptr;
+    std::array<QCPTextElement*, 4> top_{};
+    std::array<QCPTextElement*, 3> bottom_{};
+    std::array<CursorItems, 2> cursors_{};
+    QCPItemStraightLine* trigger_ = nullptr;
+    QCPItemText* triggerText_ = nullptr;
+    unsigned long serial_ = 0;
+    bool drawn_ = false;
+};
+
+QColor colorOf(Color color);
+
+}  // namespace zel
