@@ -7,20 +7,13 @@
 #include "forms/Forms.h"
 #include "link/ZELBas.h"
 #include "model/ZEL3Variables.h"
+#include "platform/LinkAddress.h"
 #include "platform/Platform.h"
 
 namespace zel {
 
 class CommandExchange;
 class TraceReader;
-
-/// Where an instrument is to be found.
-struct LinkAddress {
-    enum class Kind { Serial, Tcp };
-    Kind kind = Kind::Serial;
-    std::string port;  ///< device name, or host
-    int number = 0;    ///< baud rate, or TCP port
-};
 
 class Program {
   public:

@@ -1,0 +1,249 @@
+#include "desktop/binders/Binder.h"
+
+#include <QMenu>
+#include <QSignalBlocker>
+#include <QStyle>
+#include <QVariant>
+
+#include "desktop/binders/ToolTips.h"
+
+namespace zel {
+namespace {
+
+constexpr int kFrameMs = 16;
+
+struct Face {
+    Color color;
+    const char* name;
+};
+constexpr Face kFaces[] = {
+    {kRed, "red"}, {kGreen, "green"}, {65280, "green"}, {14737632, "plain"}, {0xE0E0E0, "plain"}};
+
+QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
+
+/// A caption of two lines on a button; "&" is no mnemonic here.
+QString caption(const std::string& utf8) {
+    return text(utf8).replace("\r\n", "\n").replace("&", "&&");
+}
+
+/// Keys without a handler belong to rooms that are not built yet.
+template <class T>
+bool hasHandler(const T& control) {
+    return control.Clicked.connected();
+}
+
+}  // namespace
+
+QString faceOf(Color color) {
+    for (const Face& face : kFaces)
+        if (face.color == color) return face.name;
+    return "plain";
+}
+
+void setFace(QWidget* widget, const QString& face) {
+    if (widget->property("face").toString() == face) return;
+    widget->setProperty("face", face);
+    widget->style()->unpolish(widget);
+    widget->style()->polish(widget);
+}
+
+Binder::Binder(QObject* parent) : QObject(parent) {
+    frame_.setSingleShot(true);
+    connect(&frame_, &QTimer::timeout, this, [this] { flush(); });
+}
+
+bool Binder::refused(const Control& control) const { return refuses && refuses(control); }
+
+QObject* Binder::widgetOf(const Control& control) const {
+    const auto found = entries_.find(&control);
+    return found == entries_.end() ? nullptr : found->second.widget;
+}
+
+void Binder::markDirty(const void* key) {
+    dirty_.insert(key);
+    if (!frame_.isActive()) frame_.start(kFrameMs);
+}
+
+void Binder::flush() {
+    if (flushing_) return;
+    flushing_ = true;
+    while (!dirty_.empty()) {
+        const std::unordered_set<const void*> changed = std::move(dirty_);
+        dirty_.clear();
+        for (const void* key : changed)
+            if (const auto found = entries_.find(key); found != entries_.end())
+                found->second.show();
+    }
+    flushing_ = false;
+}
+
+void Binder::follow(Control& control, QObject* widget, std::function<void()> show) {
+    widget->setObjectName(text(control.form().name() == "ControllerForm"
+                                   ? control.name()
+                                   : control.form().name() + "." + control.name()));
+    entries_[&control] = {widget, std::move(show)};
+    // The windows end ahead of the forms: a change behind their end is nobody's.
+    control.Changed.connect([self = QPointer<Binder>(this), key = &control] {
+        if (self) self->markDirty(key);
+    });
+    // Not yet: the widget may have no window of its own so far.
+    markDirty(&control);
+}
+
+void Binder::describe(const Control& control, QWidget* widget) {
+    const QString tip = toolTipOf(control);
+    widget->setToolTip(tip);
+    if (widget->accessibleName().isEmpty()) widget->setAccessibleName(tip.section('\n', 0, 0));
+}
+
+void Binder::bind(Button& control, QPushButton* widget) {
+    describe(control, widget);
+    connect(widget, &QPushButton::clicked, this, [this, &control] {
+        if (!refused(control)) control.Click();
+    });
+    follow(control, widget, [&control, widget] {
+        widget->setText(caption(control.Caption));
+        widget->setEnabled(control.Enabled && hasHandler(control));
+        widget->setVisible(control.Visible);
+        QString face = faceOf(control.BackColor);
+        const std::string& picture = control.Picture;
+        if (face == "plain" && picture.size() > 2)
+            face = picture.compare(picture.size() - 2, 2, "_b") == 0 ? "blue" : "yellow";
+        setFace(widget, face);
+    });
+}
+
+void Binder::bind(TextBox& control, PanelLineEdit* widget) {
+    describe(control, widget);
+    widget->setControl(&control, [this, &control] { return refused(control); });
+    connect(widget, &QLineEdit::textEdited, this,
+            [&control](const QString& typed) { control.Text = typed.toStdString(); });
+    follow(control, widget, [&control, widget] {
+        const QString shown = text(control.Text);
+        if (widget->text() != shown) {
+            const QSignalBlocker quiet(widget);
+            widget->setText(shown);
+        }
+        widget->setReadOnly(control.Locked);
+        widget->setEnabled(control.Enabled);
+        widget->setVisible(control.Visible);
+        setFace(widget, control.Locked ? "locked" : "entry");
+        const Color ink = control.ForeColor;
+        widget->setStyleSheet(ink == kWindowText ? QString()
+                                                 : QString("color: %1").arg(inkOf(ink).name()));
+    });
+}
+
+void Binder::bind(Label& control, QLabel* widget) {
+    describe(control, widget);
+    follow(control, widget, [&control, widget] {
+        widget->setText(text(control.Caption));
+        widget->setVisible(control.Visible);
+        const Color ink = control.ForeColor;
+        widget->setStyleSheet(ink == kWindowText ? QString()
+                                                 : QString("color: %1").arg(inkOf(ink).name()));
+    });
+}
+
+void Binder::bind(CheckBox& control, QCheckBox* widget) {
+    describe(control, widget);
+    connect(widget, &QCheckBox::clicked, this, [this, &control, widget] {
+        if (refused(control)) {
+            widget->setChecked(control.Value());
+        } else {
+            control.Click();
+            markDirty(&control);
+        }
+    });
+    follow(control, widget, [&control, widget] {
+        widget->setText(caption(control.Caption));
+        widget->setChecked(control.Value());
+        widget->setEnabled(control.Enabled && hasHandler(control));
+        widget->setVisible(control.Visible);
+    });
+}
+
+void Binder::bind(OptionButton& control, QRadioButton* widget) {
+    describe(control, widget);
+    // The group is the form's: Qt's own exclusion would not know what code selects.
+    widget->setAutoExclusive(false);
+    connect(widget, &QRadioButton::clicked, this, [this, &control, widget] {
+        if (!refused(control)) control.Click();
+        widget->setChecked(control.Value());
+        markDirty(&control);
+    });
+    follow(control, widget, [&control, widget] {
+        widget->setText(caption(control.Caption));
+        widget->setChecked(control.Value());
+        widget->setEnabled(control.Enabled);
+        widget->setVisible(control.Visible);
+    });
+}
+
+void Binder::bind(DropDownList& control, QComboBox* widget) {
+    describe(control, widget);
+    widget->setEditable(control.editable());
+    widget->setInsertPolicy(QComboBox::NoInsert);
+    connect(widget, &QComboBox::activated, this, [this, &control](int index) {
+        if (!refused(control) && !control.Locked) control.pick(index);
+        markDirty(&control);
+    });
+    if (control.editable())
+        connect(widget, &QComboBox::editTextChanged, this,
+                [&control](const QString& typed) { control.setText(typed.toStdString()); });
+    follow(control, widget, [&control, widget] {
+        const QSignalBlocker quiet(widget);
+        QStringList items;
+        for (const std::string& item : control.items()) items << text(item);
+        bool same = items.size() == widget->count();
+        for (int i = 0; same && i < items.size(); ++i) same = widget->itemText(i) == items[i];
+        if (!same) {
+            widget->clear();
+            widget->addItems(items);
+        }
+        widget->setCurrentIndex(control.ListIndex());
+        if (control.editable() && widget->currentText() != text(control.Text()))
+            widget->setEditText(text(control.Text()));
+        widget->setEnabled(control.Enabled && !control.Locked);
+        widget->setVisible(control.Visible);
+    });
+}
+
+void Binder::bind(Frame& control, QWidget* widget, QLabel* captionLabel) {
+    follow(control, widget, [&control, widget, captionLabel] {
+        if (captionLabel != nullptr) {
+            captionLabel->setText(text(control.Caption));
+            captionLabel->setVisible(control.Visible);
+        }
+        if (captionLabel == nullptr) widget->setVisible(control.Visible);
+    });
+}
+
+void Binder::bind(MenuItem& control, QAction* action) {
+    connect(action, &QAction::triggered, this, [this, &control] {
+        if (!refused(control)) control.Click();
+        markDirty(&control);
+    });
+    follow(control, action, [&control, action] {
+        action->setText(caption(control.Caption));
+        action->setVisible(control.Visible);
+        action->setEnabled(control.Enabled && (action->menu() != nullptr || hasHandler(control)));
+        action->setCheckable(control.Checked);
+        action->setChecked(control.Checked);
+    });
+}
+
+void Binder::bindShow(Control& control, QWidget* widget, std::function<void()> show) {
+    describe(control, widget);
+    follow(control, widget, std::move(show));
+}
+
+void Binder::bindForm(Form& form, QObject* owner, std::function<void()> show) {
+    entries_[&form] = {owner, std::move(show)};
+    form.Changed.connect([self = QPointer<Binder>(this), key = &form] {
+        if (self) self->markDirty(key);
+    });
+    markDirty(&form);
+}
+
+}  // namespace zel

@@ -1,0 +1,88 @@
+#pragma once
+// Binds the controls of the forms to widgets: what a control changes is shown with the next frame,
+// what a user does goes to the control at once.
+
+#include <QAbstractButton>
+#include <QAction>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QGroupBox>
+#include <QLabel>
+#include <QLineEdit>
+#include <QObject>
+#include <QPointer>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QTimer>
+#include <functional>
+#include <unordered_map>
+#include <unordered_set>
+#include <vector>
+
+#include "platform/Controls.h"
+
+namespace zel {
+
+class PanelLineEdit;
+
+class Binder : public QObject {
+  public:
+    explicit Binder(QObject* parent = nullptr);
+
+    void bind(Button& control, QPushButton* widget);
+    void bind(TextBox& control, PanelLineEdit* widget);
+    void bind(Label& control, QLabel* widget);
+    void bind(CheckBox& control, QCheckBox* widget);
+    void bind(OptionButton& control, QRadioButton* widget);
+    void bind(DropDownList& control, QComboBox* widget);
+    void bind(Frame& control, QWidget* widget, QLabel* caption);
+    void bind(MenuItem& control, QAction* action);
+    /// For controls that need a drawing of their own: `show` runs with the next frame after a
+    /// change.
+    void bindShow(Control& control, QWidget* widget, std::function<void()> show);
+    void bindForm(Form& form, QObject* owner, std::function<void()> show);
+
+    /// Shows all changes now.
+    void flush();
+    /// While this answers true for a control, what a user does to it is dropped: work is under
+    /// way that it must not disturb.
+    std::function<bool(const Control&)> refuses;
+    /// Whether the control was bound, for the tests.
+    QObject* widgetOf(const Control& control) const;
+
+  private:
+    void follow(Control& control, QObject* widget, std::function<void()> show);
+    void markDirty(const void* key);
+    void describe(const Control& control, QWidget* widget);
+    bool refused(const Control& control) const;
+
+    struct Entry {
+        QObject* widget;
+        std::function<void()> show;
+    };
+    std::unordered_map<const void*, Entry> entries_;
+    std::unordered_set<const void*> dirty_;
+    QTimer frame_;
+    bool flushing_ = false;
+};
+
+/// A line of text that tells its text box of each key ahead of the insertion.
+class PanelLineEdit : public QLineEdit {
+  public:
+    explicit PanelLineEdit(QWidget* parent = nullptr) : QLineEdit(parent) {}
+    void setControl(TextBox* control, std::function<bool()> refused);
+
+  protected:
+    void keyPressEvent(QKeyEvent* event) override;
+
+  private:
+    TextBox* control_ = nullptr;
+    std::function<bool()> refused_;
+};
+
+/// The face of a control's colour for the style sheet: "plain", "red", "green", "gray".
+QString faceOf(Color color);
+/// Puts the face on the widget and has it drawn anew.
+void setFace(QWidget* widget, const QString& face);
+
+}  // namespace zel

@@ -1,0 +1,106 @@
+#include "desktop/binders/ToolTips.h"
+
+#include <algorithm>
+
+namespace zel {
+namespace {
+
+struct Tip {
+    const char* name;
+    const char* text;
+};
+const Tip kTips[] = {
+    {"PlaySingleButton", "Read one sweep (F9)"},
+    {"PlayContinuousButton", "Read sweep after sweep (F10)"},
+    {"StopButton", "Stop the continuous view or the recording (Esc)"},
+    {"cmdZoom", "Draw a rectangle to look closer; press again for the whole span"},
+    {"cmd3D", "Waterfall"},
+    {"cmdSpecial", "Scripts of measurements"},
+    {"CFLabel", "Centre frequency"},
+    {"SpanLabel", "Span"},
+    {"MarkerLabel", "Marker: position and level"},
+    {"DeltaLabel", "Delta marker or pointer: position and level"},
+    {"DebugTextBox", "Last step of the exchange with the instrument"},
+    {"GetOption", "A soft key asks the instrument"},
+    {"SetOption", "A soft key changes the instrument"},
+    {"FrequencyButton", "Frequency menu"},
+    {"SpanButton", "Span menu"},
+    {"AmplitudeButton", "Amplitude menu"},
+    {"BWButton", "Bandwidth menu"},
+    {"SweepButton", "Sweep menu"},
+    {"TraceButton", "Trace menu"},
+    {"MeasButton", "Measurement menu"},
+    {"TrackButton1", "Tracking generator menu"},
+    {"MarkerButton", "Marker menu"},
+    {"AnalyzerButton", "Analyzer mode"},
+    {"TrackButton", "Tracking generator mode"},
+    {"PwrButton", "Power sensor mode"},
+    {"ChnPwrButton", "Channel power mode"},
+    {"OccBWButton", "Occupied bandwidth mode"},
+    {"TDMAButton", "TDMA power mode"},
+    {"DistFaultButton", "Distance to fault mode"},
+    {"AnalyzerCheck", "Analyzer mode"},
+    {"TrackingGenCheck", "Tracking generator mode"},
+    {"PowerSensorCheck", "Power sensor mode"},
+    {"ChannelPowerCheck", "Channel power mode"},
+    {"OccBWCheck", "Occupied bandwidth mode"},
+    {"TDMAPowerCheck", "TDMA power mode"},
+    {"DistFaultCheck", "Distance to fault mode"},
+    {"MarkerCheckBox", "Switch the marker on or off"},
+    {"DeltaCheckBox", "Switch the delta marker on or off"},
+    {"MarkPkButton", "Marker to the highest peak"},
+    {"NextPeakButton", "Marker to the next peak"},
+    {"MinPeakButton", "Marker to the minimum"},
+    {"MarkToCentButton", "The marker's frequency becomes the centre"},
+    {"MarkToRefButton", "The marker's level becomes the reference level"},
+    {"ResetButton", "Preset the instrument"},
+    {"LocalButton", "Give the instrument's own keys back"},
+    {"OnOffButton", "Toggle remote (R) and local (L) control; the key shows the next state"},
+    {"ManualCommandText", "A line of the instrument's protocol"},
+    {"SendButton", "Send the line"},
+    {"ManualCommandTextAnsw", "The instrument's answer"},
+    {"TimeLabel", "Length of the session"},
+    {"COMList", "Serial port: choose one or type a device name"},
+    {"BaudList", "Baud rate: the instrument's own"},
+    {"ZELButton", "Open the port and connect"},
+    {"IDText", "Identity of the instrument"},
+    {"TelNumberBox", "Telephone number of the far modem"},
+    {"AirBaudRateText", "The modem's answer"},
+    {"manualSizeMin", "Lower end of the vertical axis"},
+    {"manualSizeMax", "Upper end of the vertical axis"},
+    {"IPAdressTextBox", "Name or address of the computer at the instrument"},
+    {"RemotePortTextBox", "TCP port of the server"},
+    {"IDTextBox", "State of the connection"},
+    {"localPortTextBox", "TCP port on which the server listens"},
+    {"txtDebug", "State of the server"},
+    {"CWGraph1", "The sweep. With a marker on, drag it or move it with the arrow keys"},
+};
+
+bool darkInk = true;
+
+}  // namespace
+
+QString toolTipOf(const Control& control) {
+    const std::string base = control.name().substr(0, control.name().find('('));
+    for (const Tip& tip : kTips)
+        if (base == tip.name) return QString::fromUtf8(tip.text);
+    if (base == "SoftKey") return QString("Soft key (F%1)").arg(control.name()[8] - '0' + 2);
+    if (base == "SoftTextBox") return "Value: type a number with its prefix, then Enter";
+    if (base == "ChoiceBox") return "Choice";
+    return {};
+}
+
+void useDarkInk(bool darkTheme) { darkInk = darkTheme; }
+
+QColor inkOf(Color color) {
+    const QColor plain(static_cast<int>(color & 0xFF), static_cast<int>(color >> 8 & 0xFF),
+                       static_cast<int>(color >> 16 & 0xFF));
+    int hue = 0;
+    int saturation = 0;
+    int lightness = 0;
+    plain.getHsl(&hue, &saturation, &lightness);
+    lightness = darkInk ? std::max(lightness, 170) : std::min(lightness, 90);
+    return QColor::fromHsl(hue < 0 ? 0 : hue, saturation, lightness);
+}
+
+}  // namespace zel

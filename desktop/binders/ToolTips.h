@@ -1,0 +1,18 @@
+#pragma once
+// What the controls are for, in words, and the ink of coloured texts.
+
+#include <QColor>
+#include <QString>
+
+#include "platform/Form.h"
+
+namespace zel {
+
+/// The tip of a control; empty for one that speaks for itself.
+QString toolTipOf(const Control& control);
+/// The theme in use shows coloured texts on a dark or a light ground.
+void useDarkInk(bool darkTheme);
+/// A colour of the panel as a text colour with enough contrast.
+QColor inkOf(Color color);
+
+}  // namespace zel

@@ -1,0 +1,40 @@
+#pragma once
+// A dialog window for a form: shown, hidden and modal as the form says.
+
+#include <QDialog>
+
+#include "desktop/binders/Binder.h"
+#include "platform/Form.h"
+
+namespace zel {
+
+class FormWindow : public QDialog {
+  public:
+    FormWindow(Form& form, Binder& binder, QWidget* parent);
+
+  protected:
+    /// Behind the building of the window's content.
+    void followForm();
+    void closeEvent(QCloseEvent* event) override;
+    void reject() override;
+    void keyPressEvent(QKeyEvent* event) override;
+
+    Form& form_;
+    Binder& binder_;
+};
+
+/// A window that lays the form's controls out in their order: a row a text box, options below
+/// each other, buttons at the foot.
+class PlainFormWindow : public FormWindow {
+  public:
+    PlainFormWindow(Form& form, Binder& binder, QWidget* parent);
+};
+
+/// The connection dialog.
+class MainForm;
+class ConnectionWindow : public FormWindow {
+  public:
+    ConnectionWindow(MainForm& form, Binder& binder, QWidget* parent);
+};
+
+}  // namespace zel

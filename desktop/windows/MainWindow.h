@@ -1,0 +1,49 @@
+#pragma once
+// The panel's window: the graph and its readouts, the keys, the menus, the state of things.
+
+#include <QMainWindow>
+#include <QProgressBar>
+#include <memory>
+#include <vector>
+
+#include "desktop/binders/Binder.h"
+#include "desktop/graph/GraphWidget.h"
+#include "desktop/windows/FormWindow.h"
+#include "shell/Program.h"
+
+namespace zel {
+
+class MainWindow : public QMainWindow {
+  public:
+    explicit MainWindow(Program& program);
+    ~MainWindow() override;
+
+    GraphWidget& graph() { return *graph_; }
+    Binder& binder() { return binder_; }
+    /// Shows everything as the forms have it, at once.
+    void showNow();
+
+  protected:
+    void closeEvent(QCloseEvent* event) override;
+
+  private:
+    QWidget* graphSide();
+    void buildMenus();
+    void buildStatusLine();
+    void buildShortcuts();
+    void showState();
+    bool mustNotDisturb(const Control& control) const;
+    void shortcut(const QKeySequence& keys, Button& control);
+
+    Program& program_;
+    ControllerForm& panel_;
+    Binder binder_;
+    GraphWidget* graph_ = nullptr;
+    QLabel* state_ = nullptr;
+    QLabel* activity_ = nullptr;
+    QProgressBar* busy_ = nullptr;
+    std::vector<std::unique_ptr<FormWindow>> windows_;
+    QTimer activityOff_;
+};
+
+}  // namespace zel

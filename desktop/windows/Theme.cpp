@@ -1,0 +1,139 @@
+#include "desktop/windows/Theme.h"
+
+#include <QApplication>
+#include <QPalette>
+#include <QStyle>
+#include <QStyleFactory>
+
+#include "desktop/binders/ToolTips.h"
+
+namespace zel {
+namespace {
+
+struct ThemeColors {
+    const char* window;
+    const char* base;
+    const char* text;
+    const char* dim;
+    const char* button;
+    const char* buttonHover;
+    const char* border;
+    const char* accent;
+    const char* accentText;
+    const char* yellow;
+    const char* yellowText;
+    const char* red;
+    const char* green;
+    const char* locked;
+};
+constexpr ThemeColors kDark = {"#1b2027", "#11151a", "#e6ebf0", "#7d8894", "#2c343e",
+                               "#38424e", "#46525f", "#2f7fd6", "#ffffff", "#4a4220",
+                               "#ffe08a", "#c0392b", "#1e8449", "#191e24"};
+constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#ffffff",
+                                "#e3e9f0", "#b4bdc7", "#1d6fc4", "#ffffff", "#fbeeb8",
+                                "#5c4a00", "#c0392b", "#1e8449", "#e4e8ec"};
+
+constexpr const char* kStyleSheet = R"(
+QWidget { font-size: 9pt; }
+QPushButton { background: @button; color: @text; border: 1px solid @border; border-radius: 4px;
+    padding: 2px 6px; min-height: 20px; }
+QPushButton:hover { background: @buttonHover; }
+QPushButton:pressed { background: @accent; color: @accentText; }
+QPushButton:focus { border: 2px solid @accent; padding: 1px 5px; }
+QPushButton:disabled { color: @dim; background: @window; }
+QPushButton[face="red"] { background: @red; color: #ffffff; font-weight: bold; }
+QPushButton[face="green"] { background: @green; color: #ffffff; font-weight: bold; }
+QPushButton[face="yellow"] { background: @yellow; color: @yellowText; font-weight: bold; }
+QPushButton[face="blue"] { background: @accent; color: @accentText; font-weight: bold; }
+QPushButton[face]:disabled { color: @dim; background: @window; font-weight: normal; }
+QPushButton[face]:focus { border: 2px solid @text; }
+QPushButton#StopButton { background: @red; color: #ffffff; font-weight: bold; }
+QLineEdit, QComboBox { background: @base; color: @text; border: 1px solid @border;
+    border-radius: 3px; padding: 1px 4px; min-height: 20px; }
+QLineEdit:focus, QComboBox:focus { border: 2px solid @accent; padding: 0px 3px; }
+QLineEdit[face="locked"] { background: @locked; }
+QLineEdit:disabled, QComboBox:disabled { color: @dim; background: @window; }
+QLabel#caption { color: @dim; font-size: 8pt; }
+QLabel#readout, QLabel[readout="true"] { font-size: 10pt; font-weight: bold; }
+QFrame#group { border: 1px solid @border; border-radius: 5px; }
+QToolTip { background: @base; color: @text; border: 1px solid @border; }
+QStatusBar QLabel { padding: 0 6px; }
+QMenuBar::item:disabled, QMenu::item:disabled { color: @dim; }
+QRadioButton:focus, QCheckBox:focus { background: @buttonHover; }
+QRadioButton::indicator, QCheckBox::indicator { width: 12px; height: 12px;
+    border: 1px solid @dim; background: @base; }
+QCheckBox::indicator { border-radius: 3px; }
+QRadioButton::indicator { border-radius: 7px; }
+QRadioButton::indicator:checked, QCheckBox::indicator:checked { background: @accent;
+    border: 1px solid @text; }
+QRadioButton::indicator:disabled, QCheckBox::indicator:disabled { border-color: @border; }
+)";
+
+QString styled(const ThemeColors& c) {
+    const std::pair<const char*, const char*> names[] = {
+        {"@buttonHover", c.buttonHover},
+        {"@button", c.button},
+        {"@accentText", c.accentText},
+        {"@accent", c.accent},
+        {"@border", c.border},
+        {"@yellowText", c.yellowText},
+        {"@yellow", c.yellow},
+        {"@window", c.window},
+        {"@locked", c.locked},
+        {"@base", c.base},
+        {"@text", c.text},
+        {"@dim", c.dim},
+        {"@red", c.red},
+        {"@green", c.green},
+    };
+    QString sheet = kStyleSheet;
+    for (const auto& [name, value] : names) sheet.replace(name, value);
+    return sheet;
+}
+
+QPalette paletteOf(const ThemeColors& c) {
+    QPalette palette;
+    palette.setColor(QPalette::Window, c.window);
+    palette.setColor(QPalette::WindowText, c.text);
+    palette.setColor(QPalette::Base, c.base);
+    palette.setColor(QPalette::AlternateBase, c.window);
+    palette.setColor(QPalette::Text, c.text);
+    palette.setColor(QPalette::Button, c.button);
+    palette.setColor(QPalette::ButtonText, c.text);
+    palette.setColor(QPalette::ToolTipBase, c.base);
+    palette.setColor(QPalette::ToolTipText, c.text);
+    palette.setColor(QPalette::Highlight, c.accent);
+    palette.setColor(QPalette::HighlightedText, c.accentText);
+    palette.setColor(QPalette::PlaceholderText, c.dim);
+    for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
+        palette.setColor(QPalette::Disabled, role, c.dim);
+    return palette;
+}
+
+bool systemIsDark(const QApplication& application) {
+    return application.style()->standardPalette().color(QPalette::Window).lightness() < 128;
+}
+
+}  // namespace
+
+ThemeChoice themeFromText(const QString& text) {
+    if (text == "light") return ThemeChoice::Light;
+    return text == "dark" ? ThemeChoice::Dark : ThemeChoice::System;
+}
+
+QString themeText(ThemeChoice choice) {
+    return choice == ThemeChoice::Light ? "light" : choice == ThemeChoice::Dark ? "dark" : "system";
+}
+
+bool applyTheme(QApplication& application, ThemeChoice choice) {
+    const bool dark =
+        choice == ThemeChoice::Dark || (choice == ThemeChoice::System && systemIsDark(application));
+    const ThemeColors& colors = dark ? kDark : kLight;
+    application.setStyle(QStyleFactory::create("Fusion"));
+    application.setPalette(paletteOf(colors));
+    application.setStyleSheet(styled(colors));
+    useDarkInk(dark);
+    return dark;
+}
+
+}  // namespace zel

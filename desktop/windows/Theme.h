@@ -1,0 +1,17 @@
+#pragma once
+// The light and the dark look of the windows.
+
+#include <QString>
+
+class QApplication;
+
+namespace zel {
+
+enum class ThemeChoice { System, Light, Dark };
+
+ThemeChoice themeFromText(const QString& text);
+QString themeText(ThemeChoice choice);
+/// Palette and style sheet of the whole program. True when the dark look came out.
+bool applyTheme(QApplication& application, ThemeChoice choice);
+
+}  // namespace zel
