@@ -1,0 +1,118 @@
+// ZELSim: a simulated instrument on a pseudo terminal or a TCP port.
+
+#include <CLI/CLI.hpp>
+#include <iostream>
+#include <string>
+#include <vector>
+
+#include "ZELSim/Device.h"
+#include "ZELSim/Faults.h"
+#include "ZELSim/TransportPty.h"
+#include "ZELSim/TransportTcp.h"
+#include "ZELSim/Wire.h"
+
+namespace {
+
+constexpr int kFailed = 1;
+constexpr int kWrongUse = 2;
+
+struct Options {
+    bool pty = false;
+    bool strictBaud = false;
+    std::string link;
+    std::string tcp;
+    std::vector<std::string> faults;
+    zelsim::DeviceSetup device;
+    zelsim::WireSetup wire;
+};
+
+int fail(const std::string& problem) {
+    std::cerr << "ZELSim: " << problem << '\n';
+    return kFailed;
+}
+
+int servePty(const Options& options, zelsim::Wire& wire) {
+    zelsim::PtyEndpoint endpoint;
+    if (!endpoint.open(options.link, options.wire.baud, options.strictBaud)) {
+        return fail(endpoint.problem());
+    }
+    std::cout << endpoint.device() << '\n';
+    if (!options.link.empty()) {
+        std::cout << options.link << '\n';
+    }
+    std::cout.flush();
+    return zelsim::serve(wire, endpoint) ? 0 : fail("cannot wait for the line");
+}
+
+int serveTcp(const Options& options, zelsim::Wire& wire) {
+    zelsim::TcpEndpoint endpoint;
+    if (!endpoint.open(options.tcp)) {
+        return fail(endpoint.problem());
+    }
+    std::cout << endpoint.address() << std::endl;
+    return zelsim::serve(wire, endpoint) ? 0 : fail("cannot wait for the line");
+}
+
+int run(Options& options) {
+    for (const std::string& text : options.faults) {
+        std::string problem;
+        const auto rule = zelsim::parseFault(text, problem);
+        if (!rule) {
+            std::cerr << "ZELSim: --fault " << text << ": " << problem << '\n';
+            return kWrongUse;
+        }
+        options.wire.faults.push_back(*rule);
+    }
+    options.wire.wholeAnswers = !options.pty;
+    zelsim::catchEndSignals();
+    zelsim::Device device(options.device);
+    zelsim::Wire wire(device, options.wire);
+    return options.pty ? servePty(options, wire) : serveTcp(options, wire);
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    Options options;
+    CLI::App app{
+        "ZELSim, a simulated ZEL3 spectrum analyser: it speaks the instrument's line protocol on\n"
+        "a pseudo terminal or a TCP port until it is ended. It prints the name of the terminal\n"
+        "(and of the link), or the address and port."};
+    app.footer(std::string(zelsim::faultHelp()));
+    auto* pty = app.add_flag("--pty", options.pty, "Serve a pseudo terminal");
+    app.add_option("--link", options.link, "Make a symbolic link of this name to the terminal")
+        ->type_name("NAME")
+        ->needs(pty);
+    auto* tcp = app.add_option("--tcp", options.tcp,
+                               "Serve a TCP port (address 127.0.0.1; port 0: any free one)")
+                    ->type_name("[ADDRESS:]PORT");
+    pty->excludes(tcp);
+    app.add_option("--baud", options.wire.baud,
+                   "Pace the line: 10 bits a byte at N baud, both ways (0: as fast as it goes)")
+        ->type_name("N")
+        ->check(CLI::Range(0, 4000000));
+    app.add_flag("--strict-baud", options.strictBaud,
+                 "With --pty and --baud: a host port at another rate gets noise")
+        ->needs(pty);
+    app.add_option("--seed", options.device.seed, "Seed of the noise and of the moving signals (1)")
+        ->type_name("N");
+    app.add_option("--speed", options.device.speed, "Sweeps take their time divided by F (1)")
+        ->type_name("F")
+        ->check(CLI::Range(1e-3, 1e9));
+    app.add_option("--trigger-period", options.device.triggerPeriod,
+                   "Seconds between edges at the external trigger input (0.5); 0: none ever comes")
+        ->type_name("S")
+        ->check(CLI::Range(0.0, 1e6));
+    app.add_option("--fault", options.faults, "A fault on purpose, see below")
+        ->type_name("KIND[:NAME=VALUE,...]")
+        ->allow_extra_args(false);
+    try {
+        app.parse(argc, argv);
+        if (!options.pty && options.tcp.empty()) {
+            throw CLI::RequiredError("--pty or --tcp");
+        }
+    } catch (const CLI::ParseError& error) {
+        return app.exit(error) == 0 ? 0 : kWrongUse;
+    }
+    return run(options);
+}
