@@ -1,0 +1,80 @@
+#include "platform/virtual/ScriptedSocket.h"
+
+#include <utility>
+
+namespace zel {
+
+ScriptedSocket::ScriptedSocket(Events& events) : events_(events), script_(events) {
+    script_.deliver = [this](const std::string& bytes) { arrive(bytes); };
+    script_.died = [this] { peerCloses(); };
+}
+
+ScriptedSocket::~ScriptedSocket() { events_.cancel(task_); }
+
+void ScriptedSocket::connectsTo(SocketState end, int ms) {
+    end_ = end;
+    endMs_ = ms;
+}
+
+void ScriptedSocket::knock(int requestId) {
+    events_.cancel(task_);
+    task_ = events_.schedule(0, [this, requestId] {
+        if (state_ == SocketState::Listening) ConnectionRequest(requestId);
+    });
+}
+
+void ScriptedSocket::arrive(const std::string& bytes) {
+    if (state_ != SocketState::Connected) return;
+    waiting_ += bytes;
+    DataArrival();
+}
+
+void ScriptedSocket::peerCloses() {
+    if (state_ != SocketState::Connected) return;
+    state_ = SocketState::PeerClosing;
+    script_.closed();
+    PeerClosed();
+}
+
+void ScriptedSocket::connectTo(const std::string& host, int port) {
+    close();
+    host_ = host;
+    port_ = port;
+    state_ = SocketState::Connecting;
+    if (end_ == SocketState::Connecting) return;
+    task_ = events_.schedule(endMs_, [this] {
+        state_ = end_;
+        if (state_ == SocketState::Connected) begin();
+    });
+}
+
+void ScriptedSocket::listen(int port) {
+    close();
+    port_ = port;
+    state_ = SocketState::Listening;
+}
+
+void ScriptedSocket::accept(int) {
+    state_ = SocketState::Connected;
+    begin();
+}
+
+void ScriptedSocket::close() {
+    events_.cancel(task_);
+    script_.closed();
+    waiting_.clear();
+    state_ = SocketState::Closed;
+}
+
+bool ScriptedSocket::sendData(std::string_view bytes) {
+    if (state_ != SocketState::Connected) return false;
+    script_.sent(bytes);
+    return true;
+}
+
+void ScriptedSocket::begin() {
+    waiting_.clear();
+    script_.opened();
+}
+
+}  // namespace zel

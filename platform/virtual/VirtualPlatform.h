@@ -1,0 +1,38 @@
+#pragma once
+// The whole platform of tests and of the built-in simulator: virtual time, scripts and memory.
+
+#include "platform/Platform.h"
+#include "platform/virtual/MemoryServices.h"
+#include "platform/virtual/RecordedBoxes.h"
+#include "platform/virtual/ScriptedPort.h"
+#include "platform/virtual/ScriptedSocket.h"
+#include "platform/virtual/VirtualTime.h"
+
+namespace zel {
+
+struct VirtualPlatform {
+    VirtualClock clock;
+    VirtualEvents events{clock};
+    RecordedBoxes boxes;
+    ScriptedPort port{events};
+    FixedPortList ports;
+    ScriptedSocket tcpSocket{events};
+    ScriptedSocket serverSocket{events};
+    MemorySettings settings;
+    MemoryDebugChannel debug;
+    MemoryClipboard clipboard;
+    MemoryLauncher launcher;
+    MemoryStartupFolder startup;
+    FixedApplicationFolder folder;
+    QueuedFileDialogs fileDialogs;
+
+    /// The bundle with the scripted port.
+    Platform bundle() { return bundle(port); }
+    /// The bundle with another port on this time, such as a simulated instrument.
+    Platform bundle(SerialPort& other) {
+        return {clock,    events, boxes,     other,    ports,   tcpSocket, serverSocket,
+                settings, debug,  clipboard, launcher, startup, folder,    fileDialogs};
+    }
+};
+
+}  // namespace zel
