@@ -4,8 +4,8 @@
 
 #include <QAbstractEventDispatcher>
 #include <QCoreApplication>
-#include <QThread>
 #include <algorithm>
+#include <array>
 #include <cmath>
 
 namespace zel {
@@ -14,6 +14,7 @@ namespace {
 // An answer of a fast line comes within this time; events need not run meanwhile.
 constexpr int kShortWayMs = 2;
 constexpr std::int64_t kPumpEveryMicros = 2000;
+constexpr std::size_t kMostSources = 8;
 
 }  // namespace
 
@@ -36,12 +37,21 @@ bool QtEvents::bytesWait() const {
                        [](const auto& entry) { return entry.second.bytesWait(); });
 }
 
-bool QtEvents::pollSources(int ms) const {
-    std::vector<pollfd> descriptors;
-    for (const auto& [id, source] : sources_)
-        if (const int fd = source.descriptor(); fd >= 0) descriptors.push_back({fd, POLLIN, 0});
-    if (descriptors.empty()) return false;
-    return ::poll(descriptors.data(), descriptors.size(), ms) > 0;
+bool QtEvents::pollSources(int ms) {
+    std::array<pollfd, kMostSources> descriptors{};
+    nfds_t count = 0;
+    for (const auto& [id, source] : sources_) {
+        const int fd = source.descriptor();
+        if (fd >= 0 && count < descriptors.size())
+            descriptors.at(count++) = {fd, POLLIN | POLLRDHUP, 0};
+    }
+    if (count == 0 || ::poll(descriptors.data(), count, ms) <= 0) return false;
+    const bool ended = std::any_of(descriptors.begin(), descriptors.end(), [](const pollfd& d) {
+        return (d.revents & (POLLHUP | POLLRDHUP | POLLERR | POLLNVAL)) != 0;
+    });
+    // The loop has to notice the end of a line: it would be readable for ever.
+    if (ended) processEvents();
+    return true;
 }
 
 bool QtEvents::processEvents() {

@@ -5,7 +5,6 @@
 #include <functional>
 #include <map>
 #include <memory>
-#include <vector>
 
 #include "platform/Clock.h"
 #include "platform/Events.h"
@@ -34,7 +33,7 @@ class QtEvents : public Events {
 
   private:
     bool bytesWait() const;
-    bool pollSources(int ms) const;
+    bool pollSources(int ms);
     bool processEvents();
     void processAndWait(int ms);
 

@@ -5,7 +5,7 @@
 
 #include <QFileInfo>
 #include <QSerialPortInfo>
-#include <QTimer>
+#include <array>
 
 namespace zel {
 namespace {
@@ -94,28 +94,47 @@ void QtSerialPort::close() {
 
 void QtSerialPort::lost() {
     if (!port_.isOpen()) return;
+    if (!hungUp()) {
+        // The loop came to read what `input` has taken already. It goes on listening.
+        port_.clearError();
+        port_.setReadBufferSize(kMostBuffered);
+        return;
+    }
     problem_ = name_ + " has gone. Check the cable, then disconnect and connect again.";
     // The port is still on the stack: it is closed when its own work is done.
     QSerialPort* port = &port_;
     if (port->isOpen()) port->close();
 }
 
-bool QtSerialPort::readable() const {
+bool QtSerialPort::hungUp() const {
     pollfd descriptor{static_cast<int>(port_.handle()), POLLIN, 0};
-    return ::poll(&descriptor, 1, 0) > 0;
+    return ::poll(&descriptor, 1, 0) > 0 &&
+           (descriptor.revents & (POLLHUP | POLLERR | POLLNVAL)) != 0;
 }
 
 std::string QtSerialPort::input() {
     if (!port_.isOpen()) return {};
-    // What the line has, without the detour through the event loop.
-    if (port_.bytesAvailable() == 0 && readable()) port_.waitForReadyRead(1);
-    if (!port_.isOpen()) return {};
-    const QByteArray bytes = port_.readAll();
-    return bytes.toStdString();
+    // What the event loop has fetched comes first; what the line has now, without the detour
+    // through the loop, behind it.
+    std::string bytes;
+    if (port_.bytesAvailable() > 0) bytes = port_.readAll().toStdString();
+    std::array<char, 4096> room;
+    ssize_t count = 0;
+    do {
+        count = ::read(static_cast<int>(port_.handle()), room.data(), room.size());
+        if (count > 0) bytes.append(room.data(), static_cast<std::size_t>(count));
+    } while (count == static_cast<ssize_t>(room.size()) && bytes.size() < kMostBuffered);
+    return bytes;
 }
 
 void QtSerialPort::output(std::string_view bytes) {
     if (!port_.isOpen()) return;
+    // A short line goes out at once; what the line does not take now is left to the event loop.
+    if (port_.bytesToWrite() == 0) {
+        const ssize_t count = ::write(static_cast<int>(port_.handle()), bytes.data(), bytes.size());
+        if (count > 0) bytes.remove_prefix(static_cast<std::size_t>(count));
+    }
+    if (bytes.empty()) return;
     port_.write(bytes.data(), static_cast<qint64>(bytes.size()));
     port_.flush();
 }

@@ -23,7 +23,7 @@ class QtSerialPort : public SerialPort {
     std::string problem() const override { return problem_; }
 
   private:
-    bool readable() const;
+    bool hungUp() const;
     void lost();
     std::string openProblem() const;
 

@@ -1,0 +1,32 @@
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+
+QApplication& testApplication() {
+    static int count = 1;
+    static char name[] = "test_desktop";
+    static char* arguments[] = {name, nullptr};
+    static QApplication application(count, arguments);
+    return application;
+}
+
+Desk::Desk() {
+    applyTheme(testApplication(), ThemeChoice::Dark);
+    program = std::make_unique<Program>(platform.bundle(port), "");
+    program->start();
+    window = std::make_unique<MainWindow>(*program);
+}
+
+Desk::~Desk() { window.reset(); }
+
+void Desk::connect() {
+    ASSERT_TRUE(program->connect({LinkAddress::Kind::Serial, "/dev/zel3", 57600}, true));
+}
+
+void Desk::show() {
+    window->show();
+    window->showNow();
+    QApplication::processEvents();
+}
+
+}  // namespace zel

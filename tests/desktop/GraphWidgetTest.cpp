@@ -1,0 +1,125 @@
+// The graph's widget: zoom rectangle, pointer readout, cursors; pictures in files.
+
+#include <QFile>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QXmlStreamReader>
+
+#include "desktop/graph/GraphImage.h"
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+namespace {
+
+class GraphDesk : public Desk {
+  protected:
+    void SetUp() override {
+        connect();
+        show();
+    }
+    QPoint at(double x, double y) {
+        GraphWidget& graph = window->graph();
+        return {static_cast<int>(graph.xAxis->coordToPixel(x)),
+                static_cast<int>(graph.yAxis->coordToPixel(y))};
+    }
+    void drag(QPoint from, QPoint to) {
+        QTest::mousePress(&window->graph(), Qt::LeftButton, {}, from);
+        QTest::mouseMove(&window->graph(), to);
+        QTest::mouseRelease(&window->graph(), Qt::LeftButton, {}, to);
+    }
+};
+
+TEST_F(GraphDesk, ZoomRectangle_SetsBothAxesAndEndsTheMode) {
+    panel().cmdZoom.Click();
+    window->showNow();
+    drag(at(1e9, -40), at(2e9, -90));
+    const Graph& graph = panel().CWGraph1;
+    EXPECT_NEAR(graph.xAxis().Minimum, 1e9, 2e7);
+    EXPECT_NEAR(graph.xAxis().Maximum, 2e9, 2e7);
+    EXPECT_NEAR(graph.yAxis().Maximum, -40, 1);
+    EXPECT_NEAR(graph.yAxis().Minimum, -90, 1);
+    EXPECT_EQ(graph.TrackMode, 1);
+    EXPECT_TRUE(panel().GraphZoomed);
+}
+
+TEST_F(GraphDesk, ZoomRectangle_OfAFewPixels_ChangesNothing) {
+    panel().cmdZoom.Click();
+    window->showNow();
+    const QPoint start = at(1e9, -40);
+    drag(start, start + QPoint(2, 2));
+    EXPECT_EQ(panel().CWGraph1.xAxis().Maximum, 3e9);
+}
+
+TEST_F(GraphDesk, PointerOverThePlot_ShowsItsPlace) {
+    QTest::mouseMove(&window->graph(), at(1.5e9, -70));
+    EXPECT_EQ(panel().DeltaLabel.Caption.get().rfind("Cursor:1.", 0), 0U)
+        << panel().DeltaLabel.Caption.get();
+}
+
+TEST_F(GraphDesk, ShownCursor_IsDraggedAndSnapsToTheTrace) {
+    panel().MarkerCheckBox.Click();
+    window->showNow();
+    const GraphCursor before = panel().CWGraph1.cursor(1);
+    ASSERT_TRUE(before.Visible);
+    drag(at(before.X, -60), at(6e8, -60));
+    const GraphCursor& after = panel().CWGraph1.cursor(1);
+    EXPECT_NEAR(after.X, 6e8, 2e7);
+    EXPECT_EQ(panel().MarkerValue, after.X);
+    EXPECT_EQ(panel().MarkerLabel.Caption.get().rfind("Marker:", 0), 0U);
+}
+
+TEST_F(GraphDesk, HiddenCursor_IsNotDragged) {
+    const double before = panel().CWGraph1.cursor(1).X;
+    drag(at(before, -60), at(6e8, -60));
+    EXPECT_EQ(panel().CWGraph1.cursor(1).X, before);
+}
+
+TEST_F(GraphDesk, Png_IsWrittenWithThePlot) {
+    const QTemporaryDir folder;
+    const QString file = folder.filePath("graph.png");
+    QString error;
+    ASSERT_TRUE(
+        saveGraphImage(panel().CWGraph1, annotateView(panel(), program->variables()), file, &error))
+        << error.toStdString();
+    const QImage image(file);
+    EXPECT_EQ(image.size(), QSize(2000, 1240));
+    int tracePixels = 0;
+    for (int y = 0; y < image.height(); y += 2)
+        for (int x = 0; x < image.width(); x += 2)
+            if (const QColor c = image.pixelColor(x, y); c.red() > 200 && c.blue() < 120)
+                ++tracePixels;
+    EXPECT_GT(tracePixels, 1000);
+}
+
+TEST_F(GraphDesk, Svg_IsWellFormedAndKeepsTheZoomedTraceInside) {
+    panel().CWGraph1.setXRange(1e9, 1.1e9);
+    const QTemporaryDir folder;
+    const QString file = folder.filePath("graph.svg");
+    ASSERT_TRUE(saveGraphImage(panel().CWGraph1, annotateView(panel(), program->variables()), file,
+                               nullptr, {900, 500}));
+    QFile svg(file);
+    ASSERT_TRUE(svg.open(QIODevice::ReadOnly));
+    QXmlStreamReader reader(&svg);
+    int lines = 0;
+    while (!reader.atEnd())
+        if (reader.readNext() == QXmlStreamReader::StartElement && reader.name() == u"polyline")
+            ++lines;
+    EXPECT_FALSE(reader.hasError()) << reader.errorString().toStdString();
+    EXPECT_GT(lines, 0);
+}
+
+TEST_F(GraphDesk, PictureOfAnUnknownKind_IsRefusedInWords) {
+    QString error;
+    EXPECT_FALSE(saveGraphImage(panel().CWGraph1, {}, "graph.xyz", &error));
+    EXPECT_EQ(error, "Unknown kind of picture: .xyz (png or svg)");
+}
+
+TEST_F(GraphDesk, PictureThatCannotBeWritten_SaysWhichAndWhy) {
+    QString error;
+    EXPECT_FALSE(saveGraphImage(panel().CWGraph1, {}, "/no/such/folder/graph.png", &error));
+    EXPECT_TRUE(error.startsWith("Cannot write /no/such/folder/graph.png: "))
+        << error.toStdString();
+}
+
+}  // namespace
+}  // namespace zel

@@ -1,0 +1,234 @@
+// The panel's window: every control bound, shown as its form says, reachable by keyboard.
+
+#include <QDir>
+#include <QMenu>
+#include <QSet>
+#include <QTest>
+
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+namespace {
+
+bool needsNoWidget(const Control& control) {
+    const bool separator = control.kind() == ControlKind::MenuItem &&
+                           static_cast<const MenuItem&>(control).Caption.get() == "-";
+    return control.kind() == ControlKind::Timer || separator;
+}
+
+TEST_F(Desk, Panel_EveryControl_HasItsWidget) {
+    for (const Control* control : panel().controls()) {
+        if (needsNoWidget(*control)) continue;
+        EXPECT_NE(window->binder().widgetOf(*control), nullptr) << control->name();
+    }
+}
+
+TEST_F(Desk, ConnectionDialog_EveryControl_HasItsWidget) {
+    for (const Control* control : program->forms().main.controls())
+        EXPECT_NE(window->binder().widgetOf(*control), nullptr) << control->name();
+}
+
+TEST_F(Desk, ManualScaleDialog_EveryControl_HasItsWidget) {
+    for (const Control* control : program->forms().manualScale.controls())
+        EXPECT_NE(window->binder().widgetOf(*control), nullptr) << control->name();
+}
+
+TEST_F(Desk, Widgets_AreVisibleWhereTheFormSaysSo) {
+    connect();
+    show();
+    int looked = 0;
+    for (const Control* control : panel().controls()) {
+        auto* widget = widgetOf<QWidget>(*control);
+        if (widget == nullptr || control->kind() == ControlKind::Picture ||
+            control->kind() == ControlKind::Frame)
+            continue;
+        EXPECT_EQ(widget->isVisible(), control->Visible.get()) << control->name();
+        ++looked;
+    }
+    EXPECT_GT(looked, 50);
+}
+
+TEST_F(Desk, StopKey_IsHiddenUntilAViewRuns) {
+    show();
+    EXPECT_FALSE(widgetOf<QWidget>(panel().StopButton)->isVisible());
+    panel().StopButton.Visible = true;
+    EXPECT_TRUE(widgetOf<QWidget>(panel().StopButton)->isVisible());
+}
+
+TEST_F(Desk, KeyWithoutAHandler_IsDisabled) {
+    show();
+    ASSERT_FALSE(panel().cmdSpecial.Clicked.connected());
+    EXPECT_FALSE(widgetOf<QWidget>(panel().cmdSpecial)->isEnabled());
+    EXPECT_TRUE(widgetOf<QWidget>(panel().FrequencyButton)->isEnabled());
+}
+
+TEST_F(Desk, EnabledKeysAndBoxes_AreReachedByTab) {
+    connect();
+    show();
+    QSet<const QWidget*> chain;
+    const QWidget* at = window->focusWidget() != nullptr ? window->focusWidget() : window.get();
+    for (int i = 0; i < 1000; ++i) {
+        at = at->nextInFocusChain();
+        if ((at->focusPolicy() & Qt::TabFocus) != 0) chain.insert(at);
+    }
+    for (const Control* control : panel().controls()) {
+        const bool works = control->kind() == ControlKind::Button ||
+                           control->kind() == ControlKind::TextBox ||
+                           control->kind() == ControlKind::DropDownList ||
+                           control->kind() == ControlKind::CheckBox;
+        const auto* widget = widgetOf<QWidget>(*control);
+        if (!works || control == &panel().DebugTextBox || !widget->isEnabled()) continue;
+        EXPECT_TRUE(chain.contains(widget)) << control->name();
+    }
+}
+
+TEST_F(Desk, ClickOnSingle_ReadsASweep) {
+    connect();
+    show();
+    const auto before = panel().CWGraph1.plotSerial();
+    QTest::mouseClick(widgetOf<QPushButton>(panel().PlaySingleButton), Qt::LeftButton);
+    EXPECT_EQ(panel().CWGraph1.plotSerial(), before + 1);
+}
+
+TEST_F(Desk, TypingInASoftBox_ReplacesTheValueAndEnterSendsIt) {
+    connect();
+    show();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    ASSERT_EQ(box->text(), "1.5 GHz");
+    QTest::keyClicks(box, "900M");
+    EXPECT_EQ(panel().SoftTextBox(0).Text.get(), "900M");
+    QTest::keyClick(box, Qt::Key_Return);
+    EXPECT_EQ(program->variables().CenterFrequency, 900e6);
+    window->binder().flush();
+    EXPECT_EQ(widgetOf<QLabel>(panel().CFLabel)->text(), "Center: 900 MHz");
+}
+
+TEST_F(Desk, ArrowAheadOfTyping_KeepsTheText) {
+    connect();
+    show();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    box->setCursorPosition(0);
+    QTest::keyClick(box, Qt::Key_Right);
+    QTest::keyClicks(box, "2");
+    EXPECT_EQ(panel().SoftTextBox(0).Text.get(), "12.5 GHz");
+}
+
+TEST_F(Desk, LockedBox_TakesNoKeys) {
+    show();
+    auto* line = widgetOf<QLineEdit>(panel().DebugTextBox);
+    const QString before = line->text();
+    QTest::keyClicks(line, "abc");
+    EXPECT_EQ(line->text(), before);
+    EXPECT_TRUE(line->isReadOnly());
+}
+
+TEST_F(Desk, PickInAList_SendsTheChoice) {
+    connect();
+    panel().AmplitudeButton.Click();
+    show();
+    auto* list = widgetOf<QComboBox>(panel().ChoiceBox(1));
+    emit list->activated(2);
+    EXPECT_EQ(program->variables().ReferenceRange, 2);
+    window->binder().flush();
+    EXPECT_EQ(list->currentText(), "2dB/DIV");
+}
+
+TEST_F(Desk, ClickWhileWorkIsUnderWay_IsDropped) {
+    connect();
+    show();
+    auto* key = widgetOf<QPushButton>(panel().SpanButton);
+    panel().MousePointer = 11;
+    QTest::mouseClick(key, Qt::LeftButton);
+    EXPECT_EQ(panel().State, ControllerForm::Freq);
+    panel().MousePointer = 0;
+    QTest::mouseClick(key, Qt::LeftButton);
+    EXPECT_EQ(panel().State, ControllerForm::SPAN);
+}
+
+TEST_F(Desk, SoftKeyShortcut_PressesTheKey) {
+    connect();
+    panel().AmplitudeButton.Click();
+    show();
+    window->activateWindow();
+    QApplication::processEvents();
+    QTest::keyClick(window.get(), Qt::Key_F3);
+    EXPECT_EQ(panel().SoftTextBox(1).Text.get(), "10dB/DIV (0)");
+}
+
+TEST_F(Desk, ModalForm_ShowsAWindowThatClosesWithTheForm) {
+    show();
+    MainForm& form = program->forms().main;
+    form.Modal = true;
+    form.Show();
+    window->binder().flush();
+    auto* dialog = window->findChild<QDialog*>("MainForm");
+    ASSERT_NE(dialog, nullptr);
+    EXPECT_TRUE(dialog->isVisible());
+    EXPECT_TRUE(dialog->isModal());
+    form.Hide();
+    window->binder().flush();
+    EXPECT_FALSE(dialog->isVisible());
+}
+
+TEST_F(Desk, DialogClosedByTheUser_UnloadsItsForm) {
+    show();
+    ManualScaleForm& form = program->forms().manualScale;
+    panel().UtilityGraphSettings.Click();
+    window->binder().flush();
+    auto* dialog = window->findChild<QDialog*>("ManualScaleForm");
+    ASSERT_TRUE(dialog->isVisible());
+    dialog->close();
+    EXPECT_FALSE(form.Visible);
+    EXPECT_FALSE(form.loaded());
+}
+
+TEST_F(Desk, ClosingTheWindow_AsksAndStaysOnNo) {
+    show();
+    platform.boxes.answer(BoxAnswer::No);
+    EXPECT_FALSE(window->close());
+    platform.boxes.answer(BoxAnswer::Yes);
+    EXPECT_TRUE(window->close());
+    EXPECT_TRUE(program->ended());
+}
+
+struct Look {
+    const char* name;
+    ThemeChoice theme;
+    QSize size;
+};
+
+class Looks : public Desk, public testing::WithParamInterface<Look> {};
+
+/// The pictures stay beside the test's program, to be looked at.
+TEST_P(Looks, Window_FitsItsSizeWithNothingCut) {
+    applyTheme(testApplication(), GetParam().theme);
+    connect();
+    window->resize(GetParam().size);
+    show();
+    EXPECT_EQ(window->size(), GetParam().size);
+    for (const Control* control : panel().controls()) {
+        const auto* button = widgetOf<QPushButton>(*control);
+        if (button == nullptr || !button->isVisible()) continue;
+        const QRect inside(button->mapTo(window.get(), QPoint()), button->size());
+        EXPECT_TRUE(window->rect().contains(inside)) << control->name();
+        QSize needed;
+        for (const QString& line : button->text().split('\n'))
+            needed = needed.expandedTo(button->fontMetrics().size(0, line));
+        EXPECT_LE(needed.width(), button->width()) << control->name();
+    }
+    const QString folder = QApplication::applicationDirPath() + "/pictures";
+    ASSERT_TRUE(QDir().mkpath(folder));
+    EXPECT_TRUE(window->grab().save(folder + "/" + GetParam().name + ".png"));
+}
+
+INSTANTIATE_TEST_SUITE_P(Sizes, Looks,
+                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
+                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
+                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
+                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
+                         [](const auto& look) {
+                             return QString(look.param.name).replace('-', '_').toStdString();
+                         });
+
+}  // namespace
+}  // namespace zel

@@ -1,0 +1,189 @@
+// The platform on Qt over pseudo terminals and loopback sockets.
+
+#include <fcntl.h>
+#include <gtest/gtest.h>
+#include <pty.h>
+#include <termios.h>
+#include <unistd.h>
+
+#include <QTemporaryDir>
+#include <array>
+
+#include "desktop/platform/QtPlatform.h"
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+namespace {
+
+/// A pseudo terminal whose master the test holds.
+class Terminal {
+  public:
+    Terminal() {
+        std::array<char, 128> name{};
+        int slave = -1;
+        EXPECT_EQ(openpty(&master, &slave, name.data(), nullptr, nullptr), 0);
+        termios raw{};
+        tcgetattr(slave, &raw);
+        cfmakeraw(&raw);
+        tcsetattr(slave, TCSANOW, &raw);
+        ::close(slave);
+        path = name.data();
+    }
+    ~Terminal() { hangUp(); }
+    Terminal(const Terminal&) = delete;
+    Terminal& operator=(const Terminal&) = delete;
+    void send(const std::string& bytes) const {
+        EXPECT_EQ(::write(master, bytes.data(), bytes.size()), static_cast<ssize_t>(bytes.size()));
+    }
+    std::string received() const {
+        std::array<char, 4096> buffer{};
+        const ssize_t count = ::read(master, buffer.data(), buffer.size());
+        return count > 0 ? std::string(buffer.data(), static_cast<std::size_t>(count)) : "";
+    }
+    void hangUp() {
+        if (master >= 0) ::close(master);
+        master = -1;
+    }
+    int master = -1;
+    std::string path;
+};
+
+class OnQt : public testing::Test {
+  protected:
+    OnQt() { testApplication(); }
+    bool openPort(const std::string& name) {
+        SerialSetup setup;
+        setup.CommPort = name;
+        setup.Settings = "57600,N,8,1";
+        return platform.serialPort.open(setup);
+    }
+    QTemporaryDir home;
+    QtPlatform platform{home.path()};
+};
+
+TEST_F(OnQt, SerialPort_WritesAndReadsBytes) {
+    const Terminal line;
+    ASSERT_TRUE(openPort(line.path)) << platform.serialPort.problem();
+    platform.serialPort.output("GET\r");
+    EXPECT_EQ(line.received(), "GET\r");
+    line.send(std::string("0\r\0\xFF", 4));
+    platform.events.wait(1000);
+    EXPECT_EQ(platform.serialPort.input(), std::string("0\r\0\xFF", 4));
+    EXPECT_EQ(platform.serialPort.input(), "");
+}
+
+TEST_F(OnQt, Wait_EndsWithTheFirstByteOfTheLine) {
+    const Terminal line;
+    ASSERT_TRUE(openPort(line.path));
+    int waits = 0;
+    platform.events.schedule(5, [&line] { line.send("0\r"); });
+    std::string got;
+    while (got.empty() && waits < 20) {
+        platform.events.wait(60000);
+        ++waits;
+        got = platform.serialPort.input();
+    }
+    EXPECT_EQ(got, "0\r");
+    EXPECT_LT(waits, 20);
+}
+
+TEST_F(OnQt, BytesThatTheLoopFetched_ComeAheadOfThoseOnTheLine) {
+    const Terminal line;
+    ASSERT_TRUE(openPort(line.path));
+    line.send("first ");
+    platform.events.sleep(10);  // the loop fetches what has come
+    line.send("second");
+    std::string got = platform.serialPort.input();
+    for (int i = 0; i < 50 && got.size() < 12; ++i) {
+        platform.events.wait(20);
+        got += platform.serialPort.input();
+    }
+    EXPECT_EQ(got, "first second");
+}
+
+TEST_F(OnQt, FarEndThatCloses_ClosesThePortAndSaysSo) {
+    Terminal line;
+    ASSERT_TRUE(openPort(line.path));
+    line.hangUp();
+    for (int i = 0; i < 50 && platform.serialPort.isOpen(); ++i) {
+        platform.events.wait(20);
+        platform.serialPort.input();
+    }
+    EXPECT_FALSE(platform.serialPort.isOpen());
+    EXPECT_NE(platform.serialPort.problem().find(line.path + " has gone"), std::string::npos);
+    EXPECT_EQ(platform.serialPort.input(), "");
+    platform.serialPort.output("nothing happens");
+}
+
+TEST_F(OnQt, PortThatIsNotThere_IsNamed) {
+    EXPECT_FALSE(openPort("/dev/zel3-is-not-here"));
+    EXPECT_EQ(platform.serialPort.problem(),
+              "/dev/zel3-is-not-here is not there. Check the cable and the name of the port.");
+}
+
+TEST_F(OnQt, PortHeldByAnother_IsNamed) {
+    const Terminal line;
+    ASSERT_TRUE(openPort(line.path));
+    QtSerialPort second(platform.events);
+    SerialSetup setup;
+    setup.CommPort = line.path;
+    setup.Settings = "57600,N,8,1";
+    EXPECT_FALSE(second.open(setup));
+    EXPECT_EQ(second.problem(),
+              line.path + " is held by another program. Close it there and try again.");
+}
+
+TEST_F(OnQt, ScheduledTasks_RunByTheirTime) {
+    std::string order;
+    platform.events.schedule(20, [&] { order += "b"; });
+    platform.events.schedule(1, [&] { order += "a"; });
+    const TaskId cancelled = platform.events.schedule(5, [&] { order += "x"; });
+    platform.events.cancel(cancelled);
+    for (int i = 0; i < 200 && order.size() < 2; ++i) platform.events.wait(20);
+    EXPECT_EQ(order, "ab");
+}
+
+TEST_F(OnQt, Sockets_CarryBytesBothWaysAndTellTheirState) {
+    QtSocket& server = platform.serverSocket;
+    QtSocket& client = platform.tcpSocket;
+    int port = 40000;
+    do {
+        server.close();
+        server.listen(++port);
+    } while (server.state() == SocketState::Error && port < 40100);
+    ASSERT_EQ(server.state(), SocketState::Listening);
+    server.ConnectionRequest.connect([&server](int id) { server.accept(id); });
+    EXPECT_EQ(client.state(), SocketState::Closed);
+    client.connectTo("127.0.0.1", port);
+    for (int i = 0; i < 200 && server.state() != SocketState::Connected; ++i)
+        platform.events.wait(20);
+    ASSERT_EQ(client.state(), SocketState::Connected);
+    EXPECT_TRUE(client.sendData("IDN?\r"));
+    for (int i = 0; i < 200 && server.peekData().empty(); ++i) platform.events.wait(20);
+    EXPECT_EQ(server.peekData(), "IDN?\r");
+    EXPECT_EQ(server.getData(), "IDN?\r");
+    EXPECT_EQ(server.getData(), "");
+    client.close();
+    EXPECT_EQ(client.state(), SocketState::Closed);
+    EXPECT_FALSE(client.sendData("x"));
+    for (int i = 0; i < 200 && server.state() == SocketState::Connected; ++i)
+        platform.events.wait(20);
+    EXPECT_NE(server.state(), SocketState::Connected);
+}
+
+TEST_F(OnQt, Socket_ToAPortWhereNobodyListens_EndsInError) {
+    platform.tcpSocket.connectTo("127.0.0.1", 1);
+    for (int i = 0; i < 200 && platform.tcpSocket.state() == SocketState::Connecting; ++i)
+        platform.events.wait(20);
+    EXPECT_EQ(platform.tcpSocket.state(), SocketState::Error);
+}
+
+TEST_F(OnQt, Settings_SurviveTheProgram) {
+    platform.settings.set("ZELRemote", "DIRECTCON", "CommPort", "3");
+    QtPlatform later(home.path());
+    EXPECT_EQ(later.settings.get("ZELRemote", "DIRECTCON", "CommPort", "0"), "3");
+    EXPECT_EQ(platform.settings.get("ZELRemote", "DIRECTCON", "absent", "R"), "R");
+}
+
+}  // namespace
+}  // namespace zel
