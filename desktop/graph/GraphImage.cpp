@@ -81,6 +81,7 @@ bool saveGraphImage(const Graph& graph, const ViewAnnotations& view, const QStri
     shown.setTrigger(graph.trigger());
     for (int i = 1; i <= graph.cursorCount(); ++i) shown.addCursor(graph.cursor(i));
     clipToView(shown, graph);
+    if (!svg) picture.setTraceWidth(1 / kOversampling);
     picture.update(shown, view);
     const QByteArray bytes = svg ? svgOf(plot, size) : pngOf(plot, size);
     QSaveFile file(path);

@@ -29,6 +29,8 @@ class GraphPlot {
 
     /// Takes the data and the texts over; the caller replots.
     void update(const Graph& graph, const ViewAnnotations& view);
+    /// In pixels of the plot. One pixel of the device is what Qt draws fast.
+    void setTraceWidth(double width) { trace_->setPen(QPen(colors_.trace, width)); }
     QCPAxisRect& axisRect() { return *axisRect_; }
     /// The 1-based index of the cursor within reach of a pixel, or 0.
     int cursorAt(const QPointF& pixel) const;
