@@ -4,6 +4,7 @@
 #include <QCommandLineParser>
 #include <QTimer>
 #include <cstdio>
+#include <cstdlib>
 
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/MainWindow.h"
@@ -77,7 +78,11 @@ int main(int argc, char** argv) {
     zel::QtPlatform platform(options.home);
     zel::Program program(platform.bundle(), options.words.toStdString());
     int result = 0;
-    program.Ended.connect([] { QApplication::quit(); });
+    program.Ended.connect([&result] {
+        // At once: no view, wait or window on the stack holds the end up.
+        std::fflush(nullptr);
+        std::_Exit(result);
+    });
     zel::MainWindow window(program);
     if (options.size.isValid()) window.resize(options.size);
     const auto run = [&] {

@@ -191,6 +191,30 @@ TEST_F(Desk, ClosingTheWindow_AsksAndStaysOnNo) {
     EXPECT_TRUE(program->ended());
 }
 
+/// A picture beside the test's program, to be looked at.
+bool savePicture(QWidget& widget, const QString& name) {
+    const QString folder = QApplication::applicationDirPath() + "/pictures";
+    return QDir().mkpath(folder) && widget.grab().save(folder + "/" + name + ".png");
+}
+
+TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
+    show();
+    platform.ports.ports = {"/dev/ttyUSB0", "/dev/ttyS0"};
+    platform.events.schedule(10, [this] {
+        window->binder().flush();
+        auto* dialog = window->findChild<QDialog*>("MainForm");
+        EXPECT_TRUE(dialog->isVisible());
+        MainForm& form = program->forms().main;
+        EXPECT_EQ(widgetOf<QComboBox>(form.COMList)->currentText(), "/dev/ttyUSB0");
+        EXPECT_TRUE(widgetOf<QWidget>(form.ZELButton)->isVisible());
+        EXPECT_FALSE(widgetOf<QWidget>(form.TelNumberBox)->isVisible());
+        EXPECT_TRUE(savePicture(*dialog, "connection"));
+        form.CancelConnButton1.Click();
+    });
+    panel().Direct.Click();
+    EXPECT_FALSE(program->forms().main.Visible);
+}
+
 struct Look {
     const char* name;
     ThemeChoice theme;
@@ -199,7 +223,6 @@ struct Look {
 
 class Looks : public Desk, public testing::WithParamInterface<Look> {};
 
-/// The pictures stay beside the test's program, to be looked at.
 TEST_P(Looks, Window_FitsItsSizeWithNothingCut) {
     applyTheme(testApplication(), GetParam().theme);
     connect();
@@ -216,9 +239,7 @@ TEST_P(Looks, Window_FitsItsSizeWithNothingCut) {
             needed = needed.expandedTo(button->fontMetrics().size(0, line));
         EXPECT_LE(needed.width(), button->width()) << control->name();
     }
-    const QString folder = QApplication::applicationDirPath() + "/pictures";
-    ASSERT_TRUE(QDir().mkpath(folder));
-    EXPECT_TRUE(window->grab().save(folder + "/" + GetParam().name + ".png"));
+    EXPECT_TRUE(savePicture(*window, GetParam().name));
 }
 
 INSTANTIATE_TEST_SUITE_P(Sizes, Looks,
