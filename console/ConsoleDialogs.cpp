@@ -1,0 +1,86 @@
+#include "console/ConsoleDialogs.h"
+
+#include <array>
+#include <utility>
+
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr std::array<std::pair<BoxIcon, const char*>, 6> kIcons{{
+    {BoxIcon::Plain, "plain"},
+    {BoxIcon::Critical, "critical"},
+    {BoxIcon::Question, "question"},
+    {BoxIcon::Warning, "warning"},
+    {BoxIcon::Exclamation, "exclamation"},
+    {BoxIcon::Information, "information"},
+}};
+
+const char* iconName(BoxIcon icon) {
+    for (const auto& [known, name] : kIcons)
+        if (known == icon) return name;
+    return "plain";
+}
+
+std::string oneLine(const std::string& text) {
+    const std::string joined = replaceAll(text, kCrLf, "\n");
+    return replaceAll(replaceAll(joined, "\r", "\n"), "\n", " / ");
+}
+
+struct Word {
+    const char* text;
+    bool affirmative;
+};
+constexpr std::array<Word, 4> kWords{
+    {{"yes", true}, {"ok", true}, {"no", false}, {"cancel", false}}};
+
+bool isCancel(const std::string& answer) { return lowerCase(trimmed(answer)) == "cancel"; }
+
+}  // namespace
+
+std::optional<std::string> AnswerQueue::next() {
+    if (answers_.empty()) return std::nullopt;
+    std::string answer = std::move(answers_.front());
+    answers_.pop_front();
+    return answer;
+}
+
+std::string boxLine(BoxIcon icon, const std::string& title, const std::string& text) {
+    return std::string("box[") + iconName(icon) + "] " + oneLine(title) + " | " + oneLine(text);
+}
+
+BoxAnswer ConsoleBoxes::show(const Box& box) {
+    output_.repeatable(boxLine(box.icon, box.title, box.text));
+    if (box.buttons == BoxButtons::Ok) return BoxAnswer::Ok;
+    const bool yesNo = box.buttons == BoxButtons::YesNo;
+    const BoxAnswer agreed = yesNo ? BoxAnswer::Yes : BoxAnswer::Ok;
+    const BoxAnswer refused = yesNo ? BoxAnswer::No : BoxAnswer::Cancel;
+    const std::optional<std::string> answer = answers_.next();
+    if (!answer) return agreed;
+    for (const Word& word : kWords)
+        if (lowerCase(trimmed(*answer)) == word.text) return word.affirmative ? agreed : refused;
+    if (misfit) misfit(*answer);
+    return agreed;
+}
+
+std::optional<std::string> ConsoleBoxes::prompt(const std::string& text, const std::string& title,
+                                                const std::string& preset) {
+    output_.repeatable(boxLine(BoxIcon::Question, title, text));
+    std::optional<std::string> answer = answers_.next();
+    if (!answer || lowerCase(trimmed(*answer)) == "ok") return preset;
+    if (isCancel(*answer)) return std::nullopt;
+    return answer;
+}
+
+std::optional<std::string> ConsoleFileDialogs::save(const FileDialogRequest&) { return next(); }
+
+std::optional<std::string> ConsoleFileDialogs::open(const FileDialogRequest&) { return next(); }
+
+std::optional<std::string> ConsoleFileDialogs::next() {
+    std::optional<std::string> answer = answers_.next();
+    if (answer && isCancel(*answer)) answer.reset();
+    return answer;
+}
+
+}  // namespace zel

@@ -1,0 +1,102 @@
+#include "console/Fronts.h"
+
+#include <QApplication>
+#include <QCoreApplication>
+
+#include "ZELSim/InProcessPort.h"
+#include "console/Address.h"
+#include "desktop/graph/GraphImage.h"
+#include "desktop/platform/QtPlatform.h"
+#include "platform/virtual/MemoryServices.h"
+#include "platform/virtual/ScriptedSocket.h"
+#include "platform/virtual/VirtualTime.h"
+#include "trace/ViewAnnotations.h"
+
+namespace zel {
+namespace {
+
+class SilentDebugChannel : public DebugChannel {
+  public:
+    void output(const std::string&) override {}
+};
+
+class SimulatorFront : public Front {
+  public:
+    explicit SimulatorFront(const std::string& home) : folder_(QString::fromStdString(home)) {
+        ports_.ports = {kSimulatorPort};
+        tcpSocket_.connectsTo(SocketState::Error);  // there is no network in here
+    }
+    const Clock& clock() const override { return clock_; }
+    Events& events() override { return events_; }
+    Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
+        return {clock_,    served, boxes,      port_,     ports_,   tcpSocket_, serverSocket_,
+                settings_, debug_, clipboard_, launcher_, startup_, folder_,    dialogs};
+    }
+
+  private:
+    VirtualClock clock_;
+    VirtualEvents events_{clock_};
+    zelsim::InProcessPort port_{clock_, events_};
+    FixedPortList ports_;
+    ScriptedSocket tcpSocket_{events_};
+    ScriptedSocket serverSocket_{events_};
+    QtApplicationFolder folder_;
+    QtSettingsStore settings_{folder_};
+    SilentDebugChannel debug_;
+    MemoryClipboard clipboard_;
+    MemoryLauncher launcher_;
+    MemoryStartupFolder startup_;
+};
+
+class PortFront : public Front {
+  public:
+    explicit PortFront(const std::string& home) : qt_(QString::fromStdString(home)) {}
+    const Clock& clock() const override { return qt_.clock; }
+    Events& events() override { return qt_.events; }
+    Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
+        return {qt_.clock,     served,           boxes,        qt_.serialPort, qt_.serialPorts,
+                qt_.tcpSocket, qt_.serverSocket, qt_.settings, qt_.debug,      clipboard_,
+                qt_.launcher,  qt_.startup,      qt_.folder,   dialogs};
+    }
+
+  private:
+    QtPlatform qt_;
+    MemoryClipboard clipboard_;  // the system's needs a window
+};
+
+}  // namespace
+
+struct ToolkitSession::Application {
+    std::unique_ptr<QCoreApplication> object;
+};
+
+ToolkitSession::ToolkitSession(int& argc, char** argv, bool windows)
+    : application_(std::make_unique<Application>()) {
+    QCoreApplication::setApplicationName("ZELRemote");
+    if (windows) {
+        if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
+        application_->object = std::make_unique<QApplication>(argc, argv);
+    } else {
+        application_->object = std::make_unique<QCoreApplication>(argc, argv);
+    }
+}
+
+ToolkitSession::~ToolkitSession() = default;
+
+std::unique_ptr<Front> makeSimulatorFront(const std::string& home) {
+    return std::make_unique<SimulatorFront>(home);
+}
+
+std::unique_ptr<Front> makePortFront(const std::string& home) {
+    return std::make_unique<PortFront>(home);
+}
+
+std::string writeGraphImage(Program& program, const std::string& file) {
+    const ControllerForm& panel = program.forms().controller;
+    QString problem;
+    const bool written = saveGraphImage(panel.CWGraph1, annotateView(panel, program.variables()),
+                                        QString::fromStdString(file), &problem);
+    return written ? std::string() : "the image could not be written: " + problem.toStdString();
+}
+
+}  // namespace zel

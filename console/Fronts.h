@@ -1,0 +1,42 @@
+#pragma once
+// The platforms of the console: real ports over Qt, or the built-in simulator in virtual time.
+
+#include <memory>
+#include <string>
+
+#include "platform/Platform.h"
+#include "shell/Program.h"
+
+namespace zel {
+
+/// The toolkit's application object, which must stand ahead of all else. With `windows` pictures
+/// can be drawn, on no screen unless QT_QPA_PLATFORM names one.
+class ToolkitSession {
+  public:
+    ToolkitSession(int& argc, char** argv, bool windows);
+    ~ToolkitSession();
+    ToolkitSession(const ToolkitSession&) = delete;
+    ToolkitSession& operator=(const ToolkitSession&) = delete;
+
+  private:
+    struct Application;
+    std::unique_ptr<Application> application_;
+};
+
+class Front {
+  public:
+    virtual ~Front() = default;
+    virtual const Clock& clock() const = 0;
+    virtual Events& events() = 0;
+    /// The platform with the given event loop, which stands in front of `events`.
+    virtual Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) = 0;
+};
+
+/// `home` is the application's folder; empty for the user's own.
+std::unique_ptr<Front> makeSimulatorFront(const std::string& home);
+std::unique_ptr<Front> makePortFront(const std::string& home);
+
+/// Draws the panel's graph; what went wrong, else an empty text.
+std::string writeGraphImage(Program& program, const std::string& file);
+
+}  // namespace zel

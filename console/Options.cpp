@@ -1,0 +1,134 @@
+#include "console/Options.h"
+
+#include <CLI/CLI.hpp>
+#include <algorithm>
+#include <map>
+#include <string>
+#include <vector>
+
+#include "console/PanelSession.h"
+#include "shell/VersionInfo.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr int kMostSweeps = 1000000;
+constexpr const char* kImageEndings[] = {".png", ".svg"};
+
+/// A keyword goes over the wire as a line of its own, so it may hold no line end.
+std::string keywordProblem(const std::string& keyword) {
+    const bool plain =
+        std::all_of(keyword.begin(), keyword.end(), [](char c) { return c >= ' ' && c <= '~'; });
+    return plain && !trimmed(keyword).empty() ? std::string() : "is no keyword: " + keyword;
+}
+
+std::string settingProblem(const std::string& setting) {
+    const auto comma = setting.find(',');
+    if (comma == 0 || comma == std::string::npos) return "takes KEYWORD,VALUE";
+    return keywordProblem(setting);
+}
+
+std::string imageProblem(const std::string& file) {
+    const std::string name = lowerCase(file);
+    for (const std::string ending : kImageEndings) {
+        const bool longer = name.size() > ending.size();
+        if (longer && name.substr(name.size() - ending.size()) == ending) return {};
+    }
+    return "takes a file that ends in .png or .svg";
+}
+
+struct Parser {
+    CLI::App app{"ZELRemote without a window: works a ZEL3 spectrum analyser from the console.",
+                 "zelctl"};
+    std::string connect;
+    std::map<const CLI::App*, Verb> verbs;
+
+    explicit Parser(Options& options) {
+        app.set_version_flag("--version", "zelctl " + versionText(kVersion));
+        app.add_option("--connect", connect,
+                       "The instrument: serial:DEVICE[@BAUD] (57600), tcp:HOST:PORT, or sim: for "
+                       "the built-in simulator")
+            ->type_name("URL");
+        app.add_option("--home", options.home, "Folder of the program's files and settings")
+            ->type_name("DIR");
+        app.add_option("--words", options.words, "Words of the program's command line")
+            ->type_name("TEXT");
+        app.add_flag("--verbose", options.verbose,
+                     "Each step of the exchanges on standard error, with the time in ms");
+        app.require_subcommand(1);
+        app.fallthrough();
+
+        verb(Verb::Info, "info", "Prints identity and settings of the instrument");
+        CLI::App* get = verb(Verb::Get, "get", "Asks for one value and prints the answer");
+        get->add_option("KEYWORD", options.argument, "Word of the instrument, such as FREQ")
+            ->required()
+            ->check(keywordProblem, "");
+        CLI::App* set = verb(Verb::Set, "set", "Changes one setting");
+        set->add_option("SETTING", options.argument, "KEYWORD,VALUE, such as FREQ,1500000000")
+            ->required()
+            ->check(settingProblem, "");
+        CLI::App* cmd = verb(Verb::Cmd, "cmd", "Carries out one command");
+        cmd->add_option("KEYWORD", options.argument, "Word of the instrument, such as INIT")
+            ->required()
+            ->check(keywordProblem, "");
+        CLI::App* sweep = verb(Verb::Sweep, "sweep", "Reads sweeps and prints them as x,value");
+        sweep->add_option("--count", options.count, "How many sweeps")
+            ->check(CLI::Range(1, kMostSweeps));
+        sweep->add_option("--image", options.image, "Draws the graph into a png or svg file")
+            ->type_name("FILE")
+            ->check(imageProblem, "");
+        CLI::App* panel =
+            verb(Verb::Panel, "panel", "Works the panel by the names of its controls");
+        panel->add_option("FILE", options.argument, "Lines of commands; standard input without it");
+    }
+
+    CLI::App* verb(Verb which, const std::string& name, const std::string& what) {
+        CLI::App* command = app.add_subcommand(name, what);
+        verbs[command] = which;
+        return command;
+    }
+};
+
+std::string missing(const Options& options) {
+    if (options.verb == Verb::Panel) return {};
+    if (!options.address) return "this verb needs an instrument: --connect URL";
+    if (upperCase(options.words).find("SERVER") != std::string::npos)
+        return "the word SERVER goes with the verb panel only";
+    return {};
+}
+
+}  // namespace
+
+std::optional<int> parseOptions(int argc, const char* const* argv, Options& options,
+                                std::ostream& out, std::ostream& errors) {
+    Parser parser(options);
+    try {
+        parser.app.parse(argc, argv);
+    } catch (const CLI::ParseError& problem) {
+        const std::vector<std::string> unknown = parser.app.remaining();
+        if (problem.get_exit_code() != 0 && parser.app.get_subcommands().empty() &&
+            !unknown.empty()) {
+            errors << "zelctl: there is no verb \"" << unknown.front()
+                   << "\"\nRun with --help for more information.\n";
+            return kWrongUse;
+        }
+        return parser.app.exit(problem, out, errors) == 0 ? kDone : kWrongUse;
+    }
+    options.verb = parser.verbs.at(parser.app.get_subcommands().front());
+    if (!parser.connect.empty()) {
+        options.address = parseAddress(parser.connect);
+        if (!options.address) {
+            errors << "zelctl: --connect takes serial:DEVICE[@BAUD], tcp:HOST:PORT or sim:, not \""
+                   << parser.connect << "\"\n";
+            return kWrongUse;
+        }
+    }
+    if (const std::string problem = missing(options); !problem.empty()) {
+        errors << "zelctl: " << problem << '\n';
+        return kWrongUse;
+    }
+    return std::nullopt;
+}
+
+}  // namespace zel

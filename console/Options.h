@@ -1,0 +1,30 @@
+#pragma once
+// The command line of the tool.
+
+#include <optional>
+#include <ostream>
+#include <string>
+
+#include "console/Address.h"
+
+namespace zel {
+
+enum class Verb { Info, Get, Set, Cmd, Sweep, Panel };
+
+struct Options {
+    std::optional<ConnectAddress> address;
+    std::string home;   ///< the application's folder; empty for the user's own
+    std::string words;  ///< the program's command line
+    bool verbose = false;
+    Verb verb = Verb::Info;
+    std::string argument;  ///< keyword of get, set, cmd; file of panel
+    int count = 1;         ///< sweeps
+    std::string image;     ///< file of the graph's picture; empty for none
+};
+
+/// Fills the options. An exit status when the run is over with that: 0 behind a help text on
+/// `out`, 2 behind the reason on `errors`.
+std::optional<int> parseOptions(int argc, const char* const* argv, Options& options,
+                                std::ostream& out, std::ostream& errors);
+
+}  // namespace zel

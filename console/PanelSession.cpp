@@ -1,0 +1,240 @@
+#include "console/PanelSession.h"
+
+#include <algorithm>
+#include <utility>
+
+#include "console/ControlAccess.h"
+#include "console/GraphText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+/// How often a line is looked for while real time passes.
+constexpr int kLookMs = 20;
+/// Commands that may wait for one another; more is no use of a panel.
+constexpr int kDeepest = 16;
+constexpr int kLongestPumpMs = 24 * 3600 * 1000;
+constexpr std::string_view kBlanks = " \t";
+constexpr std::string_view kUtf8Mark = "\xEF\xBB\xBF";
+
+/// The first word of a text, and what stands behind it and one blank.
+std::pair<std::string_view, std::string_view> firstWord(std::string_view text) {
+    const auto end = text.find_first_of(kBlanks);
+    if (end == std::string_view::npos) return {text, {}};
+    return {text.substr(0, end), text.substr(end + 1)};
+}
+
+}  // namespace
+
+struct PanelSession::CommandRow {
+    std::string_view word;
+    Command command;
+};
+
+const PanelSession::CommandRow PanelSession::kCommands[] = {
+    {"click", &PanelSession::click},     {"type", &PanelSession::type},
+    {"key", &PanelSession::key},         {"choose", &PanelSession::choose},
+    {"set", &PanelSession::set},         {"show", &PanelSession::show},
+    {"connect", &PanelSession::connect}, {"disconnect", &PanelSession::disconnect},
+    {"answer", &PanelSession::answer},   {"pump", &PanelSession::pump},
+    {"quit", &PanelSession::quit},
+};
+
+PanelSession::PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address)
+    : program_(program), m_(means), address_(std::move(address)), live_(program.forms()) {
+    m_.events.whileWaiting = [this](int ms) { return whileWaiting(ms); };
+    program_.Ended.connect([this] { ended_ = true; });
+}
+
+PanelSession::~PanelSession() { m_.events.whileWaiting = nullptr; }
+
+int PanelSession::run() {
+    live_.beginCommand();
+    program_.start();
+    live_.endCommand();
+    m_.output.settle();
+    serveLines();
+    if (!program_.ended()) program_.disconnect();
+    m_.output.settle();
+    return status_;
+}
+
+void PanelSession::complain(const std::string& what) {
+    m_.errors.line("zelctl: line " + std::to_string(line_) + ": " + what);
+    status_ = kWrongUse;
+}
+
+void PanelSession::serveLines() {
+    while (!ended_ && !program_.ended()) {
+        if (microsLeft() > 0) {
+            idle(kLongestPumpMs);
+        } else if (!readAndExecute()) {
+            idle(kLookMs);
+        }
+    }
+}
+
+/// The hook of the event loop; true when the wait is over.
+bool PanelSession::whileWaiting(int ms) {
+    if (!live_.fresh()) return false;
+    if (depth_ >= kDeepest) ended_ = true;
+    if (ended_ || program_.ended()) {
+        live_.end();
+        return false;
+    }
+    m_.output.settle();
+    if (microsLeft() > 0) {
+        idle(ms);
+    } else if (!readAndExecute()) {
+        idle(std::min(ms, kLookMs));
+    }
+    return true;
+}
+
+/// False when no line has come yet.
+bool PanelSession::readAndExecute() {
+    std::string line;
+    switch (m_.input.next(line, m_.virtualTime)) {
+        case LineInput::Got::Nothing:
+            return false;
+        case LineInput::Got::End:
+            ended_ = true;
+            return true;
+        case LineInput::Got::TooLong:
+            ++line_;
+            complain("the line is too long");
+            return true;
+        case LineInput::Got::Line:
+            break;
+    }
+    if (++line_ == 1 && startsWith(line, kUtf8Mark)) line.erase(0, kUtf8Mark.size());
+    execute(wireToUtf8(line));
+    return true;
+}
+
+void PanelSession::execute(std::string_view line) {
+    if (!line.empty() && line.back() == '\r') line.remove_suffix(1);
+    line.remove_prefix(std::min(line.find_first_not_of(kBlanks), line.size()));
+    if (line.empty() || line.front() == '#') return;
+    const auto [word, rest] = firstWord(line);
+    for (const CommandRow& row : kCommands) {
+        if (row.word != word) continue;
+        live_.beginCommand();
+        ++depth_;
+        (this->*row.command)(rest);
+        --depth_;
+        live_.endCommand();
+        m_.output.settle();
+        return;
+    }
+    complain("there is no command \"" + std::string(word) + "\"");
+}
+
+/// Lets events run, no longer than to the end of a pump.
+void PanelSession::idle(int ms) {
+    const std::int64_t left = microsLeft();
+    if (left > 0) ms = static_cast<int>(std::clamp<std::int64_t>(left / 1000, 1, ms));
+    m_.events.inner().wait(ms);
+}
+
+std::int64_t PanelSession::microsLeft() const { return pumpUntil_ - m_.clock.micros(); }
+
+Control* PanelSession::find(std::string_view name) {
+    Control* control = program_.forms().control(name);
+    if (control == nullptr) complain("there is no control \"" + std::string(name) + "\"");
+    return control;
+}
+
+void PanelSession::tell(Done done, std::string_view name) {
+    const std::string who = "refused: " + std::string(name);
+    switch (done) {
+        case Done::Yes:
+            return;
+        case Done::Hidden:
+            return m_.output.line(who + " is hidden");
+        case Done::Disabled:
+            return m_.output.line(who + " is disabled");
+        case Done::Locked:
+            return m_.output.line(who + " is locked");
+        case Done::Unfit:
+            return complain("\"" + std::string(name) + "\" cannot do that");
+        case Done::NoKey:
+            return complain("there is no key of that name");
+        case Done::NoEntry:
+            return complain("\"" + std::string(name) + "\" has no such entry");
+    }
+}
+
+void PanelSession::click(std::string_view rest) {
+    const std::string name = trimmed(rest);
+    if (Control* control = find(name)) tell(clickControl(*control), name);
+}
+
+void PanelSession::type(std::string_view rest) {
+    const auto [name, text] = firstWord(rest);
+    if (Control* control = find(name)) tell(typeInto(*control, std::string(text)), name);
+}
+
+void PanelSession::key(std::string_view rest) {
+    const auto [name, which] = firstWord(rest);
+    if (Control* control = find(name)) tell(pressNamedKey(*control, trimmed(which)), name);
+}
+
+void PanelSession::choose(std::string_view rest) {
+    const auto [name, index] = firstWord(rest);
+    if (Control* control = find(name)) tell(chooseEntry(*control, trimmed(index)), name);
+}
+
+void PanelSession::set(std::string_view rest) {
+    const auto [name, text] = firstWord(rest);
+    if (Control* control = find(name)) tell(putText(*control, std::string(text)), name);
+}
+
+void PanelSession::show(std::string_view rest) {
+    const std::string path = trimmed(rest);
+    if (path == "graph") {
+        for (const std::string& line : graphLines(program_.forms().controller.CWGraph1))
+            m_.output.line(line);
+        return;
+    }
+    const std::optional<std::string> text = textOf(program_.forms(), program_.variables(), path);
+    if (text) {
+        m_.output.line(*text);
+    } else {
+        complain("there is nothing to show as \"" + path + "\"");
+    }
+}
+
+void PanelSession::connect(std::string_view) {
+    if (!address_) return complain("connect needs the option --connect");
+    const ControllerForm& panel = program_.forms().controller;
+    const bool tcp = address_->kind == LinkAddress::Kind::Tcp;
+    const MenuItem& item = tcp ? panel.TCPConnection : panel.Direct;
+    if (const Done refused = refusal(item, false); refused != Done::Yes)
+        return tell(refused, item.name());
+    if (program_.connect(*address_, true)) return;
+    m_.output.settle();
+    m_.errors.line("zelctl: line " + std::to_string(line_) + ": no instrument was connected");
+    if (status_ == kDone) status_ = kLinkFailed;
+}
+
+void PanelSession::disconnect(std::string_view) { click("Disconnect"); }
+
+void PanelSession::answer(std::string_view rest) { m_.answers.add(std::string(rest)); }
+
+void PanelSession::pump(std::string_view rest) {
+    const std::string text = trimmed(rest);
+    const bool digits = !text.empty() && text.size() <= 8 &&
+                        text.find_first_not_of("0123456789") == std::string::npos;
+    const int ms = digits ? std::stoi(text) : -1;
+    if (ms < 0 || ms > kLongestPumpMs)
+        return complain("pump takes milliseconds, at most a day of them");
+    if (ms == 0) return m_.events.pump();
+    // The time passes between the commands, or where the command around this one waits.
+    pumpUntil_ = m_.clock.micros() + std::int64_t{ms} * 1000;
+}
+
+void PanelSession::quit(std::string_view) { ended_ = true; }
+
+}  // namespace zel

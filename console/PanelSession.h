@@ -1,0 +1,86 @@
+#pragma once
+// Works the panel by the names of its controls, one command a line.
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "console/Address.h"
+#include "console/ConsoleDialogs.h"
+#include "console/ControlActions.h"
+#include "console/LineInput.h"
+#include "console/LineOutput.h"
+#include "console/LiveStates.h"
+#include "console/ServingEvents.h"
+#include "platform/Clock.h"
+#include "shell/Program.h"
+
+namespace zel {
+
+/// Exit statuses of the tool.
+enum Status : int { kDone = 0, kLinkFailed = 1, kWrongUse = 2 };
+
+/// Lines are read between commands, and inside of a command while a modal form, a continuous view,
+/// a recording or a script runs.
+class PanelSession {
+  public:
+    struct Means {
+        const Clock& clock;
+        ServingEvents& events;
+        LineInput& input;
+        LineOutput& output;
+        LineOutput& errors;
+        AnswerQueue& answers;
+        bool virtualTime = false;  ///< no time passes while a line is awaited
+    };
+    PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address);
+    ~PanelSession();
+    PanelSession(const PanelSession&) = delete;
+    PanelSession& operator=(const PanelSession&) = delete;
+
+    /// Starts the program and serves lines to the end. An unknown word or name is told on the
+    /// errors and makes the status 2; a connection that did not come about makes it 1.
+    int run();
+    /// Tells of wrong use; the session goes on.
+    void complain(const std::string& what);
+
+  private:
+    using Command = void (PanelSession::*)(std::string_view rest);
+    struct CommandRow;
+    static const CommandRow kCommands[];
+
+    void serveLines();
+    bool whileWaiting(int ms);
+    bool readAndExecute();
+    void execute(std::string_view line);
+    void idle(int ms);
+    std::int64_t microsLeft() const;
+
+    void click(std::string_view rest);
+    void type(std::string_view rest);
+    void key(std::string_view rest);
+    void choose(std::string_view rest);
+    void set(std::string_view rest);
+    void show(std::string_view rest);
+    void connect(std::string_view rest);
+    void disconnect(std::string_view rest);
+    void answer(std::string_view rest);
+    void pump(std::string_view rest);
+    void quit(std::string_view rest);
+
+    Control* find(std::string_view name);
+    void tell(Done done, std::string_view name);
+
+    Program& program_;
+    Means m_;
+    std::optional<LinkAddress> address_;
+    LiveStates live_;
+    long line_ = 0;  ///< number of the line at hand
+    int depth_ = 0;  ///< commands on the stack
+    std::int64_t pumpUntil_ = 0;
+    bool ended_ = false;
+    int status_ = kDone;
+};
+
+}  // namespace zel

@@ -1,0 +1,82 @@
+#include "console/Tool.h"
+
+#include <unistd.h>
+
+#include <fstream>
+#include <memory>
+
+#include "console/ConsoleDialogs.h"
+#include "console/DebugWatch.h"
+#include "console/LineInput.h"
+#include "console/LineOutput.h"
+#include "console/PanelSession.h"
+#include "console/ServingEvents.h"
+#include "console/Verbs.h"
+
+namespace zel {
+namespace {
+
+/// What both kinds of run stand on.
+struct Stage {
+    Stage(const Options& options, Front& front, LineOutput& boxOutput, LineOutput& errorOutput)
+        : boxes(boxOutput, answers),
+          dialogs(answers),
+          events(front.events()),
+          program(front.platform(events, boxes, dialogs), options.words),
+          watch(program.forms().controller) {
+        watch.onExchange = [&boxOutput] { boxOutput.settle(); };
+        if (!options.verbose) return;
+        const Clock& clock = front.clock();
+        watch.onLine = [&clock, &errorOutput, start = clock.micros()](const std::string& text) {
+            const auto ms = (clock.micros() - start) / 1000;
+            errorOutput.line("[" + std::to_string(ms) + " ms] " + text);
+        };
+    }
+
+    AnswerQueue answers;
+    ConsoleBoxes boxes;
+    ConsoleFileDialogs dialogs;
+    ServingEvents events;
+    Program program;
+    DebugWatch watch;
+};
+
+int runPanel(const Options& options, Front& front, LineOutput& output, LineOutput& errors) {
+    std::ifstream file;
+    std::unique_ptr<LineInput> input;
+    if (options.argument.empty()) {
+        input = std::make_unique<DescriptorLines>(STDIN_FILENO);
+    } else {
+        file.open(options.argument, std::ios::binary);
+        if (!file || file.peek() == std::ifstream::traits_type::eof()) {
+            if (!file.eof()) {
+                errors.line("zelctl: " + options.argument + " cannot be read");
+                return kWrongUse;
+            }
+        }
+        input = std::make_unique<StreamLines>(file);
+    }
+    Stage stage(options, front, output, errors);
+    std::optional<LinkAddress> address;
+    if (options.address) address = options.address->link;
+    PanelSession session(stage.program,
+                         {front.clock(), stage.events, *input, output, errors, stage.answers,
+                          options.address && options.address->simulated},
+                         address);
+    stage.boxes.misfit = [&session](const std::string& answer) {
+        session.complain("\"" + answer + "\" answers no question: yes, no, ok or cancel does");
+    };
+    return session.run();
+}
+
+}  // namespace
+
+int runTool(const Options& options, Front& front, std::ostream& out, std::ostream& errorStream) {
+    LineOutput output(out);
+    LineOutput errors(errorStream);
+    if (options.verb == Verb::Panel) return runPanel(options, front, output, errors);
+    Stage stage(options, front, errors, errors);
+    return runVerb(options, stage.program, output, errors, writeGraphImage);
+}
+
+}  // namespace zel

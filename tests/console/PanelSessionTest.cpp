@@ -1,0 +1,173 @@
+#include <gtest/gtest.h>
+
+#include <sstream>
+#include <string>
+
+#include "ZELSim/InProcessPort.h"
+#include "console/ConsoleDialogs.h"
+#include "console/PanelSession.h"
+#include "platform/virtual/VirtualPlatform.h"
+
+namespace zel {
+namespace {
+
+/// A session over a simulated instrument; each `play` is one run of the tool.
+struct PanelSessionTest : ::testing::Test {
+    VirtualPlatform platform;
+    zelsim::InProcessPort port{platform.clock, platform.events};
+    std::ostringstream out;
+    std::ostringstream errors;
+    int status = -1;
+
+    PanelSessionTest() { platform.ports.ports = {kSimulatorPort}; }
+
+    std::string play(const std::string& lines, const std::string& words = "") {
+        out.str("");
+        errors.str("");
+        std::istringstream text(lines);
+        StreamLines input(text);
+        LineOutput output(out);
+        LineOutput errorOutput(errors);
+        AnswerQueue answers;
+        ConsoleBoxes boxes(output, answers);
+        ConsoleFileDialogs dialogs(answers);
+        ServingEvents events(platform.events);
+        Program program(
+            {platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
+             platform.serverSocket, platform.settings, platform.debug, platform.clipboard,
+             platform.launcher, platform.startup, platform.folder, dialogs},
+            words);
+        PanelSession session(program,
+                             {platform.clock, events, input, output, errorOutput, answers, true},
+                             LinkAddress{LinkAddress::Kind::Serial, kSimulatorPort, 57600});
+        boxes.misfit = [&](const std::string& answer) { session.complain(answer); };
+        status = session.run();
+        return out.str();
+    }
+};
+
+TEST_F(PanelSessionTest, CommentsAndBlankLines_PrintNothing) {
+    EXPECT_EQ(play("# words\n\n   \n  # more\r\n"), "");
+    EXPECT_EQ(status, kDone);
+}
+
+TEST_F(PanelSessionTest, ShowProperty_TwoLineCaption_IsOneLine) {
+    EXPECT_EQ(play("show SoftKey(0).Caption\n"), "CENTER\\r\\nFREQ\n");
+}
+
+TEST_F(PanelSessionTest, UnknownCommandAndName_AreToldAndTheSessionGoesOn) {
+    EXPECT_EQ(play("fly\nclick NoButton\nshow No.Caption\nshow CFLabel.Wings\nshow State\n"),
+              "0\n");
+    EXPECT_EQ(status, kWrongUse);
+    EXPECT_EQ(errors.str(),
+              "zelctl: line 1: there is no command \"fly\"\n"
+              "zelctl: line 2: there is no control \"NoButton\"\n"
+              "zelctl: line 3: there is nothing to show as \"No.Caption\"\n"
+              "zelctl: line 4: there is nothing to show as \"CFLabel.Wings\"\n");
+}
+
+TEST_F(PanelSessionTest, HiddenDisabledAndLockedControls_AreRefused) {
+    EXPECT_EQ(play("click StopButton\nclick Disconnect\ntype DebugTextBox x\nset DebugTextBox x\n"
+                   "key DebugTextBox f1\nshow DebugTextBox.Text\n"),
+              "refused: StopButton is hidden\nrefused: Disconnect is disabled\n"
+              "refused: DebugTextBox is locked\nrefused: DebugTextBox is locked\n"
+              "refused: DebugTextBox is locked\n\n");
+    EXPECT_EQ(status, kDone);
+}
+
+TEST_F(PanelSessionTest, BoxOfTheSameText_WithinOneLine_PrintsOnceWithItsCount) {
+    EXPECT_EQ(play("type SoftTextBox(0) 12\n"),
+              "box[information] ZELRemote | Please connect to the intrument first. (2 times)\n");
+}
+
+TEST_F(PanelSessionTest, ModalForm_ServesLinesUntilItIsClosed) {
+    EXPECT_EQ(play("click Direct\nshow MainForm.Visible\nshow MainForm.Modal\n"
+                   "click MainForm.CancelConnButton1\nshow MainForm.Visible\n"),
+              "true\ntrue\nfalse\n");
+}
+
+TEST_F(PanelSessionTest, ModalForm_PumpLetsTimePass) {
+    EXPECT_EQ(play("click Direct\nshow TimeLabel.Caption\npump 2500\nshow TimeLabel.Caption\n"),
+              "12:00:00\n12:00:02\n");
+}
+
+TEST_F(PanelSessionTest, EndOfInput_InAModalForm_EndsTheSession) {
+    EXPECT_EQ(play("click Direct\n"), "");
+    EXPECT_EQ(status, kDone);
+}
+
+TEST_F(PanelSessionTest, EndOfInput_InAContinuousView_StopsAndDisconnects) {
+    play("connect\nclick PlayContinuousButton\n");
+    EXPECT_EQ(status, kDone);
+    EXPECT_FALSE(port.isOpen());
+}
+
+TEST_F(PanelSessionTest, Quit_InAModalForm_ReadsNoMore) {
+    EXPECT_EQ(play("click Direct\nquit\nshow State\n"), "");
+}
+
+TEST_F(PanelSessionTest, ContinuousView_LinesAreServedAndPumpLetsItRun) {
+    EXPECT_EQ(play("connect\nclick PlayContinuousButton\nshow StopButton.Visible\npump 200\n"
+                   "show ContinuosLoopActive\nclick StopButton\nshow StopButton.Visible\n"
+                   "show State\n"),
+              "true\ntrue\nfalse\n3\n");
+    EXPECT_EQ(status, kDone);
+}
+
+TEST_F(PanelSessionTest, OrdinaryExchange_IsNotDisturbedByTheNextLine) {
+    EXPECT_EQ(play("connect\nclick PlaySingleButton\nshow MousePointer\n"
+                   "show ControllerForm.MousePointer\n"),
+              "0\n");
+    EXPECT_EQ(errors.str(), "zelctl: line 3: there is nothing to show as \"MousePointer\"\n");
+}
+
+TEST_F(PanelSessionTest, Connect_Twice_IsRefusedTheSecondTime) {
+    EXPECT_EQ(play("connect\nconnect\nshow isConnected\n"), "refused: Direct is disabled\ntrue\n");
+}
+
+TEST_F(PanelSessionTest, Answers_QueueUpAndWithoutOneTheButtonIsAffirmative) {
+    EXPECT_EQ(play("connect\nanswer cancel\ndisconnect\nshow isConnected\ndisconnect\n"
+                   "show isConnected\n"),
+              "box[question] Disconnect | Are you sure you want to close the connection?\ntrue\n"
+              "box[question] Disconnect | Are you sure you want to close the connection?\nfalse\n");
+}
+
+TEST_F(PanelSessionTest, AnswerThatFitsNoQuestion_IsWrongUse) {
+    play("connect\nanswer perhaps\ndisconnect\n");
+    EXPECT_EQ(status, kWrongUse);
+}
+
+TEST_F(PanelSessionTest, EndOfTheProgram_EndsTheSession) {
+    play("click ExitObject\nshow State\n");
+    EXPECT_EQ(out.str().find("0\n"), std::string::npos);
+    EXPECT_EQ(status, kDone);
+}
+
+TEST_F(PanelSessionTest, ServerWord_ServesLinesInTheServersWindow) {
+    EXPECT_EQ(play("show ServerForm.Visible\nquit\n", "server"), "true\n");
+}
+
+TEST_F(PanelSessionTest, Choose_IndexOutsideOfTheList_IsWrongUse) {
+    play(
+        "click Direct\nchoose MainForm.BaudList 4\nchoose MainForm.BaudList x\n"
+        "choose MainForm.BaudList 3\nshow MainForm.BaudList.Text\n");
+    EXPECT_EQ(out.str(), "115200\n");
+    EXPECT_EQ(errors.str(),
+              "zelctl: line 2: \"MainForm.BaudList\" has no such entry\n"
+              "zelctl: line 3: \"MainForm.BaudList\" has no such entry\n");
+}
+
+TEST_F(PanelSessionTest, LineThatIsTooLong_IsToldAndPassedOver) {
+    EXPECT_EQ(play("set MainForm.TelNumberBox " + std::string(70000, '1') +
+                   "\nshow MainForm.TelNumberBox.Text\n"),
+              "\n");
+    EXPECT_EQ(errors.str(), "zelctl: line 1: the line is too long\n");
+}
+
+TEST_F(PanelSessionTest, BytesThatAreNoUtf8_AreTakenAsWestern) {
+    EXPECT_EQ(play("set MainForm.TelNumberBox \xE9\nshow MainForm.TelNumberBox.Text\n"),
+              "\xC3\xA9\n");
+}
+
+}  // namespace
+}  // namespace zel
