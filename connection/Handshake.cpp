@@ -56,6 +56,7 @@ void Handshake::InitConnection() {
     if (!identify()) return;
     if (!readDetector()) return;
     readMode();
+    if (!instrumentAnswers()) return;
     bool ok = false;
     labels_.GetFreqForLabel(ok);
     if (!ok) return;
@@ -83,18 +84,20 @@ bool Handshake::wakeInstrument() {
     return true;
 }
 
+bool Handshake::instrumentAnswers() const { return link_.usable() && reader_.answered(); }
+
 void Handshake::acceptRemote() {
     // While REMOTE is not accepted, the exchange shows no box of the instrument.
     state_.RemoteAccepted = false;
     state_.RemoteAccepted = exchange_.CmdInstrument("REMOTE");
-    if (state_.RemoteAccepted || !link_.usable()) return;
+    if (state_.RemoteAccepted || !instrumentAnswers()) return;
     exchange_.SetInstrument("MEAS,1");
-    if (link_.usable()) state_.RemoteAccepted = exchange_.CmdInstrument("REMOTE");
+    if (instrumentAnswers()) state_.RemoteAccepted = exchange_.CmdInstrument("REMOTE");
 }
 
 bool Handshake::identify() {
     std::string id;
-    if (!link_.usable() || !exchange_.GetInstrument("IDN?", id)) return false;
+    if (!instrumentAnswers() || !exchange_.GetInstrument("IDN?", id)) return false;
     const std::string head = id.substr(0, kIdentityShown);
     DebugLine(panel_, head);
     const std::vector<std::string> fields = split(id, ',');

@@ -32,6 +32,8 @@ class Handshake {
 
   private:
     bool wakeInstrument();
+    /// False once a silence has taken the connection down, which was told then.
+    bool instrumentAnswers() const;
     void acceptRemote();
     bool identify();
     bool readDetector();

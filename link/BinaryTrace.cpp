@@ -86,6 +86,7 @@ BinaryTrace::Outcome BinaryTrace::readOnce(std::vector<double>& values, bool dou
     panel_.BinaryModeActive = true;
     link_.WriteToLink("TRACEBIN\r");
     delay(DelayPlace::AfterTraceKeyword);
+    const bool open = link_.usable();  // a port closed before is told by the read
     const std::string bytes = bytes_.ReadBinaryBuffer(doubleBlock ? kDoubleBytes : kSingleBytes);
     if (bytes.size() == 2) {
         status = bytes[0] - '0';
@@ -95,7 +96,13 @@ BinaryTrace::Outcome BinaryTrace::readOnce(std::vector<double>& values, bool dou
             return Outcome::Done;
         }
     }
-    if (!link_.usable()) return Outcome::Failed;  // the device has gone in the middle
+    if (!link_.usable()) {  // the device has gone in the middle
+        std::string text = "Port is not open!";
+        if (!link_.problem().empty()) text += kCrLf + link_.problem();
+        if (open) boxes_.show({BoxIcon::Critical, text});
+        state_.ExchangeFailed = true;
+        return Outcome::Failed;
+    }
     decode(bytes, doubleBlock, values);
     success = true;
     return Outcome::Done;

@@ -17,7 +17,8 @@ bool RS232Ops::OpenComPort(SerialPort& control, const std::string& portName,
                            const std::string& baudText) {
     const double baud = leadingNumber(baudText);
     if (baud < 1 || baud > 1e7) return false;
-    const std::string device = serialDeviceName(portName, {portName});
+    std::string device = serialDeviceName(portName, {});
+    if (device.empty()) device = portName;  // a name of the platform's own
     return OpenComPortNumber(control, device, static_cast<long>(baud));
 }
 

@@ -61,7 +61,7 @@ struct CodeRow {
     int code;
     std::string_view caption;
     std::string_view choice;
-    std::string_view text = "";
+    std::string_view text = {};
     double number = 0;
 };
 

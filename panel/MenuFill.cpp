@@ -135,7 +135,7 @@ void MenuFill::fillChannelPower() {
 void MenuFill::fillOccupiedBandwidth() {
     ask("OBWSTD", mirror_.OccBWStandard);
     ask("OBW", mirror_.OccBWValue);
-    mirror_.OccBWValueCopy = mirror_.OccBWValue;
+    if (!known_) mirror_.OccBWValueCopy = mirror_.OccBWValue;
     ask("OBWCHBW", mirror_.OccBWChannelBandwidth);
     show(0, mirror_.OccBWValue, "Hz");
     choose(1, mirror_.OccBWStandard);

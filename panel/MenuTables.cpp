@@ -108,7 +108,7 @@ const std::array<HardKeyMenu, 8> kHardKeyMenus = {{
     {CF::SWEEP,
      {"MANUAL\r\nSWPTIME", "AUTO\r\nSWPTIME", "SWEEP\r\nMODE", "TRIGGER", "TRIGGER\r\nDELAY"},
      "SWEEP"},
-    {CF::TRACE, {"TRACE\r\nMODE", "DETECTOR", "", "", ""}, "TRACE"},
+    {CF::TRACE, {"TRACE\r\nMODE", "DETECTOR", hiddenKey("TRACE"), "", ""}, "TRACE"},
     {CF::Marker, {"MARKER", "DELTA", "MARKER\r\nMODE", "", ""}, "MARKER"},
     {CF::MEAS, {"MEASURE", "TRANS\r\nDUCER", "LIMIT\r\nLINES", "DISPLAY\r\nLINE", ""}, "MEAS"},
 }};

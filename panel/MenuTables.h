@@ -23,22 +23,35 @@ enum class KeyAction { Leave, Enable, Disable, Hide, PaintGreen };
 
 struct MenuPosition {
     PositionKind kind = PositionKind::None;
-    std::string_view frame = "";  ///< caption; empty leaves the frame's earlier caption
+    std::string_view frame = {};  ///< caption; empty leaves the frame's earlier caption
     std::optional<CodeTable> choices = std::nullopt;
     KeyAction key = KeyAction::Leave;  ///< what becomes of the soft key beside it
     bool listAboveBox = false;         ///< the list of `choices` is shown above the box as well
 };
 
 struct MenuLayout {
-    std::int16_t state;
+    std::int16_t state = 0;
     std::array<MenuPosition, 5> positions;
 };
 
 /// The layout of that menu, or null for a state that is laid out elsewhere.
 const MenuLayout* menuLayout(std::int16_t state);
 
-/// Captions of the five soft keys; an empty one hides its key.
-using KeyCaptions = std::array<std::string_view, 5>;
+/// Caption of a soft key; a key without one is hidden, and so is a `hiddenKey`, which has one.
+struct KeyCaption {
+    constexpr KeyCaption(const char* caption) : text(caption), visible(!text.empty()) {}
+    std::string_view text;
+    bool visible;
+};
+
+constexpr KeyCaption hiddenKey(const char* caption) {
+    KeyCaption key(caption);
+    key.visible = false;
+    return key;
+}
+
+/// Captions of the five soft keys.
+using KeyCaptions = std::array<KeyCaption, 5>;
 
 /// A menu of the hard keys: its captions, its word for `FillTextFields` and its pictures.
 struct HardKeyMenu {

@@ -11,14 +11,14 @@ namespace {
 using CF = ControllerForm;
 
 struct ModeRow {
-    std::int16_t mode;
-    std::int16_t menu;
+    std::int16_t mode = 0;
+    std::int16_t menu = 0;
     KeyCaptions captions;  // an empty one hides its key
-    int waitMs;            // the instrument needs it to change its mode
-    const char* failure;
-    const char* word;      // for FillTextFields; null where the menu is not filled
-    bool whileConnecting;  // works while the handshake runs
-    bool alwaysTakesOver;  // scale and option also when the mode is on already
+    int waitMs = 0;        // the instrument needs it to change its mode
+    const char* failure = nullptr;
+    const char* word = nullptr;    // for FillTextFields; null where the menu is not filled
+    bool whileConnecting = false;  // works while the handshake runs
+    bool alwaysTakesOver = false;  // scale and option also when the mode is on already
 };
 const ModeRow kModes[] = {
     {CF::TRACKINGGENERATOR,
@@ -48,7 +48,7 @@ const ModeRow kModes[] = {
      true},
     {CF::OCCBANDWIDTH,
      CF::OCCBW,
-     {"OCCUP\r\nBW", "OCCBW\r\nSTD", "OCCBW\r\nCHNBW", "LVL\r\nADJ", ""},
+     {"OCCUP\r\nBW", "OCCBW\r\nSTD", "OCCBW\r\nCHNBW", "LVL\r\nADJ", hiddenKey("LEVEL\r\nADJ")},
      2000,
      "Occupied Bandwidth Mode unsuccessful",
      "OCCBANDWIDTH",
@@ -56,7 +56,7 @@ const ModeRow kModes[] = {
      true},
     {CF::TDMAPOWERMODE,
      CF::TDMA,
-     {"TDMA\r\nPOWER", "TDMA\r\nPWRSTD", "MEAS\r\nTIME", "LVL\r\nADJ", ""},
+     {"TDMA\r\nPOWER", "TDMA\r\nPWRSTD", "MEAS\r\nTIME", "LVL\r\nADJ", hiddenKey("LEVEL\r\nADJ")},
      0,
      "TDMA Power unsuccessful",
      "TDMAPOWER",
@@ -64,7 +64,7 @@ const ModeRow kModes[] = {
      true},
     {CF::DISTTOFAULTMEASURE,
      CF::DISTFAULT,
-     {"CABLE\r\nMODEL", "CABLE\r\nLEN", "DTF\r\nMODE", "LEN\r\nUNIT", ""},
+     {"CABLE\r\nMODEL", "CABLE\r\nLEN", "DTF\r\nMODE", "LEN\r\nUNIT", hiddenKey("LEVEL\r\nADJ")},
      0,
      "Distance to Fault Mode unsuccessful",
      "DTF",

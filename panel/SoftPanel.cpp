@@ -177,9 +177,9 @@ void SoftPanel::SetButtonsStatus(std::int16_t state) {
 
 void SoftPanel::setKeyCaptions(const KeyCaptions& captions) {
     for (int i = 0; i < panel_.SoftKey.count(); ++i) {
-        const std::string_view caption = captions.at(static_cast<std::size_t>(i));
-        panel_.SoftKey(i).Caption = std::string(caption);
-        panel_.SoftKey(i).Visible = !caption.empty();
+        const KeyCaption& caption = captions.at(static_cast<std::size_t>(i));
+        panel_.SoftKey(i).Caption = std::string(caption.text);
+        panel_.SoftKey(i).Visible = caption.visible;
     }
 }
 

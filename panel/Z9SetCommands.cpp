@@ -85,7 +85,7 @@ const std::vector<Z9SetCommands::Clause>& Z9SetCommands::clauses() {
         {CF::TDMA, 1, Setting{"TDMASTD,", S::Choice, &ZV::TDMAStandard}},
         {CF::TDMA, 2, Setting{"MEASTIME,", S::Whole, &ZV::TDMAMeasTime}},
         {CF::DISTFAULT, 0, Setting{"CABLEMOD,", S::Text}},
-        {CF::DISTFAULT, 1, Setting{"CABLELEN,", S::Value, &ZV::CableLength}},
+        {CF::DISTFAULT, 1, Setting{"CABLELEN,", S::LocaleValue, &ZV::CableLength}},
         {CF::DISTFAULT, 2, Setting{"DTFMODE,", S::Choice, &ZV::DTFMode}},
         {CF::DISTFAULT, 3, Setting{"LENUNIT,", S::Text, &ZV::LengthUnit}},
     };
@@ -120,6 +120,9 @@ bool Z9SetCommands::valueText(Source source, int index, std::string& text, doubl
         case Source::Value:
             number = boxValue(index);
             break;
+        case Source::LocaleValue:
+            text = generalNumber(boxValue(index));
+            return true;
         case Source::Whole:
             number = std::trunc(std::clamp(boxValue(index), -2147483648.0, 2147483647.0));
             break;

@@ -36,11 +36,12 @@ class Z9SetCommands {
         std::variant<std::monostate, double ZEL3Variables::*, std::int16_t ZEL3Variables::*,
                      std::uint8_t ZEL3Variables::*, std::string ZEL3Variables::*>;
     enum class Source {
-        Value,   ///< the box, a number with prefix
-        Whole,   ///< the same, cut to a whole number of 32 bits
-        Word,    ///< the same, as a 16-bit number: too large an entry ends the operation
-        Choice,  ///< index of the list
-        Text,    ///< the box, trimmed
+        Value,        ///< the box, a number with prefix
+        LocaleValue,  ///< the same, written with its zero ahead of the point
+        Whole,        ///< the same, cut to a whole number of 32 bits
+        Word,         ///< the same, as a 16-bit number: too large an entry ends the operation
+        Choice,       ///< index of the list
+        Text,         ///< the box, trimmed
     };
     using Action = void (Z9SetCommands::*)(int);
     struct Setting {

@@ -59,6 +59,8 @@ class Graph : public Control {
     unsigned long plotSerial() const { return plotSerial_; }
 
     Property<int> TrackMode{this, 1};
+    /// The picture is older than it should be, and says so.
+    Property<bool> Old{this, false};
 
     int cursorCount() const { return static_cast<int>(cursors_.size()); }
     /// 1-based as the panel counts them; an index out of range gives a cursor that nobody sees.

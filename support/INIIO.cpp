@@ -1,6 +1,8 @@
 #include "support/INIIO.h"
 
 #include <algorithm>
+#include <array>
+#include <charconv>
 #include <limits>
 
 #include "support/IniFile.h"
@@ -17,7 +19,12 @@ const IniValue kMissingDefault = std::int16_t{1};
 struct TextOf {
     std::string operator()(bool value) const { return value ? "1" : "0"; }
     std::string operator()(const std::string& value) const { return value; }
-    std::string operator()(float value) const { return generalNumber(static_cast<double>(value)); }
+    std::string operator()(float value) const {
+        // Through its own shortest digits: 0.1 has fifteen others as a double.
+        std::array<char, 64> buffer{};
+        const auto end = std::to_chars(buffer.data(), buffer.data() + buffer.size(), value).ptr;
+        return generalNumber(leadingNumber({buffer.data(), end}));
+    }
     template <class Number>
     std::string operator()(Number value) const {
         return generalNumber(static_cast<double>(value));
@@ -26,11 +33,12 @@ struct TextOf {
 
 IniType typeOf(const IniValue& value) { return static_cast<IniType>(value.index()); }
 
+/// The nearest whole number that the type holds.
 template <class Number>
 Number whole(double number) {
     constexpr double kLow = std::numeric_limits<Number>::min();
     constexpr double kHigh = std::numeric_limits<Number>::max();
-    return static_cast<Number>(std::clamp(number, kLow, kHigh));
+    return static_cast<Number>(std::clamp(roundHalfEven(number, 0), kLow, kHigh));
 }
 
 bool isTrue(const std::string& text) {
@@ -75,8 +83,7 @@ IniValue ReadIni(const std::string& fileName, const std::string& section, const 
 bool WriteIni(const std::string& fileName, const std::string& section, const std::string& key,
               const IniValue& value) {
     IniFile file = IniFile::load(fileName);
-    file.setValue(section, key, std::visit(TextOf(), value));
-    return file.save(fileName);
+    return file.setValue(section, key, std::visit(TextOf(), value)) && file.save(fileName);
 }
 
 }  // namespace zel

@@ -14,13 +14,14 @@ enum class IniType { Boolean, Integer, Long, Single, Double, Text };
 
 /// The value of a key, as the type that is named or else as the default's. A missing key gives
 /// the default; a missing default counts as the number 1. A value is cut behind 750 characters.
-/// "1", "WAHR" and "TRUE" in either case are true; a number is what the text starts with.
+/// "1", "WAHR" and "TRUE" in either case are true; a number is what the text starts with, for the
+/// whole types the nearest that they hold.
 IniValue ReadIni(const std::string& fileName, const std::string& section, const std::string& key,
                  const std::optional<IniValue>& fallback = std::nullopt,
                  std::optional<IniType> valueType = std::nullopt);
 
 /// A boolean is written as "1" or "0", a text as it stands, a number as its text. False when the
-/// file cannot be written; it is then as it was.
+/// file cannot be read or written, or when no line can hold the names; it is then as it was.
 bool WriteIni(const std::string& fileName, const std::string& section, const std::string& key,
               const IniValue& value);
 

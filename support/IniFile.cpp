@@ -4,66 +4,109 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <utility>
 
 #include "support/Text.h"
 
 namespace zel {
 namespace {
 
-constexpr std::uintmax_t kLargestFile = 1U << 20;
+constexpr std::size_t kLargestFile = 1U << 20;
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr std::string_view kBlanks = " \t";
 
 bool sameName(std::string_view a, std::string_view b) { return upperCase(a) == upperCase(b); }
 
+std::string_view withoutBlanks(std::string_view text) {
+    const auto first = text.find_first_not_of(kBlanks);
+    if (first == std::string_view::npos) return {};
+    return text.substr(first, text.find_last_not_of(kBlanks) - first + 1);
+}
+
 /// Quotes around a value keep its blanks and are no part of it.
-std::string unquoted(std::string value) {
+std::string_view unquoted(std::string_view value) {
     if (value.size() < 2) return value;
     const char quote = value.front();
     const bool quoted = (quote == '"' || quote == '\'') && value.back() == quote;
     return quoted ? value.substr(1, value.size() - 2) : value;
 }
 
+bool fitsALine(std::string_view name) {
+    return !name.empty() && withoutBlanks(name) == name && isValidUtf8(name) &&
+           name.find_first_of("\r\n") == std::string_view::npos;
+}
+
+bool fitsAKey(std::string_view name) {
+    return fitsALine(name) && name.find('=') == std::string_view::npos && name.front() != ';' &&
+           name.front() != '[';
+}
+
+/// The section's name between the brackets, where the line is a header.
+std::optional<std::string> headerName(std::string_view plain) {
+    if (!startsWith(plain, "[")) return std::nullopt;
+    const auto bracket = plain.back() == ']' ? plain.size() - 1 : plain.find(']');
+    if (bracket == std::string_view::npos) return std::nullopt;
+    return std::string(withoutBlanks(plain.substr(1, bracket - 1)));
+}
+
+/// The file's bytes; nothing where they cannot be read or are too many.
+std::optional<std::string> bytesOf(const std::string& fileName) {
+    std::error_code error;
+    if (!std::filesystem::is_regular_file(fileName, error)) return std::nullopt;
+    std::ifstream stream(fileName, std::ios::binary);
+    if (!stream) return std::nullopt;
+    std::string bytes(kLargestFile + 1, '\0');
+    stream.read(bytes.data(), static_cast<std::streamsize>(bytes.size()));
+    if (stream.bad() || !stream.eof()) return std::nullopt;
+    bytes.resize(static_cast<std::size_t>(stream.gcount()));
+    return bytes;
+}
+
 }  // namespace
 
 IniFile IniFile::load(const std::string& fileName) {
     std::error_code error;
-    const std::uintmax_t size = std::filesystem::file_size(fileName, error);
-    if (error || size > kLargestFile) return {};
-    std::ifstream stream(fileName, std::ios::binary);
-    const std::string bytes{std::istreambuf_iterator<char>(stream), {}};
-    return parse(wireToUtf8(bytes));
+    if (std::filesystem::status(fileName, error).type() == std::filesystem::file_type::not_found)
+        return {};
+    if (const std::optional<std::string> bytes = bytesOf(fileName))
+        return parse(wireToUtf8(*bytes));
+    IniFile unknown;
+    unknown.readable_ = false;
+    return unknown;
 }
 
 IniFile IniFile::parse(std::string_view text) {
     IniFile file;
-    if (startsWith(text, kByteOrderMark)) text.remove_prefix(kByteOrderMark.size());
+    file.byteOrderMark_ = startsWith(text, kByteOrderMark);
+    if (file.byteOrderMark_) text.remove_prefix(kByteOrderMark.size());
     if (!text.empty() && text.find("\r\n") == std::string_view::npos) file.lineEnd_ = "\n";
     while (!text.empty()) {
-        const auto end = text.find('\n');
-        std::string line(text.substr(0, end));
-        text.remove_prefix(end == std::string_view::npos ? text.size() : end + 1);
-        if (!line.empty() && line.back() == '\r') line.pop_back();
-        const std::string plain = trimmed(line);
-        const auto bracket = plain.find(']');
-        if (!plain.empty() && plain.front() == '[' && bracket != std::string::npos) {
-            file.sections_.push_back({trimmed(plain.substr(1, bracket - 1)), line, {}});
+        const auto end = std::min(text.find('\n'), text.size());
+        const std::size_t next = std::min(end + 1, text.size());
+        const std::size_t stop = end > 0 && text[end - 1] == '\r' ? end - 1 : end;
+        Line line{std::string(text.substr(0, stop)), std::string(text.substr(stop, next - stop)),
+                  "", ""};
+        text.remove_prefix(next);
+        const std::string_view plain = withoutBlanks(line.text);
+        if (std::optional<std::string> name = headerName(plain)) {
+            file.sections_.push_back({std::move(*name), std::move(line), {}});
             continue;
         }
-        Line entry{line, "", ""};
         const auto equals = plain.find('=');
-        const bool comment = plain.empty() || plain.front() == ';' || plain.front() == '#';
-        if (!comment && equals != std::string::npos && equals > 0) {
-            entry.key = trimmed(plain.substr(0, equals));
-            entry.value = unquoted(trimmed(plain.substr(equals + 1)));
+        if (!startsWith(plain, ";") && equals != std::string_view::npos) {
+            std::string key(withoutBlanks(plain.substr(0, equals)));
+            std::string value(unquoted(withoutBlanks(plain.substr(equals + 1))));
+            line.key = std::move(key);
+            line.value = std::move(value);
         }
-        file.sections_.back().lines.push_back(std::move(entry));
+        file.sections_.back().lines.push_back(std::move(line));
     }
     return file;
 }
 
 const IniFile::Section* IniFile::find(std::string_view name) const {
     for (const Section& section : sections_)
-        if (!section.header.empty() && sameName(section.name, name)) return &section;
+        if (!section.header.text.empty() && sameName(section.name, name)) return &section;
     return nullptr;
 }
 
@@ -79,27 +122,32 @@ std::optional<std::string> IniFile::value(std::string_view section, std::string_
     return std::nullopt;
 }
 
-void IniFile::setValue(std::string_view section, std::string_view key, std::string_view value) {
+bool IniFile::setValue(std::string_view section, std::string_view key, std::string_view value) {
+    if (!fitsALine(section) || !fitsAKey(key)) return false;
+    // A line end in a value would begin a line of its own, and a byte that is no UTF-8 would
+    // change how the whole file is read.
+    std::string plain = replaceAll(replaceAll(wireToUtf8(value), "\r", " "), "\n", " ");
+    const bool needsQuotes = unquoted(withoutBlanks(plain)) != plain;
+    const std::string written = needsQuotes ? "\"" + plain + "\"" : plain;
     Section* found = find(section);
     if (found == nullptr) {
-        sections_.push_back({std::string(section), "[" + std::string(section) + "]", {}});
+        const std::string name(section);
+        sections_.push_back({name, {"[" + name + "]", lineEnd_, "", ""}, {}});
         found = &sections_.back();
     }
-    // A line end in a value would begin a line of its own.
-    std::string plain = replaceAll(replaceAll(value, "\r", " "), "\n", " ");
-    const bool blanks =
-        !plain.empty() && (plain.front() == ' ' || plain.back() == ' ' || unquoted(plain) != plain);
-    const std::string written = blanks ? "\"" + plain + "\"" : plain;
-    Line entry{std::string(key) + "=" + written, std::string(key), plain};
+    const std::string name(key);
+    Line entry{name + "=" + written, lineEnd_, name, std::move(plain)};
     for (Line& line : found->lines) {
         if (line.key.empty() || !sameName(line.key, key)) continue;
+        entry.end = line.end;
         line = std::move(entry);
-        return;
+        return true;
     }
     // Behind the section's last line that says something.
     auto place = found->lines.end();
-    while (place != found->lines.begin() && trimmed(std::prev(place)->text).empty()) --place;
+    while (place != found->lines.begin() && withoutBlanks(std::prev(place)->text).empty()) --place;
     found->lines.insert(place, std::move(entry));
+    return true;
 }
 
 bool IniFile::removeKey(std::string_view section, std::string_view key) {
@@ -112,7 +160,7 @@ bool IniFile::removeKey(std::string_view section, std::string_view key) {
 
 bool IniFile::removeSection(std::string_view section) {
     return std::erase_if(sections_, [&](const Section& candidate) {
-               return !candidate.header.empty() && sameName(candidate.name, section);
+               return !candidate.header.text.empty() && sameName(candidate.name, section);
            }) > 0;
 }
 
@@ -121,7 +169,7 @@ bool IniFile::hasSection(std::string_view section) const { return find(section) 
 std::vector<std::string> IniFile::sections() const {
     std::vector<std::string> names;
     for (const Section& section : sections_)
-        if (!section.header.empty()) names.push_back(section.name);
+        if (!section.header.text.empty()) names.push_back(section.name);
     return names;
 }
 
@@ -135,28 +183,36 @@ std::vector<std::string> IniFile::keys(std::string_view section) const {
 
 std::string IniFile::text() const {
     std::string text;
+    bool ended = true;
+    const auto append = [&](const Line& line) {
+        if (!ended) text += lineEnd_;  // what was the last line is so no more
+        text += line.text + line.end;
+        ended = !line.end.empty();
+    };
     for (const Section& section : sections_) {
-        if (!section.header.empty()) text += section.header + lineEnd_;
-        for (const Line& line : section.lines) text += line.text + lineEnd_;
+        if (!section.header.text.empty()) append(section.header);
+        for (const Line& line : section.lines) append(line);
     }
-    return text;
+    return byteOrderMark_ ? std::string(kByteOrderMark) + text : text;
 }
 
 bool IniFile::save(const std::string& fileName) const {
+    const std::string bytes = text();
+    if (!readable_ || bytes.size() > kLargestFile) return false;
     const std::string beside = fileName + ".new";
-    {
-        std::ofstream stream(beside, std::ios::binary | std::ios::trunc);
-        stream << text();
-        stream.close();
-        if (!stream) {
-            std::error_code ignored;
-            std::filesystem::remove(beside, ignored);
-            return false;
-        }
-    }
+    std::ofstream stream(beside, std::ios::binary | std::ios::trunc);
+    stream << bytes;
+    stream.close();
     std::error_code error;
-    std::filesystem::rename(beside, fileName, error);
-    return !error;
+    const auto rights = std::filesystem::status(fileName, error).permissions();
+    if (!error) std::filesystem::permissions(beside, rights, error);
+    if (stream) {
+        std::filesystem::rename(beside, fileName, error);
+        if (!error) return true;
+    }
+    std::error_code ignored;
+    std::filesystem::remove(beside, ignored);
+    return false;
 }
 
 }  // namespace zel

@@ -25,7 +25,7 @@ std::string TrimControlChars(std::string_view text) {
 }
 
 bool parseLocaleNumber(std::string_view text, double& value) {
-    std::string plain = trimmed(text);
+    const std::string plain = trimmed(text);
     std::string digits;
     std::size_t i = 0;
     if (i < plain.size() && (plain[i] == '+' || plain[i] == '-')) {
@@ -50,9 +50,6 @@ bool parseLocaleNumber(std::string_view text, double& value) {
         for (; i < plain.size() && isDigit(plain[i]); ++i) digits += plain[i];
     }
     if (i != plain.size()) return false;
-    // An exponent sign of plus is no part of what the library reads.
-    digits = replaceAll(digits, "E+", "E");
-    digits = replaceAll(digits, "e+", "e");
     double number = 0;
     const auto result = std::from_chars(digits.data(), digits.data() + digits.size(), number);
     if (result.ec != std::errc() || !std::isfinite(number)) return false;
@@ -62,10 +59,13 @@ bool parseLocaleNumber(std::string_view text, double& value) {
 
 bool IsNumericText(std::string_view text) {
     double ignored = 0;
-    bool numeric = parseLocaleNumber(text, ignored);
-    if (numeric) return true;
-    if (text.find('s') != std::string_view::npos) numeric = isNumericWithout(text, 's');
-    if (text.find('%') != std::string_view::npos) numeric = isNumericWithout(text, '%');
+    if (parseLocaleNumber(text, ignored)) return true;
+    for (const std::string_view head : {".", "-."})
+        if (startsWith(text, head) && parseLocaleNumber(text.substr(head.size()), ignored))
+            return true;
+    bool numeric = false;
+    if (contains(text, "s")) numeric = isNumericWithout(text, 's');
+    if (contains(text, "%")) numeric = isNumericWithout(text, '%');
     return numeric;
 }
 

@@ -9,7 +9,8 @@ namespace zel {
 /// Without blanks at both ends, then without CR, LF and NUL at both ends.
 std::string TrimControlChars(std::string_view text);
 /// A number as the panel reads one: blanks around it, commas that group ahead of the point, also
-/// ".5" and "-.5", also with letters "s" or signs "%" anywhere.
+/// "." or "-." ahead of a number, also with letters "s" or signs "%" anywhere. So it passes texts
+/// that `parseLocaleNumber` does not read.
 bool IsNumericText(std::string_view text);
 /// Reads a text that is a number by the locale's rule alone; false where it is none.
 bool parseLocaleNumber(std::string_view text, double& value);

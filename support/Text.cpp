@@ -86,6 +86,10 @@ std::string replaceAll(std::string_view text, std::string_view what, std::string
     }
 }
 
+bool contains(std::string_view text, std::string_view what) {
+    return text.find(what) != std::string_view::npos;
+}
+
 bool startsWith(std::string_view text, std::string_view head) {
     return text.substr(0, head.size()) == head;
 }

@@ -18,6 +18,7 @@ std::string trimmed(std::string_view text);
 /// At each separator; at least one piece.
 std::vector<std::string> split(std::string_view text, char separator);
 std::string replaceAll(std::string_view text, std::string_view what, std::string_view with);
+bool contains(std::string_view text, std::string_view what);
 bool startsWith(std::string_view text, std::string_view head);
 bool isValidUtf8(std::string_view bytes);
 /// Bytes of the wire or of a file: valid UTF-8 as it stands, else read as Windows-1252.

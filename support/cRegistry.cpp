@@ -23,9 +23,17 @@ struct TypeMark {
     std::int32_t type;
     const char* mark;
 };
-constexpr TypeMark kTypeMarks[] = {{REG_EXPAND_SZ, "expand:"}, {REG_DWORD, "dword:"}};
+// A plain text bears its mark only where it would else be taken for another type.
+constexpr TypeMark kTypeMarks[] = {
+    {REG_EXPAND_SZ, "expand:"}, {REG_DWORD, "dword:"}, {REG_SZ, "text:"}};
 
 std::string keyText(std::int32_t key) { return generalNumber(key); }
+
+bool beginsWithAMark(const std::string& text) {
+    for (const TypeMark& row : kTypeMarks)
+        if (startsWith(text, row.mark)) return true;
+    return false;
+}
 
 std::string valueName(const std::string& name) { return name.empty() ? kDefaultValue : name; }
 
@@ -41,15 +49,20 @@ std::string cRegistry::keyName() const {
     return "";
 }
 
-bool cRegistry::KeyExists() const { return IniFile::load(fileName_).hasSection(keyName()); }
+bool cRegistry::KeyExists() const {
+    const std::string name = upperCase(keyName());
+    // A key is there as well when one below it is.
+    for (const std::string& section : IniFile::load(fileName_).sections())
+        if (upperCase(section) == name || startsWith(upperCase(section), name + "\\")) return true;
+    return false;
+}
 
 void cRegistry::CreateKey() {
     const std::string name = keyName();
     IniFile file = IniFile::load(fileName_);
-    if (!name.empty() && file.hasSection(name)) return;
+    if (file.hasSection(name)) return;
     // A key without values is kept by the value without a name.
-    if (!name.empty()) file.setValue(name, kDefaultValue, "");
-    if (name.empty() || !file.save(fileName_))
+    if (!file.setValue(name, kDefaultValue, "") || !file.save(fileName_))
         throw RegistryError("Failed to create registry Key: '" + SectionKey + "'");
 }
 
@@ -85,15 +98,15 @@ std::string cRegistry::Value() {
 
 void cRegistry::setValue(const std::string& value) {
     std::string written = value;
+    const bool marked = ValueType != REG_SZ || beginsWithAMark(value);
     for (const TypeMark& row : kTypeMarks)
-        if (row.type == ValueType) written = row.mark + value;
+        if (marked && row.type == ValueType) written = row.mark + value;
     IniFile file = IniFile::load(fileName_);
-    const std::string name = keyName();
-    if (!name.empty()) file.setValue(name, valueName(ValueKey), written);
-    if (name.empty() || !file.save(fileName_))
+    if (!file.setValue(keyName(), valueName(ValueKey), written) || !file.save(fileName_)) {
         throw RegistryError("Failed to set registry value Key: '" + keyText(ClassKey) +
                             "',Section: '" + SectionKey + "',Key: '" + ValueKey + "' to value: '" +
                             value + "'");
+    }
 }
 
 std::string cRegistry::expanded(const std::string& text) const {
@@ -123,10 +136,13 @@ bool cRegistry::EnumerateSections(std::vector<std::string>& names, std::int32_t&
         if (!startsWith(upperCase(section), head)) continue;
         const std::string rest = section.substr(head.size());
         const std::string child = rest.substr(0, rest.find('\\'));
-        if (std::find(names.begin(), names.end(), child) == names.end()) names.push_back(child);
+        const bool known = std::any_of(names.begin(), names.end(), [&](const std::string& name) {
+            return upperCase(name) == upperCase(child);
+        });
+        if (!known) names.push_back(child);
     }
     count = static_cast<std::int32_t>(names.size());
-    return KeyExists() || count > 0;
+    return KeyExists();
 }
 
 void cRegistry::writeAt(const std::string& section, const std::string& name,
@@ -145,7 +161,7 @@ void cRegistry::CreateEXEAssociation(const std::string& exePath, const std::stri
                                      const std::string& newMenuText, bool supportInstall,
                                      const std::string& installMenuText, int defaultIconIndex) {
     const std::string program = "\"" + exePath + "\"";
-    writeAt("." + association, "", className);
+    writeAt(startsWith(association, ".") ? association : "." + association, "", className);
     writeAt(className, "", classDescription);
     std::vector<EXEAssociation> verbs{{"open", openMenuText, program + " \"%1\""}};
     if (supportPrint) verbs.push_back({"print", printMenuText, program + " /p \"%1\""});

@@ -30,7 +30,7 @@ std::optional<std::string> RecordedBoxes::prompt(const std::string& text, const 
                                                  const std::string& preset) {
     prompts_.push_back({text, title, preset});
     if (lines_.empty()) return preset;
-    const std::optional<std::string> line = std::move(lines_.front());
+    std::optional<std::string> line = std::move(lines_.front());
     lines_.pop_front();
     return line;
 }

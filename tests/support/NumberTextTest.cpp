@@ -60,6 +60,7 @@ INSTANTIATE_TEST_SUITE_P(Exponent, GeneralNumber,
                          ::testing::Values(NumberRow{1e15, "1E+15"}, NumberRow{-2.5e20, "-2.5E+20"},
                                            NumberRow{1.5e-16, "1.5E-16"},
                                            NumberRow{1e100, "1E+100"},
+                                           NumberRow{1.0 / 30, "3.33333333333333E-02"},
                                            // Rounded to 15 digits it is 1E+15.
                                            NumberRow{999999999999999.9, "1E+15"},
                                            // Sixteen decimals would be needed.

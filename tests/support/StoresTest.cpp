@@ -2,39 +2,18 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
-#include <fstream>
-#include <iterator>
+#include <functional>
+#include <string>
+#include <vector>
 
 #include "support/INIIO.h"
 #include "support/IniFile.h"
 #include "support/RegAccess.h"
 #include "support/cRegistry.h"
+#include "tests/support/Stores.h"
 
 namespace zel {
 namespace {
-
-class Stores : public testing::Test {
-  protected:
-    Stores() {
-        const auto* test = testing::UnitTest::GetInstance()->current_test_info();
-        folder_ =
-            std::filesystem::temp_directory_path() / (std::string("zel-stores-") + test->name());
-        std::filesystem::remove_all(folder_);
-        std::filesystem::create_directories(folder_);
-    }
-    ~Stores() override { std::filesystem::remove_all(folder_); }
-    std::string file(const std::string& name) const { return (folder_ / name).string(); }
-    std::string write(const std::string& text) const {
-        std::ofstream(file("a.ini"), std::ios::binary) << text;
-        return file("a.ini");
-    }
-    static std::string read(const std::string& name) {
-        std::ifstream stream(name, std::ios::binary);
-        return {std::istreambuf_iterator<char>(stream), {}};
-    }
-    std::filesystem::path folder_;
-};
 
 std::string textOf(const IniValue& value) { return std::get<std::string>(value); }
 
@@ -68,6 +47,24 @@ TEST_F(Stores, ReadIni_TypeFollowsTheNameOrElseTheDefault) {
 TEST_F(Stores, ReadIni_NumberPastItsType_IsHeldAtTheEnd) {
     const std::string name = write("[A]\nx=99999999999\n");
     EXPECT_EQ(std::get<std::int16_t>(ReadIni(name, "A", "x", std::int16_t{0})), 32767);
+}
+
+TEST_F(Stores, ReadIni_WholeType_TakesTheNearestNumber) {
+    const std::string name = write("[A]\nx=42.7\ny=-3.6\n");
+    EXPECT_EQ(std::get<std::int16_t>(ReadIni(name, "A", "x", std::int16_t{0})), 43);
+    EXPECT_EQ(std::get<std::int32_t>(ReadIni(name, "A", "y", std::int32_t{0})), -4);
+}
+
+TEST_F(Stores, ReadIni_DefaultOfAnotherType_IsTurnedIntoText) {
+    const std::string name = write("");
+    EXPECT_EQ(textOf(ReadIni(name, "A", "x", 2.5, IniType::Text)), "2.5");
+    EXPECT_EQ(textOf(ReadIni(name, "A", "x", 0.1F, IniType::Text)), "0.1");
+    EXPECT_EQ(textOf(ReadIni(name, "A", "x", true, IniType::Text)), "1");
+    EXPECT_EQ(std::get<double>(ReadIni(name, "A", "x", std::string("7 dB"), IniType::Double)), 7);
+}
+
+TEST_F(Stores, ReadIni_TextWithoutANumber_GivesZero) {
+    EXPECT_EQ(std::get<std::int32_t>(ReadIni(write("[A]\nx=on\n"), "A", "x", std::int32_t{5})), 0);
 }
 
 TEST_F(Stores, ReadIni_TrueTexts_ReadAsTrue) {
@@ -120,9 +117,11 @@ TEST_F(Stores, WriteIni_EachType_IsWrittenAsItsText) {
     EXPECT_TRUE(WriteIni(name, "A", "b", true));
     EXPECT_TRUE(WriteIni(name, "A", "c", false));
     EXPECT_TRUE(WriteIni(name, "A", "i", std::int16_t{-5}));
+    EXPECT_TRUE(WriteIni(name, "A", "l", std::int32_t{100000}));
+    EXPECT_TRUE(WriteIni(name, "A", "f", 0.1F));
     EXPECT_TRUE(WriteIni(name, "A", "d", 0.5));
     EXPECT_TRUE(WriteIni(name, "A", "t", std::string("a b")));
-    EXPECT_EQ(read(name), "[A]\r\nb=1\r\nc=0\r\ni=-5\r\nd=0.5\r\nt=a b\r\n");
+    EXPECT_EQ(read(name), "[A]\r\nb=1\r\nc=0\r\ni=-5\r\nl=100000\r\nf=0.1\r\nd=0.5\r\nt=a b\r\n");
 }
 
 TEST_F(Stores, WriteIni_ValueWithBlanksOrQuotes_ReadsBackAsItWas) {
@@ -139,8 +138,58 @@ TEST_F(Stores, WriteIni_LineEndInAValue_DoesNotBeginALine) {
     EXPECT_EQ(textOf(ReadIni(name, "B", "y", std::string("none"))), "none");
 }
 
-TEST_F(Stores, WriteIni_FolderThatIsNotThere_FailsAndTouchesNothing) {
+TEST_F(Stores, WriteIni_FolderThatIsNotThere_FailsAndMakesNoFile) {
     EXPECT_FALSE(WriteIni(file("no/such/a.ini"), "A", "x", true));
+    EXPECT_EQ(files(), 0);
+}
+
+TEST_F(Stores, WriteIni_FileThatIsTooLarge_FailsAndLeavesIt) {
+    const std::string large = "[A]\nx=1\n" + std::string((1U << 20) + 1, ';');
+    const std::string name = write(large);
+    EXPECT_FALSE(WriteIni(name, "A", "x", std::string("2")));
+    EXPECT_EQ(read(name), large);
+}
+
+TEST_F(Stores, WriteIni_FileThatWouldGrowTooLarge_FailsAndLeavesIt) {
+    const std::string name = write("[A]\nx=1\n");
+    EXPECT_FALSE(WriteIni(name, "A", "y", std::string(1U << 20, 'a')));
+    EXPECT_EQ(read(name), "[A]\nx=1\n");
+}
+
+TEST_F(Stores, WriteIni_FolderInPlaceOfTheFile_FailsAndLeavesNothingBeside) {
+    std::filesystem::create_directories(folder_ / "a.ini" / "inner");
+    EXPECT_FALSE(WriteIni(file("a.ini"), "A", "x", true));
+    EXPECT_TRUE(std::filesystem::is_directory(folder_ / "a.ini" / "inner"));
+    EXPECT_EQ(files(), 1);
+}
+
+TEST_F(Stores, Save_NameThatCannotBeReplaced_LeavesNothingBeside) {
+    std::filesystem::create_directories(folder_ / "a.ini" / "inner");
+    EXPECT_FALSE(IniFile::parse("[A]\nx=1\n").save(file("a.ini")));
+    EXPECT_EQ(files(), 1);
+}
+
+TEST_F(Stores, WriteIni_NameThatNoLineCanHold_FailsAndMakesNoFile) {
+    for (const char* key : {"", " a", "a=b", ";a", "[a]", "a\nb", "\xB5"})
+        EXPECT_FALSE(WriteIni(file("a.ini"), "A", key, true)) << key;
+    for (const char* section : {"", "A ", "A]\r\n[B"})
+        EXPECT_FALSE(WriteIni(file("a.ini"), section, "x", true)) << section;
+    EXPECT_EQ(files(), 0);
+}
+
+TEST_F(Stores, WriteIni_BytesThatAreNoUtf8_LeaveTheOtherTextsReadable) {
+    const std::string name = write("[A]\nx=\xC2\xB5V\n");
+    ASSERT_TRUE(WriteIni(name, "A", "y", std::string("\xB5s")));
+    EXPECT_EQ(textOf(ReadIni(name, "A", "x", std::string())), "µV");
+    EXPECT_EQ(textOf(ReadIni(name, "A", "y", std::string())), "µs");
+}
+
+TEST_F(Stores, WriteIni_RightsOfTheFile_Stay) {
+    using std::filesystem::perms;
+    const std::string name = write("[A]\nx=1\n");
+    std::filesystem::permissions(name, perms::owner_read | perms::owner_write);
+    ASSERT_TRUE(WriteIni(name, "A", "x", std::string("2")));
+    EXPECT_EQ(std::filesystem::status(name).permissions(), perms::owner_read | perms::owner_write);
 }
 
 class Registry : public Stores {
@@ -174,9 +223,59 @@ TEST_F(Registry, Value_IsKeptWithItsType) {
     EXPECT_TRUE(later.KeyExists());
 }
 
+TEST_F(Registry, PlainTextThatLooksLikeAnotherType_StaysPlain) {
+    cRegistry keys = registry();
+    keys.ValueKey = "Note";
+    for (const std::string text : {"expand:%HOME%", "dword:1", "text:a", "plain"}) {
+        keys.ValueType = REG_SZ;
+        keys.setValue(text);
+        EXPECT_EQ(keys.Value(), text);
+        EXPECT_EQ(keys.ValueType, REG_SZ);
+    }
+}
+
+TEST_F(Registry, Value_OfAPlainTextOrOfNone_HasThePlainType) {
+    cRegistry keys = registry();
+    keys.ValueKey = "Plain";
+    keys.setValue("a");
+    keys.ValueType = REG_EXPAND_SZ;
+    EXPECT_EQ(keys.Value(), "a");
+    EXPECT_EQ(keys.ValueType, REG_SZ);
+    keys.ValueKey = "Absent";
+    keys.ValueType = REG_DWORD;
+    EXPECT_EQ(keys.Value(), "");
+    EXPECT_EQ(keys.ValueType, REG_SZ);
+}
+
+TEST_F(Registry, KeyExists_WhereOnlyAKeyBelowWasMade_IsTrue) {
+    cRegistry keys = registry();
+    keys.SectionKey = "Software\\ZEL\\A";
+    keys.CreateKey();
+    keys.SectionKey = "SOFTWARE";
+    EXPECT_TRUE(keys.KeyExists());
+    keys.SectionKey = "Soft";
+    EXPECT_FALSE(keys.KeyExists());
+}
+
+TEST_F(Registry, RootKeys_AreApart) {
+    cRegistry keys = registry();
+    keys.CreateKey();
+    keys.ClassKey = HKEY_LOCAL_MACHINE;
+    EXPECT_FALSE(keys.KeyExists());
+}
+
+TEST_F(Registry, CreateKey_ThatIsThere_KeepsItsValues) {
+    cRegistry keys = registry();
+    keys.ValueKey = "One";
+    keys.setValue("1");
+    keys.CreateKey();
+    EXPECT_EQ(keys.Value(), "1");
+}
+
 TEST_F(Registry, EnumerateSections_GivesTheKeysDirectlyBelow) {
     cRegistry keys = registry();
-    for (const char* section : {"Software\\ZEL\\A", "Software\\ZEL\\B\\C", "Software\\Other"}) {
+    for (const char* section :
+         {"Software\\ZEL\\A", "Software\\ZEL\\B\\C", "Software\\ZEL\\b\\D", "Software\\Other"}) {
         keys.SectionKey = section;
         keys.CreateKey();
     }
@@ -251,6 +350,34 @@ TEST_F(Registry, CreateEXEAssociation_PointsFromTheEndingToTheCommand) {
     EXPECT_EQ(at("ZEL.View\\shell\\print"), "&Print");
     EXPECT_EQ(at("ZEL.View\\shell\\print\\command"), "\"/opt/zelremote\" /p \"%1\"");
     EXPECT_EQ(at("ZEL.View\\shell\\new"), "none");
+    EXPECT_EQ(at("ZEL.View\\DefaultIcon"), "none");
+}
+
+TEST_F(Registry, CreateEXEAssociation_OnRequest_WritesAllVerbsAndTheIcon) {
+    cRegistry keys = registry();
+    keys.CreateEXEAssociation("/opt/zelremote", "ZEL.View", "Saved view", ".zel", "Show", false, "",
+                              true, "Fresh", true, "Set up", 2);
+    const auto at = [&](const std::string& section) {
+        return readRegistryText(registry(), HKEY_CURRENT_USER, "SOFTWARE\\Classes\\" + section, "",
+                                "none");
+    };
+    EXPECT_EQ(at(".zel"), "ZEL.View");
+    EXPECT_EQ(at("ZEL.View\\shell\\open"), "Show");
+    EXPECT_EQ(at("ZEL.View\\shell\\print"), "none");
+    EXPECT_EQ(at("ZEL.View\\shell\\new"), "Fresh");
+    EXPECT_EQ(at("ZEL.View\\shell\\install"), "Set up");
+    EXPECT_EQ(at("ZEL.View\\DefaultIcon"), "/opt/zelremote,2");
+}
+
+TEST_F(Registry, CreateAdditionalEXEAssociations_WritesAVerbEach) {
+    cRegistry keys = registry();
+    keys.CreateAdditionalEXEAssociations("ZEL.View", {{"edit", "&Edit", "ed \"%1\""}});
+    const auto at = [&](const std::string& section) {
+        return readRegistryText(registry(), HKEY_CURRENT_USER, "SOFTWARE\\Classes\\" + section, "",
+                                "none");
+    };
+    EXPECT_EQ(at("ZEL.View\\shell\\edit"), "&Edit");
+    EXPECT_EQ(at("ZEL.View\\shell\\edit\\command"), "ed \"%1\"");
 }
 
 }  // namespace

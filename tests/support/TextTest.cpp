@@ -42,6 +42,11 @@ TEST(StartsWithTest, Head_IsFoundOnlyAtTheBeginning) {
     EXPECT_FALSE(startsWith(" SPAN", "SPAN"));
 }
 
+TEST(ContainsTest, Piece_IsFoundAnywhere) {
+    EXPECT_TRUE(contains("5 ms", "ms"));
+    EXPECT_FALSE(contains("5 m", "ms"));
+}
+
 struct Utf8Row {
     std::string bytes;
     bool valid;
@@ -119,12 +124,18 @@ INSTANTIATE_TEST_SUITE_P(LettersAndSigns, IsNumeric,
                                            NumericRow{"50%", true}, NumericRow{"%", false},
                                            NumericRow{"s", false}, NumericRow{"5s%", true},
                                            NumericRow{"5 ms", false}));
+// A point ahead of a number passes, whatever the number looks like.
+INSTANTIATE_TEST_SUITE_P(PointAhead, IsNumeric,
+                         ::testing::Values(NumericRow{".1.5", true}, NumericRow{". 5", true},
+                                           NumericRow{"-..5", true}, NumericRow{".", false},
+                                           NumericRow{"-.", false}, NumericRow{"+..5", false}));
 INSTANTIATE_TEST_SUITE_P(Others, IsNumeric,
                          ::testing::Values(NumericRow{"", false}, NumericRow{" ", false},
                                            NumericRow{"Hz", false}, NumericRow{"100 Hz", false},
                                            NumericRow{"1e", false}, NumericRow{"1.2.3", false},
                                            NumericRow{"--1", false}, NumericRow{"1e999", false},
-                                           NumericRow{",", false}, NumericRow{"-", false}));
+                                           NumericRow{",", false}, NumericRow{",5", false},
+                                           NumericRow{"-", false}));
 
 TEST(ParseLocaleNumberTest, Number_IsReadWithItsGroups) {
     double value = 0;

@@ -1,0 +1,43 @@
+#pragma once
+// What the user was told: each box as one line, so that a test names icon, title and text at once.
+
+#include <string>
+#include <vector>
+
+#include "platform/virtual/RecordedBoxes.h"
+
+namespace zel {
+
+using Texts = std::vector<std::string>;
+
+inline std::string iconName(BoxIcon icon) {
+    switch (icon) {
+        case BoxIcon::Critical:
+            return "critical";
+        case BoxIcon::Question:
+            return "question";
+        case BoxIcon::Warning:
+            return "warning";
+        case BoxIcon::Exclamation:
+            return "exclamation";
+        case BoxIcon::Information:
+            return "information";
+        case BoxIcon::Plain:
+            break;
+    }
+    return "plain";
+}
+
+/// "critical | ZELRemote | Port not open!"
+inline std::string toldLine(const Box& box) {
+    return iconName(box.icon) + " | " + box.title + " | " + box.text;
+}
+
+/// All boxes so far, in order.
+inline Texts told(const RecordedBoxes& boxes) {
+    Texts lines;
+    for (const Box& box : boxes.boxes()) lines.push_back(toldLine(box));
+    return lines;
+}
+
+}  // namespace zel

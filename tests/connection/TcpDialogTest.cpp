@@ -1,0 +1,205 @@
+#include <gtest/gtest.h>
+
+#include "link/CommandExchange.h"
+#include "tests/connection/Bench.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+struct TcpDialogTest : Connection {
+    TCPConnectionForm& tcp = forms.tcpConnection;
+
+    TcpDialogTest() {
+        panel.ConnectionState = CF::TCPCON;
+        tcp.load();
+        tcp.IPAdressTextBox.Text = "host";
+        tcp.RemotePortTextBox.Text = "2277";
+    }
+    void probed() { socket.expect("\r").answer("0\r"); }
+    /// The texts that the status field shows one after another.
+    Texts states() {
+        Texts shown;
+        tcp.IDTextBox.Changed.connect([this, &shown] {
+            if (shown.empty() || shown.back() != tcp.IDTextBox.Text.get())
+                shown.push_back(tcp.IDTextBox.Text);
+        });
+        tcp.ConnectTCPButton.Click();
+        return shown;
+    }
+    std::string stored(const std::string& key) {
+        return platform.settings.get("ZELRemote", "TCPCON", key, "absent");
+    }
+};
+
+TEST_F(TcpDialogTest, MenuEntry_ShowsTheDialogModally) {
+    panel.ConnectionState = 0;
+    bool modal = false;
+    later(10, [&] {
+        modal = tcp.Visible && tcp.Modal;
+        tcp.Hide();
+    });
+    panel.TCPConnection.Click();
+    EXPECT_TRUE(modal);
+    EXPECT_EQ(panel.ConnectionState, CF::TCPCON);
+}
+
+TEST_F(TcpDialogTest, Load_FillsTheFieldsFromTheStore) {
+    platform.settings.set("ZELRemote", "TCPCON", "RemoteIP", "10.0.0.7");
+    platform.settings.set("ZELRemote", "TCPCON", "RemotePort", "4000");
+    tcp.unload(1);
+    tcp.load();
+    EXPECT_EQ(tcp.IPAdressTextBox.Text.get(), "10.0.0.7");
+    EXPECT_EQ(tcp.RemotePortTextBox.Text.get(), "4000");
+}
+
+TEST_F(TcpDialogTest, PortThatIsNoNumber_IsToldAndNothingElseDone) {
+    for (const char* text : {"", " ", "abc", "22x", "0", "-1", "65536", "1e300", "\xC3\xA4"}) {
+        boxes.clear();
+        tcp.MousePointer = 11;
+        tcp.RemotePortTextBox.Text = text;
+        tcp.ConnectTCPButton.Click();
+        EXPECT_EQ(shown(), Texts{"plain | ZELRemote | Please enter a valid TCP port!"}) << text;
+        EXPECT_EQ(tcp.MousePointer.get(), 0) << text;
+    }
+    EXPECT_TRUE(platform.settings.values.empty());
+    EXPECT_EQ(socket.host(), "");
+}
+
+TEST_F(TcpDialogTest, BlanksAroundPortAndAddress_AreTrimmed) {
+    tcp.RemotePortTextBox.Text = "  2277 ";
+    tcp.IPAdressTextBox.Text = " host ";
+    socket.connectsTo(SocketState::Error);
+    tcp.ConnectTCPButton.Click();
+    EXPECT_EQ(socket.host(), "host");
+    EXPECT_EQ(socket.port(), 2277);
+    EXPECT_EQ(shown(), Texts{});
+}
+
+TEST_F(TcpDialogTest, Fields_AreStoredAheadOfTheAttempt) {
+    socket.connectsTo(SocketState::Error);
+    tcp.ConnectTCPButton.Click();
+    EXPECT_EQ(stored("RemoteIP"), "host");
+    EXPECT_EQ(stored("RemotePort"), "2277");
+}
+
+TEST_F(TcpDialogTest, WrongAddress_EndsInTheSocketsError) {
+    socket.connectsTo(SocketState::Error, 3000);
+    EXPECT_EQ(states(), (Texts{"CONNECTING...", "TCP Socket Error."}));
+    EXPECT_EQ(shown(), Texts{});
+    EXPECT_FALSE(panel.isConnected);
+    EXPECT_EQ(socket.written(), "");
+}
+
+TEST_F(TcpDialogTest, ConnectAttempt_HasNoTimeLimitOfItsOwn) {
+    socket.connectsTo(SocketState::Error, 600'000);
+    EXPECT_GE(time([this] { tcp.ConnectTCPButton.Click(); }), 600'000);
+}
+
+TEST_F(TcpDialogTest, PeerClosing_IsShownAndTheWaitGoesOn) {
+    socket.connectsTo(SocketState::Connecting);
+    later(1000, [this] { socket.setState(SocketState::PeerClosing); });
+    later(3000, [this] { socket.setState(SocketState::Error); });
+    EXPECT_EQ(states(), (Texts{"CONNECTING...", "Remote host is closing the connection.",
+                               "TCP Socket Error."}));
+    EXPECT_GE(now(), 3000);
+}
+
+TEST_F(TcpDialogTest, SocketClosedByTheUserMeanwhile_EndsTheWait) {
+    socket.connectsTo(SocketState::Connecting);
+    later(1000, [this] { tcp.QuitTCPButton.Click(); });
+    EXPECT_LE(time([this] { tcp.ConnectTCPButton.Click(); }), 1100);
+    EXPECT_FALSE(panel.isConnected);
+}
+
+TEST_F(TcpDialogTest, Connected_ShowsAddressAndPortThenTheIdentity) {
+    probed();
+    Page(socket).whole().cmd("WAIT");
+    socket.expect("GET\r").answer("0\r");
+    socket.expect("TRACEBIN\r").answer("0\r" + levelBlock(-35250));
+    EXPECT_EQ(states(), (Texts{"CONNECTING...", "CONNECTED", "CONNECTED to host:2277", kIdentity}));
+    EXPECT_EQ(socket.failure(), "");
+    EXPECT_EQ(socket.leftOver(), "");
+    EXPECT_TRUE(panel.isConnected);
+    EXPECT_FALSE(tcp.Visible);
+    EXPECT_EQ(dialog.IDText.Text.get(), "");
+    EXPECT_EQ(panel.RawTraceData, std::vector<double>(301, -35.25));
+    EXPECT_EQ(shown(), Texts{});
+}
+
+TEST_F(TcpDialogTest, ProbesAnswer_IsTakenAwayAheadOfTheHandshake) {
+    probed();
+    Page(socket).whole();
+    EXPECT_TRUE(connectTcp());
+    EXPECT_EQ(socket.written().substr(0, 6), "\r\rcmd\r");
+    EXPECT_EQ(socket.failure(), "");
+}
+
+TEST_F(TcpDialogTest, PowerSensor_ReadsNoTrace) {
+    probed();
+    Page(socket, {{"MEAS", "3"}})
+        .wake()
+        .cmd("REMOTE")
+        .identity()
+        .detectorModeAndFrequency()
+        .get("FREQOFFS", "0");
+    tcp.ConnectTCPButton.Click();
+    EXPECT_TRUE(panel.isConnected);
+    EXPECT_EQ(socket.failure(), "");
+    EXPECT_EQ(socket.leftOver(), "");
+}
+
+TEST_F(TcpDialogTest, ServerWithoutInstrument_IsToldAfterFiveSeconds) {
+    socket.expect("\r").silence();
+    const std::int64_t ms = time([this] { tcp.ConnectTCPButton.Click(); });
+    EXPECT_GE(ms, 5000);
+    EXPECT_LE(ms, 5150);
+    EXPECT_EQ(shown(), Texts{"information | No ZEL3 found | No M&T ZEL3 found at the specified "
+                             "adress!"});
+    EXPECT_FALSE(panel.UpNow.Enabled);
+    EXPECT_EQ(socket.state(), SocketState::Connected);
+    EXPECT_FALSE(panel.isConnected);
+}
+
+TEST_F(TcpDialogTest, SecondAttempt_ClosesWhatWasLeftOver) {
+    socket.expect("\r").silence();
+    probed();
+    Page(socket).whole();
+    EXPECT_FALSE(connectTcp());
+    EXPECT_TRUE(connectTcp());
+    EXPECT_EQ(socket.failure(), "");
+    EXPECT_EQ(socket.leftOver(), "");
+}
+
+TEST_F(TcpDialogTest, Quit_EmptiesTheStatusAndUnloads) {
+    int argument = 0;
+    tcp.Unload.connect([&](int got) { argument = got; });
+    tcp.IDTextBox.Text = "CONNECTING...";
+    socket.setState(SocketState::Open);
+    tcp.QuitTCPButton.Click();
+    EXPECT_EQ(tcp.IDTextBox.Text.get(), "");
+    EXPECT_EQ(socket.state(), SocketState::Closed);
+    EXPECT_EQ(argument, 1);
+}
+
+TEST_F(TcpDialogTest, Quit_ConnectedSocket_StaysUp) {
+    probed();
+    Page(socket).whole();
+    connectTcp();
+    tcp.QuitTCPButton.Click();
+    EXPECT_EQ(socket.state(), SocketState::Connected);
+}
+
+TEST_F(TcpDialogTest, PeerGoneInSession_TheNextExchangeEndsInItsTimeOut) {
+    probed();
+    Page(socket).whole();
+    connectTcp();
+    socket.peerCloses();
+    std::string value;
+    EXPECT_LE(time([&] { EXPECT_FALSE(program.exchange().GetInstrument("FREQ", value)); }), 16'100);
+    EXPECT_EQ(shown(), Texts{"warning | ZELRemote | No response received!"});
+}
+
+}  // namespace
+}  // namespace zel

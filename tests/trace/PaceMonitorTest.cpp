@@ -1,0 +1,81 @@
+// The line beside the graph: age of the trace, sweeps a second, and what sets the pace.
+
+#include <gtest/gtest.h>
+
+#include "ZELSim/InProcessPort.h"
+#include "platform/virtual/VirtualPlatform.h"
+#include "shell/Program.h"
+
+namespace zel {
+namespace {
+
+class Pace : public testing::Test {
+  protected:
+    void connectTo(int baud) {
+        zelsim::WireSetup wire;
+        wire.baud = baud;
+        port = std::make_unique<zelsim::InProcessPort>(platform.clock, platform.events,
+                                                       zelsim::DeviceSetup{}, wire);
+        program = std::make_unique<Program>(platform.bundle(*port), "");
+        program->start();
+        ASSERT_TRUE(program->connect(
+            {LinkAddress::Kind::Serial, "/dev/zel3", baud == 0 ? 57600 : baud}, true));
+    }
+    ControllerForm& panel() { return program->forms().controller; }
+    std::string line() { return panel().PaceLabel.Caption; }
+    /// The continuous view for so long; `look` runs just ahead of its stop.
+    void view(double ms, const std::function<void()>& look) {
+        platform.events.schedule(ms, [this, look] {
+            look();
+            panel().StopButton.Click();
+        });
+        panel().PlayContinuousButton.Click();
+    }
+
+    VirtualPlatform platform;
+    std::unique_ptr<zelsim::InProcessPort> port;
+    std::unique_ptr<Program> program;
+};
+
+TEST_F(Pace, SingleTrace_TellsItsAgeAndIsNotMarkedOld) {
+    connectTo(0);
+    platform.events.runFor(4000);
+    EXPECT_EQ(line(), "4.0 s old");
+    EXPECT_FALSE(panel().CWGraph1.Old);
+    platform.events.runFor(61000);
+    EXPECT_EQ(line(), "1 min 5 s old");
+}
+
+TEST_F(Pace, FastLine_SaysThatTheSweepSetsThePace) {
+    connectTo(0);
+    view(2010, [this] {
+        EXPECT_NE(line().find("50.0 sweeps/s   the sweep sets the pace"), std::string::npos)
+            << line();
+    });
+}
+
+TEST_F(Pace, SlowLine_SaysThatTheLineSetsThePace) {
+    connectTo(19200);
+    view(20000, [this] {
+        EXPECT_NE(line().find("sweeps/s   the line sets the pace"), std::string::npos) << line();
+        EXPECT_EQ(line().find("50.0 sweeps/s"), std::string::npos) << line();
+    });
+}
+
+TEST_F(Pace, TraceOlderThanTwoSweeps_IsMarkedUntilTheNextOne) {
+    connectTo(0);
+    bool marked = false;
+    bool healed = false;
+    platform.events.schedule(1000, [this] {
+        port->device().edit().sweepTime = 5;
+        port->device().restart();
+    });
+    platform.events.schedule(4000, [&] { marked = panel().CWGraph1.Old; });
+    panel().CWGraph1.Changed.connect([&] { healed = marked && !panel().CWGraph1.Old; });
+    view(12000, [] {});
+    EXPECT_TRUE(marked);
+    EXPECT_TRUE(healed);
+}
+
+}  // namespace
+}  // namespace zel

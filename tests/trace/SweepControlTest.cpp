@@ -1,0 +1,354 @@
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "model/CodeTables.h"
+#include "tests/trace/ReadCycle.h"
+
+namespace zel {
+namespace {
+
+using Texts = std::vector<std::string>;
+
+struct SweepControlTest : ReadCycle {
+    SweepControlTest() {
+        panel.State = ControllerForm::Freq;
+        mirror.Span = 1e6;
+        mirror.TraceDetector = DETSAMPLE;
+    }
+    void fullCycle() {
+        askSettings();
+        cmd("WAIT");
+        trace(levelBlock(-35250));
+    }
+    void selectiveCycle() {
+        cmd("WAIT");
+        trace(levelBlock(-35250));
+    }
+    /// Presses Stop when the trace of that number, from 1, is drawn.
+    void stopAtPlot(unsigned long number) {
+        panel.CWGraph1.Changed.connect([this, number] {
+            if (panel.CWGraph1.plotSerial() == number && panel.StopButton.Visible)
+                panel.StopButton.Click();
+        });
+    }
+    void expectIdle() {
+        EXPECT_FALSE(panel.ContinuosLoopActive);
+        EXPECT_FALSE(panel.STOPFlag);
+        EXPECT_FALSE(panel.StopButton.Visible);
+        EXPECT_TRUE(panel.PlayContinuousButton.Visible);
+        EXPECT_TRUE(panel.Connection.Enabled);
+        EXPECT_TRUE(panel.Utility.Enabled);
+        EXPECT_TRUE(panel.RecordData.Visible);
+    }
+};
+
+TEST_F(SweepControlTest, Single_ReadsOneFullCycle) {
+    panel.YVectorVal = 5;
+    fullCycle();
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+    EXPECT_EQ(panel.YVectorVal, 0);
+}
+
+TEST_F(SweepControlTest, Single_WithTheWaterfallChecked_KeepsTheRowNumber) {
+    forms.specialMeas.chkWaterfall.setValue(true);
+    panel.YVectorVal = 5;
+    fullCycle();
+    panel.PlaySingleButton.Click();
+    EXPECT_EQ(panel.YVectorVal, 5);
+}
+
+TEST_F(SweepControlTest, Single_InATimedRecording_KeepsTheRowNumber) {
+    forms.time.ContinuousRecording = true;
+    panel.YVectorVal = 5;
+    fullCycle();
+    panel.PlaySingleButton.Click();
+    EXPECT_EQ(panel.YVectorVal, 5);
+}
+
+TEST_F(SweepControlTest, Single_InTheTdmaMenu_ReadsATrace) {
+    panel.State = ControllerForm::TDMA;
+    fullCycle();
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+}
+
+TEST_F(SweepControlTest, Continuous_NotConnected_TellsItAndDoesNotLoop) {
+    panel.isConnected = false;
+    panel.PlayContinuousButton.Click();
+    EXPECT_EQ(boxes.texts(), Texts{"Please connect to the intrument first."});
+    EXPECT_EQ(boxes.boxes()[0].icon, BoxIcon::Information);
+    EXPECT_EQ(port.written(), "");
+    EXPECT_TRUE(panel.RecordData.Visible);
+    EXPECT_TRUE(panel.PlayContinuousButton.Visible);
+    EXPECT_FALSE(panel.ContinuosLoopActive);
+}
+
+TEST_F(SweepControlTest, Continuous_FirstPassIsFullAndLaterOnesAreSelective) {
+    fullCycle();
+    selectiveCycle();
+    selectiveCycle();
+    stopAtPlot(3);
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    expectIdle();
+    EXPECT_EQ(panel.YVectorVal, 2);
+}
+
+TEST_F(SweepControlTest, Continuous_InSingleSweep_FirstPassAsksFiveWordsAndSendsNoInit) {
+    panel.SingleSweepModeActive = true;
+    get("FREQ", "1500000000");
+    get("SPAN", "1000000");
+    get("REFLVL", "-20");
+    get("RANGE", "0");
+    get("TRACEDET", "3");
+    selectiveCycle();
+    selectiveCycle();
+    stopAtPlot(2);
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    expectIdle();
+}
+
+TEST_F(SweepControlTest, Continuous_WhileItRuns_LocksTheMenusAndShowsStop) {
+    fullCycle();
+    bool locked = false;
+    panel.CWGraph1.Changed.connect([&] {
+        locked = locked || (!panel.Connection.Enabled && !panel.Utility.Enabled &&
+                            !panel.PlayContinuousButton.Visible && panel.StopButton.Visible &&
+                            panel.ContinuosLoopActive && panel.STOPFlag);
+    });
+    stopAtPlot(1);
+    panel.PlayContinuousButton.Click();
+    EXPECT_TRUE(locked);
+}
+
+TEST_F(SweepControlTest, Stop_DuringTheFirstPass_EndsAheadOfTheWaterfallsRow) {
+    int styled = 0;
+    forms.waterfall.styleLastRow.connect([&] { ++styled; });
+    fullCycle();
+    stopAtPlot(1);
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_EQ(styled, 0);
+    expectIdle();
+}
+
+TEST_F(SweepControlTest, LaterPass_StylesTheNewestPlotAndTheLastRow) {
+    int styled = 0;
+    forms.waterfall.styleLastRow.connect([&] { ++styled; });
+    fullCycle();
+    selectiveCycle();
+    stopAtPlot(2);
+    panel.PlayContinuousButton.Click();
+    EXPECT_EQ(styled, 1);
+    EXPECT_FALSE(forms.waterfall.Graph3D.plots().back().lineVisible);
+    EXPECT_EQ(forms.waterfall.Graph3D.plots().back().fillStyle, 3);
+}
+
+TEST_F(SweepControlTest, FailedFirstPass_LeavesStopAsTheWayBack) {
+    getRefused("FREQ", "6");
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_TRUE(panel.StopButton.Visible);
+    EXPECT_FALSE(panel.PlayContinuousButton.Visible);
+    EXPECT_FALSE(panel.Connection.Enabled);
+    EXPECT_FALSE(panel.Utility.Enabled);
+    EXPECT_FALSE(panel.ContinuosLoopActive);
+    EXPECT_TRUE(panel.RecordData.Visible);
+    panel.StopButton.Click();
+    EXPECT_FALSE(panel.StopButton.Visible);
+    EXPECT_TRUE(panel.PlayContinuousButton.Visible);
+    EXPECT_TRUE(panel.PlayContinuousButton.Enabled);
+}
+
+TEST_F(SweepControlTest, FailedLink_InALaterPass_EndsTheLoopWithOneView) {
+    fullCycle();
+    port.expect("cmd\r").silence();
+    panel.PlayContinuousButton.Click();
+    EXPECT_EQ(boxes.texts(), (Texts{"No response received!", "Unsuccessful View"}));
+    EXPECT_FALSE(panel.ContinuosLoopActive);
+    EXPECT_FALSE(panel.Connection.Enabled);
+    EXPECT_TRUE(panel.RecordData.Visible);
+}
+
+TEST_F(SweepControlTest, FailedLink_SeenBetweenPasses_LeavesWithoutCleanUp) {
+    panel.State = ControllerForm::TDMA;  // its first pass gives no result
+    getSilent();
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_EQ(boxes.texts(), Texts{"No response received!"});
+    EXPECT_FALSE(panel.RecordData.Visible);
+    EXPECT_TRUE(panel.StopButton.Visible);
+    EXPECT_FALSE(panel.Connection.Enabled);
+}
+
+TEST_F(SweepControlTest, NextNormalStop_EnablesTheMenusAgain) {
+    getRefused("FREQ", "6");
+    panel.PlayContinuousButton.Click();
+    panel.StopButton.Click();
+    fullCycle();
+    stopAtPlot(1);
+    panel.PlayContinuousButton.Click();
+    expectIdle();
+}
+
+TEST_F(SweepControlTest, Stop_EndsARecordingToo) {
+    panel.RecordDataFlag = true;
+    panel.RecordData.Checked = true;
+    panel.RecordData.Visible = false;
+    panel.MousePointer = 11;
+    panel.StopButton.Click();
+    EXPECT_FALSE(panel.RecordDataFlag);
+    EXPECT_FALSE(panel.RecordData.Checked);
+    EXPECT_TRUE(panel.RecordData.Visible);
+    EXPECT_EQ(panel.MousePointer.get(), 0);
+    EXPECT_FALSE(panel.STOPFlag);
+}
+
+TEST_F(SweepControlTest, Stop_InThePowerMenu_ClosesItsDialog) {
+    panel.State = ControllerForm::POWER;
+    forms.powerAndRefl.Show();
+    panel.StopButton.Click();
+    EXPECT_FALSE(forms.powerAndRefl.Visible);
+    EXPECT_FALSE(forms.powerAndRefl.loaded());
+}
+
+struct PowerReadoutTest : SweepControlTest {
+    PowerReadoutTest() {
+        panel.State = ControllerForm::POWER;
+        panel.InstrumentMode = ControllerForm::POWERSENSOR;
+    }
+    /// Chooses in the dialog and closes it, once it stands.
+    void choose(bool reflection) {
+        platform.events.schedule(0, [this, reflection] {
+            if (reflection) forms.powerAndRefl.PowerAndLeflOption.Click();
+            forms.powerAndRefl.ClosePwrForm.Click();
+        });
+    }
+    void stopAtReading(const std::string& text) {
+        panel.SoftTextBox(0).Changed.connect([this, text] {
+            if (panel.SoftTextBox(0).Text.get() == text) panel.StopButton.Click();
+        });
+    }
+};
+
+TEST_F(PowerReadoutTest, Single_ReadsThePowerIntoTheFirstBox) {
+    panel.SoftTextBox(4).Text = "old";
+    get("PWR", "-12.5");
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+    EXPECT_EQ(panel.SoftTextBox(0).Text.get(), "-12.5 dBm");
+    EXPECT_EQ(panel.SoftTextBox(4).Text.get(), "old");
+    EXPECT_EQ(panel.LastPowerText, "-12.5");
+    EXPECT_EQ(panel.LastReadingText, "-12.5");
+    EXPECT_EQ(panel.LastReflectionText, "");
+}
+
+TEST_F(PowerReadoutTest, Single_WithReflection_ReadsItIntoTheLastBox) {
+    forms.powerAndRefl.ReadPowerAndRefl = true;
+    get("PWR", "3");
+    get("REFL", "0.5");
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+    EXPECT_EQ(panel.SoftTextBox(0).Text.get(), "3 dBm");
+    EXPECT_EQ(panel.SoftTextBox(4).Text.get(), "500 mdBm");
+    EXPECT_EQ(panel.LastReflectionText, "0.5");
+    EXPECT_EQ(panel.LastReadingText, "0.5");
+}
+
+TEST_F(PowerReadoutTest, Single_InTheModeAlone_ReadsThePowerToo) {
+    panel.State = ControllerForm::Freq;
+    get("PWR", "3");
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+}
+
+TEST_F(PowerReadoutTest, Single_InAPassOfTheContinuousView_TakesThePowerBranch) {
+    panel.State = ControllerForm::Freq;
+    panel.InstrumentMode = ControllerForm::ANALYZER;
+    panel.ContinuosLoopActive = true;
+    get("PWR", "3");
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+}
+
+TEST_F(PowerReadoutTest, Single_Recording_SavesThePower) {
+    panel.RecordDataFlag = true;
+    Texts saved;
+    panel.SaveView.connect([&](const std::string& kind) { saved.push_back(kind); });
+    get("PWR", "3");
+    panel.PlaySingleButton.Click();
+    EXPECT_EQ(saved, Texts{"power"});
+}
+
+TEST_F(PowerReadoutTest, Single_RefusedReading_KeepsTheOldText) {
+    panel.SoftTextBox(0).Text = "old";
+    getRefused("PWR", "6");
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+    EXPECT_EQ(panel.SoftTextBox(0).Text.get(), "old");
+}
+
+TEST_F(PowerReadoutTest, Dialog_LoadsWithThePowerAlone) {
+    forms.powerAndRefl.ReadPowerAndRefl = true;
+    forms.powerAndRefl.load();
+    EXPECT_TRUE(forms.powerAndRefl.ReadPowerOnly);
+    EXPECT_FALSE(forms.powerAndRefl.ReadPowerAndRefl);
+    EXPECT_TRUE(forms.powerAndRefl.PowerOnlyOption.Value());
+}
+
+TEST_F(PowerReadoutTest, Dialog_Options_SetTheTwoFlags) {
+    forms.powerAndRefl.load();
+    forms.powerAndRefl.PowerAndLeflOption.Click();
+    EXPECT_FALSE(forms.powerAndRefl.ReadPowerOnly);
+    EXPECT_TRUE(forms.powerAndRefl.ReadPowerAndRefl);
+    forms.powerAndRefl.PowerOnlyOption.Click();
+    EXPECT_TRUE(forms.powerAndRefl.ReadPowerOnly);
+    EXPECT_FALSE(forms.powerAndRefl.ReadPowerAndRefl);
+}
+
+TEST_F(PowerReadoutTest, Continuous_AsksInTheDialogAndReadsUntilStop) {
+    choose(false);
+    get("PWR", "1");
+    get("PWR", "2");
+    get("PWR", "3");
+    stopAtReading("3 dBm");
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    expectIdle();
+    EXPECT_TRUE(panel.PlaySingleButton.Enabled);
+    EXPECT_TRUE(panel.CWGraph1.values().empty());
+}
+
+TEST_F(PowerReadoutTest, Continuous_WithReflection_ReadsBothInEachRound) {
+    choose(true);
+    get("PWR", "1");
+    get("REFL", "20");
+    get("PWR", "2");
+    get("REFL", "21");
+    stopAtReading("2 dBm");
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_EQ(panel.SoftTextBox(4).Text.get(), "21 dBm");
+}
+
+TEST_F(PowerReadoutTest, Continuous_InTheTdmaMenu_ReadsItsPowerWithoutADialog) {
+    panel.State = ControllerForm::TDMA;
+    panel.InstrumentMode = ControllerForm::TDMAPOWERMODE;
+    get("TDMAPWR", "-40");
+    get("TDMAPWR", "-41");
+    stopAtReading("-41 dBm");
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    expectIdle();
+    EXPECT_FALSE(forms.powerAndRefl.loaded());
+    EXPECT_TRUE(panel.CWGraph1.values().empty());
+    EXPECT_EQ(panel.LastReadingText, "-41");
+    EXPECT_EQ(panel.LastPowerText, "");
+}
+
+}  // namespace
+}  // namespace zel
