@@ -153,6 +153,7 @@ class ControllerForm : public Form {
     Label SpanLabel{*this, "SpanLabel"};
     Label MarkerLabel{*this, "MarkerLabel"};
     Label DeltaLabel{*this, "DeltaLabel"};
+    Label PaceLabel{*this, "PaceLabel"};  ///< age of the trace, sweeps a second
     TextBox DebugTextBox{*this, "DebugTextBox"};
 
     // Soft positions.
@@ -212,6 +213,7 @@ class ControllerForm : public Form {
     Picture Picture3{*this, "Picture3", "remote"};
     Label TimeLabel{*this, "TimeLabel"};
     Timer UpNow{*this, "UpNow", 1000};
+    Timer PaceTimer{*this, "PaceTimer", 250};
 };
 
 }  // namespace zel

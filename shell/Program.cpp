@@ -31,6 +31,7 @@
 #include "trace/GraphInteraction.h"
 #include "trace/GraphScaling.h"
 #include "trace/ManualScale.h"
+#include "trace/PaceMonitor.h"
 #include "trace/PowerReadout.h"
 #include "trace/SweepControl.h"
 #include "trace/TraceConversion.h"
@@ -54,7 +55,9 @@ struct Program::Rooms {
           scaling(panel, forms.waterfall, mirror, p.clock),
           graph(panel, mirror),
           manualScale(panel, forms.manualScale, p.boxes),
-          traces(forms, mirror, line, exchange, binary, conversion, scaling, p.events, p.boxes),
+          pace(panel, p.clock),
+          traces(forms, mirror, line, exchange, binary, conversion, scaling, pace, p.events,
+                 p.boxes),
           power(forms, exchange, p.events),
           sweeps(forms, exchange, traces, power, p.events, p.boxes),
           softPanel(panel),
@@ -86,6 +89,7 @@ struct Program::Rooms {
           end(forms, p.boxes) {
         panel.CommandLine = std::move(commandLine);
         timers.attach(panel.UpNow);
+        timers.attach(panel.PaceTimer);
         panel.UtilityTrouble.Clicked.connect([this] {
             // It is a help on the side: a simulator that is not installed is no error.
             platform.launcher.start(platform.folder.programPath() + "/ZELSim/ZELSim", {"--pty"});
@@ -108,6 +112,7 @@ struct Program::Rooms {
     GraphScaling scaling;
     GraphInteraction graph;
     ManualScale manualScale;
+    PaceMonitor pace;
     TraceReader traces;
     PowerReadout power;
     SweepControl sweeps;

@@ -22,8 +22,8 @@ std::uint8_t byteOf(double number) {
 
 TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, ZELBas& state,
                          CommandExchange& exchange, BinaryTrace& binary,
-                         TraceConversion& conversion, GraphScaling& scaling, Events& events,
-                         MessageBoxes& boxes)
+                         TraceConversion& conversion, GraphScaling& scaling, PaceMonitor& pace,
+                         Events& events, MessageBoxes& boxes)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
@@ -32,6 +32,7 @@ TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, ZELBas& state,
       binary_(binary),
       conversion_(conversion),
       scaling_(scaling),
+      pace_(pace),
       events_(events),
       boxes_(boxes) {}
 
@@ -98,12 +99,15 @@ TraceReader::Step TraceReader::wait() {
         query("CABLELEN", mirror_.CableLength);
         if (exchange_.ExchangeFailed()) return Step::LinkFailed;
     }
+    pace_.sweepWaitBegins();
     exchange_.CmdInstrument("WAIT");
+    pace_.sweepWaitEnds();
     panel_.TraceIntervals = kIntervals;
     return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Ok;
 }
 
 void TraceReader::begin() {
+    pace_.cycleBegins();
     panel_.RecordData.Visible = false;
     pointer(11);
     panel_.PlaySingleButton.Enabled = false;
@@ -204,6 +208,7 @@ void TraceReader::ReadSingleTrace(bool& success) {
     waterfallRow();
     scaling_.DisplayDataOnGraph(panel_.ViewStart, panel_.ViewStop, panel_.TraceIntervals,
                                 panel_.PeakTraceData, panel_.TraceData);
+    pace_.drawn();
     panel_.RecordData.Visible = true;
     success = true;
     pointer(0);
@@ -239,6 +244,7 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     scaleAndConvert();
     scaling_.DisplayDataOnGraph(panel_.ViewStart, panel_.ViewStop, panel_.TraceIntervals,
                                 panel_.PeakTraceData, panel_.TraceData);
+    pace_.drawn();
     panel_.RecordData.Visible = true;
     success = true;
     close();

@@ -10,6 +10,7 @@
 #include "platform/Events.h"
 #include "platform/MessageBox.h"
 #include "trace/GraphScaling.h"
+#include "trace/PaceMonitor.h"
 #include "trace/TraceConversion.h"
 
 namespace zel {
@@ -27,7 +28,7 @@ class TraceReader {
   public:
     TraceReader(Forms& forms, ZEL3Variables& mirror, ZELBas& state, CommandExchange& exchange,
                 BinaryTrace& binary, TraceConversion& conversion, GraphScaling& scaling,
-                Events& events, MessageBoxes& boxes);
+                PaceMonitor& pace, Events& events, MessageBoxes& boxes);
 
     /// The full cycle. True in `success` when a trace was read and drawn.
     void ReadSingleTrace(bool& success);
@@ -60,6 +61,7 @@ class TraceReader {
     BinaryTrace& binary_;
     TraceConversion& conversion_;
     GraphScaling& scaling_;
+    PaceMonitor& pace_;
     Events& events_;
     MessageBoxes& boxes_;
 };

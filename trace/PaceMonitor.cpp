@@ -1,0 +1,67 @@
+#include "trace/PaceMonitor.h"
+
+#include <algorithm>
+#include <string>
+
+#include "support/NumberText.h"
+
+namespace zel {
+namespace {
+
+constexpr std::size_t kTracesKept = 8;
+constexpr double kSecond = 1e6;             // microseconds
+constexpr std::int64_t kLongGap = 5000000;  // a pause is no pace
+constexpr std::int64_t kShortestCycle = 50000;
+
+std::string ageText(double seconds) {
+    if (seconds < 60) return formatPattern(seconds, "0.0") + " s";
+    const auto whole = static_cast<long>(seconds);
+    return std::to_string(whole / 60) + " min " + std::to_string(whole % 60) + " s";
+}
+
+}  // namespace
+
+PaceMonitor::PaceMonitor(ControllerForm& panel, const Clock& clock) : panel_(panel), clock_(clock) {
+    panel_.PaceTimer.Tick.connect([this] { show(); });
+}
+
+void PaceMonitor::cycleBegins() {
+    cycleStart_ = clock_.micros();
+    waited_ = 0;
+}
+
+void PaceMonitor::sweepWaitBegins() { waitStart_ = clock_.micros(); }
+
+void PaceMonitor::sweepWaitEnds() { waited_ = clock_.micros() - waitStart_; }
+
+void PaceMonitor::drawn() {
+    const std::int64_t now = clock_.micros();
+    if (!drawnAt_.empty() && now - drawnAt_.back() > kLongGap) drawnAt_.clear();
+    drawnAt_.push_back(now);
+    if (drawnAt_.size() > kTracesKept) drawnAt_.pop_front();
+    cycleMicros_ = now - cycleStart_;
+    sweepMicros_ = waited_;
+    panel_.PaceTimer.Enabled = true;
+    if (panel_.CWGraph1.Old) show();
+}
+
+double PaceMonitor::sweepsPerSecond() const {
+    if (drawnAt_.size() < 2 || drawnAt_.back() == drawnAt_.front()) return 0;
+    return static_cast<double>(drawnAt_.size() - 1) * kSecond /
+           static_cast<double>(drawnAt_.back() - drawnAt_.front());
+}
+
+void PaceMonitor::show() {
+    if (drawnAt_.empty()) return;
+    const std::int64_t age = clock_.micros() - drawnAt_.back();
+    std::string text = ageText(static_cast<double>(age) / kSecond) + " old";
+    const bool running = viewRuns();
+    if (running && sweepsPerSecond() > 0) {
+        text += "   " + formatPattern(sweepsPerSecond(), "0.0") + " sweeps/s   ";
+        text += sweepSetsThePace() ? "the sweep sets the pace" : "the line sets the pace";
+    }
+    panel_.CWGraph1.Old = running && age > 2 * std::max(cycleMicros_, kShortestCycle);
+    panel_.PaceLabel.Caption = text;
+}
+
+}  // namespace zel
