@@ -1,6 +1,7 @@
 #include "model/Numeric.h"
 
 #include <cmath>
+#include <stdexcept>
 #include <string_view>
 
 #include "support/NumberText.h"
@@ -131,7 +132,11 @@ double ParseLength(const std::string& text, std::string& unit) {
     const std::string plain = TrimControlChars(text);
     const std::size_t stop = materialEnd(plain);
     const double factor = lengthFactor(std::string_view(plain).substr(stop), unit);
-    return scaledNumber(plain, stop, factor);
+    const std::string number = factor == 1 ? plain : plain.substr(0, stop);
+    double value = 0;
+    if (!IsNumericText(number)) return 0;
+    if (!parseLocaleNumber(number, value)) throw std::invalid_argument(plain);
+    return value * factor;
 }
 
 double GetNumeric(const std::string& text) { return leadingNumber(replaceAll(text, ",", ".")); }

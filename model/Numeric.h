@@ -20,6 +20,7 @@ std::string RoundValueText(const std::string& text, int digits);
 /// of its own); 0 for a text that is no number or that carries a unit without a prefix.
 double ParseValue(const std::string& text, std::string& prefix);
 /// A length with "mm", "cm", "µ" or a bare number; a text with "m" behind the number gives 0.
+/// Throws std::invalid_argument for a text such as "5 s", which passes as numeric and is no number.
 double ParseLength(const std::string& text, std::string& unit);
 /// Comma becomes point, then the leading number.
 double GetNumeric(const std::string& text);

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <stdexcept>
 
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
@@ -328,7 +329,11 @@ void Z9SetCommands::marker(int index) {
     double value = 0;
     std::string unit;
     if (panel_.InstrumentMode == CF::DISTTOFAULTMEASURE) {
-        value = ParseLength(panel_.SoftTextBox(index).Text, unit);
+        try {
+            value = ParseLength(panel_.SoftTextBox(index).Text, unit);
+        } catch (const std::invalid_argument&) {
+            return;
+        }
     } else {
         value = boxValue(index);
     }

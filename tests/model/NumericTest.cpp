@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <stdexcept>
 #include <string>
 
 #include "model/Numeric.h"
@@ -163,6 +164,12 @@ INSTANTIATE_TEST_SUITE_P(
                       // A metre cuts nothing off, and so the text is no number.
                       ParseCase{"12 m", 0, "m"}, ParseCase{"12 M", 0, "M"},
                       ParseCase{"12 k", 0, ""}, ParseCase{"", 0, ""}));
+
+TEST(ParseLengthTest, TextThatPassesAsNumericAndIsNoNumber_Fails) {
+    std::string unit;
+    EXPECT_THROW(ParseLength("5 s", unit), std::invalid_argument);
+    EXPECT_THROW(ParseLength(".1.5", unit), std::invalid_argument);
+}
 
 struct ReadCase {
     const char* text;
