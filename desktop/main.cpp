@@ -23,7 +23,7 @@ struct Options {
     QString words;
     QString screenshot;
     QSize size;
-    zel::ThemeChoice theme = zel::ThemeChoice::System;
+    std::optional<zel::ThemeChoice> theme;  ///< none: as it was chosen last
     bool valid = true;
 };
 
@@ -35,7 +35,7 @@ Options parse(const QApplication& application) {
     parser.addOption({"connect", "Connect to serial:DEVICE[@BAUD] or tcp:HOST:PORT.", "url"});
     parser.addOption({"home", "Keep all files and settings in this folder.", "dir"});
     parser.addOption({"words", "Words of the program's command line.", "text"});
-    parser.addOption({"theme", "light, dark or system.", "name", "system"});
+    parser.addOption({"theme", "light, dark or system; without it the last choice.", "name"});
     parser.addOption({"size", "Size of the window, as 1024x600.", "size"});
     parser.addOption({"screenshot", "Read one sweep, save a picture of the window, end.", "file"});
     parser.addPositionalArgument("words", "Words of the program's command line.", "[words...]");
@@ -44,7 +44,7 @@ Options parse(const QApplication& application) {
     options.home = parser.value("home");
     options.words = (QStringList(parser.value("words")) + parser.positionalArguments()).join(' ');
     options.screenshot = parser.value("screenshot");
-    options.theme = zel::themeFromText(parser.value("theme"));
+    if (parser.isSet("theme")) options.theme = zel::themeFromText(parser.value("theme"));
     const QStringList size = parser.value("size").split('x');
     if (size.size() == 2) options.size = {size[0].toInt(), size[1].toInt()};
     if (parser.isSet("connect")) {
@@ -73,9 +73,11 @@ int main(int argc, char** argv) {
     QApplication::setApplicationVersion(QString::fromStdString(zel::versionText(zel::kVersion)));
     const Options options = parse(application);
     if (!options.valid) return kWrongUse;
-    zel::applyTheme(application, options.theme);
 
     zel::QtPlatform platform(options.home);
+    const zel::ThemeChoice theme = options.theme.value_or(zel::themeFromText(
+        QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Theme", ""))));
+    zel::applyTheme(application, theme);
     zel::Program program(platform.bundle(), options.words.toStdString());
     int result = 0;
     program.Ended.connect([&result] {
@@ -84,6 +86,11 @@ int main(int argc, char** argv) {
         std::_Exit(result);
     });
     zel::MainWindow window(program);
+    window.addThemeMenu(theme, [&](zel::ThemeChoice choice) {
+        zel::applyTheme(application, choice);
+        platform.settings.set("ZELRemote", "Desktop", "Theme",
+                              zel::themeText(choice).toStdString());
+    });
     if (options.size.isValid()) window.resize(options.size);
     const auto run = [&] {
         program.start();

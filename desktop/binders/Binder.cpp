@@ -1,5 +1,6 @@
 #include "desktop/binders/Binder.h"
 
+#include <QKeyEvent>
 #include <QMenu>
 #include <QSignalBlocker>
 #include <QStyle>
@@ -25,6 +26,24 @@ QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
 QString caption(const std::string& utf8) {
     return text(utf8).replace("\r\n", "\n").replace("&", "&&");
 }
+
+/// Tells a button of each key that it gets, F1 among them.
+class KeyTeller : public QObject {
+  public:
+    KeyTeller(Button& control, QObject* parent) : QObject(parent), control_(control) {}
+
+    bool eventFilter(QObject* watched, QEvent* event) override {
+        if (event->type() == QEvent::KeyPress) {
+            const auto& key = *static_cast<QKeyEvent*>(event);
+            if (const int code = keyCodeOf(key); code != 0)
+                control_.KeyDown(code, key.modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);
+        }
+        return QObject::eventFilter(watched, event);
+    }
+
+  private:
+    Button& control_;
+};
 
 /// Keys without a handler belong to rooms that are not built yet.
 template <class T>
@@ -64,6 +83,10 @@ void Binder::markDirty(const void* key) {
     if (!frame_.isActive()) frame_.start(kFrameMs);
 }
 
+void Binder::refreshAll() {
+    for (const auto& [key, entry] : entries_) markDirty(key);
+}
+
 void Binder::flush() {
     if (flushing_) return;
     flushing_ = true;
@@ -81,6 +104,11 @@ void Binder::follow(Control& control, QObject* widget, std::function<void()> sho
     widget->setObjectName(text(control.form().name() == "ControllerForm"
                                    ? control.name()
                                    : control.form().name() + "." + control.name()));
+    if (auto* shown = qobject_cast<QWidget*>(widget); shown != nullptr)
+        show = [this, &control, shown, draw = std::move(show)] {
+            describe(control, shown);
+            draw();
+        };
     entries_[&control] = {widget, std::move(show)};
     // The windows end ahead of the forms: a change behind their end is nobody's.
     control.Changed.connect([self = QPointer<Binder>(this), key = &control] {
@@ -91,13 +119,15 @@ void Binder::follow(Control& control, QObject* widget, std::function<void()> sho
 }
 
 void Binder::describe(const Control& control, QWidget* widget) {
-    const QString tip = toolTipOf(control);
+    const std::string& own = control.ToolTip;
+    const QString tip = own.empty() ? toolTipOf(control) : text(own);
+    if (widget->toolTip() == tip && !widget->accessibleName().isEmpty()) return;
     widget->setToolTip(tip);
-    if (widget->accessibleName().isEmpty()) widget->setAccessibleName(tip.section('\n', 0, 0));
+    widget->setAccessibleName(tip.isEmpty() ? text(control.name()) : tip);
 }
 
 void Binder::bind(Button& control, QPushButton* widget) {
-    describe(control, widget);
+    widget->installEventFilter(new KeyTeller(control, widget));
     connect(widget, &QPushButton::clicked, this, [this, &control] {
         if (!refused(control)) control.Click();
     });
@@ -114,10 +144,12 @@ void Binder::bind(Button& control, QPushButton* widget) {
 }
 
 void Binder::bind(TextBox& control, PanelLineEdit* widget) {
-    describe(control, widget);
     widget->setControl(&control, [this, &control] { return refused(control); });
-    connect(widget, &QLineEdit::textEdited, this,
-            [&control](const QString& typed) { control.Text = typed.toStdString(); });
+    connect(widget, &QLineEdit::textEdited, this, [this, &control](const QString& typed) {
+        // A paste does not come by the keys.
+        if (refused(control)) return markDirty(&control);
+        control.Text = typed.toStdString();
+    });
     follow(control, widget, [&control, widget] {
         const QString shown = text(control.Text);
         if (widget->text() != shown) {
@@ -135,7 +167,6 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
 }
 
 void Binder::bind(Label& control, QLabel* widget) {
-    describe(control, widget);
     follow(control, widget, [&control, widget] {
         widget->setText(text(control.Caption));
         widget->setVisible(control.Visible);
@@ -146,7 +177,6 @@ void Binder::bind(Label& control, QLabel* widget) {
 }
 
 void Binder::bind(CheckBox& control, QCheckBox* widget) {
-    describe(control, widget);
     connect(widget, &QCheckBox::clicked, this, [this, &control, widget] {
         if (refused(control)) {
             widget->setChecked(control.Value());
@@ -164,7 +194,6 @@ void Binder::bind(CheckBox& control, QCheckBox* widget) {
 }
 
 void Binder::bind(OptionButton& control, QRadioButton* widget) {
-    describe(control, widget);
     // The group is the form's: Qt's own exclusion would not know what code selects.
     widget->setAutoExclusive(false);
     connect(widget, &QRadioButton::clicked, this, [this, &control, widget] {
@@ -181,7 +210,6 @@ void Binder::bind(OptionButton& control, QRadioButton* widget) {
 }
 
 void Binder::bind(DropDownList& control, QComboBox* widget) {
-    describe(control, widget);
     widget->setEditable(control.editable());
     widget->setInsertPolicy(QComboBox::NoInsert);
     connect(widget, &QComboBox::activated, this, [this, &control](int index) {
@@ -189,8 +217,10 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
         markDirty(&control);
     });
     if (control.editable())
-        connect(widget, &QComboBox::editTextChanged, this,
-                [&control](const QString& typed) { control.setText(typed.toStdString()); });
+        connect(widget, &QComboBox::editTextChanged, this, [this, &control](const QString& typed) {
+            if (refused(control)) return markDirty(&control);
+            control.setText(typed.toStdString());
+        });
     follow(control, widget, [&control, widget] {
         const QSignalBlocker quiet(widget);
         QStringList items;
@@ -234,7 +264,6 @@ void Binder::bind(MenuItem& control, QAction* action) {
 }
 
 void Binder::bindShow(Control& control, QWidget* widget, std::function<void()> show) {
-    describe(control, widget);
     follow(control, widget, std::move(show));
 }
 

@@ -19,6 +19,7 @@
 #include <unordered_set>
 #include <vector>
 
+#include "desktop/platform/KeyCodes.h"
 #include "platform/Controls.h"
 
 namespace zel {
@@ -42,6 +43,10 @@ class Binder : public QObject {
     void bindShow(Control& control, QWidget* widget, std::function<void()> show);
     void bindForm(Form& form, QObject* owner, std::function<void()> show);
 
+    /// Shows the form anew with the next frame.
+    void refresh(const Form& form) { markDirty(&form); }
+    /// Shows every control and form anew: the colours have changed.
+    void refreshAll();
     /// Shows all changes now.
     void flush();
     /// While this answers true for a control, what a user does to it is dropped: work is under

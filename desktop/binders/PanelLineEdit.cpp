@@ -5,29 +5,6 @@
 namespace zel {
 namespace {
 
-struct KeyRow {
-    int qtKey;
-    int code;
-};
-constexpr KeyRow kKeys[] = {
-    {Qt::Key_Backspace, kKeyBackspace},
-    {Qt::Key_Clear, kKeyClear},
-    {Qt::Key_Return, kKeyEnter},
-    {Qt::Key_Enter, kKeyEnter},
-    {Qt::Key_Left, kKeyLeft},
-    {Qt::Key_Right, kKeyRight},
-    {Qt::Key_F1, kKeyF1},
-};
-
-int codeOf(const QKeyEvent& event) {
-    for (const KeyRow& row : kKeys)
-        if (row.qtKey == event.key()) return row.code;
-    const bool named = (event.key() >= Qt::Key_A && event.key() <= Qt::Key_Z) ||
-                       (event.key() >= Qt::Key_0 && event.key() <= Qt::Key_9) ||
-                       event.key() == Qt::Key_Space;
-    return named ? event.key() : 0;
-}
-
 /// The character that a key puts into the text: code points, and the two that handlers know.
 int characterOf(const QKeyEvent& event, int code) {
     if (code == kKeyEnter || code == kKeyBackspace) return code;
@@ -46,7 +23,7 @@ void PanelLineEdit::setControl(TextBox* control, std::function<bool()> refused) 
 void PanelLineEdit::keyPressEvent(QKeyEvent* event) {
     if (control_ == nullptr || isReadOnly()) return QLineEdit::keyPressEvent(event);
     if (refused_ && refused_()) return;
-    const int code = codeOf(*event);
+    const int code = keyCodeOf(*event);
     control_->KeyDown(code, event->modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);
     int character = characterOf(*event, code);
     if (character != 0) {
@@ -57,6 +34,8 @@ void PanelLineEdit::keyPressEvent(QKeyEvent* event) {
         if (character == 0) return;
         if (code == kKeyEnter) {
             selectAll();
+            // Nobody waits for it here: the window may have a key for it.
+            if (!control_->KeyPress.connected()) event->ignore();
             return;
         }
     }

@@ -20,6 +20,7 @@ const Tip kTips[] = {
     {"SpanLabel", "Span"},
     {"MarkerLabel", "Marker: position and level"},
     {"DeltaLabel", "Delta marker or pointer: position and level"},
+    {"PaceLabel", "Age of the trace, sweeps a second, and what sets the pace"},
     {"DebugTextBox", "Last step of the exchange with the instrument"},
     {"GetOption", "A soft key asks the instrument"},
     {"SetOption", "A soft key changes the instrument"},

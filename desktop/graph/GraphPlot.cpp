@@ -59,13 +59,14 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     auto* top = new QCPLayoutGrid;
     layout->addElement(0, 0, top);
     top->setMargins(QMargins(10, 8, 22, 0));
-    top_ = {addText(*top, 0, Qt::AlignLeft), addText(*top, 1, Qt::AlignLeft),
-            addText(*top, 2, Qt::AlignRight), addText(*top, 3, Qt::AlignRight)};
+    top->setRowSpacing(1);
+    top_ = {addText(*top, 0, 0, Qt::AlignLeft), addText(*top, 0, 1, Qt::AlignRight),
+            addText(*top, 1, 0, Qt::AlignLeft), addText(*top, 1, 1, Qt::AlignRight)};
     auto* bottom = new QCPLayoutGrid;
     layout->addElement(2, 0, bottom);
     bottom->setMargins(QMargins(10, 0, 22, 6));
-    bottom_ = {addText(*bottom, 0, Qt::AlignLeft), addText(*bottom, 1, Qt::AlignHCenter),
-               addText(*bottom, 2, Qt::AlignRight)};
+    bottom_ = {addText(*bottom, 0, 0, Qt::AlignLeft), addText(*bottom, 0, 1, Qt::AlignHCenter),
+               addText(*bottom, 0, 2, Qt::AlignRight)};
     layout->setRowSpacing(2);
     layout->setRowStretchFactor(0, 0.001);
     layout->setRowStretchFactor(2, 0.001);
@@ -90,13 +91,22 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     triggerText_->setFont(plotFont());
     triggerText_->setPositionAlignment(Qt::AlignLeft | Qt::AlignBottom);
     triggerText_->setVisible(false);
+    old_ = new QCPItemText(&plot_);
+    old_->position->setType(QCPItemPosition::ptAxisRectRatio);
+    old_->position->setCoords(0.5, 0.04);
+    old_->setPositionAlignment(Qt::AlignHCenter | Qt::AlignTop);
+    old_->setText("OLD TRACE");
+    old_->setColor(colors_.trigger);
+    old_->setFont(plotFont());
+    old_->setVisible(false);
 }
 
-QCPTextElement* GraphPlot::addText(QCPLayoutGrid& row, int column, Qt::Alignment alignment) {
+QCPTextElement* GraphPlot::addText(QCPLayoutGrid& grid, int row, int column,
+                                   Qt::Alignment alignment) {
     auto* element = new QCPTextElement(&plot_, " ", plotFont());
     element->setTextColor(colors_.text);
     element->setTextFlags(static_cast<int>((alignment | Qt::AlignVCenter).toInt()));
-    row.addElement(0, column, element);
+    grid.addElement(row, column, element);
     return element;
 }
 
@@ -133,6 +143,8 @@ void GraphPlot::setRanges(const Graph& graph) {
 void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     setRanges(graph);
     qSharedPointerCast<DivisionTicker>(plot_.xAxis->ticker())->setUnit(view.xUnit);
+    // Without a trace the x axis has no meaning yet.
+    plot_.xAxis->setTickLabels(view.ok || !graph.values().empty());
     plot_.yAxis->setTickLabels(graph.yAxis().ShowLabels);
     plot_.yAxis->setLabel(graph.yAxis().ShowLabels ? text(view.unit) : QString());
     if (!drawn_ || serial_ != graph.plotSerial()) {
@@ -158,6 +170,10 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
         items.point->setPen(QPen(colorOf(cursor.color), 2));
         items.point->position->setCoords(cursor.X, cursor.Y);
     }
+    old_->setVisible(graph.Old);
+    QColor ink = colors_.trace;
+    if (graph.Old) ink = ink.darker(200);
+    if (trace_->pen().color() != ink) trace_->setPen(QPen(ink, trace_->pen().widthF()));
     const GraphAnnotation& trigger = graph.trigger();
     trigger_->setVisible(trigger.Visible);
     triggerText_->setVisible(trigger.Visible);
@@ -166,9 +182,9 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     triggerText_->position->setCoords(plot_.xAxis->range().lower, trigger.Height);
     triggerText_->setText(text(trigger.Caption));
     top_[0]->setText(joined({text(view.refLevel), text(view.range)}));
-    top_[1]->setText(text(view.mode));
-    top_[2]->setText(text(view.detector));
-    top_[3]->setText(joined({text(view.rbw), text(view.vbw), text(view.sweepTime)}));
+    top_[1]->setText(joined({text(view.rbw), text(view.vbw)}));
+    top_[2]->setText(joined({text(view.mode), text(view.detector)}));
+    top_[3]->setText(text(view.sweepTime));
     bottom_[0]->setText(text(view.left));
     bottom_[1]->setText(text(view.center));
     bottom_[2]->setText(text(view.right));
@@ -184,15 +200,15 @@ int GraphPlot::cursorAt(const QPointF& pixel) const {
     return 0;
 }
 
-double GraphPlot::valueAt(double x) const {
+QPointF GraphPlot::pointAt(double x) const {
     const auto found = trace_->findBegin(x, true);
     const auto data = trace_->data();
-    if (data->isEmpty()) return 0;
+    if (data->isEmpty()) return {x, 0};
     auto at = data->at(found);
     if (at == data->constEnd()) --at;
     const auto next = at + 1;
     if (next != data->constEnd() && std::fabs(next->key - x) < std::fabs(at->key - x)) at = next;
-    return at->value;
+    return {at->key, at->value};
 }
 
 }  // namespace zel

@@ -34,7 +34,8 @@ class GraphPlot {
     QCPAxisRect& axisRect() { return *axisRect_; }
     /// The 1-based index of the cursor within reach of a pixel, or 0.
     int cursorAt(const QPointF& pixel) const;
-    double valueAt(double x) const;
+    /// The point of the trace that lies nearest to x; (x, 0) where there is no trace.
+    QPointF pointAt(double x) const;
 
   private:
     struct CursorItems {
@@ -43,7 +44,7 @@ class GraphPlot {
         bool visible = false;
         double x = 0;
     };
-    QCPTextElement* addText(QCPLayoutGrid& row, int column, Qt::Alignment alignment);
+    QCPTextElement* addText(QCPLayoutGrid& grid, int row, int column, Qt::Alignment alignment);
     void styleAxes();
     void setRanges(const Graph& graph);
 
@@ -56,6 +57,7 @@ class GraphPlot {
     std::array<CursorItems, 2> cursors_{};
     QCPItemStraightLine* trigger_ = nullptr;
     QCPItemText* triggerText_ = nullptr;
+    QCPItemText* old_ = nullptr;
     unsigned long serial_ = 0;
     bool drawn_ = false;
 };

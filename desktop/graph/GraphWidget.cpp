@@ -5,7 +5,7 @@
 #include <QRubberBand>
 #include <algorithm>
 
-#include "platform/Controls.h"
+#include "desktop/platform/KeyCodes.h"
 
 namespace zel {
 namespace {
@@ -93,12 +93,14 @@ void GraphWidget::finishZoom(const QRect& rectangle) {
 }
 
 void GraphWidget::moveCursor(int index, double x) {
-    graph_.CursorMoved(index, x, picture_->valueAt(x));
+    const QPointF point = picture_->pointAt(x);
+    graph_.CursorMoved(index, point.x(), point.y());
 }
 
 void GraphWidget::keyPressEvent(QKeyEvent* event) {
     const int key = event->key();
-    if (key == Qt::Key_F1) graph_.KeyDown(kKeyF1, 0);
+    if (const int code = keyCodeOf(*event); code != 0)
+        graph_.KeyDown(code, event->modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);
     const bool sideways = key == Qt::Key_Left || key == Qt::Key_Right;
     const bool movable = graph_.TrackMode == static_cast<int>(TrackMode::DragCursors);
     if (!sideways || !movable) return QCustomPlot::keyPressEvent(event);

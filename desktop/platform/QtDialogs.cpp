@@ -38,6 +38,10 @@ const ButtonSet kButtonSets[] = {
     {BoxButtons::YesNo, QMessageBox::Yes | QMessageBox::No, QMessageBox::No},
 };
 
+QString linesOf(const std::string& text) {
+    return QString::fromStdString(text).replace("\r\n", "\n");
+}
+
 BoxAnswer answerOf(int button) {
     switch (button) {
         case QMessageBox::Cancel:
@@ -106,7 +110,7 @@ BoxAnswer QtMessageBoxes::show(const Box& box) {
     window.setIcon(iconOf(box.icon));
     window.setWindowTitle(QString::fromStdString(box.title));
     window.setTextFormat(Qt::PlainText);
-    window.setText(QString::fromStdString(box.text).replace("\r\n", "\n"));
+    window.setText(linesOf(box.text));
     for (const ButtonSet& row : kButtonSets) {
         if (row.set != box.buttons) continue;
         window.setStandardButtons(row.buttons);
@@ -121,7 +125,7 @@ std::optional<std::string> QtMessageBoxes::prompt(const std::string& text, const
     const NormalPointer pointer;
     bool accepted = false;
     const QString reply = QInputDialog::getText(
-        QApplication::activeWindow(), QString::fromStdString(title), QString::fromStdString(text),
+        QApplication::activeWindow(), QString::fromStdString(title), linesOf(text),
         QLineEdit::Normal, QString::fromStdString(preset), &accepted);
     if (!accepted) return std::nullopt;
     return reply.toStdString();

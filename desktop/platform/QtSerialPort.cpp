@@ -15,7 +15,7 @@ constexpr int kDataReceived = 2;
 
 /// "COM3" is the third port of the mainboard here; any other name stands for itself.
 QString deviceOf(const std::string& name) {
-    const QString text = QString::fromStdString(name);
+    QString text = QString::fromStdString(name);
 #ifndef Q_OS_WIN
     if (text.startsWith("COM")) {
         bool number = false;
@@ -49,10 +49,12 @@ QtSerialPort::~QtSerialPort() {
 }
 
 std::string QtSerialPort::openProblem() const {
-    const QString device = QString::fromStdString(name_);
-    if (!QFileInfo::exists(device))
+    if (name_.empty()) return "No serial port is chosen. Choose one or type the name of a device.";
+    // A name without a folder is one of the devices.
+    const std::string path = name_.front() == '/' ? name_ : "/dev/" + name_;
+    if (!QFileInfo::exists(QString::fromStdString(path)))
         return name_ + " is not there. Check the cable and the name of the port.";
-    if (::access(name_.c_str(), R_OK | W_OK) != 0)
+    if (::access(path.c_str(), R_OK | W_OK) != 0)
         return "No rights to use " + name_ +
                ". Add yourself to the group \"dialout\" and log in again.";
     if (port_.error() == QSerialPort::PermissionError)
@@ -101,9 +103,7 @@ void QtSerialPort::lost() {
         return;
     }
     problem_ = name_ + " has gone. Check the cable, then disconnect and connect again.";
-    // The port is still on the stack: it is closed when its own work is done.
-    QSerialPort* port = &port_;
-    if (port->isOpen()) port->close();
+    port_.close();
 }
 
 bool QtSerialPort::hungUp() const {
@@ -118,7 +118,7 @@ std::string QtSerialPort::input() {
     // through the loop, behind it.
     std::string bytes;
     if (port_.bytesAvailable() > 0) bytes = port_.readAll().toStdString();
-    std::array<char, 4096> room;
+    std::array<char, 4096> room{};
     ssize_t count = 0;
     do {
         count = ::read(static_cast<int>(port_.handle()), room.data(), room.size());

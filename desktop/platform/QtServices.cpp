@@ -1,14 +1,17 @@
 #include "desktop/platform/QtServices.h"
 
 #include <QCoreApplication>
+#include <QDesktopServices>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
+#include <QGuiApplication>
 #include <QLoggingCategory>
 #include <QProcess>
 #include <QSaveFile>
 #include <QSettings>
 #include <QStandardPaths>
+#include <QUrl>
 
 namespace zel {
 namespace {
@@ -50,7 +53,9 @@ std::string QtSettingsStore::get(const std::string& application, const std::stri
                                  const std::string& key, const std::string& fallback) {
     const QSettings settings(file_, QSettings::IniFormat);
     const QVariant value = settings.value(settingsKey(application, section, key));
-    return value.isValid() ? value.toString().toStdString() : fallback;
+    if (!value.isValid()) return fallback;
+    // A text with commas that a hand wrote without quotes comes as a list.
+    return value.toStringList().join(", ").toStdString();
 }
 
 void QtSettingsStore::set(const std::string& application, const std::string& section,
@@ -67,7 +72,11 @@ void QtDebugChannel::output(const std::string& text) {
 bool QtLauncher::start(const std::string& path, const std::vector<std::string>& arguments) {
     QStringList list;
     for (const std::string& argument : arguments) list << QString::fromStdString(argument);
-    return QProcess::startDetached(QString::fromStdString(path), list);
+    const QFileInfo file(QString::fromStdString(path));
+    const bool document = file.isFile() && !file.isExecutable();
+    if (document && qobject_cast<QGuiApplication*>(QCoreApplication::instance()) != nullptr)
+        return QDesktopServices::openUrl(QUrl::fromLocalFile(file.absoluteFilePath()));
+    return QProcess::startDetached(file.filePath(), list);
 }
 
 bool QtStartupFolder::createLink(const std::string& linkName, const std::string& argument) {

@@ -29,6 +29,7 @@ QString captionOf(const Control& control) {
 }
 
 constexpr int kFieldWidth = 260;
+constexpr int kHourglass = 11;
 
 }  // namespace
 
@@ -42,7 +43,9 @@ void FormWindow::followForm() {
     binder_.bindForm(form_, this, [this] {
         setWindowTitle(QString::fromStdString(form_.Caption));
         const bool shown = form_.Visible;
-        setCursor(form_.MousePointer == 11 ? Qt::WaitCursor : Qt::ArrowCursor);
+        const bool busy = form_.MousePointer == kHourglass;
+        setCursor(busy ? Qt::BusyCursor : Qt::ArrowCursor);
+        if (busy_ != nullptr) busy_->setVisible(busy);
         if (shown == isVisible()) return;
         if (shown) {
             setWindowModality(form_.Modal ? Qt::ApplicationModal : Qt::NonModal);
@@ -66,9 +69,11 @@ void FormWindow::closeEvent(QCloseEvent* event) {
 void FormWindow::reject() { close(); }
 
 void FormWindow::keyPressEvent(QKeyEvent* event) {
-    // Enter in a field is the field's; QDialog would press a button.
+    // Enter presses the button that has the focus, else the one that the dialog is for.
     if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter) {
-        if (auto* button = qobject_cast<QPushButton*>(focusWidget())) button->click();
+        if (auto* focused = qobject_cast<QPushButton*>(focusWidget())) return focused->click();
+        for (QPushButton* button : findChildren<QPushButton*>())
+            if (button->isDefault() && button->isVisible()) return button->click();
         return;
     }
     QDialog::keyPressEvent(event);
@@ -95,6 +100,7 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
             auto* button = new QPushButton;
             button->setAutoDefault(false);
             button->setMinimumWidth(90);
+            if (buttons->count() == 1) button->setDefault(true);  // behind the stretch
             buttons->addWidget(button);
             binder.bind(static_cast<Button&>(*control), button);
         }
@@ -158,7 +164,16 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     for (Button* control : {&form.ZELButton, &form.DisconnectButton, &form.DisconnectButton2,
                             &form.CancelConnButton, &form.CancelConnButton1})
         keys->addWidget(button(*control));
+    static_cast<QPushButton*>(binder.widgetOf(form.ZELButton))->setDefault(true);
     layout->addStretch(1);
+    busy_ = new QProgressBar;
+    busy_->setRange(0, 0);
+    busy_->setTextVisible(false);
+    busy_->setFixedHeight(6);
+    QSizePolicy policy = busy_->sizePolicy();
+    policy.setRetainSizeWhenHidden(true);  // nothing moves when the work begins
+    busy_->setSizePolicy(policy);
+    layout->addWidget(busy_);
     layout->addLayout(keys);
     layout->setSizeConstraint(QLayout::SetMinimumSize);
     followForm();

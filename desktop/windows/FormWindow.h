@@ -2,6 +2,7 @@
 // A dialog window for a form: shown, hidden and modal as the form says.
 
 #include <QDialog>
+#include <QProgressBar>
 
 #include "desktop/binders/Binder.h"
 #include "platform/Form.h"
@@ -21,6 +22,7 @@ class FormWindow : public QDialog {
 
     Form& form_;
     Binder& binder_;
+    QProgressBar* busy_ = nullptr;  ///< runs while the form shows the hourglass
 };
 
 /// A window that lays the form's controls out in their order: a row a text box, options below

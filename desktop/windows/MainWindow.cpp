@@ -1,5 +1,6 @@
 #include "desktop/windows/MainWindow.h"
 
+#include <QActionGroup>
 #include <QApplication>
 #include <QCloseEvent>
 #include <QGridLayout>
@@ -17,7 +18,9 @@ namespace {
 
 constexpr int kSpacing = 6;
 constexpr int kActivityMs = 150;
-constexpr int kSideWidth = 400;
+constexpr int kDotWidth = 26;
+constexpr int kSideWidth = 440;
+constexpr int kWidestSide = 620;
 constexpr int kHourglass = 11;
 
 QLabel* readout() {
@@ -39,11 +42,11 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     auto* layout = new QHBoxLayout(centre);
     layout->setSpacing(kSpacing);
     layout->setContentsMargins(kSpacing, kSpacing, kSpacing, kSpacing);
-    layout->addWidget(graphSide(), 1);
+    layout->addWidget(graphSide(), 7);
     auto* side = new PanelSide(panel_, binder_);
     side->setMinimumWidth(kSideWidth);
-    side->setMaximumWidth(kSideWidth + 120);
-    layout->addWidget(side, 0);
+    side->setMaximumWidth(kWidestSide);
+    layout->addWidget(side, 3);
     setCentralWidget(centre);
     buildMenus();
     buildStatusLine();
@@ -58,6 +61,9 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     binder_.bindForm(panel_, this, [this] {
         setWindowTitle(QString::fromStdString(panel_.Caption));
         showState();
+    });
+    forms.main.Changed.connect([self = QPointer<MainWindow>(this)] {
+        if (self) self->binder_.refresh(self->panel_);
     });
     binder_.flush();
     graph_->setFocus();
@@ -95,6 +101,11 @@ QWidget* MainWindow::graphSide() {
         readouts->addWidget(label, place / 2, place % 2);
         ++place;
     }
+    QLabel* pace = new QLabel;
+    pace->setObjectName("caption");
+    pace->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    binder_.bind(panel_.PaceLabel, pace);
+    readouts->addWidget(pace, 0, 2, 2, 1);
     readouts->setColumnStretch(0, 2);
     readouts->setColumnStretch(1, 3);
     layout->addLayout(readouts);
@@ -122,10 +133,34 @@ void MainWindow::buildMenus() {
     }
 }
 
+void MainWindow::addThemeMenu(ThemeChoice now, std::function<void(ThemeChoice)> choose) {
+    auto* menu = new QMenu("View", this);
+    auto* help = qobject_cast<QAction*>(binder_.widgetOf(panel_.HelpMenu));
+    menuBar()->insertMenu(help, menu);
+    auto* group = new QActionGroup(menu);
+    constexpr std::pair<ThemeChoice, const char*> kThemes[] = {
+        {ThemeChoice::System, "Theme of the System"},
+        {ThemeChoice::Light, "Light Theme"},
+        {ThemeChoice::Dark, "Dark Theme"},
+    };
+    for (const auto& [theme, caption] : kThemes) {
+        QAction* action = menu->addAction(caption);
+        action->setCheckable(true);
+        action->setChecked(theme == now);
+        group->addAction(action);
+        connect(action, &QAction::triggered, this, [this, choose, chosen = theme] {
+            choose(chosen);
+            binder_.refreshAll();
+        });
+    }
+}
+
 void MainWindow::buildStatusLine() {
     state_ = new QLabel;
     activity_ = new QLabel;
     activity_->setToolTip("Traffic on the link");
+    activity_->setText("<span style='color:#77818b'>●</span>");
+    activity_->setMinimumWidth(kDotWidth);
     busy_ = new QProgressBar;
     busy_->setRange(0, 0);
     busy_->setFixedSize(90, 10);
@@ -167,7 +202,8 @@ void MainWindow::showState() {
         text = "Connecting...";
     }
     state_->setText(text);
-    const bool busy = panel_.MousePointer == kHourglass;
+    const bool busy =
+        panel_.MousePointer == kHourglass || forms.main.MousePointer == kHourglass;
     busy_->setVisible(busy && !panel_.ContinuosLoopActive);
     setCursor(busy && !panel_.ContinuosLoopActive ? Qt::BusyCursor : Qt::ArrowCursor);
 }

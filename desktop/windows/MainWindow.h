@@ -9,6 +9,7 @@
 #include "desktop/binders/Binder.h"
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/windows/FormWindow.h"
+#include "desktop/windows/Theme.h"
 #include "shell/Program.h"
 
 namespace zel {
@@ -20,6 +21,8 @@ class MainWindow : public QMainWindow {
 
     GraphWidget& graph() { return *graph_; }
     Binder& binder() { return binder_; }
+    /// A menu of the themes; `choose` hears each choice, behind which all is drawn anew.
+    void addThemeMenu(ThemeChoice now, std::function<void(ThemeChoice)> choose);
     /// Shows everything as the forms have it, at once.
     void showNow();
 

@@ -10,6 +10,7 @@ namespace {
 
 constexpr int kSpacing = 5;
 constexpr int kTallest = 84;
+constexpr int kFieldWidth = 120;
 
 QFrame* group() {
     auto* frame = new QFrame;
@@ -66,8 +67,14 @@ QWidget* PanelSide::playKeys() {
     QFrame* frame = group();
     auto* layout = layoutOf<QHBoxLayout>(frame);
     for (Button* control : {&panel_.PlaySingleButton, &panel_.PlayContinuousButton,
-                            &panel_.StopButton, &panel_.cmdZoom, &panel_.cmd3D, &panel_.cmdSpecial})
-        layout->addWidget(key(*control), 1);
+                            &panel_.StopButton, &panel_.cmdZoom, &panel_.cmd3D,
+                            &panel_.cmdSpecial}) {
+        QPushButton* button = key(*control);
+        // Where the row is tight each key still shows its whole caption.
+        button->setMinimumWidth(0);
+        button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Fixed);
+        layout->addWidget(button);
+    }
     return frame;
 }
 
@@ -100,10 +107,12 @@ QWidget* PanelSide::softPositions() {
         places->setContentsMargins(0, 0, 0, 0);
         places->setSpacing(3);
         auto* box = new PanelLineEdit;
-        box->setMinimumWidth(40);
         auto* list = new QComboBox;
-        list->setMinimumWidth(40);
-        list->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+        // What a menu shows here does not move the keys: the place is the same for all.
+        for (QWidget* field : {static_cast<QWidget*>(box), static_cast<QWidget*>(list)}) {
+            field->setMinimumWidth(40);
+            field->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+        }
         places->addWidget(box, 1);
         places->addWidget(list, 1);
         binder_.bind(panel_.SoftTextBox(i), box);
@@ -111,6 +120,7 @@ QWidget* PanelSide::softPositions() {
         binder_.bind(panel_.SoftFrame(i), fields, caption);
         row->addWidget(fields, 1, 1, 1, 2, Qt::AlignTop);
         row->setColumnStretch(1, 1);
+        row->setColumnMinimumWidth(1, kFieldWidth);
         layout->addLayout(row, 1);
     }
     return frame;

@@ -14,7 +14,8 @@ struct ThemeColors {
     const char* window;
     const char* base;
     const char* text;
-    const char* dim;
+    const char* dim;      ///< what cannot be used now
+    const char* caption;  ///< small texts beside fields
     const char* button;
     const char* buttonHover;
     const char* border;
@@ -26,12 +27,12 @@ struct ThemeColors {
     const char* green;
     const char* locked;
 };
-constexpr ThemeColors kDark = {"#1b2027", "#11151a", "#e6ebf0", "#7d8894", "#2c343e",
-                               "#38424e", "#46525f", "#2f7fd6", "#ffffff", "#4a4220",
-                               "#ffe08a", "#c0392b", "#1e8449", "#191e24"};
-constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#ffffff",
-                                "#e3e9f0", "#b4bdc7", "#1d6fc4", "#ffffff", "#fbeeb8",
-                                "#5c4a00", "#c0392b", "#1e8449", "#e4e8ec"};
+constexpr ThemeColors kDark = {"#1b2027", "#11151a", "#e6ebf0", "#7d8894", "#aab4bf",
+                               "#2c343e", "#38424e", "#46525f", "#2873c6", "#ffffff",
+                               "#4a4220", "#ffe08a", "#c0392b", "#1e8449", "#191e24"};
+constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#48525c",
+                                "#ffffff", "#e3e9f0", "#9aa5b1", "#1d6fc4", "#ffffff",
+                                "#fbeeb8", "#5c4a00", "#c0392b", "#1e8449", "#e4e8ec"};
 
 constexpr const char* kStyleSheet = R"(
 QWidget { font-size: 9pt; }
@@ -51,9 +52,14 @@ QPushButton#StopButton { background: @red; color: #ffffff; font-weight: bold; }
 QLineEdit, QComboBox { background: @base; color: @text; border: 1px solid @border;
     border-radius: 3px; padding: 1px 4px; min-height: 20px; }
 QLineEdit:focus, QComboBox:focus { border: 2px solid @accent; padding: 0px 3px; }
+QComboBox::drop-down { border: none; width: 18px; }
+QComboBox::down-arrow { width: 0; height: 0; border-left: 4px solid @base;
+    border-right: 4px solid @base; border-top: 5px solid @caption; }
+QComboBox::down-arrow:disabled { border-left-color: @window; border-right-color: @window;
+    border-top-color: @dim; }
 QLineEdit[face="locked"] { background: @locked; }
 QLineEdit:disabled, QComboBox:disabled { color: @dim; background: @window; }
-QLabel#caption { color: @dim; font-size: 8pt; }
+QLabel#caption { color: @caption; font-size: 8pt; }
 QLabel#readout, QLabel[readout="true"] { font-size: 10pt; font-weight: bold; }
 QFrame#group { border: 1px solid @border; border-radius: 5px; }
 QToolTip { background: @base; color: @text; border: 1px solid @border; }
@@ -83,6 +89,7 @@ QString styled(const ThemeColors& c) {
         {"@base", c.base},
         {"@text", c.text},
         {"@dim", c.dim},
+        {"@caption", c.caption},
         {"@red", c.red},
         {"@green", c.green},
     };
@@ -104,14 +111,16 @@ QPalette paletteOf(const ThemeColors& c) {
     palette.setColor(QPalette::ToolTipText, c.text);
     palette.setColor(QPalette::Highlight, c.accent);
     palette.setColor(QPalette::HighlightedText, c.accentText);
-    palette.setColor(QPalette::PlaceholderText, c.dim);
+    palette.setColor(QPalette::PlaceholderText, c.caption);
     for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
         palette.setColor(QPalette::Disabled, role, c.dim);
     return palette;
 }
 
-bool systemIsDark(const QApplication& application) {
-    return application.style()->standardPalette().color(QPalette::Window).lightness() < 128;
+/// As the desktop's own settings have it, ahead of any palette of ours.
+bool systemIsDark() {
+    static const bool dark = QApplication::palette().color(QPalette::Window).lightness() < 128;
+    return dark;
 }
 
 }  // namespace
@@ -126,8 +135,8 @@ QString themeText(ThemeChoice choice) {
 }
 
 bool applyTheme(QApplication& application, ThemeChoice choice) {
-    const bool dark =
-        choice == ThemeChoice::Dark || (choice == ThemeChoice::System && systemIsDark(application));
+    const bool system = systemIsDark();
+    const bool dark = choice == ThemeChoice::Dark || (choice == ThemeChoice::System && system);
     const ThemeColors& colors = dark ? kDark : kLight;
     application.setStyle(QStyleFactory::create("Fusion"));
     application.setPalette(paletteOf(colors));

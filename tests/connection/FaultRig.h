@@ -51,9 +51,12 @@ class LosingPort : public SerialPort {
     long taken_ = 0;
 };
 
-enum class Fault { Dies, Splits, Garbles, Loses };
-inline constexpr Fault kFaults[] = {Fault::Dies, Fault::Splits, Fault::Garbles, Fault::Loses};
-inline constexpr const char* kFaultNames[] = {"dies", "splits", "garbles", "loses"};
+/// A split is a pause too short to be noticed, a stall one that is shorter than any time-out.
+enum class Fault { Dies, Splits, Stalls, Garbles, Loses };
+inline constexpr Fault kFaults[] = {Fault::Dies, Fault::Splits, Fault::Stalls, Fault::Garbles,
+                                    Fault::Loses};
+inline constexpr int kStallMs = 3000;
+inline constexpr const char* kFaultNames[] = {"dies", "splits", "stalls", "garbles", "loses"};
 
 struct FaultRig {
     VirtualPlatform platform;
@@ -68,7 +71,8 @@ struct FaultRig {
     void arm(Fault fault, long byte) {
         LineFaults faults;
         if (fault == Fault::Dies) faults.dropAt = byte;
-        if (fault == Fault::Splits) faults.splitAt = byte;
+        if (fault == Fault::Splits || fault == Fault::Stalls) faults.splitAt = byte;
+        faults.splitPauseMs = fault == Fault::Stalls ? kStallMs : 15;
         if (fault == Fault::Garbles) faults.garbleAt = byte;
         faulty.arm(faults);
         line.loseByte(fault == Fault::Loses ? byte : -1);

@@ -65,7 +65,55 @@ TEST_F(GraphDesk, ShownCursor_IsDraggedAndSnapsToTheTrace) {
     const GraphCursor& after = panel().CWGraph1.cursor(1);
     EXPECT_NEAR(after.X, 6e8, 2e7);
     EXPECT_EQ(panel().MarkerValue, after.X);
+    const Graph& graph = panel().CWGraph1;
+    const double place = (after.X - graph.firstX()) / graph.increment();
+    EXPECT_NEAR(place, std::round(place), 1e-6);
+    EXPECT_EQ(after.Y, graph.values().at(static_cast<std::size_t>(std::lround(place))));
     EXPECT_EQ(panel().MarkerLabel.Caption.get().rfind("Marker:", 0), 0U);
+}
+
+TEST_F(GraphDesk, ArrowKey_MovesTheCursorByOnePoint) {
+    panel().MarkerCheckBox.Click();
+    window->showNow();
+    const Graph& graph = panel().CWGraph1;
+    drag(at(graph.cursor(1).X, -60), at(6e8, -60));
+    const double before = graph.cursor(1).X;
+    QTest::keyClick(&window->graph(), Qt::Key_Right);
+    EXPECT_NEAR(graph.cursor(1).X, before + graph.increment(), 1);
+    QTest::keyClick(&window->graph(), Qt::Key_Left);
+    EXPECT_NEAR(graph.cursor(1).X, before, 1);
+}
+
+TEST_F(GraphDesk, F1_IsToldToTheGraph) {
+    std::vector<int> codes;
+    panel().CWGraph1.KeyDown.connect([&codes](int code, int) { codes.push_back(code); });
+    QTest::keyClick(&window->graph(), Qt::Key_F1);
+    EXPECT_EQ(codes, std::vector<int>{kKeyF1});
+}
+
+/// Every text of a layout, with those of the layouts inside it.
+void collectTexts(QCPLayout& layout, QList<QCPTextElement*>& texts) {
+    for (QCPLayoutElement* element : layout.elements(true))
+        if (auto* text = qobject_cast<QCPTextElement*>(element)) texts << text;
+}
+
+TEST_F(GraphDesk, LongTextsAroundTheGraph_AreNotCutInTheSmallestWindow) {
+    ZEL3Variables& mirror = program->variables();
+    mirror.ReferenceUnit = 3;
+    mirror.ReferenceLevel = -123.45;
+    mirror.ResolutionBandwidth = 2;
+    mirror.VideoBandwidth = 3;
+    mirror.SweepTime = 0.123;
+    panel().InstrumentMode = ControllerForm::DISTTOFAULTMEASURE;
+    window->resize(1024, 600);
+    show();
+    QList<QCPTextElement*> texts;
+    collectTexts(*window->graph().plotLayout(), texts);
+    ASSERT_EQ(texts.size(), 7);
+    for (QCPTextElement* element : texts) {
+        const int needed = QFontMetrics(element->font()).horizontalAdvance(element->text());
+        EXPECT_GE(element->rect().width(), needed) << element->text().toStdString();
+    }
 }
 
 TEST_F(GraphDesk, HiddenCursor_IsNotDragged) {

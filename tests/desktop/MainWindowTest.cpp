@@ -1,5 +1,6 @@
 // The panel's window: every control bound, shown as its form says, reachable by keyboard.
 
+#include <QClipboard>
 #include <QDir>
 #include <QMenu>
 #include <QSet>
@@ -213,6 +214,114 @@ TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
     });
     panel().Direct.Click();
     EXPECT_FALSE(program->forms().main.Visible);
+}
+
+TEST_F(Desk, ToolTipOfTheForm_TakesTheWidgetsPlace) {
+    auto* key = widgetOf<QPushButton>(panel().SpanButton);
+    EXPECT_EQ(key->toolTip(), "Span menu");
+    EXPECT_EQ(key->accessibleName(), "Span menu");
+    panel().SpanButton.ToolTip = "not now";
+    window->binder().flush();
+    EXPECT_EQ(key->toolTip(), "not now");
+    EXPECT_EQ(key->accessibleName(), "not now");
+}
+
+TEST_F(Desk, EveryBoundWidget_HasAnAccessibleName) {
+    int looked = 0;
+    for (const Control* control : panel().controls()) {
+        const auto* widget = widgetOf<QWidget>(*control);
+        if (widget == nullptr || control->kind() == ControlKind::Picture ||
+            control->kind() == ControlKind::Frame)
+            continue;
+        EXPECT_FALSE(widget->accessibleName().isEmpty()) << control->name();
+        ++looked;
+    }
+    EXPECT_GT(looked, 50);
+}
+
+TEST_F(Desk, KeyOnAButton_IsToldToItsControl) {
+    show();
+    std::vector<int> codes;
+    panel().SpanButton.KeyDown.connect([&codes](int code, int) { codes.push_back(code); });
+    QTest::keyClick(widgetOf<QPushButton>(panel().SpanButton), Qt::Key_F1);
+    EXPECT_EQ(codes, std::vector<int>{kKeyF1});
+}
+
+TEST_F(Desk, PasteWhileWorkIsUnderWay_IsDropped) {
+    connect();
+    show();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    const QString before = box->text();
+    panel().MousePointer = 11;
+    QApplication::clipboard()->setText("900M");
+    box->paste();
+    window->binder().flush();
+    EXPECT_EQ(panel().SoftTextBox(0).Text.get(), before.toStdString());
+    EXPECT_EQ(box->text(), before);
+    panel().MousePointer = 0;
+}
+
+TEST_F(Desk, MenusOfAllKinds_LeaveTheKeysWhereTheyAre) {
+    connect();
+    window->resize(1024, 600);
+    show();
+    const auto* key = widgetOf<QWidget>(panel().MarkerButton);
+    const QPoint place = key->mapTo(window.get(), QPoint());
+    panel().StopButton.Visible = true;
+    for (Button* menu : {&panel().AmplitudeButton, &panel().BWButton, &panel().SweepButton}) {
+        menu->Click();
+        show();
+        EXPECT_EQ(key->mapTo(window.get(), QPoint()), place) << menu->name();
+    }
+}
+
+TEST_F(Desk, EnterInTheConnectionDialog_PressesConnect) {
+    show();
+    MainForm& form = program->forms().main;
+    form.Show();
+    window->binder().flush();
+    int clicks = 0;
+    form.ZELButton.Clicked.connect([&clicks] { ++clicks; });
+    port.close();
+    auto* dialog = window->findChild<QDialog*>("MainForm");
+    dialog->setFocus();
+    QTest::keyClick(dialog, Qt::Key_Return);
+    EXPECT_EQ(clicks, 1);
+    form.Hide();
+    window->binder().flush();
+}
+
+TEST_F(Desk, HourglassOfTheDialog_ShowsThatWorkGoesOn) {
+    show();
+    MainForm& form = program->forms().main;
+    form.Show();
+    window->binder().flush();
+    auto* dialog = window->findChild<QDialog*>("MainForm");
+    const auto* bar = dialog->findChild<QProgressBar*>();
+    ASSERT_NE(bar, nullptr);
+    EXPECT_FALSE(bar->isVisible());
+    form.MousePointer = 11;
+    window->binder().flush();
+    EXPECT_TRUE(bar->isVisible());
+    form.MousePointer = 0;
+    form.Hide();
+    window->binder().flush();
+}
+
+TEST_F(Desk, ThemeMenu_DrawsColouredTextsAnew) {
+    std::vector<ThemeChoice> chosen;
+    window->addThemeMenu(ThemeChoice::Dark, [&chosen](ThemeChoice theme) {
+        chosen.push_back(theme);
+        applyTheme(testApplication(), theme);
+    });
+    panel().DeltaLabel.ForeColor = 65280;
+    const auto* label = widgetOf<QLabel>(panel().DeltaLabel);
+    const QString dark = label->styleSheet();
+    for (QAction* action : window->findChildren<QAction*>())
+        if (action->text() == "Light Theme") action->trigger();
+    window->binder().flush();
+    EXPECT_EQ(chosen, std::vector<ThemeChoice>{ThemeChoice::Light});
+    EXPECT_NE(label->styleSheet(), dark);
 }
 
 struct Look {

@@ -6,6 +6,7 @@
 #include <termios.h>
 #include <unistd.h>
 
+#include <QFile>
 #include <QTemporaryDir>
 #include <array>
 
@@ -121,6 +122,69 @@ TEST_F(OnQt, PortThatIsNotThere_IsNamed) {
               "/dev/zel3-is-not-here is not there. Check the cable and the name of the port.");
 }
 
+TEST_F(OnQt, PortWithoutAName_AsksForOne) {
+    EXPECT_FALSE(openPort(""));
+    EXPECT_EQ(platform.serialPort.problem(),
+              "No serial port is chosen. Choose one or type the name of a device.");
+}
+
+TEST_F(OnQt, FileThatIsNoPort_IsRefusedByName) {
+    const QString file = home.filePath("notes.txt");
+    QFile(file).open(QIODevice::WriteOnly);
+    EXPECT_FALSE(openPort(file.toStdString()));
+    EXPECT_EQ(platform.serialPort.problem().find(file.toStdString() + ": "), 0U)
+        << platform.serialPort.problem();
+    EXPECT_FALSE(platform.serialPort.isOpen());
+}
+
+TEST_F(OnQt, BaudRatesThatAreNone_AreNamed) {
+    const Terminal line;
+    for (const char* baud : {"", "fast", "0", "-9600", "99999999999"}) {
+        SerialSetup setup;
+        setup.CommPort = line.path;
+        setup.Settings = std::string(baud) + ",N,8,1";
+        EXPECT_FALSE(platform.serialPort.open(setup)) << baud;
+        EXPECT_EQ(platform.serialPort.problem().find(line.path + " does not take the baud rate"),
+                  0U)
+            << baud << ": " << platform.serialPort.problem();
+        platform.serialPort.close();
+    }
+}
+
+TEST_F(OnQt, SecondThoughtsAfterAFailedOpen_FindThePortFree) {
+    const Terminal line;
+    EXPECT_FALSE(openPort("/dev/zel3-is-not-here"));
+    EXPECT_TRUE(openPort(line.path)) << platform.serialPort.problem();
+    EXPECT_EQ(platform.serialPort.problem(), "");
+}
+
+TEST_F(OnQt, Burst_ArrivesWhole) {
+    const Terminal line;
+    ASSERT_TRUE(openPort(line.path));
+    std::string sent(60000, '\0');
+    for (std::size_t i = 0; i < sent.size(); ++i) sent[i] = static_cast<char>(i * 7 % 251);
+    std::string got;
+    for (std::size_t at = 0; at < sent.size(); at += 3000) {
+        line.send(sent.substr(at, 3000));
+        platform.events.sleep(1);
+        if (at % 9000 == 0) got += platform.serialPort.input();
+    }
+    for (int i = 0; i < 100 && got.size() < sent.size(); ++i) {
+        platform.events.wait(20);
+        got += platform.serialPort.input();
+    }
+    EXPECT_EQ(got, sent);
+}
+
+TEST_F(OnQt, Sleep_LastsItsTimeAndRunsTasks) {
+    bool ran = false;
+    platform.events.schedule(3, [&ran] { ran = true; });
+    const std::int64_t start = platform.clock.micros();
+    platform.events.sleep(25);
+    EXPECT_GE(platform.clock.micros() - start, 25000);
+    EXPECT_TRUE(ran);
+}
+
 TEST_F(OnQt, PortHeldByAnother_IsNamed) {
     const Terminal line;
     ASSERT_TRUE(openPort(line.path));
@@ -176,6 +240,16 @@ TEST_F(OnQt, Socket_ToAPortWhereNobodyListens_EndsInError) {
     for (int i = 0; i < 200 && platform.tcpSocket.state() == SocketState::Connecting; ++i)
         platform.events.wait(20);
     EXPECT_EQ(platform.tcpSocket.state(), SocketState::Error);
+}
+
+TEST_F(OnQt, SettingsWrittenByHandWithACommaOrABlank_AreReadAsTheyStand) {
+    platform.settings.set("ZELRemote", "DIRECTCON", "CommPort", "3");
+    QFile file(home.filePath("user.ini"));
+    ASSERT_TRUE(file.open(QIODevice::Append));
+    file.write("DIRECTCON\\Label=Lab, upstairs\n");
+    file.close();
+    QtPlatform later(home.path());
+    EXPECT_EQ(later.settings.get("ZELRemote", "DIRECTCON", "Label", ""), "Lab, upstairs");
 }
 
 TEST_F(OnQt, Settings_SurviveTheProgram) {
