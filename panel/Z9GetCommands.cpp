@@ -6,6 +6,7 @@
 #include "model/FrequencyLabels.h"
 #include "model/Numeric.h"
 #include "support/NumberText.h"
+#include "support/StringOp.h"
 
 namespace zel {
 namespace {
@@ -242,7 +243,7 @@ void Z9GetCommands::bandwidth(int index) {
     softPanel_.SetSoftButtonsColor(index);
     if (index == 0) softPanel_.SetButtonColor(3, "green");
     const std::optional<std::string> reply = boxes_.prompt(key.prompt, "Enter Value", "");
-    if (!reply || reply->empty()) return;  // nothing to convert: nothing is sent
+    if (!reply || !IsNumericText(*reply)) return;  // nothing to convert: nothing is sent
     const double code = leadingNumber(*reply);
     exchange_.SetInstrument(key.promptWord + WireNumber(code));
     mirror_.*key.field = code;

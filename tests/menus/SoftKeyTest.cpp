@@ -251,6 +251,16 @@ TEST_F(SoftKeyTest, BandwidthPrompt_SendsTheLowerCaseWord) {
     EXPECT_EQ(boxes.prompts()[1].text, "Set the Video Bandwidth (0-12):");
 }
 
+TEST_F(SoftKeyTest, BandwidthPrompt_Letters_SendAndStoreNothing) {
+    open(kBW);
+    mirror.ResolutionBandwidth = 3;
+    panel.SetOption.setValue(true);
+    boxes.answerPrompt("auto");
+    panel.SoftKey(0).Click();
+    EXPECT_EQ(port.written(), "");
+    EXPECT_EQ(mirror.ResolutionBandwidth, 3);
+}
+
 TEST_F(SoftKeyTest, BandwidthPrompt_CancelledOrEmpty_SendsAndStoresNothing) {
     open(kBW);
     mirror.ResolutionBandwidth = 3;
