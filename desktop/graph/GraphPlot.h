@@ -39,8 +39,8 @@ class GraphPlot {
 
   private:
     struct CursorItems {
-        QCPItemStraightLine* line;
-        QCPItemTracer* point;
+        QCPItemStraightLine* line = nullptr;
+        QCPItemTracer* point = nullptr;
         bool visible = false;
         double x = 0;
     };

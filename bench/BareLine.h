@@ -1,0 +1,39 @@
+#pragma once
+// The least that a program can do to fetch sweeps: termios, poll, read and write in a loop.
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace zelbench {
+
+/// Every routine throws std::runtime_error when the instrument is silent or refuses.
+class BareLine {
+  public:
+    /// Opens the terminal raw at `baud` and takes the instrument into remote control.
+    BareLine(const std::string& device, int baud);
+    ~BareLine();
+    BareLine(const BareLine&) = delete;
+    BareLine& operator=(const BareLine&) = delete;
+
+    /// The words of a full read cycle, in its order; the samples are read and not looked at.
+    void sweep();
+    /// Bytes on the line so far, both ways.
+    std::size_t bytes() const { return bytes_; }
+
+  private:
+    std::string get(std::string_view word);
+    void command(std::string_view word);
+    void write(std::string_view bytes);
+    void readMore();
+    std::string_view line();
+    void accepted();
+
+    int line_ = -1;
+    std::size_t sampleBytes_ = 0;  // of a sweep, with the separators behind the blocks
+    std::size_t bytes_ = 0;
+    std::string buffer_;
+    std::size_t taken_ = 0;
+};
+
+}  // namespace zelbench

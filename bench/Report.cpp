@@ -1,0 +1,74 @@
+// Measures the program's speed and prints the table of docs/performance.md.
+//
+// bench_report [--only LETTERS]: the figures of these letters ("ab"), all without it. Exit code 0
+// when every figure keeps its limit, 1 when one does not, 2 on wrong use.
+
+#include <QApplication>
+#include <functional>
+#include <iostream>
+#include <stdexcept>
+
+#include "bench/Conversion.h"
+#include "bench/Figures.h"
+#include "bench/Redraw.h"
+#include "bench/SweepRate.h"
+#include "bench/Windows.h"
+
+namespace {
+
+using zelbench::Figure;
+
+struct Measurement {
+    char letter;
+    const char* what;
+    std::function<Figure()> run;
+};
+
+Figure measure(const Measurement& measurement) {
+    try {
+        return measurement.run();
+    } catch (const std::exception& error) {
+        Figure failed;
+        failed.what = std::string("(") + measurement.letter + ") " + measurement.what;
+        failed.note = error.what();
+        return failed;
+    }
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    // What is measured is the program, not a display.
+    if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication application(argc, argv);
+    const QStringList words = QApplication::arguments();
+    if (words.size() != 1 && (words.size() != 3 || words[1] != "--only")) {
+        std::cerr << "Use: bench_report [--only LETTERS]\n";
+        return 2;
+    }
+    const QString only = words.size() == 3 ? words[2] : QString();
+    const std::string build = (QApplication::applicationDirPath() + "/..").toStdString();
+    const std::string simulator = build + "/ZELSim/ZELSim";
+    const std::string panel = build + "/bench/bench_panel_window";
+    const std::string empty = build + "/bench/bench_empty_window";
+
+    const std::vector<Measurement> measurements{
+        {'a', "full sweeps, unpaced", [&] { return zelbench::unpacedSweeps(simulator); }},
+        {'b', "sweeps at 57,600 baud", [&] { return zelbench::pacedSweeps(simulator, false); }},
+        {'b', "sweeps at 57,600 baud", [&] { return zelbench::pacedSweeps(simulator, true); }},
+        {'c', "conversion", [] { return zelbench::conversionCost(57600); }},
+        {'c', "conversion", [] { return zelbench::conversionCost(115200); }},
+        {'d', "redraw", [] { return zelbench::graphRedraw(); }},
+        {'e', "idle", [&] { return zelbench::idleShare(panel, simulator); }},
+        {'f', "first paint", [&] { return zelbench::firstPaint(panel, empty); }},
+    };
+    zelbench::Figures figures;
+    bool allMet = true;
+    for (const Measurement& measurement : measurements) {
+        if (!only.isEmpty() && !only.contains(QChar(measurement.letter))) continue;
+        figures.push_back(measure(measurement));
+        allMet = allMet && figures.back().met();
+    }
+    std::cout << zelbench::markdownTable(figures);
+    return allMet ? 0 : 1;
+}
