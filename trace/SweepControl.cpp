@@ -98,44 +98,34 @@ void SweepControl::RunContinuousView() {
     panel_.ContinuosLoopActive = false;
 }
 
+bool SweepControl::powerPass(Pass kind) {
+    power_.ReadPowerReadings(kind == Pass::PowerSensor ? "PowerSensor" : "TDMAPower", kPowerBox);
+    return true;
+}
+
 bool SweepControl::firstPass() {
-    bool success = true;
-    switch (passKind()) {
-        case Pass::Trace:
-            if (panel_.SingleSweepModeActive) {
-                traces_.ReadSingleTrace2({true, true, true, true, true}, success);
-            } else {
-                traces_.ReadSingleTrace(success);
-            }
-            break;
-        case Pass::PowerSensor:
-            power_.ReadPowerReadings("PowerSensor", kPowerBox);
-            break;
-        case Pass::TDMAPower:
-            power_.ReadPowerReadings("TDMAPower", kPowerBox);
-            break;
+    const Pass kind = passKind();
+    if (kind != Pass::Trace) return powerPass(kind);
+    bool success = false;
+    if (panel_.SingleSweepModeActive) {
+        traces_.ReadSingleTrace2({true, true, true, true, true}, success);
+    } else {
+        traces_.ReadSingleTrace(success);
     }
     return success;
 }
 
 bool SweepControl::laterPass() {
-    bool success = true;
-    switch (passKind()) {
-        case Pass::Trace:
-            if (!forms_.waterfall.Graph3D.plots().empty()) {
-                forms_.waterfall.Graph3D.plots().back().lineVisible = false;
-                forms_.waterfall.Graph3D.plots().back().fillStyle = kPassFillStyle;
-            }
-            if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
-            traces_.ReadSingleTrace2({}, success);
-            break;
-        case Pass::PowerSensor:
-            power_.ReadPowerReadings("PowerSensor", kPowerBox);
-            break;
-        case Pass::TDMAPower:
-            power_.ReadPowerReadings("TDMAPower", kPowerBox);
-            break;
+    const Pass kind = passKind();
+    if (kind != Pass::Trace) return powerPass(kind);
+    if (!forms_.waterfall.Graph3D.plots().empty()) {
+        GraphCurve3D& newest = forms_.waterfall.Graph3D.plots().back();
+        newest.lineVisible = false;
+        newest.fillStyle = kPassFillStyle;
     }
+    if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
+    bool success = false;
+    traces_.ReadSingleTrace2({}, success);
     return success;
 }
 

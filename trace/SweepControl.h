@@ -28,6 +28,7 @@ class SweepControl {
   private:
     enum class Pass { Trace, PowerSensor, TDMAPower };
     Pass passKind() const;
+    bool powerPass(Pass kind);
     bool firstPass();
     bool laterPass();
 
