@@ -34,11 +34,12 @@ ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, Handshake& hand
     dialog_.ZELButton.Clicked.connect([this] { ZELButton_Click(); });
     dialog_.LoadSettingsButton.Clicked.connect([this] { profiles_.LoadSettings_Click(); });
     dialog_.SaveSettingsButton.Clicked.connect([this] { profiles_.SaveSettings_Click(); });
-    for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1})
+    for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1}) {
         close->Clicked.connect([this] {
             dialog_.Hide();
             panel_.ErrorFlag = false;
         });
+    }
 }
 
 void ConnectionDialog::EnumerateComPorts() {

@@ -50,10 +50,11 @@ Options parse(const QApplication& application) {
     if (parser.isSet("connect")) {
         options.address = zel::linkAddressOf(parser.value("connect").toStdString());
         options.valid = options.address.has_value();
-        if (!options.valid)
+        if (!options.valid) {
             std::fprintf(stderr,
                          "zelremote: --connect takes serial:DEVICE[@BAUD] or "
                          "tcp:HOST:PORT\n");
+        }
     }
     return options;
 }

@@ -128,7 +128,7 @@ void ByteLink::CloseTCPSocket() { socket_.close(); }
 std::string ByteLink::takeBytes() { return isTcp() ? socket_.getData() : port_.input(); }
 
 std::string serialDeviceName(const std::string& text, const std::vector<std::string>& known) {
-    const std::string name = trimmed(text);
+    std::string name = trimmed(text);
     if (name.empty()) return "";
     if (std::find(known.begin(), known.end(), name) != known.end()) return name;
     if (name.front() == '/') return name;

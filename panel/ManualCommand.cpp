@@ -107,7 +107,7 @@ void ManualCommand::showAnswer(std::string text, bool statusOnly) {
     text = replaceAll(text, "\r", "");
     for (const StatusWord& row : kAnswerHeads) {
         if (row.answer != text) continue;
-        text = std::string(row.head) + text;
+        text.insert(0, row.head);
         break;
     }
     TextBox& answer = panel_.ManualCommandTextAnsw;

@@ -18,7 +18,7 @@ class MarkerKeys {
                MarkerReadout& readout, TraceReader& traces, Events& events, MessageBoxes& boxes);
 
     /// A peak key by its command: MARKPK, MARKNXTPK, MARKMIN.
-    void peak(const char* command);
+    void peak(const char* word);
     void MarkToCentButton_Click();
     void MarkToRefButton_Click();
     void MarkerCheckBox_Click();

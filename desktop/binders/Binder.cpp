@@ -104,11 +104,12 @@ void Binder::follow(Control& control, QObject* widget, std::function<void()> sho
     widget->setObjectName(text(control.form().name() == "ControllerForm"
                                    ? control.name()
                                    : control.form().name() + "." + control.name()));
-    if (auto* shown = qobject_cast<QWidget*>(widget); shown != nullptr)
+    if (auto* shown = qobject_cast<QWidget*>(widget); shown != nullptr) {
         show = [this, &control, shown, draw = std::move(show)] {
             describe(control, shown);
             draw();
         };
+    }
     entries_[&control] = {widget, std::move(show)};
     // The windows end ahead of the forms: a change behind their end is nobody's.
     control.Changed.connect([self = QPointer<Binder>(this), key = &control] {
@@ -216,11 +217,12 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
         if (!refused(control) && !control.Locked) control.pick(index);
         markDirty(&control);
     });
-    if (control.editable())
+    if (control.editable()) {
         connect(widget, &QComboBox::editTextChanged, this, [this, &control](const QString& typed) {
             if (refused(control)) return markDirty(&control);
             control.setText(typed.toStdString());
         });
+    }
     follow(control, widget, [&control, widget] {
         const QSignalBlocker quiet(widget);
         QStringList items;

@@ -62,7 +62,7 @@ class Binder : public QObject {
     bool refused(const Control& control) const;
 
     struct Entry {
-        QObject* widget;
+        QObject* widget = nullptr;
         std::function<void()> show;
     };
     std::unordered_map<const void*, Entry> entries_;

@@ -28,9 +28,9 @@ QMessageBox::Icon iconOf(BoxIcon icon) {
 }
 
 struct ButtonSet {
-    BoxButtons set;
+    BoxButtons set = BoxButtons::Ok;
     QMessageBox::StandardButtons buttons;
-    QMessageBox::StandardButton escape;
+    QMessageBox::StandardButton escape = QMessageBox::Ok;
 };
 const ButtonSet kButtonSets[] = {
     {BoxButtons::Ok, QMessageBox::Ok, QMessageBox::Ok},

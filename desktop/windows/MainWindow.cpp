@@ -133,7 +133,7 @@ void MainWindow::buildMenus() {
     }
 }
 
-void MainWindow::addThemeMenu(ThemeChoice now, std::function<void(ThemeChoice)> choose) {
+void MainWindow::addThemeMenu(ThemeChoice now, const std::function<void(ThemeChoice)>& choose) {
     auto* menu = new QMenu("View", this);
     auto* help = qobject_cast<QAction*>(binder_.widgetOf(panel_.HelpMenu));
     menuBar()->insertMenu(help, menu);
@@ -202,8 +202,7 @@ void MainWindow::showState() {
         text = "Connecting...";
     }
     state_->setText(text);
-    const bool busy =
-        panel_.MousePointer == kHourglass || forms.main.MousePointer == kHourglass;
+    const bool busy = panel_.MousePointer == kHourglass || forms.main.MousePointer == kHourglass;
     busy_->setVisible(busy && !panel_.ContinuosLoopActive);
     setCursor(busy && !panel_.ContinuosLoopActive ? Qt::BusyCursor : Qt::ArrowCursor);
 }

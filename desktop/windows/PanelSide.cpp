@@ -66,9 +66,9 @@ QPushButton* PanelSide::key(Button& control, bool tall) {
 QWidget* PanelSide::playKeys() {
     QFrame* frame = group();
     auto* layout = layoutOf<QHBoxLayout>(frame);
-    for (Button* control : {&panel_.PlaySingleButton, &panel_.PlayContinuousButton,
-                            &panel_.StopButton, &panel_.cmdZoom, &panel_.cmd3D,
-                            &panel_.cmdSpecial}) {
+    for (Button* control :
+         {&panel_.PlaySingleButton, &panel_.PlayContinuousButton, &panel_.StopButton,
+          &panel_.cmdZoom, &panel_.cmd3D, &panel_.cmdSpecial}) {
         QPushButton* button = key(*control);
         // Where the row is tight each key still shows its whole caption.
         button->setMinimumWidth(0);
