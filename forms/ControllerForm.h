@@ -10,6 +10,17 @@
 
 namespace zel {
 
+/// What a loaded file says about the view that is shown. The mirror stays the instrument's, but
+/// for the fields that a file sets; there its range is dB a division and no code.
+struct ShownFile {
+    bool fromFile = false;
+    std::string mode;       ///< as the file names it; empty when it does not
+    std::string rbw;        ///< Hz
+    std::string vbw;        ///< Hz
+    std::string sweepTime;  ///< s
+    std::string detector;   ///< as the file names it
+};
+
 class ControllerForm : public Form {
   public:
     ControllerForm();
@@ -65,7 +76,8 @@ class ControllerForm : public Form {
     double DeltaValue = 0;   ///< x of the delta marker
     double LastSpan = 0;     ///< span ahead of the last manual change, Hz
     bool RecordDataFlag = false;
-    std::string DataFileName;
+    std::string DataFileName;           ///< target of a recording or a script
+    std::string CommonDialog1FileName;  ///< the name that stands in the file dialog
     std::vector<double> DataXAxisArrayToLoad;
     std::vector<double> DataValArrayToLoad;
     bool ContinuosLoopActive = false;
@@ -108,13 +120,24 @@ class ControllerForm : public Form {
     std::vector<double> XVector;
     std::vector<double> YVector;
     std::int16_t YVectorVal = 0;  ///< row number of the current trace in the waterfall
+    ShownFile Shown;              ///< of the view on the graph
 
     /// Saves the trace just read: "trace" or "power".
     Event<const std::string&> SaveView;
+    /// Loads the file of that path, as `LoadData` does with the one that was chosen.
+    Event<const std::string&> OpenFile;
+    std::string DebugLogName = "debug.log";  ///< in the application's folder
+    Event<> CloseDebugLog;                   ///< ahead of its deletion
+    Event<> TraceLoaded;  ///< behind each trace of a file that was read and drawn
+    /// The front draws the graph into the file of that path, its ending names the kind. The second
+    /// text takes what went wrong.
+    Event<const std::string&, std::string&> DrawImage;
 
     // Menus.
     MenuItem FileMenu{*this, "FileMenu", "File"};
     MenuItem LoadData{*this, "LoadData", "Load Data...", &FileMenu};
+    MenuItem RecentMenu{*this, "RecentMenu", "Recent Files", &FileMenu};
+    ControlArray<MenuItem, 8> RecentFile{*this, "RecentFile", std::string(), &RecentMenu};
     MenuItem SaveCurrentView{*this, "SaveCurrentView", "Save Current View...", &FileMenu};
     MenuItem MenuFileSaveImage{*this, "MenuFileSaveImage", "Save Image...", &FileMenu};
     MenuItem RecordData{*this, "RecordData", "Record Data...", &FileMenu};
@@ -154,6 +177,7 @@ class ControllerForm : public Form {
     Label MarkerLabel{*this, "MarkerLabel"};
     Label DeltaLabel{*this, "DeltaLabel"};
     Label PaceLabel{*this, "PaceLabel"};  ///< age of the trace, sweeps a second
+    Label FileLabel{*this, "FileLabel"};  ///< progress of a recording or of a file that loads
     TextBox DebugTextBox{*this, "DebugTextBox"};
 
     // Soft positions.

@@ -48,8 +48,13 @@ class TimeForm : public Form {
         addVariables(
             {{"ContinuousRecording", &ContinuousRecording}, {"RecordedCount", &RecordedCount}});
     }
-    bool ContinuousRecording = false;
-    double RecordedCount = 0;
+    bool ContinuousRecording = false;  ///< traces are appended to the file
+    double RecordedCount = 0;          ///< traces taken so far; 0 asks for the full read cycle
+    Label lblRecText{*this, "lblRecText", "Record data every"};
+    TextBox TimeIntervalBox{*this, "TimeIntervalBox"};  ///< s
+    Button SubmitTimeButton{*this, "SubmitTimeButton", "OK"};
+    Button CancelTimeButton{*this, "CancelTimeButton", "Cancel"};
+    Timer X{*this, "X", 0};
 };
 
 /// The waterfall's window. Its row calls are events that the waterfall's room handles.
@@ -59,6 +64,7 @@ class WaterfallForm : public Form {
     zel::Graph3D Graph3D{*this, "Graph3D"};
     Label lblMin{*this, "lblMin"};
     Label lblMAX{*this, "lblMAX"};
+    Event<> clearGraph;  ///< all rows go
     Event<> resetRowCount;
     Event<int> limitRows;                ///< keeps at most so many rows
     Event<const std::string&> stampRow;  ///< counts a row; the text is the time of day
@@ -68,8 +74,15 @@ class WaterfallForm : public Form {
 
 class SpecialMeasForm : public Form {
   public:
-    SpecialMeasForm() : Form("SpecialMeasForm") { Caption = "Special Measurements"; }
+    SpecialMeasForm() : Form("SpecialMeasForm") {
+        Caption = "Special Measurements";
+        addVariables({{"DataFileNameSpec", &DataFileNameSpec}});
+        sldSpeed.Value = sldSpeed.Max.get();
+    }
+    std::string DataFileNameSpec;        ///< the result file of a script; empty without one
+    Slider sldSpeed{*this, "sldSpeed"};  ///< pace of a loaded series; the top is without a pause
     CheckBox chkWaterfall{*this, "chkWaterfall", "Waterfall"};
+    Button cmdStop{*this, "cmdStop", "Stop"};
 };
 
 class ScriptEditor : public Form {

@@ -51,6 +51,7 @@ bool BinaryTrace::mayAskAgain(const Round& round) const {
 }
 
 bool BinaryTrace::GetTraceBinary(std::vector<double>& values, bool doubleBlock) {
+    const DialogueScope scope(state_);
     const Round round = beginRound();
     for (;;) {
         DebugLine(panel_, "Binary trace transfer starting");
@@ -123,6 +124,7 @@ void BinaryTrace::decode(const std::string& bytes, bool doubleBlock, std::vector
 }
 
 bool BinaryTrace::GetCTraceBinary(std::vector<double>& values) {
+    const DialogueScope scope(state_);
     const Round round = beginRound();
     DebugLine(panel_, "Binary ctrace transfer starting");
     for (;;) {

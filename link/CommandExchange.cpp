@@ -78,6 +78,7 @@ bool CommandExchange::refuseCommand(const std::string& keyword, int status, floa
 }
 
 bool CommandExchange::CmdInstrument(const std::string& keyword) {
+    const DialogueScope scope(state_);
     float t0 = 0;
     beginLine("CMD", keyword, t0);
     link_.drain(kDrainReads);
@@ -102,6 +103,7 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
 
 bool CommandExchange::CmdInstrumentTriggered(const std::string& keyword,
                                              std::int32_t timeoutSeconds) {
+    const DialogueScope scope(state_);
     panel_.MousePointer = 11;
     events_.pump();
     const bool success = triggeredDialogue(keyword, timeoutSeconds);
@@ -128,6 +130,7 @@ bool CommandExchange::triggeredDialogue(const std::string& keyword, std::int32_t
 }
 
 bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
+    const DialogueScope scope(state_);
     float t0 = 0;
     beginLine("SET", keywordAndValue, t0);
     link_.drain(kDrainReads);
@@ -151,6 +154,7 @@ bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
 }
 
 bool CommandExchange::GetInstrument(const std::string& keyword, std::string& value) {
+    const DialogueScope scope(state_);
     float t0 = 0;
     beginLine("GET", keyword, t0);
     link_.drain(kDrainReads);

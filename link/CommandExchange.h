@@ -32,6 +32,8 @@ class CommandExchange {
     bool SetInstrument(const std::string& keywordAndValue);
     /// Reads a value; left as it was on failure. An empty answer is a success.
     bool GetInstrument(const std::string& keyword, std::string& value);
+    /// A dialogue is under way further up the stack, and only lets events run: the line is taken.
+    bool busy() const { return state_.DialoguesUnderWay > 0; }
     /// The last read of a line failed, or the link is gone: loops end.
     bool ExchangeFailed() const { return state_.ExchangeFailed; }
 

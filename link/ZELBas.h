@@ -17,6 +17,19 @@ struct ZELBas {
     bool ComplexTraceActive = false;
     bool ComplexTraceRequested = false;  ///< a complex transfer had to be asked for again
     std::int16_t BinaryDecodeIndex = 0;
+    int DialoguesUnderWay = 0;  ///< exchanges and binary transfers that have begun and not ended
+};
+
+/// Counts a dialogue for as long as it lives.
+class DialogueScope {
+  public:
+    explicit DialogueScope(ZELBas& state) : state_(state) { ++state_.DialoguesUnderWay; }
+    ~DialogueScope() { --state_.DialoguesUnderWay; }
+    DialogueScope(const DialogueScope&) = delete;
+    DialogueScope& operator=(const DialogueScope&) = delete;
+
+  private:
+    ZELBas& state_;
 };
 
 }  // namespace zel

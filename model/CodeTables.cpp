@@ -10,23 +10,27 @@ namespace {
 // meant.
 
 constexpr CodeRow kReferenceUnit[] = {
-    {0, "dBm (", "dBm", "dBm"},
-    {1, "dBmV (", "dBmV", "dBmV"},
-    {2, "dBmuV (", "dBµV", "dBµV"},
-    {3, "dBmuV/m (", "dBµV/m", "dBµV/m"},
-    {4, "dBmuA/m (", "dBµA/m", "dBµA/m"},
-    {5, "dB (", "dB", "dB"},
-    {6, "Volt (", "Volt", "V"},
-    {7, "Watt (", "Watt", "W"},
+    {0, "dBm (", "dBm", "dBm", 0, "dBm"},
+    {1, "dBmV (", "dBmV", "dBmV", 0, "dBmV"},
+    {2, "dBmuV (", "dBµV", "dBµV", 0, "dBuV"},
+    {3, "dBmuV/m (", "dBµV/m", "dBµV/m", 0, "dBuV/m"},
+    {4, "dBmuA/m (", "dBµA/m", "dBµA/m", 0, "dBuA/m"},
+    {5, "dB (", "dB", "dB", 0, "dB"},
+    {6, "Volt (", "Volt", "V", 0, "V"},
+    {7, "Watt (", "Watt", "W", 0, "W"},
     {8, "V/m (", "", "dBm"},
 };
 
 constexpr CodeRow kRange[] = {
-    {0, "10dB/DIV (", "10dB/DIV", "", 10},     {1, "5dB/DIV (", "5dB/DIV", "", 5},
-    {2, "2dB/DIV (", "2dB/DIV", "", 2},        {3, "1dB/DIV (", "1dB/DIV", "", 1},
-    {4, "LIN 0-100% (", "LIN 0-100%", "", 10}, {5, "VSWR 1-6 (", "VSWR 1-6", "", 10},
-    {6, "VSWR 1-2 (", "VSWR 1-2", "", 10},     {7, "VSWR 1-1,5 (", "", "", 10},
-    {8, "VSWR 1-1,1 (", "", "", 10},
+    {0, "10dB/DIV (", "10dB/DIV", "", 10, "10 dB/div"},
+    {1, "5dB/DIV (", "5dB/DIV", "", 5, "5 dB/div"},
+    {2, "2dB/DIV (", "2dB/DIV", "", 2, "2 dB/div"},
+    {3, "1dB/DIV (", "1dB/DIV", "", 1, "1 dB/div"},
+    {4, "LIN 0-100% (", "LIN 0-100%", "", 10, "lin 0 - 100%"},
+    {5, "VSWR 1-6 (", "VSWR 1-6", "", 10, "TODO"},
+    {6, "VSWR 1-2 (", "VSWR 1-2", "", 10, "TODO"},
+    {7, "VSWR 1-1,5 (", "", "", 10, "TODO"},
+    {8, "VSWR 1-1,1 (", "", "", 10, "TODO"},
 };
 
 constexpr CodeRow kResolutionBandwidth[] = {
@@ -60,36 +64,39 @@ constexpr CodeRow kVideoBandwidth[] = {
 };
 
 constexpr CodeRow kDetector[] = {
-    {0, "Auto Peak (", "Auto Peak"}, {1, "Min Peak (", "Min Peak"}, {2, "Max Peak (", "Max Peak"},
-    {3, "Sample (", "Sample"},       {4, "RMS (", "RMS"},
+    {0, "Auto Peak (", "Auto Peak", "", 0, "Auto Peak (Auto)"},
+    {1, "Min Peak (", "Min Peak", "", 0, "Min Peak"},
+    {2, "Max Peak (", "Max Peak", "", 0, "Max Peak"},
+    {3, "Sample (", "Sample", "", 0, "Sample"},
+    {4, "RMS (", "RMS", "", 0, "RMS"},
 };
 
 constexpr CodeRow kTraceMode[] = {
-    {0, "Clear Write (", "Clear Write", "Trace Mode;Clear / Write"},
-    {1, "Average (", "Average", "Trace Mode;Average"},
-    {2, "Max Hold (", "Max Hold", "Trace Mode;Min Hold"},
-    {3, "Min Hold (", "Min Hold", "Trace Mode;Max Hold"},
-    {4, "View (", "View", "Trace Mode;View"},
+    {0, "Clear Write (", "Clear Write", "", 0, "Clear / Write"},
+    {1, "Average (", "Average", "", 0, "Average"},
+    {2, "Max Hold (", "Max Hold", "", 0, "Min Hold"},
+    {3, "Min Hold (", "Min Hold", "", 0, "Max Hold"},
+    {4, "View (", "View", "", 0, "View"},
 };
 
 constexpr CodeRow kTriggerSource[] = {
-    {0, "Free Run (", "Free Run", "TRIGGER\r\nDELAY"},
-    {1, "Video (", "Video", "TRIGGER\r\nLEVEL"},
-    {2, "Ext - Rise (", "Ext - Rise", "TRIGGER\r\nDELAY"},
-    {3, "Ext - Fall (", "Ext - Fall", "TRIGGER\r\nDELAY"},
+    {0, "Free Run (", "Free Run", "TRIGGER\r\nDELAY", 0, "Free Run"},
+    {1, "Video (", "Video", "TRIGGER\r\nLEVEL", 0, "Video"},
+    {2, "Ext - Rise (", "Ext - Rise", "TRIGGER\r\nDELAY", 0, "Ext Rise"},
+    {3, "Ext - Fall (", "Ext - Fall", "TRIGGER\r\nDELAY", 0, "Ext Fall"},
     {4, "", "Delay", "TRIGGER\r\nDELAY"},
 };
 
 constexpr CodeRow kStandard[] = {
-    {0, "User (", "User"},
-    {1, "3GPP WCDMA (", "3GPP WCDMA"},
-    {2, "cdmaOne (", "cmdaOne"},
-    {3, "cdma2000 1x (", "cdma2000 1x"},
+    {0, "User (", "User", "", 0, "USER"},
+    {1, "3GPP WCDMA (", "3GPP WCDMA", "", 0, "3GPP WCDMA"},
+    {2, "cdmaOne (", "cmdaOne", "", 0, "cdmaOne"},
+    {3, "cdma2000 1x (", "cdma2000 1x", "", 0, "cdma2000 1x"},
 };
 
 constexpr CodeRow kTDMAStandard[] = {
-    {0, "User (", "User"},
-    {1, "GSM/EDGE (", "GSM/EDGE"},
+    {0, "User (", "User", "", 0, "TDMA PWR USER"},
+    {1, "GSM/EDGE (", "GSM/EDGE", "", 0, "GSM EDGE"},
 };
 
 constexpr CodeRow kChannelPowerUnit[] = {
@@ -99,21 +106,22 @@ constexpr CodeRow kChannelPowerUnit[] = {
 };
 
 constexpr CodeRow kDTFMode[] = {
-    {0, "DTF (", "DTF"},
-    {1, "Reflection (", "Reflection"},
-    {2, "Spectrum (", "Spectrum"},
+    {0, "DTF (", "DTF", "", 0, "DTF"},
+    {1, "Reflection (", "Reflection", "", 0, "DTF Reflection"},
+    {2, "Spectrum (", "Spectrum", "", 0, "DTF Spectrum"},
 };
 
 constexpr CodeRow kMeasurementMode[] = {
     {0, "Off (", "Off", ""},
-    {1, "Analyzer (", "Analyzer", "Analyzer"},
-    {2, "Tracking Generator (", "Tracking Gen", "Tracking Generator"},
-    {3, "Power Sensor (", "Pwr Sensor", "Power Sensor"},
-    {4, "Channel Power (", "Chn Power", "Channel Power"},
-    {5, "Occupied Bandwidth (", "Occ Bandwidth", "Occupied Bandwidth"},
-    {6, "TDMA Power (", "TDMA Pwr", "TDMA Power"},
-    {7, "Distance To Fault (", "Dist to Fault", "Distance To Fault"},
-    {8, "VSWR 1-1,1 (", "Receiver", "Receiver"},  // caption of the range table's code 8
+    {1, "Analyzer (", "Analyzer", "Analyzer", 0, "Analyzer"},
+    {2, "Tracking Generator (", "Tracking Gen", "Tracking Generator", 0, "Tracking Gen"},
+    {3, "Power Sensor (", "Pwr Sensor", "Power Sensor", 0, "Power Sensor"},
+    {4, "Channel Power (", "Chn Power", "Channel Power", 0, "Channel Power"},
+    {5, "Occupied Bandwidth (", "Occ Bandwidth", "Occupied Bandwidth", 0, "Occupied Bandwidth"},
+    {6, "TDMA Power (", "TDMA Pwr", "TDMA Power", 0, "TDMA Power"},
+    {7, "Distance To Fault (", "Dist to Fault", "Distance To Fault", 0, "Fault Location"},
+    {8, "VSWR 1-1,1 (", "Receiver", "Receiver", 0,
+     "Receiver"},  // caption of the range table's code 8
 };
 
 constexpr CodeRow kRFInput[] = {{0, "50 Ohm (", "50 Ohm"}, {1, "75 Ohm (", "75 Ohm"}};

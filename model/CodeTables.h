@@ -55,14 +55,15 @@ inline constexpr int DTFMODEREFLECTION = 1;
 inline constexpr int DTFMODESPECTRUM = 2;
 
 /// One code: the caption that a query writes (the code and ")" follow it), the entry of a choice
-/// list (empty: not offered), a further text (unit, soft key caption, saved line) and a number
-/// (hertz of a bandwidth, dB a division of a range).
+/// list (empty: not offered), a further text (unit, soft key caption), a number (hertz of a
+/// bandwidth, dB a division of a range) and the word in a saved view (empty: no line).
 struct CodeRow {
     int code;
     std::string_view caption;
     std::string_view choice;
     std::string_view text = {};
     double number = 0;
+    std::string_view saved = {};
 };
 
 enum class CodeTable {
@@ -71,7 +72,7 @@ enum class CodeTable {
     ResolutionBandwidth,  ///< number: Hz, 0 for auto
     VideoBandwidth,       ///< number: Hz, 0 for auto
     Detector,
-    TraceMode,      ///< text: the line of a saved file, which swaps codes 2 and 3 on purpose
+    TraceMode,
     TriggerSource,  ///< text: caption of soft key 4
     Standard,       ///< of channel power and occupied bandwidth
     TDMAStandard,

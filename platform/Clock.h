@@ -3,6 +3,8 @@
 
 #include <cmath>
 #include <cstdint>
+#include <optional>
+#include <string>
 
 namespace zel {
 
@@ -13,6 +15,15 @@ class Clock {
     virtual std::int64_t micros() const = 0;
     /// Local date and time in days since 1899-12-30, the time of day in the fraction.
     virtual double date() const = 0;
+    /// The day of a date as a text, "2026-01-31" unless the platform has its own way.
+    virtual std::string dateText(double date) const;
+    /// The time of day of a date as a text, "23:59:59".
+    virtual std::string timeText(double date) const;
+    /// When a file was last written, as `date`; nothing for a file that is not there.
+    virtual std::optional<double> modified(const std::string& path) const = 0;
+
+    /// Day and time of day.
+    std::string dateTimeText(double date) const { return dateText(date) + " " + timeText(date); }
 
     /// Seconds since midnight, local time.
     double secondsOfDay() const {

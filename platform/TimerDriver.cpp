@@ -22,15 +22,24 @@ void TimerDriver::follow(Timer& timer) {
     if (wanted > 0) arm(timer);
 }
 
-void TimerDriver::arm(Timer& timer) {
+void TimerDriver::arm(Timer& timer, std::optional<int> ms) {
     Entry& entry = entries_[&timer];
-    entry.task = events_.schedule(entry.interval, [this, &timer] {
+    entry.task = events_.schedule(ms.value_or(entry.interval), [this, &timer] {
         Entry& due = entries_[&timer];
         arm(timer);  // ahead of the tick, so that a long tick keeps the pace
-        if (due.inTick) return;
+        if (due.inTick) {
+            due.missed = true;
+            return;
+        }
         due.inTick = true;
         timer.Tick();
         due.inTick = false;
+        if (!due.missed) return;
+        // A tick that fell due meanwhile is late, not lost.
+        due.missed = false;
+        if (due.interval == 0) return;
+        events_.cancel(due.task);
+        arm(timer, 0);
     });
 }
 

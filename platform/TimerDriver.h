@@ -2,6 +2,7 @@
 // Runs the timers of a form on the event loop.
 
 #include <map>
+#include <optional>
 
 #include "platform/Controls.h"
 #include "platform/Events.h"
@@ -24,9 +25,10 @@ class TimerDriver {
         int interval = 0;  ///< of the running task; 0 when none runs
         TaskId task = 0;
         bool inTick = false;
+        bool missed = false;  ///< a tick fell due while one ran
     };
     void follow(Timer& timer);
-    void arm(Timer& timer);
+    void arm(Timer& timer, std::optional<int> ms = {});
 
     Events& events_;
     std::map<Timer*, Entry> entries_;

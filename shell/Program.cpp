@@ -8,6 +8,12 @@
 #include "connection/Profiles.h"
 #include "connection/SessionClock.h"
 #include "connection/TcpDialog.h"
+#include "files/FileMenu.h"
+#include "files/FileOps.h"
+#include "files/RecentFiles.h"
+#include "files/Recording.h"
+#include "files/ViewReader.h"
+#include "files/ViewWriter.h"
 #include "link/AnswerReader.h"
 #include "link/BinaryReader.h"
 #include "link/BinaryTrace.h"
@@ -60,6 +66,13 @@ struct Program::Rooms {
                  p.boxes),
           power(forms, exchange, p.events),
           sweeps(forms, exchange, traces, power, p.events, p.boxes),
+          files(panel, p.fileDialogs, p.folder, p.clock),
+          views(forms, mirror, exchange, files, p.clock, p.boxes),
+          viewReader(forms, mirror, files, scaling, conversion, p.clock, p.events, p.boxes),
+          recording(forms, mirror, link, reader, exchange, traces, sweeps, files, views, p.clock,
+                    p.events, p.boxes),
+          recent(panel, p.settings),
+          fileMenu(panel, files, p.folder, p.boxes),
           softPanel(panel),
           fill(panel, mirror, exchange),
           markerReadout(panel, mirror, exchange),
@@ -90,6 +103,8 @@ struct Program::Rooms {
         panel.CommandLine = std::move(commandLine);
         timers.attach(panel.UpNow);
         timers.attach(panel.PaceTimer);
+        timers.attach(forms.time.X);
+        viewReader.FileLoaded.connect([this](const std::string& path) { recent.add(path); });
         panel.UtilityTrouble.Clicked.connect([this] {
             // It is a help on the side: a simulator that is not installed is no error.
             platform.launcher.start(platform.folder.programPath() + "/ZELSim/ZELSim", {"--pty"});
@@ -116,6 +131,12 @@ struct Program::Rooms {
     TraceReader traces;
     PowerReadout power;
     SweepControl sweeps;
+    FileOps files;
+    ViewWriter views;
+    ViewReader viewReader;
+    Recording recording;
+    RecentFiles recent;
+    FileMenu fileMenu;
     SoftPanel softPanel;
     MenuFill fill;
     MarkerReadout markerReadout;
@@ -153,6 +174,7 @@ CommandExchange& Program::exchange() { return rooms_->exchange; }
 TraceReader& Program::traces() { return rooms_->traces; }
 
 void Program::start() {
+    rooms_->recent.load();
     if (!rooms_->startUp.Form_Load(kVersion)) rooms_->end.end();
 }
 

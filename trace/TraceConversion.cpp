@@ -104,7 +104,7 @@ void TraceConversion::CalculateDataAutoPeak(int decimals) {
     colour(trace);
 }
 
-void TraceConversion::colour(const std::vector<double>& shown) {
+void TraceConversion::colour(const std::vector<double>& shown) const {
     const double low = graph3D_.axis(3).Minimum;
     const double height = graph3D_.axis(3).Maximum - low;
     std::vector<double>& colours = panel_.TraceColours;

@@ -27,11 +27,12 @@ class TraceConversion {
     /// Lifts a value to the bottom of the display, ten divisions below the top. With
     /// `useRangeCode` the range is a code, without it dB a division.
     double ClipToBottom(double value, bool useRangeCode) const;
+    /// `TraceColours` of the values that the graph shows, by the range of the waterfall's axis 3.
+    void colour(const std::vector<double>& shown) const;
 
   private:
     bool isLogarithmicUnit() const;
     double linearDisplayValue(double value, bool clearOtherUnits) const;
-    void colour(const std::vector<double>& shown);
 
     ControllerForm& panel_;
     const ZEL3Variables& mirror_;

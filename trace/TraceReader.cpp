@@ -154,6 +154,7 @@ bool TraceReader::ReadTraceData(double& /*xFirstRef*/, double& /*xLastRef*/) {
 }
 
 void TraceReader::scaleAndConvert() {
+    panel_.Shown = {};
     conversion_.SelectRawScale();
     panel_.ViewXOffset = panel_.ViewSpan == 0 ? 0 : panel_.ViewStart;
     scaling_.setGraphAxes(panel_.ViewStart, panel_.ViewStop, mirror_.ReferenceLevel,
@@ -233,7 +234,8 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     }
     begin();
     if (panel_.RecordDataFlag && !exchange_.CmdInstrument("INIT")) return close();
-    Step step = askAgain(again);
+    // A loaded file has set fields of the mirror: they are the instrument's again behind this.
+    Step step = panel_.Shown.fromFile ? askSettings() : askAgain(again);
     if (step == Step::Ok) step = wait();
     if (step == Step::LinkFailed) return abortView(success);
     if (step == Step::Refused) return close();

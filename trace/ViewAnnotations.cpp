@@ -7,6 +7,8 @@
 namespace zel {
 namespace {
 
+constexpr const char* kFaultLocation = "Fault Location";
+
 std::string choiceText(CodeTable table, double code) {
     const CodeRow* row = findCode(table, code);
     if (row == nullptr) return "";
@@ -17,31 +19,56 @@ std::string choiceText(CodeTable table, double code) {
     return bracket == std::string::npos ? caption : caption.substr(0, bracket);
 }
 
-std::string verticalUnit(const ZEL3Variables& mirror) {
-    if (mirror.ReferenceRange > RANGE1DB) return "%";
+std::string verticalUnit(const ZEL3Variables& mirror, double range) {
+    if (range > RANGE1DB) return "%";
     // On a logarithmic range volts and watts are drawn in dBm.
     if (mirror.ReferenceUnit > UNITDB) return "dBm";
     return levelUnitText(mirror.ReferenceUnit);
 }
 
+/// "RBW 300 kHz"; empty where the file says nothing.
+std::string fileText(const char* name, const std::string& value, const char* unit) {
+    return value.empty() ? "" : std::string(name) + FormatValue(value, unit);
+}
+
+/// What only the file knows; the mirror holds the instrument's own state.
+void annotateFile(const ShownFile& shown, ViewAnnotations& view) {
+    view.rbw = fileText("RBW ", shown.rbw, "Hz");
+    view.vbw = fileText("VBW ", shown.vbw, "Hz");
+    view.sweepTime = fileText("SWT ", shown.sweepTime, "s");
+    view.detector = shown.detector.empty() ? "" : "Det " + shown.detector;
+    view.mode = shown.mode;
+}
+
 }  // namespace
+
+double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror) {
+    const double range = mirror.ReferenceRange;
+    if (!panel.Shown.fromFile || range == RANGELIN) return range;
+    for (int code = RANGE10DB; code <= RANGE1DB; ++code)
+        if (decibelsPerDivision(code) == range) return code;
+    return range;
+}
 
 ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror) {
     ViewAnnotations view;
     const Graph& graph = panel.CWGraph1;
     view.ok = !graph.values().empty();
-    view.xUnit = GetDimension(panel, mirror);
-    view.unit = verticalUnit(mirror);
+    const bool faultFile = panel.Shown.fromFile && panel.Shown.mode == kFaultLocation;
+    view.xUnit = faultFile ? "m" : GetDimension(panel, mirror);
+    const double range = shownRangeCode(panel, mirror);
+    view.unit = verticalUnit(mirror, range);
     if (!view.ok) return view;
     view.refLevel = "Ref " + FormatValue(mirror.ReferenceLevel, levelUnitText(mirror.ReferenceUnit),
                                          "", mirror.ReferenceUnit > UNITDB);
-    view.range = choiceText(CodeTable::Range, mirror.ReferenceRange);
+    view.range = choiceText(CodeTable::Range, range);
     view.rbw = "RBW " + choiceText(CodeTable::ResolutionBandwidth, mirror.ResolutionBandwidth);
     view.vbw = "VBW " + choiceText(CodeTable::VideoBandwidth, mirror.VideoBandwidth);
     view.sweepTime = "SWT " + FormatValue(mirror.SweepTime, "s");
     view.detector = "Det " + choiceText(CodeTable::Detector, mirror.TraceDetector);
     const CodeRow* mode = findCode(CodeTable::MeasurementMode, panel.InstrumentMode);
     if (mode != nullptr) view.mode = std::string(mode->text);
+    if (panel.Shown.fromFile) annotateFile(panel.Shown, view);
     const double left = graph.xAxis().Minimum;
     const double right = graph.xAxis().Maximum;
     view.left = "Start " + FormatValue(left, view.xUnit);

@@ -24,6 +24,8 @@ struct ViewAnnotations {
     std::string right;
 };
 
+/// The range code of the view on the graph, also where a file gave dB a division.
+double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror);
 /// From the mirror and from the axes as they are shown, zoomed or not.
 ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror);
 

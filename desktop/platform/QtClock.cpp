@@ -1,6 +1,10 @@
 #include "desktop/platform/QtClock.h"
 
+#include <QDateTime>
+#include <QFileInfo>
+#include <QLocale>
 #include <chrono>
+#include <cmath>
 #include <ctime>
 
 namespace zel {
@@ -8,6 +12,36 @@ namespace zel {
 std::int64_t QtClock::micros() const {
     const auto now = std::chrono::steady_clock::now().time_since_epoch();
     return std::chrono::duration_cast<std::chrono::microseconds>(now).count();
+}
+
+namespace {
+
+const QDate kFirstDay(1899, 12, 30);
+constexpr double kDayMilliseconds = 86400000;
+
+}  // namespace
+
+std::string QtClock::dateText(double date) const {
+    const QLocale locale = QLocale::system();
+    QString format = locale.dateFormat(QLocale::ShortFormat);
+    if (!format.contains("yyyy")) format.replace("yy", "yyyy");
+    const QDate day = kFirstDay.addDays(static_cast<qint64>(std::floor(date)));
+    return locale.toString(day, format).toStdString();
+}
+
+std::string QtClock::timeText(double date) const {
+    const auto ms = static_cast<int>((date - std::floor(date)) * kDayMilliseconds);
+    const QTime time = QTime::fromMSecsSinceStartOfDay(ms);
+    // The short form of most locales leaves the seconds out.
+    return time.toString("HH:mm:ss").toStdString();
+}
+
+std::optional<double> QtClock::modified(const std::string& path) const {
+    const QFileInfo file(QString::fromStdString(path));
+    if (!file.exists()) return std::nullopt;
+    const QDateTime time = file.lastModified();
+    return static_cast<double>(kFirstDay.daysTo(time.date())) +
+           time.time().msecsSinceStartOfDay() / kDayMilliseconds;
 }
 
 double QtClock::date() const {

@@ -9,6 +9,10 @@ class QtClock : public Clock {
   public:
     std::int64_t micros() const override;
     double date() const override;
+    /// In the short form of the system's locale, with four digits of the year.
+    std::string dateText(double date) const override;
+    std::string timeText(double date) const override;
+    std::optional<double> modified(const std::string& path) const override;
 };
 
 }  // namespace zel

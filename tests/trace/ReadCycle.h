@@ -29,6 +29,12 @@ struct ReadCycle : Session, ::testing::Test {
             get(kSettings[i].word, other == others.end() ? kSettings[i].value : other->second);
         }
     }
+    /// Recording is on, and its file takes all and keeps none.
+    void recordIntoNothing() {
+        panel.RecordDataFlag = true;
+        panel.CommonDialog1FileName = "/dev/null";
+        mirror.ResolutionBandwidth = mirror.VideoBandwidth = 1;
+    }
     bool readFull() {
         bool success = true;
         program.traces().ReadSingleTrace(success);

@@ -66,7 +66,7 @@ TEST_F(FullCycleTest, Panel_IsBusyDuringTheCycleAndReadyBehindIt) {
     askSettings();
     cmd("WAIT");
     trace(levelBlock(-35250));
-    panel.RecordDataFlag = true;
+    recordIntoNothing();
     bool busy = false;
     panel.SaveView.connect([&](const std::string&) {
         busy = panel.MousePointer == 11 && !panel.PlaySingleButton.Enabled &&
@@ -294,7 +294,7 @@ TEST_F(FullCycleTest, XVector_BelongsToTheRangeOfTheTraceBefore) {
 }
 
 TEST_F(FullCycleTest, Recording_SavesTheConvertedTraceAheadOfTheDrawing) {
-    panel.RecordDataFlag = true;
+    recordIntoNothing();
     Texts saved;
     panel.SaveView.connect([&](const std::string& kind) {
         saved.push_back(kind);

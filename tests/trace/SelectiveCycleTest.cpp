@@ -119,7 +119,7 @@ TEST_F(SelectiveCycleTest, NotConnected_IsToldOnce) {
 }
 
 TEST_F(SelectiveCycleTest, Recording_StartsTheSweepWithInit) {
-    panel.RecordDataFlag = true;
+    recordIntoNothing();
     Texts saved;
     panel.SaveView.connect([&](const std::string& kind) { saved.push_back(kind); });
     cmd("INIT");

@@ -1,0 +1,51 @@
+#pragma once
+// The file dialogs of the panel and the reading of whole files.
+
+#include <functional>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "platform/Clock.h"
+#include "platform/Services.h"
+
+namespace zel {
+
+/// All dialogs return the chosen path, or the empty text when cancelled.
+class FileOps {
+  public:
+    /// Called with the bytes read so far and the size of the file.
+    using Progress = std::function<void(std::uint64_t done, std::uint64_t size)>;
+
+    FileOps(ControllerForm& panel, FileDialogs& dialogs, ApplicationFolder& folder,
+            const Clock& clock)
+        : panel_(panel), dialogs_(dialogs), folder_(folder), clock_(clock) {}
+
+    std::string LastDialogFileName;  ///< what the last dialog gave; empty if none yet
+    std::string LastOpenFolder;      ///< where the open dialog begins; empty at the start
+
+    /// `filterIndex` counts from 1: all files, text, data, CSV.
+    std::string ShowSaveDataDialog(int filterIndex);
+    /// The ending of the kind that is offered first. A name without an ending gets it.
+    std::string ShowSaveImageDialog(const std::string& extension);
+    std::string ShowOpenDataDialog(int filterIndex);
+    /// The file's text; bytes that are no UTF-8 count as Windows-1252. Throws
+    /// std::runtime_error with a text for the user when the file cannot be read or is larger
+    /// than `kLargestFile`. An empty path or file gives the empty text.
+    std::string ReadWholeFile(const std::string& path, const Progress& progress = {}) const;
+    /// Day and time at which the last dialog's file was written; " " without one.
+    std::string LastFileDateTime() const;
+    /// Takes a name as if a dialog had given it.
+    void note(const std::string& path);
+
+    static constexpr std::uint64_t kLargestFile = 2'000'000'000;
+
+  private:
+    std::string finish(const std::optional<std::string>& chosen);
+
+    ControllerForm& panel_;
+    FileDialogs& dialogs_;
+    ApplicationFolder& folder_;
+    const Clock& clock_;
+};
+
+}  // namespace zel

@@ -1,0 +1,89 @@
+#include "files/LoadedRows.h"
+
+#include <charconv>
+#include <cmath>
+#include <string>
+
+#include "files/ViewFormat.h"
+#include "model/CodeTables.h"
+#include "model/Numeric.h"
+
+namespace zel {
+namespace {
+
+constexpr std::string_view kBlank = " ";
+constexpr double kMostRange = 255;
+
+bool isDigit(char c) { return c >= '0' && c <= '9'; }
+
+}  // namespace
+
+bool looksLikeNumber(std::string_view field) {
+    while (!field.empty() && field.front() == ' ') field.remove_prefix(1);
+    if (!field.empty() && (field.front() == '-' || field.front() == '+')) field.remove_prefix(1);
+    if (!field.empty() && (field.front() == '.' || field.front() == ',')) field.remove_prefix(1);
+    return !field.empty() && isDigit(field.front());
+}
+
+double fieldNumber(std::string_view field) {
+    // What the program writes itself needs none of the tolerance.
+    double value = 0;
+    const char* const end = field.data() + field.size();
+    const auto [stop, problem] = std::from_chars(field.data(), end, value);
+    if (problem == std::errc() && stop == end && std::isfinite(value)) return value;
+    return ParseNumberInvariant(std::string(field));
+}
+
+double LoadedRows::ConvertLoadedValue(double value) const {
+    conversion_.ClipToReferenceLevel(value);
+    int code = 0;
+    const double range = std::nearbyint(mirror_.ReferenceRange);
+    MapRangeCode(range >= 0 && range <= kMostRange ? static_cast<int>(range) : 0, true, code);
+    if (code < RANGELIN || mirror_.ReferenceUnit >= UNITV) {
+        if (mirror_.ReferenceUnit == UNITV) value = VoltsToDbm(value);
+        if (mirror_.ReferenceUnit == UNITW) value = WattsToDbm(value);
+    } else if (range >= RANGELIN && range <= RANGEVSWR11) {
+        value = DbmToPercent(value, mirror_.ReferenceLevel);
+    }
+    return conversion_.ClipToBottom(value, false);
+}
+
+int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startIndex,
+                             int& nextIndex) {
+    std::vector<double>& xs = panel_.DataXAxisArrayToLoad;
+    std::vector<double>& values = panel_.DataValArrayToLoad;
+    std::vector<double>& raw = panel_.RawTraceData;
+    const int perRow = autoPeak ? 2 : 1;
+    xs.assign(kRows, 0);
+    values.assign(static_cast<std::size_t>(kRows * perRow), 0);
+    raw.assign(values.size(), 0);
+    const int last = lines.last();
+    int rows = 0;
+    int i = startIndex;
+    while (rows < kRows) {
+        while (i <= last && lines[i] == kBlank) ++i;
+        // A line end behind the last row makes an entry of its own, which is no row.
+        if (i > last || (i == last && lines[i].empty())) {
+            i = last + 1;
+            break;
+        }
+        if (i + perRow > last) {  // the file ends in the middle of this row
+            i = last + 1;
+            break;
+        }
+        xs[static_cast<std::size_t>(rows)] = fieldNumber(lines[i++]);
+        for (int k = 0; k < perRow; ++k, ++i) {
+            const auto slot = static_cast<std::size_t>(rows * perRow + k);
+            raw[slot] = fieldNumber(lines[i]);
+            values[slot] = ConvertLoadedValue(raw[slot]);
+        }
+        ++rows;
+    }
+    nextIndex = i > last ? -1 : i;
+    xs.resize(static_cast<std::size_t>(rows));
+    values.resize(static_cast<std::size_t>(rows * perRow));
+    raw.resize(values.size());
+    return rows;
+}
+
+}  // namespace zel

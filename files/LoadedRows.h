@@ -1,0 +1,40 @@
+#pragma once
+// Reads the rows of one trace out of a file's entries, converted for display.
+
+#include <string_view>
+#include <vector>
+
+#include "files/FieldList.h"
+#include "forms/ControllerForm.h"
+#include "model/ZEL3Variables.h"
+#include "trace/TraceConversion.h"
+
+namespace zel {
+
+class LoadedRows {
+  public:
+    LoadedRows(ControllerForm& panel, const ZEL3Variables& mirror,
+               const TraceConversion& conversion)
+        : panel_(panel), mirror_(mirror), conversion_(conversion) {}
+
+    /// Fills `DataXAxisArrayToLoad` and `DataValArrayToLoad` with at most 301 rows from the entry
+    /// `startIndex` on. `nextIndex` is the entry behind the rows, or -1 when the text is used up.
+    /// Returns how many rows were there; the arrays, `RawTraceData` too, hold as many.
+    int ReadDataRows(const FieldList& lines, bool autoPeak, int startIndex, int& nextIndex);
+    /// A value of the file in the reference unit, as the graph shows it.
+    double ConvertLoadedValue(double value) const;
+
+    static constexpr int kRows = 301;
+
+  private:
+    ControllerForm& panel_;
+    const ZEL3Variables& mirror_;
+    const TraceConversion& conversion_;
+};
+
+/// The number of an entry, with point or comma; 0 for what is none.
+double fieldNumber(std::string_view field);
+/// True where an entry begins as a number does.
+bool looksLikeNumber(std::string_view field);
+
+}  // namespace zel

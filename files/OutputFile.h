@@ -1,0 +1,39 @@
+#pragma once
+// A text file that is written in one piece: what a line too many would spoil stays as it was.
+
+#include <string>
+#include <string_view>
+
+namespace zel {
+
+/// Lines gather in memory and reach the file in `close`, so that a failure halfway leaves either
+/// the older file or the appended one without the piece.
+class OutputFile {
+  public:
+    enum class Mode { Output, Append };
+
+    OutputFile(std::string path, Mode mode) : path_(std::move(path)), mode_(mode) {}
+
+    const std::string& path() const { return path_; }
+    /// Adds text and CR LF.
+    void line(std::string_view text) {
+        text_ += text;
+        text_ += "\r\n";
+    }
+    std::string& text() { return text_; }
+    /// Writes what was gathered. What went wrong, for a user; else an empty text.
+    std::string close();
+
+  private:
+    std::string append() const;
+    std::string replace() const;
+
+    std::string path_;
+    Mode mode_;
+    std::string text_;
+};
+
+/// "The file NAME cannot be written: No space left on device".
+std::string writeProblem(const std::string& path, int errorNumber);
+
+}  // namespace zel

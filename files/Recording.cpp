@@ -1,0 +1,286 @@
+#include "files/Recording.h"
+
+#include <algorithm>
+#include <cmath>
+#include <filesystem>
+#include <limits>
+
+#include "model/CodeTables.h"
+#include "support/NumberText.h"
+#include "support/TimeText.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr int kCsvFilter = 4;
+constexpr int kHourglass = 11;
+constexpr int kResyncMs = 300;
+constexpr int kPassFillStyle = 3;
+constexpr int kRetryMs = 10;
+constexpr std::int16_t kLastRow = 32767;
+constexpr double kDaySeconds = 86400;
+
+template <class Whole>
+Whole wholeNumber(double value) {
+    constexpr double kMost = std::numeric_limits<Whole>::max();
+    return static_cast<Whole>(std::clamp(std::nearbyint(value), 0.0, kMost));
+}
+
+/// "118 kB".
+std::string sizeText(std::uintmax_t bytes) {
+    constexpr const char* kUnits[] = {" B", " kB", " MB", " GB"};
+    auto size = static_cast<double>(bytes);
+    std::size_t unit = 0;
+    while (size >= 1000 && unit < 3) size /= 1000, ++unit;
+    return formatPattern(size, size < 10 && unit > 0 ? "0.0" : "0") + kUnits[unit];
+}
+
+}  // namespace
+
+Recording::Recording(Forms& forms, ZEL3Variables& mirror, ByteLink& link, AnswerReader& reader,
+                     CommandExchange& exchange, TraceReader& traces, SweepControl& sweeps,
+                     FileOps& files, ViewWriter& writer, const Clock& clock, Events& events,
+                     MessageBoxes& boxes)
+    : forms_(forms),
+      panel_(forms.controller),
+      dialog_(forms.time),
+      mirror_(mirror),
+      link_(link),
+      reader_(reader),
+      exchange_(exchange),
+      traces_(traces),
+      sweeps_(sweeps),
+      files_(files),
+      writer_(writer),
+      clock_(clock),
+      events_(events),
+      boxes_(boxes),
+      running_(clock) {
+    panel_.RecordData.Clicked.connect([this] { RecordData_Click(); });
+    dialog_.Load.connect([this] { loadForm(); });
+    dialog_.SubmitTimeButton.Clicked.connect([this] { SubmitTimeButton_Click(); });
+    dialog_.CancelTimeButton.Clicked.connect([this] { dialog_.unload(1); });
+    dialog_.X.Tick.connect([this] { X_Timer(); });
+    panel_.UpNow.Tick.connect([this] { showProgress(); });
+    // Stop need not wait for the next tick, which may be hours away.
+    panel_.StopButton.Clicked.connect([this] {
+        if (dialog_.X.Enabled && !inTick_) windUp();
+    });
+}
+
+void Recording::pointer(int shape) {
+    panel_.MousePointer = shape;
+    events_.pump();
+}
+
+void Recording::ReadTriggerSource() {
+    if (panel_.InstrumentMode == CF::POWERSENSOR) return;
+    std::string answer;
+    if (exchange_.GetInstrument("TRIGSRC", answer))
+        mirror_.TriggerSource =
+            static_cast<std::int16_t>(std::clamp(leadingNumber(answer), -1.0, 32767.0));
+    mirror_.ExternalTriggerActive =
+        mirror_.TriggerSource == TRIGEXTRISE || mirror_.TriggerSource == TRIGEXTFALL;
+}
+
+void Recording::RecordData_Click() {
+    ReadTriggerSource();
+    if (!panel_.RecordData.Checked) {
+        loadForm();
+        dialog_.Show();
+        return;
+    }
+    panel_.RecordDataFlag = false;
+    panel_.RecordData.Checked = false;
+}
+
+void Recording::loadForm() {
+    dialog_.lblRecText.Caption =
+        mirror_.ExternalTriggerActive ? "Timeout (ExtTrigger): " : "Record data every";
+    dialog_.RecordedCount = 0;
+}
+
+void Recording::abandon() {
+    panel_.RecordData.Checked = false;
+    panel_.RecordDataFlag = false;
+    dialog_.Hide();
+}
+
+bool Recording::chooseFile() {
+    panel_.DataFileName = files_.ShowSaveDataDialog(kCsvFilter);
+    if (panel_.DataFileName.empty()) return false;
+    // Emptied once; each trace is then appended to it.
+    OutputFile file(panel_.DataFileName, OutputFile::Mode::Output);
+    const std::string problem = file.close();
+    if (problem.empty()) return true;
+    boxes_.show({BoxIcon::Critical, problem});
+    return false;
+}
+
+void Recording::SubmitTimeButton_Click() {
+    if (panel_.RecordData.Checked) return;
+    const double entered = leadingNumber(dialog_.TimeIntervalBox.Text.get());
+    panel_.RecordTimeValue = entered;
+    panel_.RecordData.Checked = true;
+    panel_.RecordDataFlag = true;
+    if (!chooseFile()) {
+        abandon();
+        return;
+    }
+    writer_.RecordingFileName = panel_.DataFileName;
+    panel_.PlayContinuousButton.Visible = false;
+    panel_.StopButton.Visible = true;
+    dialog_.Hide();
+    dialog_.RecordedCount = 0;
+    running_.Reset();
+    lastTick_ = clock_.micros();
+    if (mirror_.ExternalTriggerActive) {
+        RecordExtTrigger(wholeNumber<std::int16_t>(entered));
+        return;
+    }
+    dialog_.X.Enabled = false;
+    dialog_.X.Interval = wholeNumber<int>(entered * 1000);
+    dialog_.X.Enabled = true;
+    panel_.PlayContinuousButton.Enabled = false;
+    showProgress();
+}
+
+void Recording::windUp() {
+    dialog_.ContinuousRecording = false;
+    panel_.PlayContinuousButton.Enabled = true;
+    dialog_.X.Enabled = false;
+    dialog_.RecordedCount = 0;
+    writer_.RecordingFileName.clear();
+    panel_.FileLabel.Caption = "";
+}
+
+bool Recording::takeTrace() {
+    if (dialog_.RecordedCount == 0 || panel_.State == CF::POWER) {
+        sweeps_.PlaySingleButton_Click();
+        return true;
+    }
+    if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
+    if (!forms_.waterfall.Graph3D.plots().empty()) {
+        GraphCurve3D& newest = forms_.waterfall.Graph3D.plots().back();
+        newest.lineVisible = false;
+        newest.fillStyle = kPassFillStyle;
+    }
+    bool success = false;
+    traces_.ReadSingleTrace2({}, success);
+    return success;
+}
+
+void Recording::X_Timer() {
+    if (exchange_.busy()) {
+        // The line is in the middle of a dialogue that lets events run: this tick comes behind it.
+        events_.schedule(kRetryMs, [this] {
+            if (dialog_.X.Enabled && !inTick_) X_Timer();
+        });
+        return;
+    }
+    lastTick_ = clock_.micros();
+    dialog_.ContinuousRecording = true;
+    if (!panel_.RecordData.Checked) {
+        windUp();
+        return;
+    }
+    inTick_ = true;
+    pointer(kHourglass);
+    bool taken = true;
+    if (!mirror_.ExternalTriggerActive) {
+        taken = takeTrace();
+        if (taken) ++dialog_.RecordedCount;
+    }
+    inTick_ = false;
+    panel_.MousePointer = 0;
+    if (!panel_.RecordData.Checked) {
+        windUp();
+        return;
+    }
+    if (taken) events_.pump();
+    showProgress();
+}
+
+void Recording::resynchronise() {
+    events_.sleep(kResyncMs);
+    link_.WriteToLink("\r");
+    reader_.ReadAnswer();
+    events_.sleep(kResyncMs);
+    events_.pump();
+    link_.WriteToLink("\r");
+    reader_.ReadAnswer();
+}
+
+void Recording::RecordExtTrigger(std::int32_t timeout) {
+    dialog_.ContinuousRecording = true;
+    bool good = true;
+    panel_.STOPFlag = true;
+    events_.pump();
+    for (bool recording = true; recording;) {
+        pointer(kHourglass);
+        if (!good) {
+            resynchronise();
+            if (panel_.isSpecMeas) {
+                forms_.specialMeas.cmdStop.Click();
+            } else {
+                panel_.StopButton.Click();
+                dialog_.ContinuousRecording = false;
+            }
+        } else {
+            if (panel_.isSpecMeas) exchange_.CmdInstrument("INIT");
+            good = exchange_.CmdInstrumentTriggered("WAIT", timeout);
+            if (good) {
+                const bool again = dialog_.RecordedCount != 0 && panel_.State != CF::POWER;
+                bool success = true;
+                if (again) {
+                    traces_.ReadSingleTrace2({}, success);
+                } else {
+                    sweeps_.PlaySingleButton_Click();
+                }
+                if (!success) {
+                    panel_.MousePointer = 0;
+                    break;
+                }
+                ++dialog_.RecordedCount;
+                showProgress();
+            } else if (panel_.isSpecMeas) {
+                forms_.specialMeas.cmdStop.Click();
+                resynchronise();
+            }
+        }
+        if (!panel_.STOPFlag || panel_.isSpecMeas) {
+            dialog_.ContinuousRecording = false;
+            pointer(0);
+            recording = false;
+        }
+    }
+    if (panel_.isSpecMeas) return;
+    // A trace that failed leaves the loop as well: the panel goes back to what it was.
+    if (panel_.RecordData.Checked) panel_.StopButton.Click();
+    windUp();
+}
+
+std::string Recording::progressText() const {
+    if (writer_.RecordingFileName.empty() || !panel_.RecordData.Checked) return {};
+    std::error_code missing;
+    const auto bytes = std::filesystem::file_size(writer_.RecordingFileName, missing);
+    const double count = dialog_.RecordedCount;
+    std::string text = std::filesystem::path(writer_.RecordingFileName).filename().string() + ": " +
+                       generalNumber(count) + (count == 1 ? " trace, " : " traces, ") +
+                       sizeText(missing ? 0 : bytes) + ", " +
+                       timeOfDayText(std::nearbyint(running_.Elapsed() / 1000.0) / kDaySeconds);
+    if (mirror_.ExternalTriggerActive) return text + ", waits for the trigger";
+    if (dialog_.X.Interval == 0) return text + ", the interval of 0 s takes no trace";
+    const double left =
+        dialog_.X.Interval / 1000.0 - static_cast<double>(clock_.micros() - lastTick_) / 1e6;
+    return text + ", next in " + generalNumber(std::max(0.0, std::nearbyint(left))) + " s";
+}
+
+void Recording::showProgress() {
+    const std::string text = progressText();
+    if (!text.empty()) panel_.FileLabel.Caption = text;
+}
+
+}  // namespace zel

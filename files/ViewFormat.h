@@ -1,0 +1,26 @@
+#pragma once
+// The words of a saved view that the writer and the reader share.
+
+#include <string>
+
+namespace zel {
+
+inline constexpr const char* kTime = "Time";
+inline constexpr const char* kMeasurementType = "Measurement Type";
+inline constexpr const char* kDynamicRange = "Dynamic Range";
+inline constexpr const char* kZeroSpan = "ZERO SPAN";
+inline constexpr const char* kSweepTime = "Sweeptime";
+inline constexpr const char* kResolutionBandwidth = "Resolution Bandwidth";
+inline constexpr const char* kVideoBandwidth = "Video Bandwidth";
+inline constexpr const char* kReferenceUnit = "Reference Unit";
+inline constexpr const char* kReferenceRange = "Reference Range";
+inline constexpr const char* kReferenceLevel = "Reference Level";
+inline constexpr const char* kTraceDetector = "Trace Detector";
+inline constexpr const char* kTraceWritePointer = "Trace Write Pointer";
+inline constexpr const char* kMeasuredValue = "Measured Value";
+
+/// With `toCode` dB a division becomes a range code: 10, 5, 2, 1 give 0 to 3, anything else
+/// stays. Without it a range code becomes dB a division, 10 for a code that is none of 0 to 3.
+void MapRangeCode(int value, bool toCode, int& out);
+
+}  // namespace zel

@@ -1,0 +1,25 @@
+#pragma once
+// The header of a saved view: the settings of the instrument, a line each.
+
+#include <functional>
+#include <string>
+
+#include "files/OutputFile.h"
+#include "forms/ControllerForm.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Clock.h"
+
+namespace zel {
+
+struct ViewHeader {
+    const ControllerForm& panel;
+    ZEL3Variables& mirror;
+    const Clock& clock;
+    /// Asks for a bandwidth that is on automatic ("RBW", "VBW"): for the next file.
+    std::function<void(const char* word, double& bandwidth)> askBandwidth;
+
+    /// All lines, the empty one at the end too.
+    void write(OutputFile& file) const;
+};
+
+}  // namespace zel

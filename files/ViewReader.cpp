@@ -1,0 +1,362 @@
+#include "files/ViewReader.h"
+
+#include <algorithm>
+#include <cmath>
+#include <filesystem>
+#include <stdexcept>
+
+#include "files/ViewFormat.h"
+#include "model/CodeTables.h"
+#include "model/FrequencyLabels.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr int kCsvFilter = 4;
+constexpr int kHourglass = 11;
+/// What one trace's header and 301 rows come to.
+constexpr int kLargestSingle = 970;
+constexpr int kRowsBehindMark = 3;
+constexpr int kSlowestMs = 1000;
+constexpr int kMsPerStep = 100;
+constexpr std::size_t kDayLength = 10;
+constexpr double kIntervals = 300;
+constexpr int kShownBytes = 4 * 1024 * 1024;
+constexpr int kFirstLogEntry = 3;
+
+constexpr const char* kAutoPeak = "Auto Peak";
+constexpr const char* kLinear = "lin 0 - 100%";
+
+/// The first entry from `from` on that holds the word, or -1.
+int findEntry(const FieldList& lines, std::string_view word, int from = 0) {
+    for (int i = from; i <= lines.last(); ++i)
+        if (contains(lines[i], word)) return i;
+    return -1;
+}
+
+std::string rangeNumber(double percent) { return generalNumber(std::floor(percent * 100)) + " %"; }
+
+/// Runs something at the end of a scope, whatever way it is left.
+template <class Action>
+class AtEnd {
+  public:
+    explicit AtEnd(Action action) : action_(std::move(action)) {}
+    ~AtEnd() { action_(); }
+    AtEnd(const AtEnd&) = delete;
+    AtEnd& operator=(const AtEnd&) = delete;
+
+  private:
+    Action action_;
+};
+
+}  // namespace
+
+ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, GraphScaling& scaling,
+                       const TraceConversion& conversion, const Clock& clock, Events& events,
+                       MessageBoxes& boxes)
+    : forms_(forms),
+      panel_(forms.controller),
+      mirror_(mirror),
+      files_(files),
+      scaling_(scaling),
+      clock_(clock),
+      events_(events),
+      boxes_(boxes),
+      conversion_(conversion),
+      rows_(forms.controller, mirror, conversion) {
+    panel_.LoadData.Clicked.connect([this] { LoadData_Click(); });
+    panel_.OpenFile.connect([this](const std::string& path) {
+        files_.note(path);
+        loadFile(path);
+    });
+    // Only a series has a pace.
+    forms_.specialMeas.sldSpeed.Visible = false;
+}
+
+void ViewReader::LoadData_Click() {
+    if (loading_) return;
+    const std::string path = files_.ShowOpenDataDialog(kCsvFilter);
+    if (!path.empty()) loadFile(path);
+}
+
+void ViewReader::loadFile(const std::string& path) {
+    if (loading_) return;
+    loading_ = true;
+    const AtEnd done([this] {
+        panel_.FileLabel.Caption = "";
+        loading_ = false;
+    });
+    name_ = std::filesystem::path(path).filename().string();
+    try {
+        const std::string text =
+            files_.ReadWholeFile(path, [this](std::uint64_t got, std::uint64_t size) {
+                if (size > kShownBytes)
+                    progress("Reading", static_cast<double>(got) / static_cast<double>(size));
+            });
+        // The name decides ahead of the contents.
+        if (contains(upperCase(name_), "DAT") || contains(text, "END OF LOG")) {
+            LoadTheDataForOlderVersions(text);
+        } else {
+            LoadTheData(text, files_.LastFileDateTime(), 0);
+        }
+        FileLoaded(path);
+    } catch (const std::runtime_error& problem) {
+        boxes_.show({BoxIcon::Critical, problem.what()});
+    }
+}
+
+void ViewReader::progress(const std::string& what, double part) {
+    panel_.FileLabel.Caption = what + " " + name_ + ": " + rangeNumber(part);
+    events_.pump();
+}
+
+int ViewReader::nextMark(const FieldList& lines, std::string_view word, int from) {
+    return word.empty() ? -1 : findEntry(lines, word, from);
+}
+
+void ViewReader::takeRange(std::string_view entry) {
+    if (contains(entry, "lin")) {
+        mirror_.ReferenceRange = RANGELIN;
+        return;
+    }
+    const double number = leadingNumber(entry);
+    int code = -1;
+    if (number == std::floor(number) && std::fabs(number) < kSlowestMs)
+        MapRangeCode(static_cast<int>(number), true, code);
+    // A range that no number names, as those of the reflection are saved, is drawn at 10 dB.
+    const bool known = code >= RANGE10DB && code <= RANGE1DB && number >= 1;
+    mirror_.ReferenceRange = known && (number == 10 || number == 5 || number == 2 || number == 1)
+                                 ? number
+                                 : decibelsPerDivision(RANGE10DB);
+}
+
+ViewReader::Header ViewReader::readHeader(const std::string& text, const FieldList& lines,
+                                          const std::string& fileTime) {
+    Header header;
+    mirror_.TraceDetector = contains(text, kAutoPeak) ? DETAUTOPEAK : DETSAMPLE;
+    panel_.IsLINValued = contains(text, kLinear);
+    panel_.isZELViewLinFile = panel_.IsLINValued && !contains(text, "ZELRemote");
+    header.zeroSpan = contains(text, kZeroSpan);
+    if (header.zeroSpan) mirror_.Span = 0;
+
+    // A mark that is there ends the header, so the walk need not go through all rows.
+    const int pointer = findEntry(lines, kTraceWritePointer);
+    const int measured = contains(text, kMeasuredValue) ? findEntry(lines, kMeasuredValue) : -1;
+    const bool later = measured > pointer;
+    header.mark = later ? measured : pointer;
+    if (header.mark >= 0) header.markWord = later ? kMeasuredValue : kTraceWritePointer;
+
+    const auto find = [&lines](auto&& fits) {
+        for (int i = 0; i <= lines.last(); ++i)
+            if (fits(lines[i])) return i;
+        return -1;
+    };
+    const int level = find([](std::string_view entry) {
+        return contains(entry, kReferenceLevel) || contains(entry, "RefLvl");
+    });
+    if (level >= 0) mirror_.ReferenceLevel = fieldNumber(lines[level + 1]);
+    const int range = find([](std::string_view entry) {
+        return contains(entry, "Range") && !contains(entry, kDynamicRange);
+    });
+    if (range >= 0) takeRange(lines[range + 1]);
+    const int unit = findEntry(lines, kReferenceUnit);
+    for (const CodeRow& row : codeTable(CodeTable::ReferenceUnit))
+        if (unit >= 0 && !row.saved.empty() && lines[unit + 1] == row.saved)
+            mirror_.ReferenceUnit = row.code;
+    const int time = findEntry(lines, kTime);
+    if (time >= 0)
+        header.rowLabel = std::string(lines[time + 1]) + " " + fileTime.substr(0, kDayLength);
+    rememberShown(lines, header.mark);
+    return header;
+}
+
+void ViewReader::rememberShown(const FieldList& lines, int end) {
+    struct Entry {
+        const char* name;
+        std::string ShownFile::*text;
+    };
+    constexpr Entry kEntries[] = {{kMeasurementType, &ShownFile::mode},
+                                  {kResolutionBandwidth, &ShownFile::rbw},
+                                  {kVideoBandwidth, &ShownFile::vbw},
+                                  {kSweepTime, &ShownFile::sweepTime},
+                                  {kTraceDetector, &ShownFile::detector}};
+    panel_.Shown = {};
+    panel_.Shown.fromFile = true;
+    for (int i = 0; i < end; ++i)
+        for (const Entry& entry : kEntries)
+            if (lines[i] == entry.name) panel_.Shown.*entry.text = std::string(lines[i + 1]);
+}
+
+void ViewReader::LoadTheData(const std::string& text, const std::string& fileTime,
+                             std::int16_t rowNumber) {
+    if (text.empty()) return;
+    panel_.Connection.Enabled = false;
+    panel_.Utility.Enabled = false;
+    panel_.PlayContinuousButton.Visible = false;
+    panel_.StopButton.Visible = true;
+    panel_.STOPFlag = true;
+    panel_.YVectorVal = rowNumber;
+    if (rowNumber == 0) forms_.waterfall.clearGraph();
+    panel_.MousePointer = kHourglass;
+    events_.pump();
+
+    const FieldList lines(text, [this](double part) { progress("Loading", part); });
+    const Header header = readHeader(text, lines, fileTime);
+    const bool series = rowNumber == 0 && lines.last() > kLargestSingle;
+    showTraces(lines, header, series);
+
+    forms_.specialMeas.sldSpeed.Visible = false;
+    panel_.STOPFlag = false;
+    panel_.Connection.Enabled = true;
+    panel_.Utility.Enabled = true;
+    panel_.PlayContinuousButton.Visible = true;
+    panel_.StopButton.Visible = false;
+    forms_.waterfall.saveGraphView();
+    panel_.MousePointer = 0;
+    events_.pump();
+}
+
+void ViewReader::showTraces(const FieldList& lines, const Header& header, bool series) {
+    const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
+    int start = header.mark + kRowsBehindMark;
+    if (header.mark < 0) {
+        // A table without a header begins with its first number.
+        for (start = 0; start <= lines.last() && !looksLikeNumber(lines[start]);) ++start;
+    }
+    for (int shown = 1; start >= 0; ++shown) {
+        events_.pump();
+        int next = -1;
+        if (rows_.ReadDataRows(lines, autoPeak, start, next) == 0) break;
+        const int mark = series && next >= 0 ? nextMark(lines, header.markWord, next) : -1;
+        showTrace(header, series);
+        panel_.TraceLoaded();
+        start = mark < 0 ? -1 : mark + kRowsBehindMark;
+        if (start < 0 && shown == 1) break;
+        forms_.specialMeas.sldSpeed.Visible = true;
+        panel_.FileLabel.Caption =
+            "Trace " + std::to_string(shown) + " of " + name_ + ", " +
+            rangeNumber(start < 0 ? 1 : static_cast<double>(start) / lines.count());
+        if (start >= 0 && !pause()) break;
+    }
+}
+
+bool ViewReader::pause() {
+    const Slider& speed = forms_.specialMeas.sldSpeed;
+    const Stopwatch watch(clock_);
+    // The slider may move while a trace stands.
+    const auto left = [&] {
+        return speed.Value == speed.Max
+                   ? 0
+                   : kSlowestMs - kMsPerStep * speed.Value.get() - watch.Elapsed();
+    };
+    while (panel_.STOPFlag && left() > 0) events_.wait(std::min(left(), kMsPerStep));
+    events_.pump();
+    return speed.Value >= 0 && panel_.STOPFlag;
+}
+
+void ViewReader::spread(bool zeroSpan, double first, double last) {
+    if (zeroSpan) {
+        panel_.ViewStop = last;
+        panel_.SpanLabel.Caption = "Span: 0 Hz";
+        return;
+    }
+    mirror_.CenterFrequency = first + (last - first) / 2;
+    mirror_.Span = last - first;
+    panel_.CFLabel.Caption = centerLabelText(generalNumber(mirror_.CenterFrequency));
+    panel_.SpanLabel.Caption = spanLabelText(generalNumber(mirror_.Span));
+}
+
+void ViewReader::showTrace(const Header& header, bool series) {
+    const std::vector<double>& xs = panel_.DataXAxisArrayToLoad;
+    const std::vector<double>& values = panel_.DataValArrayToLoad;
+    const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
+    const double pairs = autoPeak ? 2 : 1;
+    spread(header.zeroSpan, xs.front(), xs.back());
+
+    double first = xs.front();
+    double last = xs.back();
+    double increment = xs.size() > 1 ? (xs[1] - xs[0]) / pairs : 0;
+    if (header.zeroSpan) {
+        // The column holds no times then: the sweep's own time spreads the points.
+        const double sweep = leadingNumber(panel_.Shown.sweepTime);
+        first = 0;
+        increment = last / (autoPeak ? 2 * kIntervals + 1 : kIntervals);
+        if (last == 0 && sweep > 0) {
+            mirror_.SweepTime = last = panel_.ViewStop = sweep;
+            increment = sweep / (pairs * (kIntervals - 2));
+        }
+    }
+    panel_.ViewSpan = header.zeroSpan ? 0 : last - first;
+    panel_.TraceIntervals = kIntervals;
+    scaling_.setGraphXAxis(first, last);
+    const double range = mirror_.ReferenceRange;
+    scaling_.setGraphYAxis(mirror_.ReferenceLevel, static_cast<int>(range), false);
+    scaling_.addWaterfallRowLimit();
+    forms_.waterfall.stampRow(header.rowLabel);
+    if (series) forms_.waterfall.styleLastRow();
+
+    panel_.CWGraph1.plotY(values, first, increment);
+    scaling_.BuildXYVectors(increment);
+    conversion_.colour(values);
+    forms_.waterfall.Graph3D.plotCurve(panel_.YVector, panel_.XVector, values, panel_.TraceColours);
+    panel_.CWGraph1.Old = false;
+    constexpr std::int16_t kLastRow = 32767;
+    if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
+}
+
+void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
+    if (text.empty()) return;
+    const bool pairs = contains(text, "MinMax");
+    const bool linear = contains(text, "LIN");
+    const bool zeroSpan = contains(text, "ZeroSpan");
+    const FieldList lines(text, [this](double part) { progress("Loading", part); });
+    int start = kFirstLogEntry;
+    while (start <= lines.last() && !looksLikeNumber(lines[start])) ++start;
+
+    std::vector<double>& xs = panel_.DataXAxisArrayToLoad;
+    std::vector<double>& values = panel_.DataValArrayToLoad;
+    xs.clear();
+    values.clear();
+    const int perRow = pairs ? 2 : 1;
+    for (int i = start; static_cast<int>(xs.size()) < LoadedRows::kRows;) {
+        // A blank closes a row; behind the rows stands the end of the log.
+        while (i <= lines.last() && trimmed(lines[i]).empty()) ++i;
+        if (i + perRow > lines.last() || contains(lines[i], "END OF LOG")) break;
+        xs.push_back(leadingNumber(lines[i++]));
+        for (int k = 0; k < perRow; ++k) values.push_back(leadingNumber(lines[i++]));
+    }
+    if (xs.empty()) return;
+
+    spread(zeroSpan, xs.front(), xs.back());
+    if (zeroSpan) mirror_.Span = 0;
+    panel_.Shown = {};
+    panel_.Shown.fromFile = true;
+    panel_.RawTraceData = values;
+    mirror_.TraceDetector = pairs ? DETAUTOPEAK : DETSAMPLE;
+    const double increment = xs.size() > 1 ? (xs[1] - xs[0]) / perRow : 0;
+    panel_.ViewSpan = zeroSpan ? 0 : mirror_.Span;
+    panel_.TraceIntervals = kIntervals;
+    panel_.ViewStart = xs.front();
+    panel_.ViewStop = xs.back();
+    Graph& graph = panel_.CWGraph1;
+    graph.setXRange(xs.front(), xs.back());
+    const auto [low, high] = std::minmax_element(values.begin(), values.end());
+    if (linear) {
+        graph.setYRange(0, 100);
+    } else {
+        // Whole tens, so that the trace touches neither edge.
+        constexpr double kStep = 10;
+        graph.setYRange(std::floor(*low / kStep - 0.1) * kStep,
+                        std::ceil(*high / kStep + 0.1) * kStep);
+    }
+    graph.showYLabels(true);
+    graph.plotY(values, xs.front(), increment);
+    graph.Old = false;
+    panel_.TraceLoaded();
+}
+
+}  // namespace zel

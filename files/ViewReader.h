@@ -1,0 +1,72 @@
+#pragma once
+// Shows saved files on the graph: one view, a series of them, a log of the older format.
+
+#include <string>
+
+#include "files/FieldList.h"
+#include "files/FileOps.h"
+#include "files/LoadedRows.h"
+#include "forms/Forms.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "trace/GraphScaling.h"
+#include "trace/TraceConversion.h"
+
+namespace zel {
+
+class ViewReader {
+  public:
+    /// Connects the menu entry and the front's request to open a file.
+    ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, GraphScaling& scaling,
+               const TraceConversion& conversion, const Clock& clock, Events& events,
+               MessageBoxes& boxes);
+
+    void LoadData_Click();
+    /// Reads and shows a file; what cannot be read is told in a box. Nothing happens while another
+    /// file loads.
+    void loadFile(const std::string& path);
+    /// `text` holds the whole file, its fields apart by CR (a semicolon counts as one); `fileTime`
+    /// is day and time of the file, `rowNumber` the waterfall's row to go on with, 0 for a file
+    /// that starts anew.
+    void LoadTheData(const std::string& text, const std::string& fileTime, std::int16_t rowNumber);
+    void LoadTheDataForOlderVersions(const std::string& text);
+
+    /// A file was read; its path.
+    Event<const std::string&> FileLoaded;
+
+  private:
+    /// What the header said, and where the rows begin.
+    struct Header {
+        bool zeroSpan = false;
+        int mark = -1;  ///< entry of the data mark
+        std::string_view markWord;
+        std::string rowLabel;
+    };
+
+    Header readHeader(const std::string& text, const FieldList& lines, const std::string& fileTime);
+    void takeRange(std::string_view entry);
+    void rememberShown(const FieldList& lines, int end);
+    void showTraces(const FieldList& lines, const Header& header, bool series);
+    void showTrace(const Header& header, bool series);
+    void spread(bool zeroSpan, double first, double last);
+    bool pause();
+    void progress(const std::string& what, double part);
+    static int nextMark(const FieldList& lines, std::string_view word, int from);
+
+    Forms& forms_;
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    FileOps& files_;
+    GraphScaling& scaling_;
+    const Clock& clock_;
+    Events& events_;
+    MessageBoxes& boxes_;
+    const TraceConversion& conversion_;
+    LoadedRows rows_;
+    std::string name_;  ///< of the file, without its folder
+    bool loading_ = false;
+};
+
+}  // namespace zel

@@ -1,0 +1,158 @@
+#include "files/ViewWriter.h"
+
+#include <algorithm>
+#include <iterator>
+
+#include "files/ViewFormat.h"
+#include "files/ViewHeader.h"
+#include "model/CodeTables.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+constexpr int kCsvFilter = 4;
+constexpr const char* kXFormat = "#.000";
+
+struct AutoBandwidth {
+    const char* word;
+    const char* message;
+};
+constexpr double kUnknownBandwidth = 1000000;
+constexpr AutoBandwidth kAutoBandwidths[] = {
+    {"RBW",
+     "No value for the Resolution Bandwidth was saved. Please enter it manually in the .csv file."},
+    {"VBW",
+     "No value for the Video Bandwidth was saved. Please enter it manually in the .csv file."},
+};
+
+}  // namespace
+
+ViewWriter::ViewWriter(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
+                       FileOps& files, const Clock& clock, MessageBoxes& boxes)
+    : forms_(forms),
+      panel_(forms.controller),
+      mirror_(mirror),
+      exchange_(exchange),
+      files_(files),
+      clock_(clock),
+      boxes_(boxes) {
+    panel_.SaveCurrentView.Clicked.connect([this] { SaveCurrentView_Click(); });
+    panel_.SaveView.connect([this](const std::string& kind) { SaveView(kind); });
+}
+
+void ViewWriter::SaveCurrentView_Click() {
+    panel_.DataFileName = panel_.isSpecMeas ? forms_.specialMeas.DataFileNameSpec
+                                            : files_.ShowSaveDataDialog(kCsvFilter);
+    if (panel_.DataFileName.empty()) return;
+    fromMenu_ = true;
+    SaveView(panel_.InstrumentMode == CF::POWERSENSOR ? "power" : "trace");
+    fromMenu_ = false;
+}
+
+void ViewWriter::SaveView(const std::string& kind) {
+    if (kind == "trace") SaveTraceView(upperCase(trimmed(panel_.CommandLine)) != "NOHEADER");
+    if (kind == "power") savePowerValues();
+}
+
+OutputFile ViewWriter::target() const {
+    using Mode = OutputFile::Mode;
+    if (panel_.isSpecMeas) return {panel_.DataFileName, Mode::Append};
+    const bool timed = forms_.time.ContinuousRecording;
+    const bool recording = timed && !fromMenu_ && !RecordingFileName.empty();
+    return {recording ? RecordingFileName : panel_.CommonDialog1FileName,
+            timed ? Mode::Append : Mode::Output};
+}
+
+void ViewWriter::SaveTraceView(bool withHeader) {
+    OutputFile file = target();
+    WriteViewHeader(file, withHeader);
+    WriteViewData(file);
+    WriteFooterAndCloseFileZELViewFormat(file);
+}
+
+void ViewWriter::bandwidth(const char* word, double& value) {
+    if (panel_.isConnected) {
+        std::string answer;
+        if (exchange_.GetInstrument(word, answer)) value = leadingNumber(answer);
+        return;
+    }
+    value = kUnknownBandwidth;
+    for (const AutoBandwidth& row : kAutoBandwidths)
+        if (std::string_view(word) == row.word) boxes_.show({BoxIcon::Exclamation, row.message});
+}
+
+void ViewWriter::WriteViewHeader(OutputFile& file, bool withHeader) {
+    if (!withHeader) return;
+    ViewHeader{panel_, mirror_, clock_,
+               [this](const char* word, double& value) { bandwidth(word, value); }}
+        .write(file);
+}
+
+void ViewWriter::WriteViewData(OutputFile& file) {
+    const bool zeroSpan = panel_.ViewSpan == 0;
+    const double step = zeroSpan || panel_.TraceIntervals == 0
+                            ? 0
+                            : (panel_.ViewStop - panel_.ViewStart) / panel_.TraceIntervals;
+    const std::vector<double>& values = panel_.RawTraceData;
+    const bool pairs = mirror_.TraceDetector == DETAUTOPEAK;
+    double x = zeroSpan ? 0 : panel_.ViewStart;
+    for (std::size_t i = 0; i < values.size(); i += pairs ? 2 : 1) {
+        if (i > 0) x += step;
+        panel_.ViewXOffset = x;
+        std::string& text = file.text();
+        text += formatPattern(x, kXFormat);
+        text += ';';
+        text += generalNumber(values[i]);
+        if (!pairs) {
+            file.line("; ");
+        } else {
+            text += ';';
+            file.line(i + 1 < values.size() ? generalNumber(values[i + 1]) : "0");
+        }
+    }
+}
+
+void ViewWriter::finish(OutputFile& file) {
+    const std::string problem = file.close();
+    if (problem.empty()) return;
+    const bool recording = panel_.RecordDataFlag;
+    // Ahead of the box, so that no further trace is begun behind it.
+    if (recording) panel_.StopButton.Click();
+    boxes_.show(
+        {BoxIcon::Critical, recording ? problem + kCrLf + "The recording was stopped." : problem});
+}
+
+void ViewWriter::WriteFooterAndCloseFileZELViewFormat(OutputFile& file) { finish(file); }
+
+void ViewWriter::savePowerValues() {
+    const bool recording = !fromMenu_ && !panel_.isSpecMeas && !RecordingFileName.empty();
+    OutputFile file(recording ? RecordingFileName : panel_.DataFileName, OutputFile::Mode::Append);
+    file.line("Power at: " + nowText() + ": " + panel_.LastPowerText);
+    if (forms_.powerAndRefl.ReadPowerAndRefl)
+        file.line("VSWR:" + std::string(26, ' ') + panel_.LastReflectionText);
+    finish(file);
+}
+
+void ViewWriter::WriteLogHeader(OutputFile& file) {
+    const bool pairs = mirror_.TraceDetector == DETAUTOPEAK;
+    const bool linear = mirror_.ReferenceRange >= RANGELIN;
+    const char* kind =
+        pairs ? (linear ? "(LIN/MinMax) at;" : "(MinMax) at;") : (linear ? "(LIN) at;" : " at;");
+    file.line((mirror_.Span == 0 ? "Data(ZeroSpan)" : "Data") + std::string(kind) + nowText() +
+              ";");
+    file.line("______________________________");
+    file.line(" ");
+}
+
+void ViewWriter::WriteFooterAndCloseFile(OutputFile& file) {
+    file.line(" ........END OF LOG FOR " + nowText());
+    file.line("___________________________________________");
+    file.line(" ");
+    finish(file);
+}
+
+}  // namespace zel

@@ -1,0 +1,122 @@
+#pragma once
+// A session with a folder of its own for files, and traces to put into them.
+
+#include <unistd.h>
+
+#include <filesystem>
+#include <fstream>
+#include <sstream>
+#include <string>
+#include <vector>
+
+#include "tests/Session.h"
+#include "trace/TraceConversion.h"
+
+namespace zel {
+
+using Texts = std::vector<std::string>;
+
+class Folder {
+  public:
+    Folder() {
+        std::string pattern = (std::filesystem::temp_directory_path() / "views-XXXXXX").string();
+        path_ = ::mkdtemp(pattern.data());
+    }
+    ~Folder() {
+        std::error_code ignored;
+        std::filesystem::remove_all(path_, ignored);
+    }
+    Folder(const Folder&) = delete;
+    Folder& operator=(const Folder&) = delete;
+
+    std::string file(const std::string& name) const { return (path_ / name).string(); }
+    std::string read(const std::string& name) const {
+        std::ifstream in(file(name), std::ios::binary);
+        std::ostringstream text;
+        text << in.rdbuf();
+        return text.str();
+    }
+    std::string write(const std::string& name, const std::string& text) const {
+        std::ofstream(file(name), std::ios::binary) << text;
+        return file(name);
+    }
+    bool has(const std::string& name) const { return std::filesystem::exists(file(name)); }
+
+  private:
+    std::filesystem::path path_;
+};
+
+/// Without their CR LF; a last line that is not ended counts.
+inline Texts linesOf(const std::string& text) {
+    Texts lines;
+    std::size_t start = 0;
+    for (std::size_t end; (end = text.find("\r\n", start)) != std::string::npos; start = end + 2)
+        lines.push_back(text.substr(start, end - start));
+    if (start < text.size()) lines.push_back(text.substr(start));
+    return lines;
+}
+
+struct FileSession : Session {
+    explicit FileSession(const std::string& commandLine = "") : Session(commandLine) {
+        program.start();
+        mirror.ResolutionBandwidth = 7;
+        mirror.VideoBandwidth = 9;
+    }
+
+    /// A trace of these raw samples is on the graph, as behind a read cycle.
+    void sweepOf(const std::vector<double>& samples) {
+        const bool pairs = mirror.TraceDetector == 0;
+        (pairs ? panel.PeakTraceData : panel.TraceData) = samples;
+        TraceConversion conversion(panel, mirror, forms.waterfall.Graph3D);
+        conversion.SelectRawScale();
+        conversion.ConvertTrace();
+        panel.TraceIntervals = 300;
+        panel.ViewSpan = mirror.Span;
+        panel.ViewStart = mirror.Span == 0 ? 0 : mirror.CenterFrequency - mirror.Span / 2;
+        panel.ViewStop =
+            mirror.Span == 0 ? mirror.SweepTime : mirror.CenterFrequency + mirror.Span / 2;
+    }
+    const std::vector<double>& drawn() const {
+        return mirror.TraceDetector == 0 ? panel.PeakTraceData : panel.TraceData;
+    }
+    /// From 1.4995 GHz to 1.5005 GHz.
+    void narrowSpan() {
+        mirror.CenterFrequency = 1.5e9;
+        mirror.Span = 1e6;
+        mirror.SweepTime = 0.02;
+        mirror.ReferenceLevel = -20;
+    }
+    /// 301 samples (602 with auto peak) that fall from the first value by the step.
+    static std::vector<double> ramp(double first, double step, std::size_t count = 301) {
+        std::vector<double> samples(count);
+        for (std::size_t i = 0; i < count; ++i) samples[i] = first + static_cast<double>(i) * step;
+        return samples;
+    }
+    /// Saves through the menu entry.
+    std::string save(const std::string& name) {
+        platform.fileDialogs.answer(folder.file(name));
+        panel.SaveCurrentView.Click();
+        return folder.read(name);
+    }
+    Texts header(const std::string& name = "view.csv") {
+        Texts lines = linesOf(save(name));
+        Texts head;
+        for (const std::string& line : lines) {
+            if (line.empty()) break;
+            head.push_back(line);
+        }
+        return head;
+    }
+    /// The value of a header line; "-" when there is no such line.
+    std::string entry(const std::string& name) {
+        for (const std::string& line : header())
+            if (line.compare(0, name.size() + 1, name + ";") == 0)
+                return line.substr(name.size() + 1);
+        return "-";
+    }
+    void open(const std::string& name) { panel.OpenFile(folder.file(name)); }
+
+    Folder folder;
+};
+
+}  // namespace zel
