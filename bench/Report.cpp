@@ -10,6 +10,7 @@
 
 #include "bench/Conversion.h"
 #include "bench/Figures.h"
+#include "bench/Files.h"
 #include "bench/Redraw.h"
 #include "bench/SweepRate.h"
 #include "bench/Windows.h"
@@ -61,6 +62,10 @@ int main(int argc, char** argv) {
         {'d', "redraw", [] { return zelbench::graphRedraw(); }},
         {'e', "idle", [&] { return zelbench::idleShare(panel, simulator); }},
         {'f', "first paint", [&] { return zelbench::firstPaint(panel, empty); }},
+        {'j', "load", [] { return zelbench::loadRate(); }},
+        {'j', "load", [] { return zelbench::loadBesidePlainPass(); }},
+        {'k', "view", [] { return zelbench::viewWriting(); }},
+        {'l', "series", [] { return zelbench::seriesPlay(); }},
     };
     zelbench::Figures figures;
     bool allMet = true;

@@ -34,19 +34,26 @@ double fieldNumber(std::string_view field) {
     return ParseNumberInvariant(std::string(field));
 }
 
-double LoadedRows::ConvertLoadedValue(double value) const {
-    conversion_.ClipToReferenceLevel(value);
-    int code = 0;
+LoadedRows::Scale LoadedRows::scale() const {
     const double range = std::nearbyint(mirror_.ReferenceRange);
+    int code = 0;
     MapRangeCode(range >= 0 && range <= kMostRange ? static_cast<int>(range) : 0, true, code);
     if (code < RANGELIN || mirror_.ReferenceUnit >= UNITV) {
-        if (mirror_.ReferenceUnit == UNITV) value = VoltsToDbm(value);
-        if (mirror_.ReferenceUnit == UNITW) value = WattsToDbm(value);
-    } else if (range >= RANGELIN && range <= RANGEVSWR11) {
-        value = DbmToPercent(value, mirror_.ReferenceLevel);
+        if (mirror_.ReferenceUnit == UNITV) return Scale::Volts;
+        return mirror_.ReferenceUnit == UNITW ? Scale::Watts : Scale::AsTheyAre;
     }
+    return range >= RANGELIN && range <= RANGEVSWR11 ? Scale::Percent : Scale::AsTheyAre;
+}
+
+double LoadedRows::converted(double value, Scale scale) const {
+    conversion_.ClipToReferenceLevel(value);
+    if (scale == Scale::Volts) value = VoltsToDbm(value);
+    if (scale == Scale::Watts) value = WattsToDbm(value);
+    if (scale == Scale::Percent) value = DbmToPercent(value, mirror_.ReferenceLevel);
     return conversion_.ClipToBottom(value, false);
 }
+
+double LoadedRows::ConvertLoadedValue(double value) const { return converted(value, scale()); }
 
 int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startIndex,
                              int& nextIndex) {
@@ -57,6 +64,7 @@ int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startInd
     xs.assign(kRows, 0);
     values.assign(static_cast<std::size_t>(kRows * perRow), 0);
     raw.assign(values.size(), 0);
+    const Scale how = scale();
     const int last = lines.last();
     int rows = 0;
     int i = startIndex;
@@ -75,7 +83,7 @@ int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startInd
         for (int k = 0; k < perRow; ++k, ++i) {
             const auto slot = static_cast<std::size_t>(rows * perRow + k);
             raw[slot] = fieldNumber(lines[i]);
-            values[slot] = ConvertLoadedValue(raw[slot]);
+            values[slot] = converted(raw[slot], how);
         }
         ++rows;
     }

@@ -27,6 +27,11 @@ class LoadedRows {
     static constexpr int kRows = 301;
 
   private:
+    /// How the values of a trace become what the graph shows.
+    enum class Scale { AsTheyAre, Volts, Watts, Percent };
+    Scale scale() const;
+    double converted(double value, Scale scale) const;
+
     ControllerForm& panel_;
     const ZEL3Variables& mirror_;
     const TraceConversion& conversion_;

@@ -10,8 +10,8 @@ void MapRangeCode(int value, bool toCode, int& out) {
         out = static_cast<int>(decibelsPerDivision(value));
         return;
     }
-    for (int code = RANGE10DB; code <= RANGE1DB; ++code)
-        if (decibelsPerDivision(code) == value) out = code;
+    for (const CodeRow& row : codeTable(CodeTable::Range))
+        if (row.code <= RANGE1DB && row.number == value) out = row.code;
 }
 
 }  // namespace zel
