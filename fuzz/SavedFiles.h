@@ -1,0 +1,33 @@
+#pragma once
+// A reader of saved files with all that it stands on, and no instrument.
+
+#include <cstddef>
+#include <cstdint>
+#include <string>
+
+#include "files/FileOps.h"
+#include "files/ViewReader.h"
+#include "forms/Forms.h"
+#include "model/ZEL3Variables.h"
+#include "platform/virtual/VirtualPlatform.h"
+#include "trace/GraphScaling.h"
+#include "trace/TraceConversion.h"
+
+namespace zel {
+
+struct SavedFiles {
+    VirtualPlatform platform;
+    Forms forms;
+    ZEL3Variables mirror;
+    FileOps files{forms.controller, platform.fileDialogs, platform.folder, platform.clock};
+    GraphScaling scaling{forms.controller, forms.waterfall, mirror, platform.clock};
+    TraceConversion conversion{forms.controller, mirror, forms.waterfall.Graph3D};
+    ViewReader reader{forms,      mirror,         files,           scaling,
+                      conversion, platform.clock, platform.events, platform.boxes};
+};
+
+inline std::string textOf(const std::uint8_t* data, std::size_t size) {
+    return {reinterpret_cast<const char*>(data), size};
+}
+
+}  // namespace zel
