@@ -30,6 +30,7 @@ std::string statusLine(int status) { return std::to_string(status) + kCr; }
 Wire::Wire(Device& device, const WireSetup& setup)
     : device_(device),
       baud_(setup.baud),
+      answering_(std::max(setup.answering, 0.0)),
       whole_(setup.wholeAnswers),
       faults_(setup.faults, device.seed()) {}
 
@@ -176,7 +177,7 @@ void Wire::send(std::string bytes, double delay) {
         return;
     }
     Segment segment;
-    segment.start = std::max(now() + delay, sending_);
+    segment.start = std::max(now() + answering_ + delay, sending_);
     segment.perByte = byteTime();
     sending_ = segment.start + static_cast<double>(bytes.size()) * segment.perByte;
     segment.bytes = std::move(bytes);

@@ -16,10 +16,11 @@
 namespace zelsim {
 
 struct WireSetup {
-    int baud = 0;  ///< 10 bits a byte in both directions; 0: no time on the line
+    int baud = 0;          ///< 10 bits a byte in both directions; 0: no time on the line
+    double answering = 0;  ///< s that the instrument takes for each answer
     /// An answer is handed out in one piece when its last byte is due (packets of a network).
     bool wholeAnswers = false;
-    std::vector<FaultRule> faults;
+    std::vector<FaultRule> faults = {};
 };
 
 /// All times are durations in seconds; nothing here looks at a clock.
@@ -71,6 +72,7 @@ class Wire {
 
     Device& device_;
     int baud_;
+    double answering_;
     int hostBaud_ = 0;
     bool whole_;
     FaultPlan faults_;

@@ -52,6 +52,7 @@ std::string boxLine(BoxIcon icon, const std::string& title, const std::string& t
 
 BoxAnswer ConsoleBoxes::show(const Box& box) {
     output_.repeatable(boxLine(box.icon, box.title, box.text));
+    if (box.icon == BoxIcon::Critical) ++failures_;
     if (box.buttons == BoxButtons::Ok) return BoxAnswer::Ok;
     const bool yesNo = box.buttons == BoxButtons::YesNo;
     const BoxAnswer agreed = yesNo ? BoxAnswer::Yes : BoxAnswer::Ok;

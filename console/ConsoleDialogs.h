@@ -33,6 +33,9 @@ class ConsoleBoxes : public MessageBoxes {
     /// Gets an answer that does not fit its question; the affirmative button is taken then.
     std::function<void(const std::string&)> misfit;
 
+    /// Boxes so far that told of a failure.
+    int failures() const { return failures_; }
+
     BoxAnswer show(const Box& box) override;
     std::optional<std::string> prompt(const std::string& text, const std::string& title,
                                       const std::string& preset) override;
@@ -40,6 +43,7 @@ class ConsoleBoxes : public MessageBoxes {
   private:
     LineOutput& output_;
     AnswerQueue& answers_;
+    int failures_ = 0;
 };
 
 /// Cancelled unless an answer waits; "cancel" cancels as well.

@@ -122,8 +122,22 @@ Done pressNamedKey(Control& control, std::string_view name) {
     return Done::Yes;
 }
 
+namespace {
+
+Done moveSlider(Slider& slider, std::optional<int> position) {
+    if (const Done refused = refusal(slider, true); refused != Done::Yes) return refused;
+    if (!position || *position < slider.Min || *position > slider.Max) return Done::NoEntry;
+    slider.Value = *position;
+    slider.Scrolled();
+    return Done::Yes;
+}
+
+}  // namespace
+
 Done chooseEntry(Control& control, std::string_view text) {
     const std::optional<int> index = wholeNumber(text);
+    if (control.kind() == ControlKind::Slider)
+        return moveSlider(static_cast<Slider&>(control), index);
     const bool dropDown = control.kind() == ControlKind::DropDownList;
     if (!dropDown && control.kind() != ControlKind::ListBox) return Done::Unfit;
     if (const Done refused = refusal(control, true); refused != Done::Yes) return refused;

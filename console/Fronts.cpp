@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QCoreApplication>
+#include <QLoggingCategory>
 
 #include "ZELSim/InProcessPort.h"
 #include "console/Address.h"
@@ -14,6 +15,8 @@
 
 namespace zel {
 namespace {
+
+constexpr double kAnswerSeconds = 0.0001;
 
 class SilentDebugChannel : public DebugChannel {
   public:
@@ -36,7 +39,8 @@ class SimulatorFront : public Front {
   private:
     VirtualClock clock_;
     VirtualEvents events_{clock_};
-    zelsim::InProcessPort port_{clock_, events_};
+    // Virtual time has to go on from one answer to the next also where no sweep is waited for.
+    zelsim::InProcessPort port_{clock_, events_, {}, {.answering = kAnswerSeconds}};
     FixedPortList ports_;
     ScriptedSocket tcpSocket_{events_};
     ScriptedSocket serverSocket_{events_};
@@ -75,7 +79,10 @@ ToolkitSession::ToolkitSession(int& argc, char** argv, bool windows)
     QCoreApplication::setApplicationName("ZELRemote");
     if (windows) {
         if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
+        // A start without a session of the desktop has warnings that mean nothing here.
+        QLoggingCategory::setFilterRules("default.warning=false");
         application_->object = std::make_unique<QApplication>(argc, argv);
+        QLoggingCategory::setFilterRules({});
     } else {
         application_->object = std::make_unique<QCoreApplication>(argc, argv);
     }
@@ -91,12 +98,17 @@ std::unique_ptr<Front> makePortFront(const std::string& home) {
     return std::make_unique<PortFront>(home);
 }
 
-std::string writeGraphImage(Program& program, const std::string& file) {
+std::string drawGraphImage(Program& program, const std::string& file) {
     const ControllerForm& panel = program.forms().controller;
     QString problem;
-    const bool written = saveGraphImage(panel.CWGraph1, annotateView(panel, program.variables()),
-                                        QString::fromStdString(file), &problem);
-    return written ? std::string() : "the image could not be written: " + problem.toStdString();
+    saveGraphImage(panel.CWGraph1, annotateView(panel, program.variables()),
+                   QString::fromStdString(file), &problem);
+    return problem.toStdString();
+}
+
+std::string writeGraphImage(Program& program, const std::string& file) {
+    const std::string problem = drawGraphImage(program, file);
+    return problem.empty() ? std::string() : "the image could not be written: " + problem;
 }
 
 }  // namespace zel

@@ -36,7 +36,9 @@ class Front {
 std::unique_ptr<Front> makeSimulatorFront(const std::string& home);
 std::unique_ptr<Front> makePortFront(const std::string& home);
 
-/// Draws the panel's graph; what went wrong, else an empty text.
+/// Draws the panel's graph; what went wrong, else an empty text. Needs a session with `windows`.
+std::string drawGraphImage(Program& program, const std::string& file);
+/// The same, in words that stand alone.
 std::string writeGraphImage(Program& program, const std::string& file);
 
 }  // namespace zel

@@ -1,6 +1,7 @@
 #include "console/GraphText.h"
 
 #include <algorithm>
+#include <functional>
 
 #include "support/NumberText.h"
 #include "support/Text.h"
@@ -49,21 +50,39 @@ std::vector<std::string> graphLines(const Graph& graph) {
 
 std::string sweepHeader(bool autoPeak) { return autoPeak ? "x,value1,value2" : "x,value"; }
 
-std::vector<std::string> sweepRows(const ControllerForm& panel, bool autoPeak) {
-    const Graph& graph = panel.CWGraph1;
-    const std::vector<double>& values = panel.RawTraceData;
+namespace {
+
+/// A row a point: the x of its first value, then its values.
+std::vector<std::string> rowsOf(const std::vector<double>& values, bool autoPeak,
+                                const std::function<double(std::size_t)>& xOfValue) {
     const std::size_t width = autoPeak ? 2 : 1;
     const std::size_t count = std::min(kPoints, values.size() / width);
     std::vector<std::string> rows;
     rows.reserve(count);
     for (std::size_t row = 0; row < count; ++row) {
         const std::size_t i = row * width;
-        std::string text =
-            shortestNumber(graph.firstX() + static_cast<double>(i) * graph.increment());
+        std::string text = shortestNumber(xOfValue(i));
         for (std::size_t k = 0; k < width; ++k) text += "," + shortestNumber(values[i + k]);
         rows.push_back(std::move(text));
     }
     return rows;
+}
+
+}  // namespace
+
+std::vector<std::string> sweepRows(const ControllerForm& panel, bool autoPeak) {
+    const Graph& graph = panel.CWGraph1;
+    return rowsOf(panel.RawTraceData, autoPeak, [&graph](std::size_t i) {
+        return graph.firstX() + static_cast<double>(i) * graph.increment();
+    });
+}
+
+std::vector<std::string> loadedRows(const ControllerForm& panel, bool autoPeak) {
+    const std::vector<double>& xs = panel.DataXAxisArrayToLoad;
+    return rowsOf(panel.DataValArrayToLoad, autoPeak, [&xs, autoPeak](std::size_t i) {
+        const std::size_t row = autoPeak ? i / 2 : i;
+        return row < xs.size() ? xs[row] : 0;
+    });
 }
 
 }  // namespace zel

@@ -19,5 +19,7 @@ std::string sweepHeader(bool autoPeak);
 /// graph, the values are `RawTraceData`, both in the shortest form that reads back exactly. Fewer
 /// rows where there are fewer values.
 std::vector<std::string> sweepRows(const ControllerForm& panel, bool autoPeak);
+/// The same of a loaded file, from the loaded arrays.
+std::vector<std::string> loadedRows(const ControllerForm& panel, bool autoPeak);
 
 }  // namespace zel

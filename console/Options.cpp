@@ -14,7 +14,9 @@ namespace zel {
 namespace {
 
 constexpr int kMostSweeps = 1000000;
-constexpr const char* kImageEndings[] = {".png", ".svg"};
+constexpr double kShortestInterval = 0.001;
+constexpr double kLongestInterval = 2'000'000;
+constexpr const char* kImageEndings[] = {".wmf", ".svg", ".png", ".pdf"};
 
 /// A keyword goes over the wire as a line of its own, so it may hold no line end.
 std::string keywordProblem(const std::string& keyword) {
@@ -35,7 +37,7 @@ std::string imageProblem(const std::string& file) {
         const bool longer = name.size() > ending.size();
         if (longer && name.substr(name.size() - ending.size()) == ending) return {};
     }
-    return "takes a file that ends in .png or .svg";
+    return "takes a file that ends in .wmf, .svg, .png or .pdf";
 }
 
 struct Parser {
@@ -75,12 +77,33 @@ struct Parser {
         CLI::App* sweep = verb(Verb::Sweep, "sweep", "Reads sweeps and prints them as x,value");
         sweep->add_option("--count", options.count, "How many sweeps")
             ->check(CLI::Range(1, kMostSweeps));
-        sweep->add_option("--image", options.image, "Draws the graph into a png or svg file")
-            ->type_name("FILE")
-            ->check(imageProblem, "");
+        outputOption(sweep, options, "Saves the view as the panel does");
+        imageOption(sweep, options);
+        CLI::App* record = verb(Verb::Record, "record", "Records traces by a timer");
+        record->add_option("--interval", options.interval, "Seconds from trace to trace")
+            ->required()
+            ->check(CLI::Range(kShortestInterval, kLongestInterval));
+        record->add_option("--count", options.count, "How many traces")
+            ->required()
+            ->check(CLI::Range(1, kMostSweeps));
+        outputOption(record, options, "File of the recording")->required();
+        CLI::App* show = verb(Verb::Show, "show", "Loads a saved view and prints its rows");
+        show->add_option("FILE", options.argument, "Saved view, recording or log")->required();
+        imageOption(show, options);
         CLI::App* panel =
             verb(Verb::Panel, "panel", "Works the panel by the names of its controls");
         panel->add_option("FILE", options.argument, "Lines of commands; standard input without it");
+    }
+
+    static CLI::Option* outputOption(CLI::App* verb, Options& options, const char* what) {
+        return verb->add_option("--output", options.output, what)->type_name("FILE");
+    }
+
+    static void imageOption(CLI::App* verb, Options& options) {
+        verb->add_option("--image", options.image,
+                         "Draws the graph into a file: wmf, svg, png or pdf by its ending")
+            ->type_name("FILE")
+            ->check(imageProblem, "");
     }
 
     CLI::App* verb(Verb which, const std::string& name, const std::string& what) {
@@ -91,7 +114,7 @@ struct Parser {
 };
 
 std::string missing(const Options& options) {
-    if (options.verb == Verb::Panel) return {};
+    if (options.verb == Verb::Panel || options.verb == Verb::Show) return {};
     if (!options.address) return "this verb needs an instrument: --connect URL";
     if (upperCase(options.words).find("SERVER") != std::string::npos)
         return "the word SERVER goes with the verb panel only";

@@ -9,7 +9,7 @@
 
 namespace zel {
 
-enum class Verb { Info, Get, Set, Cmd, Sweep, Panel };
+enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Panel };
 
 struct Options {
     std::optional<ConnectAddress> address;
@@ -17,8 +17,10 @@ struct Options {
     std::string words;  ///< the program's command line
     bool verbose = false;
     Verb verb = Verb::Info;
-    std::string argument;  ///< keyword of get, set, cmd; file of panel
-    int count = 1;         ///< sweeps
+    std::string argument;  ///< keyword of get, set, cmd; file of show and panel
+    int count = 1;         ///< sweeps, traces
+    double interval = 0;   ///< of a recording, s
+    std::string output;    ///< file of the saved view or the recording; empty for none
     std::string image;     ///< file of the graph's picture; empty for none
 };
 

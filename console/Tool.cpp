@@ -24,6 +24,10 @@ struct Stage {
           events(front.events()),
           program(front.platform(events, boxes, dialogs), options.words),
           watch(program.forms().controller) {
+        program.forms().controller.DrawImage.connect(
+            [this](const std::string& file, std::string& problem) {
+                problem = drawGraphImage(program, file);
+            });
         watch.onExchange = [&boxOutput] { boxOutput.settle(); };
         if (!options.verbose) return;
         const Clock& clock = front.clock();
@@ -40,6 +44,15 @@ struct Stage {
     Program program;
     DebugWatch watch;
 };
+
+/// "[#####-----] 12 of 24", over what stood there.
+void drawBar(std::ostream& stream, int done, int wanted) {
+    constexpr int kWidth = 40;
+    const int filled = static_cast<int>(static_cast<long long>(kWidth) * done / wanted);
+    stream << "\r[" << std::string(static_cast<std::size_t>(filled), '#')
+           << std::string(static_cast<std::size_t>(kWidth - filled), '-') << "] " << done << " of "
+           << wanted << (done == wanted ? "\n" : "") << std::flush;
+}
 
 int runPanel(const Options& options, Front& front, LineOutput& output, LineOutput& errors) {
     std::ifstream file;
@@ -76,7 +89,11 @@ int runTool(const Options& options, Front& front, std::ostream& out, std::ostrea
     LineOutput errors(errorStream);
     if (options.verb == Verb::Panel) return runPanel(options, front, output, errors);
     Stage stage(options, front, errors, errors);
-    return runVerb(options, stage.program, output, errors, writeGraphImage);
+    ProgressBar progress;
+    if (isatty(STDERR_FILENO) != 0)
+        progress = [&errorStream](int done, int wanted) { drawBar(errorStream, done, wanted); };
+    return runVerb(options, {stage.program, stage.events, stage.answers, stage.boxes, output,
+                             errors, writeGraphImage, progress});
 }
 
 }  // namespace zel

@@ -14,20 +14,26 @@ namespace {
 
 struct Run {
     const Options& options;
-    Program& program;
-    LineOutput& output;
-    LineOutput& errors;
-    const ImageWriter& image;
+    const VerbStage& stage;
 
+    Program& program() const { return stage.program; }
+    LineOutput& output() const { return stage.output; }
+    ControllerForm& panel() const { return stage.program.forms().controller; }
     int fail(const std::string& what) const {
-        errors.line("zelctl: " + what);
+        stage.errors.line("zelctl: " + what);
         return kLinkFailed;
+    }
+    /// Draws the picture that was asked for, if one was.
+    int drawImage() const {
+        if (options.image.empty()) return kDone;
+        const std::string problem = stage.image(program(), options.image);
+        return problem.empty() ? kDone : fail(problem);
     }
 };
 
 int info(const Run& run) {
-    Forms& forms = run.program.forms();
-    const ZEL3Variables& mirror = run.program.variables();
+    Forms& forms = run.program().forms();
+    const ZEL3Variables& mirror = run.program().variables();
     const bool tcp = run.options.address->link.kind == LinkAddress::Kind::Tcp;
     const std::pair<const char*, std::string> lines[] = {
         {"Identity", tcp ? forms.tcpConnection.IDTextBox.Text : forms.main.IDText.Text},
@@ -42,41 +48,82 @@ int info(const Run& run) {
         {"SweepTime", generalNumber(mirror.SweepTime)},
         {"Detector", std::to_string(mirror.TraceDetector)},
     };
-    for (const auto& [name, value] : lines) run.output.line(std::string(name) + ": " + value);
+    for (const auto& [name, value] : lines) run.output().line(std::string(name) + ": " + value);
     return kDone;
 }
 
 int get(const Run& run) {
     std::string value;
-    if (!run.program.exchange().GetInstrument(run.options.argument, value))
+    if (!run.program().exchange().GetInstrument(run.options.argument, value))
         return run.fail("no answer to GET " + run.options.argument);
-    run.output.line(value);
+    run.output().line(value);
     return kDone;
 }
 
 int set(const Run& run) {
-    if (run.program.exchange().SetInstrument(run.options.argument)) return kDone;
+    if (run.program().exchange().SetInstrument(run.options.argument)) return kDone;
     return run.fail("the instrument did not take " + run.options.argument);
 }
 
 int cmd(const Run& run) {
-    if (run.program.exchange().CmdInstrument(run.options.argument)) return kDone;
+    if (run.program().exchange().CmdInstrument(run.options.argument)) return kDone;
     return run.fail("the instrument did not carry out " + run.options.argument);
 }
 
 int sweep(const Run& run) {
-    const ControllerForm& panel = run.program.forms().controller;
+    const ControllerForm& panel = run.panel();
     for (int i = 0; i < run.options.count; ++i) {
         bool success = false;
-        run.program.traces().ReadSingleTrace(success);
+        run.program().traces().ReadSingleTrace(success);
         if (!success) return run.fail("sweep " + std::to_string(i + 1) + " could not be read");
-        const bool autoPeak = run.program.variables().TraceDetector == 0;
-        run.output.line(i == 0 ? sweepHeader(autoPeak) : std::string());
-        run.output.lines(sweepRows(panel, autoPeak));
+        const bool autoPeak = run.program().variables().TraceDetector == 0;
+        run.output().line(i == 0 ? sweepHeader(autoPeak) : std::string());
+        run.output().lines(sweepRows(panel, autoPeak));
     }
-    if (run.options.image.empty()) return kDone;
-    const std::string problem = run.image(run.program, run.options.image);
-    return problem.empty() ? kDone : run.fail(problem);
+    if (!run.options.output.empty()) {
+        run.stage.answers.add(run.options.output);
+        run.panel().SaveCurrentView.Click();
+        if (run.stage.boxes.failures() > 0) return kLinkFailed;
+    }
+    return run.drawImage();
+}
+
+int record(const Run& run) {
+    constexpr int kWaitMs = 100;
+    ControllerForm& panel = run.panel();
+    TimeForm& dialog = run.program().forms().time;
+    panel.RecordData.Click();
+    dialog.TimeIntervalBox.Text = generalNumber(run.options.interval);
+    run.stage.answers.add(run.options.output);
+    dialog.SubmitTimeButton.Click();
+    const auto taken = [&dialog] { return static_cast<int>(dialog.RecordedCount); };
+    int shown = 0;
+    while (panel.RecordData.Checked && taken() < run.options.count &&
+           !run.program().exchange().ExchangeFailed()) {
+        run.stage.events.wait(kWaitMs);
+        if (!panel.RecordData.Checked || taken() == shown) continue;
+        shown = taken();
+        if (run.stage.progress) run.stage.progress(shown, run.options.count);
+    }
+    const bool whole = panel.RecordData.Checked && taken() >= run.options.count;
+    if (panel.RecordData.Checked) panel.StopButton.Click();
+    if (whole) return kDone;
+    return run.fail("the recording ended behind " + std::to_string(shown) + " traces");
+}
+
+int show(const Run& run) {
+    ControllerForm& panel = run.panel();
+    const ZEL3Variables& mirror = run.program().variables();
+    int traces = 0;
+    panel.TraceLoaded.connect([&] {
+        const bool autoPeak = mirror.TraceDetector == 0;
+        run.output().line(traces++ == 0 ? sweepHeader(autoPeak) : std::string());
+        run.output().lines(loadedRows(panel, autoPeak));
+    });
+    panel.OpenFile(run.options.argument);
+    if (run.stage.boxes.failures() > 0) return kLinkFailed;
+    if (traces == 0) return run.fail(run.options.argument + " holds no rows");
+    return run.drawImage();
 }
 
 using Routine = int (*)(const Run&);
@@ -85,24 +132,25 @@ struct VerbRow {
     Routine routine;
 };
 constexpr VerbRow kVerbs[] = {
-    {Verb::Info, info}, {Verb::Get, get}, {Verb::Set, set}, {Verb::Cmd, cmd}, {Verb::Sweep, sweep},
+    {Verb::Info, info},   {Verb::Get, get},       {Verb::Set, set},   {Verb::Cmd, cmd},
+    {Verb::Sweep, sweep}, {Verb::Record, record}, {Verb::Show, show},
 };
 
 }  // namespace
 
-int runVerb(const Options& options, Program& program, LineOutput& output, LineOutput& errors,
-            const ImageWriter& image) {
-    const Run run{options, program, output, errors, image};
-    program.start();
-    if (!program.connect(options.address->link, false)) {
-        errors.settle();
+int runVerb(const Options& options, const VerbStage& stage) {
+    const Run run{options, stage};
+    const bool needsInstrument = options.verb != Verb::Show;
+    stage.program.start();
+    if (needsInstrument && !stage.program.connect(options.address->link, false)) {
+        stage.errors.settle();
         return run.fail("no instrument was connected");
     }
     int status = kWrongUse;
     for (const VerbRow& row : kVerbs)
         if (row.verb == options.verb) status = row.routine(run);
-    program.disconnect();
-    errors.settle();
+    if (needsInstrument) stage.program.disconnect();
+    stage.errors.settle();
     return status;
 }
 

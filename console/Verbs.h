@@ -1,11 +1,13 @@
 #pragma once
-// The verbs that ask an instrument something and end: info, get, set, cmd, sweep.
+// The verbs that do one thing and end: info, get, set, cmd, sweep, record, show.
 
 #include <functional>
 #include <string>
 
+#include "console/ConsoleDialogs.h"
 #include "console/LineOutput.h"
 #include "console/Options.h"
+#include "platform/Events.h"
 #include "shell/Program.h"
 
 namespace zel {
@@ -13,9 +15,23 @@ namespace zel {
 /// Draws the panel's graph into a file; what went wrong, else an empty text.
 using ImageWriter = std::function<std::string(Program&, const std::string& file)>;
 
-/// Starts the program, connects, does the verb of the options, disconnects. The exit status;
-/// boxes have told of failures of the link, what the verb misses is told on `errors`.
-int runVerb(const Options& options, Program& program, LineOutput& output, LineOutput& errors,
-            const ImageWriter& image);
+/// Shows how far a recording has come: traces taken, traces wanted.
+using ProgressBar = std::function<void(int done, int wanted)>;
+
+struct VerbStage {
+    Program& program;
+    Events& events;
+    AnswerQueue& answers;       ///< of the file dialogs
+    const ConsoleBoxes& boxes;  ///< told what went wrong with a file
+    LineOutput& output;
+    LineOutput& errors;
+    ImageWriter image;
+    ProgressBar progress;  ///< may be empty
+};
+
+/// Starts the program, connects, does the verb of the options, disconnects; `show` needs no
+/// instrument. The exit status; boxes have told of failures of the link, what the verb misses is
+/// told on `errors`.
+int runVerb(const Options& options, const VerbStage& stage);
 
 }  // namespace zel

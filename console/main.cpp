@@ -13,7 +13,9 @@ int main(int argc, char** argv) {
     if (const auto status = zel::parseOptions(argc, argv, options, std::cout, std::cerr))
         return *status;
     try {
-        const zel::ToolkitSession toolkit(argc, argv, !options.image.empty());
+        // In a session each menu can be used, that of the picture too.
+        const bool pictures = !options.image.empty() || options.verb == zel::Verb::Panel;
+        const zel::ToolkitSession toolkit(argc, argv, pictures);
         const bool simulated = options.address && options.address->simulated;
         const auto front =
             simulated ? zel::makeSimulatorFront(options.home) : zel::makePortFront(options.home);

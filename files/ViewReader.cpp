@@ -73,8 +73,7 @@ ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, Grap
         files_.note(path);
         loadFile(path);
     });
-    // Only a series has a pace.
-    forms_.specialMeas.sldSpeed.Visible = false;
+    panel_.PlaybackFrame.Visible = false;
 }
 
 void ViewReader::LoadData_Click() {
@@ -209,7 +208,7 @@ void ViewReader::LoadTheData(const std::string& text, const std::string& fileTim
     const bool series = rowNumber == 0 && lines.last() > kLargestSingle;
     showTraces(lines, header, series);
 
-    forms_.specialMeas.sldSpeed.Visible = false;
+    panel_.PlaybackFrame.Visible = false;
     panel_.STOPFlag = false;
     panel_.Connection.Enabled = true;
     panel_.Utility.Enabled = true;
@@ -236,7 +235,7 @@ void ViewReader::showTraces(const FieldList& lines, const Header& header, bool s
         panel_.TraceLoaded();
         start = mark < 0 ? -1 : mark + kRowsBehindMark;
         if (start < 0 && shown == 1) break;
-        forms_.specialMeas.sldSpeed.Visible = true;
+        panel_.PlaybackFrame.Visible = true;
         panel_.FileLabel.Caption =
             "Trace " + std::to_string(shown) + " of " + name_ + ", " +
             rangeNumber(start < 0 ? 1 : static_cast<double>(start) / lines.count());

@@ -177,6 +177,7 @@ class ControllerForm : public Form {
     Label MarkerLabel{*this, "MarkerLabel"};
     Label DeltaLabel{*this, "DeltaLabel"};
     Label PaceLabel{*this, "PaceLabel"};  ///< age of the trace, sweeps a second
+    Frame PlaybackFrame{*this, "PlaybackFrame"};  ///< shown while a series of traces is played
     Label FileLabel{*this, "FileLabel"};  ///< progress of a recording or of a file that loads
     TextBox DebugTextBox{*this, "DebugTextBox"};
 

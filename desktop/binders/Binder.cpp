@@ -1,11 +1,13 @@
 #include "desktop/binders/Binder.h"
 
-#include <QKeyEvent>
 #include <QMenu>
 #include <QSignalBlocker>
 #include <QStyle>
 #include <QVariant>
+#include <algorithm>
 
+#include "desktop/binders/EventGuards.h"
+#include "desktop/binders/ShortcutTable.h"
 #include "desktop/binders/ToolTips.h"
 
 namespace zel {
@@ -26,24 +28,6 @@ QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
 QString caption(const std::string& utf8) {
     return text(utf8).replace("\r\n", "\n").replace("&", "&&");
 }
-
-/// Tells a button of each key that it gets, F1 among them.
-class KeyTeller : public QObject {
-  public:
-    KeyTeller(Button& control, QObject* parent) : QObject(parent), control_(control) {}
-
-    bool eventFilter(QObject* watched, QEvent* event) override {
-        if (event->type() == QEvent::KeyPress) {
-            const auto& key = *static_cast<QKeyEvent*>(event);
-            if (const int code = keyCodeOf(key); code != 0)
-                control_.KeyDown(code, key.modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);
-        }
-        return QObject::eventFilter(watched, event);
-    }
-
-  private:
-    Button& control_;
-};
 
 /// Keys without a handler belong to rooms that are not built yet.
 template <class T>
@@ -121,10 +105,12 @@ void Binder::follow(Control& control, QObject* widget, std::function<void()> sho
 
 void Binder::describe(const Control& control, QWidget* widget) {
     const std::string& own = control.ToolTip;
-    const QString tip = own.empty() ? toolTipOf(control) : text(own);
+    const QString words = own.empty() ? toolTipOf(control) : text(own);
+    const QString keys = shortcutOf(control);
+    const QString tip = keys.isEmpty() ? words : words + " (" + keys + ")";
     if (widget->toolTip() == tip && !widget->accessibleName().isEmpty()) return;
     widget->setToolTip(tip);
-    widget->setAccessibleName(tip.isEmpty() ? text(control.name()) : tip);
+    widget->setAccessibleName(words.isEmpty() ? text(control.name()) : words);
 }
 
 void Binder::bind(Button& control, QPushButton* widget) {
@@ -138,6 +124,7 @@ void Binder::bind(Button& control, QPushButton* widget) {
         widget->setVisible(control.Visible);
         QString face = faceOf(control.BackColor);
         const std::string& picture = control.Picture;
+        widget->setProperty("picture", text(picture));
         if (face == "plain" && picture.size() > 2)
             face = picture.compare(picture.size() - 2, 2, "_b") == 0 ? "blue" : "yellow";
         setFace(widget, face);
@@ -146,10 +133,11 @@ void Binder::bind(Button& control, QPushButton* widget) {
 
 void Binder::bind(TextBox& control, PanelLineEdit* widget) {
     widget->setControl(&control, [this, &control] { return refused(control); });
-    connect(widget, &QLineEdit::textEdited, this, [this, &control](const QString& typed) {
-        // A paste does not come by the keys.
+    connect(widget, &QLineEdit::textEdited, this, [this, &control, widget](const QString& typed) {
         if (refused(control)) return markDirty(&control);
         control.Text = typed.toStdString();
+        // A paste does not come by the keys; it edits the text, which then is to stay.
+        if (!widget->typing()) control.KeyDown(kKeyRight, 0);
     });
     follow(control, widget, [&control, widget] {
         const QString shown = text(control.Text);
@@ -212,6 +200,7 @@ void Binder::bind(OptionButton& control, QRadioButton* widget) {
 
 void Binder::bind(DropDownList& control, QComboBox* widget) {
     widget->setEditable(control.editable());
+    widget->installEventFilter(new ListGuard(control, widget));
     widget->setInsertPolicy(QComboBox::NoInsert);
     connect(widget, &QComboBox::activated, this, [this, &control](int index) {
         if (!refused(control) && !control.Locked) control.pick(index);
@@ -236,7 +225,23 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
         widget->setCurrentIndex(control.ListIndex());
         if (control.editable() && widget->currentText() != text(control.Text()))
             widget->setEditText(text(control.Text()));
-        widget->setEnabled(control.Enabled && !control.Locked);
+        widget->setEnabled(control.Enabled);
+        widget->setVisible(control.Visible);
+        setFace(widget, control.Locked ? "locked" : "entry");
+    });
+}
+
+void Binder::bind(Slider& control, QSlider* widget) {
+    connect(widget, &QSlider::valueChanged, this, [this, &control](int value) {
+        if (refused(control)) return markDirty(&control);
+        control.Value = value;
+        control.Scrolled();
+    });
+    follow(control, widget, [&control, widget] {
+        const QSignalBlocker quiet(widget);
+        widget->setRange(control.Min, control.Max);
+        widget->setValue(control.Value);
+        widget->setEnabled(control.Enabled);
         widget->setVisible(control.Visible);
     });
 }
@@ -256,8 +261,17 @@ void Binder::bind(MenuItem& control, QAction* action) {
         if (!refused(control)) control.Click();
         markDirty(&control);
     });
-    follow(control, action, [&control, action] {
-        action->setText(caption(control.Caption));
+    const QString keys = shortcutOf(control);
+    // A menu of the menu bar opens by its letter, an entry has keys of its own.
+    const bool opens = control.parent() == nullptr;
+    if (!opens) action->setShortcut(QKeySequence(keys));
+    follow(control, action, [&control, action, keys, opens] {
+        QString words = caption(control.Caption);
+        if (opens && !keys.isEmpty())
+            words.insert(std::max<qsizetype>(words.indexOf(keys.back(), 0, Qt::CaseInsensitive), 0),
+                         '&');
+        action->setText(words);
+        action->setToolTip(text(control.ToolTip));
         action->setVisible(control.Visible);
         action->setEnabled(control.Enabled && (action->menu() != nullptr || hasHandler(control)));
         action->setCheckable(control.Checked);

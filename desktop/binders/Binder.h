@@ -13,6 +13,7 @@
 #include <QPointer>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QSlider>
 #include <QTimer>
 #include <functional>
 #include <unordered_map>
@@ -36,6 +37,7 @@ class Binder : public QObject {
     void bind(CheckBox& control, QCheckBox* widget);
     void bind(OptionButton& control, QRadioButton* widget);
     void bind(DropDownList& control, QComboBox* widget);
+    void bind(Slider& control, QSlider* widget);
     void bind(Frame& control, QWidget* widget, QLabel* caption);
     void bind(MenuItem& control, QAction* action);
     /// For controls that need a drawing of their own: `show` runs with the next frame after a
@@ -74,14 +76,19 @@ class Binder : public QObject {
 /// A line of text that tells its text box of each key ahead of the insertion.
 class PanelLineEdit : public QLineEdit {
   public:
-    explicit PanelLineEdit(QWidget* parent = nullptr) : QLineEdit(parent) {}
+    explicit PanelLineEdit(QWidget* parent = nullptr);
     void setControl(TextBox* control, std::function<bool()> refused);
+    /// A key is on its way into the text, and its control knows of it.
+    bool typing() const { return typing_; }
 
   protected:
     void keyPressEvent(QKeyEvent* event) override;
 
   private:
+    void insertKey(QKeyEvent* event);
+
     TextBox* control_ = nullptr;
+    bool typing_ = false;
     std::function<bool()> refused_;
 };
 

@@ -15,6 +15,11 @@ int characterOf(const QKeyEvent& event, int code) {
 
 }  // namespace
 
+PanelLineEdit::PanelLineEdit(QWidget* parent) : QLineEdit(parent) {
+    // What is dropped would pass the keys by; a file is for the window.
+    setAcceptDrops(false);
+}
+
 void PanelLineEdit::setControl(TextBox* control, std::function<bool()> refused) {
     control_ = control;
     refused_ = std::move(refused);
@@ -23,6 +28,15 @@ void PanelLineEdit::setControl(TextBox* control, std::function<bool()> refused) 
 void PanelLineEdit::keyPressEvent(QKeyEvent* event) {
     if (control_ == nullptr || isReadOnly()) return QLineEdit::keyPressEvent(event);
     if (refused_ && refused_()) return;
+    if (event->matches(QKeySequence::Paste) || event->matches(QKeySequence::Cut) ||
+        event->matches(QKeySequence::Undo) || event->matches(QKeySequence::Redo))
+        return QLineEdit::keyPressEvent(event);
+    typing_ = true;
+    insertKey(event);
+    typing_ = false;
+}
+
+void PanelLineEdit::insertKey(QKeyEvent* event) {
     const int code = keyCodeOf(*event);
     control_->KeyDown(code, event->modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);
     int character = characterOf(*event, code);

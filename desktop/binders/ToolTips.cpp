@@ -10,9 +10,9 @@ struct Tip {
     const char* text;
 };
 const Tip kTips[] = {
-    {"PlaySingleButton", "Read one sweep (F9)"},
-    {"PlayContinuousButton", "Read sweep after sweep (F10)"},
-    {"StopButton", "Stop the continuous view or the recording (Esc)"},
+    {"PlaySingleButton", "Read one sweep"},
+    {"PlayContinuousButton", "Read sweep after sweep"},
+    {"StopButton", "Stop the continuous view or the recording"},
     {"cmdZoom", "Draw a rectangle to look closer; press again for the whole span"},
     {"cmd3D", "Waterfall"},
     {"cmdSpecial", "Scripts of measurements"},
@@ -74,6 +74,9 @@ const Tip kTips[] = {
     {"IDTextBox", "State of the connection"},
     {"localPortTextBox", "TCP port on which the server listens"},
     {"txtDebug", "State of the server"},
+    {"FileLabel", "Progress of the recording or of the file that loads"},
+    {"sldSpeed", "Set the speed for loading traces."},
+    {"TimeIntervalBox", "Seconds from one trace to the next"},
     {"CWGraph1", "The sweep. With a marker on, drag it or move it with the arrow keys"},
 };
 
@@ -85,7 +88,7 @@ QString toolTipOf(const Control& control) {
     const std::string base = control.name().substr(0, control.name().find('('));
     for (const Tip& tip : kTips)
         if (base == tip.name) return QString::fromUtf8(tip.text);
-    if (base == "SoftKey") return QString("Soft key (F%1)").arg(control.name()[8] - '0' + 2);
+    if (base == "SoftKey") return "Soft key";
     if (base == "SoftTextBox") return "Value: type a number with its prefix, then Enter";
     if (base == "ChoiceBox") return "Choice";
     return {};

@@ -1,16 +1,22 @@
 #include "desktop/graph/GraphImage.h"
 
+#include <QApplication>
 #include <QBuffer>
 #include <QFileInfo>
+#include <QPageSize>
+#include <QPdfWriter>
 #include <QSaveFile>
 #include <QSvgGenerator>
 
 #include "desktop/graph/GraphPlot.h"
+#include "desktop/graph/MetafileEngine.h"
 
 namespace zel {
 namespace {
 
 constexpr double kOversampling = 2;
+constexpr double kPointsPerInch = 72;
+constexpr const char* kTitle = "ZELRemote";
 
 QByteArray pngOf(QCustomPlot& plot, QSize size) {
     QByteArray bytes;
@@ -20,76 +26,114 @@ QByteArray pngOf(QCustomPlot& plot, QSize size) {
     return bytes;
 }
 
+bool draw(QCustomPlot& plot, QSize size, QPaintDevice& device) {
+    QCPPainter painter;
+    if (!painter.begin(&device)) return false;
+    painter.setMode(QCPPainter::pmVectorized);
+    plot.toPainter(&painter, size.width(), size.height());
+    return painter.end();
+}
+
 QByteArray svgOf(QCustomPlot& plot, QSize size) {
     QByteArray bytes;
     QBuffer buffer(&bytes);
     buffer.open(QIODevice::WriteOnly);
     QSvgGenerator generator;
     generator.setOutputDevice(&buffer);
+    generator.setResolution(plot.logicalDpiX());
     generator.setSize(size);
     generator.setViewBox(QRect(QPoint(), size));
-    generator.setTitle("ZELRemote");
-    QCPPainter painter;
-    if (painter.begin(&generator)) {
-        painter.setMode(QCPPainter::pmVectorized);
-        plot.toPainter(&painter, size.width(), size.height());
-        painter.end();
+    generator.setTitle(kTitle);
+    return draw(plot, size, generator) ? bytes : QByteArray();
+}
+
+QByteArray pdfOf(QCustomPlot& plot, QSize size) {
+    QByteArray bytes;
+    QBuffer buffer(&bytes);
+    buffer.open(QIODevice::WriteOnly);
+    {
+        QPdfWriter writer(&buffer);
+        writer.setResolution(plot.logicalDpiX());
+        const QSizeF points = QSizeF(size) * kPointsPerInch / plot.logicalDpiX();
+        writer.setPageSize(QPageSize(points, QPageSize::Point, kTitle, QPageSize::ExactMatch));
+        writer.setPageMargins({});
+        writer.setTitle(kTitle);
+        writer.setCreator(kTitle);
+        if (!draw(plot, size, writer)) return {};
     }
     return bytes;
 }
 
-/// What a zoomed view shows: the clip of the plot area is lost in an SVG file, so the trace ends
-/// at the edge by itself.
-void clipToView(Graph& graph, const Graph& original) {
-    std::vector<double> values = original.values();
-    const GraphAxis& y = original.yAxis();
-    const GraphAxis& x = original.xAxis();
-    std::size_t first = values.size();
-    std::size_t last = 0;
-    for (std::size_t i = 0; i < values.size(); ++i) {
-        values[i] = std::min(std::max(values[i], y.Minimum), y.Maximum);
-        const double at = original.firstX() + static_cast<double>(i) * original.increment();
-        if (at < x.Minimum || at > x.Maximum) continue;
-        first = std::min(first, i);
-        last = std::max(last, i);
-    }
-    if (first > last) return graph.plotY({}, 0, 0);
-    const auto begin = values.begin();
-    graph.plotY(
-        {begin + static_cast<std::ptrdiff_t>(first), begin + static_cast<std::ptrdiff_t>(last) + 1},
-        original.firstX() + static_cast<double>(first) * original.increment(),
-        original.increment());
+QByteArray wmfOf(QCustomPlot& plot, QSize size) {
+    MetafileDevice device(size, plot.logicalDpiX());
+    return draw(plot, size, device) ? device.finish() : QByteArray();
+}
+
+struct Kind {
+    const char* ending;
+    QByteArray (*write)(QCustomPlot& plot, QSize size);
+    bool paper;      ///< has light colours always
+    double pen;      ///< width of the trace, pixels
+    bool keepsClip;  ///< what is drawn outside of a clip is not seen
+};
+constexpr Kind kKinds[] = {
+    {"wmf", wmfOf, true, 1, true},
+    {"svg", svgOf, false, 1, false},
+    {"png", pngOf, false, 1 / kOversampling, true},
+    {"pdf", pdfOf, true, 1, true},
+};
+
+const Kind* kindOf(const QString& path, QString& problem) {
+    const QString ending = QFileInfo(path).suffix().toLower();
+    for (const Kind& kind : kKinds)
+        if (ending == kind.ending) return &kind;
+    problem = ending.isEmpty() ? "A picture's name ends in its kind: wmf, svg, png or pdf"
+                               : "Unknown kind of picture: ." + ending + " (wmf, svg, png or pdf)";
+    return nullptr;
+}
+
+/// The graph as it stands, but for the mark of age: that is about the screen.
+void copyGraph(const Graph& graph, Graph& shown) {
+    shown.setXRange(graph.xAxis().Minimum, graph.xAxis().Maximum);
+    shown.setYRange(graph.yAxis().Minimum, graph.yAxis().Maximum);
+    shown.showYLabels(graph.yAxis().ShowLabels);
+    shown.setTrigger(graph.trigger());
+    for (int i = 1; i <= graph.cursorCount(); ++i) shown.addCursor(graph.cursor(i));
+    shown.plotY(graph.values(), graph.firstX(), graph.increment());
+}
+
+QString save(const Graph& graph, const ViewAnnotations& view, const QString& path, QSize size,
+             bool dark) {
+    QString problem;
+    const Kind* kind = kindOf(path, problem);
+    if (kind == nullptr) return problem;
+    if (qobject_cast<QApplication*>(QCoreApplication::instance()) == nullptr)
+        return "Pictures cannot be drawn here";
+    QCustomPlot plot;
+    GraphPlot picture(plot, dark && !kind->paper ? darkGraph() : lightGraph());
+    Form form("picture");
+    Graph shown(form, "graph");
+    copyGraph(graph, shown);
+    picture.setTraceWidth(kind->pen);
+    picture.update(shown, view);
+    if (!kind->keepsClip) picture.clipToView();
+    const QByteArray bytes = kind->write(plot, size);
+    if (bytes.isEmpty()) return "Cannot draw " + path;
+    QSaveFile file(path);
+    // The commit does not tell of bytes that only its own flush failed to write.
+    if (file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.flush() &&
+        file.commit())
+        return {};
+    return "Cannot write " + path + ": " + file.errorString();
 }
 
 }  // namespace
 
 bool saveGraphImage(const Graph& graph, const ViewAnnotations& view, const QString& path,
                     QString* error, QSize size, bool dark) {
-    const QString kind = QFileInfo(path).suffix().toLower();
-    const bool svg = kind == "svg";
-    if (!svg && kind != "png") {
-        if (error != nullptr) *error = "Unknown kind of picture: ." + kind + " (png or svg)";
-        return false;
-    }
-    QCustomPlot plot;
-    GraphPlot picture(plot, dark ? darkGraph() : lightGraph());
-    Form form("picture");
-    Graph shown(form, "graph");
-    shown.setXRange(graph.xAxis().Minimum, graph.xAxis().Maximum);
-    shown.setYRange(graph.yAxis().Minimum, graph.yAxis().Maximum);
-    shown.showYLabels(graph.yAxis().ShowLabels);
-    shown.setTrigger(graph.trigger());
-    for (int i = 1; i <= graph.cursorCount(); ++i) shown.addCursor(graph.cursor(i));
-    clipToView(shown, graph);
-    if (!svg) picture.setTraceWidth(1 / kOversampling);
-    picture.update(shown, view);
-    const QByteArray bytes = svg ? svgOf(plot, size) : pngOf(plot, size);
-    QSaveFile file(path);
-    if (!bytes.isEmpty() && file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() &&
-        file.commit())
-        return true;
-    if (error != nullptr) *error = "Cannot write " + path + ": " + file.errorString();
-    return false;
+    const QString problem = save(graph, view, path, size, dark);
+    if (error != nullptr) *error = problem;
+    return problem.isEmpty();
 }
 
 }  // namespace zel

@@ -9,9 +9,10 @@
 
 namespace zel {
 
-/// The file's ending chooses the kind: png, svg. False with a text in `error` when the kind is
-/// unknown or the file cannot be written; an older file of that name is then left as it was.
-/// Needs a QApplication.
+/// The file's ending chooses the kind, its case does not matter: wmf, svg, pdf (drawings) or png
+/// (twice `size` in dots). wmf and pdf are for paper and have light colours always. False with a
+/// text in `error` when the kind is unknown, or when the file cannot be written; an older file of
+/// that name is then left as it was. Needs a QApplication, and says so where there is none.
 bool saveGraphImage(const Graph& graph, const ViewAnnotations& view, const QString& path,
                     QString* error, QSize size = {1000, 620}, bool dark = true);
 

@@ -3,12 +3,15 @@
 #include <cmath>
 
 #include "desktop/graph/DivisionTicker.h"
+#include "desktop/graph/PolylineClip.h"
 
 namespace zel {
 namespace {
 
 constexpr double kCursorReach = 8;  // pixels
 constexpr int kFontPoints = 9;
+/// Half of the last label of the x axis stands in it: one that does not fit is not drawn at all.
+constexpr int kRightMargin = 42;
 
 QFont plotFont() {
     QFont font;
@@ -38,6 +41,7 @@ GraphColors lightGraph() {
     colors.text = QColor(0x10, 0x14, 0x18);
     colors.trace = QColor(0x0b, 0x4f, 0xa8);
     colors.trigger = QColor(0xb0, 0x20, 0x20);
+    colors.cursorDarkness = 170;
     return colors;
 }
 
@@ -52,19 +56,19 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     plot_.setNoAntialiasingOnDrag(true);
     axisRect_ = plot_.axisRect();
     axisRect_->setBackground(colors_.plotArea);
-    axisRect_->setMinimumMargins(QMargins(8, 4, 22, 4));
+    axisRect_->setMinimumMargins(QMargins(8, 4, kRightMargin, 4));
 
     QCPLayoutGrid* layout = plot_.plotLayout();
     layout->insertRow(0);
     auto* top = new QCPLayoutGrid;
     layout->addElement(0, 0, top);
-    top->setMargins(QMargins(10, 8, 22, 0));
+    top->setMargins(QMargins(10, 8, kRightMargin, 0));
     top->setRowSpacing(1);
     top_ = {addText(*top, 0, 0, Qt::AlignLeft), addText(*top, 0, 1, Qt::AlignRight),
             addText(*top, 1, 0, Qt::AlignLeft), addText(*top, 1, 1, Qt::AlignRight)};
     auto* bottom = new QCPLayoutGrid;
     layout->addElement(2, 0, bottom);
-    bottom->setMargins(QMargins(10, 0, 22, 6));
+    bottom->setMargins(QMargins(10, 0, kRightMargin, 6));
     bottom_ = {addText(*bottom, 0, 0, Qt::AlignLeft), addText(*bottom, 0, 1, Qt::AlignHCenter),
                addText(*bottom, 0, 2, Qt::AlignRight)};
     layout->setRowSpacing(2);
@@ -163,11 +167,11 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
         items.line->setVisible(cursor.Visible);
         items.point->setVisible(cursor.Visible);
         if (!cursor.Visible) continue;
-        const QPen pen(colorOf(cursor.color), 1);
-        items.line->setPen(pen);
+        const QColor color = colorOf(cursor.color).darker(colors_.cursorDarkness);
+        items.line->setPen(QPen(color, 1));
         items.line->point1->setCoords(cursor.X, 0);
         items.line->point2->setCoords(cursor.X, 1);
-        items.point->setPen(QPen(colorOf(cursor.color), 2));
+        items.point->setPen(QPen(color, 2));
         items.point->position->setCoords(cursor.X, cursor.Y);
     }
     old_->setVisible(graph.Old);
@@ -188,6 +192,30 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     bottom_[0]->setText(text(view.left));
     bottom_[1]->setText(text(view.center));
     bottom_[2]->setText(text(view.right));
+}
+
+void GraphPlot::clipToView() {
+    const QCPRange x = plot_.xAxis->range();
+    const QCPRange y = plot_.yAxis->range();
+    QPolygonF line;
+    for (const QCPGraphData& point : *trace_->data()) line.append({point.key, point.value});
+    QVector<double> keys;
+    QVector<double> values;
+    for (const QPolygonF& part : clipPolyline(line, {x.lower, y.lower, x.size(), y.size()})) {
+        for (const QPointF& point : part) {
+            keys << point.x();
+            values << point.y();
+        }
+        keys << part.back().x();
+        values << qQNaN();  // the pen is lifted
+    }
+    trace_->setData(keys, values, true);
+    drawn_ = false;
+    for (const CursorItems& cursor : cursors_) {
+        const QPointF at = cursor.point->position->coords();
+        if (!x.contains(at.x()) || !y.contains(at.y())) cursor.point->setVisible(false);
+    }
+    if (!y.contains(triggerText_->position->coords().y())) triggerText_->setVisible(false);
 }
 
 int GraphPlot::cursorAt(const QPointF& pixel) const {

@@ -18,6 +18,7 @@ struct GraphColors {
     QColor text{0xd8, 0xe0, 0xe8};
     QColor trace{0xff, 0xd8, 0x4d};
     QColor trigger{0xff, 0x6b, 0x6b};
+    int cursorDarkness = 100;  ///< percent: cursors are made for a dark ground
 };
 GraphColors darkGraph();
 GraphColors lightGraph();  ///< for paper
@@ -31,6 +32,9 @@ class GraphPlot {
     void update(const Graph& graph, const ViewAnnotations& view);
     /// In pixels of the plot. One pixel of the device is what Qt draws fast.
     void setTraceWidth(double width) { trace_->setPen(QPen(colors_.trace, width)); }
+    /// Ends the trace and all that goes with it at the edges of the graticule, for pictures whose
+    /// format has no clip. Holds until the next update.
+    void clipToView();
     QCPAxisRect& axisRect() { return *axisRect_; }
     /// The 1-based index of the cursor within reach of a pixel, or 0.
     int cursorAt(const QPointF& pixel) const;

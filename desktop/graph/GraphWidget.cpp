@@ -28,17 +28,24 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
 
 void GraphWidget::refresh() {
     picture_->update(graph_, annotate_());
-    if (zooming()) {
-        setCursor(Qt::CrossCursor);
-    } else {
-        unsetCursor();
-    }
+    showPointer(mapFromGlobal(QCursor::pos()));
     replot(QCustomPlot::rpQueuedReplot);
 }
 
 void GraphWidget::drawNow() {
     picture_->update(graph_, annotate_());
     replot(QCustomPlot::rpImmediateRefresh);
+}
+
+void GraphWidget::showPointer(const QPointF& pixel) {
+    const bool movable = graph_.TrackMode == static_cast<int>(TrackMode::DragCursors);
+    if (zooming()) {
+        setCursor(Qt::CrossCursor);
+    } else if (movable && (dragged_ > 0 || picture_->cursorAt(pixel) > 0)) {
+        setCursor(Qt::SplitHCursor);
+    } else {
+        unsetCursor();
+    }
 }
 
 bool GraphWidget::zooming() const {
@@ -69,6 +76,7 @@ void GraphWidget::mouseMoveEvent(QMouseEvent* event) {
         band_->setGeometry(QRect(bandStart_, clamped(pixel).toPoint()).normalized());
         return;
     }
+    showPointer(pixel);
     if (dragged_ > 0) return moveCursor(dragged_, xAxis->pixelToCoord(clamped(pixel).x()));
     if (picture_->axisRect().rect().contains(pixel.toPoint()) && !graph_.values().empty())
         graph_.PlotAreaTracking(xAxis->pixelToCoord(pixel.x()), yAxis->pixelToCoord(pixel.y()));

@@ -29,6 +29,8 @@ class GraphWidget : public QCustomPlot {
 
   private:
     bool zooming() const;
+    /// The pointer's shape: a cross while a rectangle is awaited, arrows over a cursor to drag.
+    void showPointer(const QPointF& pixel);
     void moveCursor(int index, double x);
     void finishZoom(const QRect& rectangle);
     QPointF clamped(const QPointF& pixel);

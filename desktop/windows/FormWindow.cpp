@@ -12,21 +12,26 @@
 namespace zel {
 namespace {
 
-struct FieldCaption {
+struct Field {
     const char* control;
-    const char* caption;
+    const char* caption;  ///< empty where a label of the form says it
+    const char* unit = "";
 };
-constexpr FieldCaption kCaptions[] = {
+constexpr Field kFields[] = {
     {"manualSizeMin", "Minimum"},  {"manualSizeMax", "Maximum"}, {"IPAdressTextBox", "Address"},
     {"RemotePortTextBox", "Port"}, {"IDTextBox", "State"},       {"localPortTextBox", "Local port"},
-    {"txtDebug", "State"},
+    {"txtDebug", "State"},         {"TimeIntervalBox", "", "s"},
 };
 
-QString captionOf(const Control& control) {
-    for (const FieldCaption& row : kCaptions)
-        if (control.name() == row.control) return row.caption;
-    return QString::fromStdString(control.name());
+Field fieldOf(const Control& control) {
+    for (const Field& row : kFields)
+        if (control.name() == row.control) return row;
+    return {control.name().c_str(), control.name().c_str()};
 }
+
+/// Buttons that leave a dialog without doing what it is for.
+constexpr const char* kCancels[] = {"cmdCancel", "CancelTimeButton", "QuitTCPButton",
+                                    "ClosePwrForm"};
 
 constexpr int kFieldWidth = 260;
 constexpr int kHourglass = 11;
@@ -37,6 +42,8 @@ FormWindow::FormWindow(Form& form, Binder& binder, QWidget* parent)
     : QDialog(parent), form_(form), binder_(binder) {
     setObjectName(QString::fromStdString(form.name()));
     setWindowFlag(Qt::WindowContextHelpButtonHint, false);
+    shown_.setSingleShot(true);
+    connect(&shown_, &QTimer::timeout, this, [this] { focusFirst(); });
 }
 
 void FormWindow::followForm() {
@@ -52,6 +59,8 @@ void FormWindow::followForm() {
             show();
             raise();
             activateWindow();
+            // Behind the texts of this frame, which would take the selection away.
+            shown_.start(0);
         } else {
             hide();
         }
@@ -66,7 +75,31 @@ void FormWindow::closeEvent(QCloseEvent* event) {
     event->accept();
 }
 
-void FormWindow::reject() { close(); }
+void FormWindow::reject() {
+    for (const Button* button : cancels_) {
+        auto* key = qobject_cast<QPushButton*>(binder_.widgetOf(*button));
+        if (key != nullptr && key->isVisible() && key->isEnabled()) return key->click();
+    }
+    close();
+}
+
+void FormWindow::focusFirst() {
+    for (const Control* control : form_.controls()) {
+        auto* widget = qobject_cast<QWidget*>(binder_.widgetOf(*control));
+        if (widget == nullptr || !widget->isVisible() || !widget->isEnabled()) continue;
+        const auto* line = qobject_cast<QLineEdit*>(widget);
+        const bool entry = (line != nullptr && !line->isReadOnly()) ||
+                           qobject_cast<QComboBox*>(widget) != nullptr ||
+                           (control->kind() == ControlKind::OptionButton &&
+                            static_cast<const OptionButton*>(control)->Value());
+        if (!entry) continue;
+        widget->setFocus(Qt::TabFocusReason);
+        if (auto* field = qobject_cast<QLineEdit*>(widget); field != nullptr) field->selectAll();
+        return;
+    }
+    for (QPushButton* button : findChildren<QPushButton*>())
+        if (button->isDefault() && button->isVisible()) button->setFocus(Qt::TabFocusReason);
+}
 
 void FormWindow::keyPressEvent(QKeyEvent* event) {
     // Enter presses the button that has the focus, else the one that the dialog is for.
@@ -85,12 +118,28 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
     auto* fields = new QFormLayout;
     auto* buttons = new QHBoxLayout;
     buttons->addStretch(1);
+    layout->setSpacing(10);
+    layout->setContentsMargins(14, 12, 14, 12);
     layout->addLayout(fields);
+    QLabel* caption = nullptr;
     for (Control* control : form.controls()) {
-        if (control->kind() == ControlKind::TextBox) {
+        if (control->kind() == ControlKind::Label) {
+            caption = new QLabel;
+            binder.bind(static_cast<Label&>(*control), caption);
+        } else if (control->kind() == ControlKind::TextBox) {
+            const Field field = fieldOf(*control);
             auto* line = new PanelLineEdit;
-            line->setMinimumWidth(kFieldWidth);
-            fields->addRow(captionOf(*control), line);
+            auto* row = new QHBoxLayout;
+            row->addWidget(line, 1);
+            if (*field.unit != 0) {
+                row->addWidget(new QLabel(field.unit));
+            } else {
+                line->setMinimumWidth(kFieldWidth);
+            }
+            if (caption == nullptr) caption = new QLabel(field.caption);
+            caption->setBuddy(line);
+            fields->addRow(caption, row);
+            caption = nullptr;
             binder.bind(static_cast<TextBox&>(*control), line);
         } else if (control->kind() == ControlKind::OptionButton) {
             auto* option = new QRadioButton;
@@ -103,6 +152,8 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
             if (buttons->count() == 1) button->setDefault(true);  // behind the stretch
             buttons->addWidget(button);
             binder.bind(static_cast<Button&>(*control), button);
+            for (const char* name : kCancels)
+                if (control->name() == name) setCancel(static_cast<Button&>(*control));
         }
     }
     layout->addStretch(1);
@@ -165,6 +216,10 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
                             &form.CancelConnButton, &form.CancelConnButton1})
         keys->addWidget(button(*control));
     static_cast<QPushButton*>(binder.widgetOf(form.ZELButton))->setDefault(true);
+    // While it dials, Esc ends the dialling.
+    for (const Button* control :
+         {&form.CancelButton, &form.CancelConnButton, &form.CancelConnButton1})
+        setCancel(*control);
     layout->addStretch(1);
     busy_ = new QProgressBar;
     busy_->setRange(0, 0);

@@ -14,19 +14,25 @@ class FormWindow : public QDialog {
     FormWindow(Form& form, Binder& binder, QWidget* parent);
 
   protected:
+    /// The first field that takes an entry has the focus, else the default button.
+    void focusFirst();
     /// Behind the building of the window's content.
     void followForm();
+    /// The button that Esc stands for, while it can be pressed.
+    void setCancel(const Button& button) { cancels_.push_back(&button); }
     void closeEvent(QCloseEvent* event) override;
     void reject() override;
     void keyPressEvent(QKeyEvent* event) override;
 
     Form& form_;
     Binder& binder_;
+    std::vector<const Button*> cancels_;
+    QTimer shown_;
     QProgressBar* busy_ = nullptr;  ///< runs while the form shows the hourglass
 };
 
 /// A window that lays the form's controls out in their order: a row a text box, options below
-/// each other, buttons at the foot.
+/// each other, buttons at the foot. A label ahead of a text box is its caption.
 class PlainFormWindow : public FormWindow {
   public:
     PlainFormWindow(Form& form, Binder& binder, QWidget* parent);

@@ -6,12 +6,17 @@
 #include <QGridLayout>
 #include <QHBoxLayout>
 #include <QMenuBar>
-#include <QShortcut>
 #include <QStatusBar>
 #include <QVBoxLayout>
+#include <algorithm>
 #include <map>
+#include <set>
 
+#include "desktop/graph/GraphImage.h"
+#include "desktop/windows/FileDrop.h"
 #include "desktop/windows/PanelSide.h"
+#include "desktop/windows/PlaybackBar.h"
+#include "desktop/windows/Shortcuts.h"
 
 namespace zel {
 namespace {
@@ -21,7 +26,17 @@ constexpr int kActivityMs = 150;
 constexpr int kDotWidth = 26;
 constexpr int kSideWidth = 440;
 constexpr int kWidestSide = 620;
+constexpr int kPaceWidth = 190;
 constexpr int kHourglass = 11;
+constexpr QSize kSmallestImage(800, 500);
+
+/// The last part of a text whose parts stand apart goes to a line of its own: the readouts beside
+/// it have two lines, and need the room in a small window.
+QString inTwoLines(const std::string& parts) {
+    QString text = QString::fromStdString(parts);
+    if (const qsizetype gap = text.lastIndexOf("   "); gap > 0) text.replace(gap, 3, "\n");
+    return text;
+}
 
 QLabel* readout() {
     auto* label = new QLabel;
@@ -43,20 +58,25 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     layout->setSpacing(kSpacing);
     layout->setContentsMargins(kSpacing, kSpacing, kSpacing, kSpacing);
     layout->addWidget(graphSide(), 7);
-    auto* side = new PanelSide(panel_, binder_);
+    auto* side = new PanelSide(panel_, program_.variables(), binder_);
+    terminators_ = &side->terminators();
     side->setMinimumWidth(kSideWidth);
     side->setMaximumWidth(kWidestSide);
     layout->addWidget(side, 3);
     setCentralWidget(centre);
     buildMenus();
     buildStatusLine();
-    buildShortcuts();
+    buildShortcuts(*this, panel_, binder_);
+    terminators_->buildShortcuts(*this);
+    installEventFilter(new FileDrop(
+        *this, [this] { return mustNotDisturb(panel_.LoadData); },
+        [this](const QString& path) { panel_.OpenFile(path.toStdString()); }));
 
     Forms& forms = program_.forms();
     windows_.push_back(std::make_unique<ConnectionWindow>(forms.main, binder_, this));
-    for (Form* form :
-         {static_cast<Form*>(&forms.manualScale), static_cast<Form*>(&forms.powerAndRefl),
-          static_cast<Form*>(&forms.tcpConnection), static_cast<Form*>(&forms.server)})
+    for (Form* form : {static_cast<Form*>(&forms.manualScale),
+                       static_cast<Form*>(&forms.powerAndRefl), static_cast<Form*>(&forms.time),
+                       static_cast<Form*>(&forms.tcpConnection), static_cast<Form*>(&forms.server)})
         windows_.push_back(std::make_unique<PlainFormWindow>(*form, binder_, this));
     binder_.bindForm(panel_, this, [this] {
         setWindowTitle(QString::fromStdString(panel_.Caption));
@@ -65,20 +85,32 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     forms.main.Changed.connect([self = QPointer<MainWindow>(this)] {
         if (self) self->binder_.refresh(self->panel_);
     });
+    panel_.DrawImage.connect(
+        [self = QPointer<MainWindow>(this)](const std::string& path, std::string& problem) {
+            if (self) self->drawImage(path, problem);
+        });
     binder_.flush();
     graph_->setFocus();
 }
 
 MainWindow::~MainWindow() { windows_.clear(); }
 
+void MainWindow::drawImage(const std::string& path, std::string& problem) {
+    QString error;
+    saveGraphImage(panel_.CWGraph1, annotateView(panel_, program_.variables()),
+                   QString::fromStdString(path), &error, graph_->size().expandedTo(kSmallestImage));
+    problem = error.toStdString();
+}
+
 bool MainWindow::mustNotDisturb(const Control& control) const {
     // The continuous view refuses by itself, in words.
     if (panel_.ContinuosLoopActive) return false;
     const bool busy = panel_.MousePointer == kHourglass || panel_.AcquisitionRunning ||
                       program_.forms().main.MousePointer == kHourglass;
-    const bool always = &control == &panel_.StopButton || &control == &panel_.ExitObject ||
-                        &control == &program_.forms().main.CancelButton;
-    return busy && !always;
+    const Forms& forms = program_.forms();
+    const Control* const always[] = {&panel_.StopButton, &panel_.ExitObject,
+                                     &forms.main.CancelButton, &forms.specialMeas.sldSpeed};
+    return busy && std::find(std::begin(always), std::end(always), &control) == std::end(always);
 }
 
 QWidget* MainWindow::graphSide() {
@@ -90,6 +122,8 @@ QWidget* MainWindow::graphSide() {
                              [this] { return annotateView(panel_, program_.variables()); });
     binder_.bindShow(panel_.CWGraph1, graph_, [this] { graph_->refresh(); });
     layout->addWidget(graph_, 1);
+    layout->addWidget(
+        new PlaybackBar(panel_.PlaybackFrame, program_.forms().specialMeas.sldSpeed, binder_));
     auto* readouts = new QGridLayout;
     readouts->setHorizontalSpacing(2 * kSpacing);
     readouts->setVerticalSpacing(2);
@@ -104,7 +138,11 @@ QWidget* MainWindow::graphSide() {
     QLabel* pace = new QLabel;
     pace->setObjectName("caption");
     pace->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
-    binder_.bind(panel_.PaceLabel, pace);
+    pace->setFixedWidth(kPaceWidth);
+    binder_.bindShow(panel_.PaceLabel, pace, [this, pace] {
+        pace->setText(inTwoLines(panel_.PaceLabel.Caption));
+        pace->setVisible(panel_.PaceLabel.Visible);
+    });
     readouts->addWidget(pace, 0, 2, 2, 1);
     readouts->setColumnStretch(0, 2);
     readouts->setColumnStretch(1, 3);
@@ -118,11 +156,17 @@ QWidget* MainWindow::graphSide() {
 
 void MainWindow::buildMenus() {
     std::map<const MenuItem*, QMenu*> menus;
+    std::set<const MenuItem*> parents;
+    for (Control* control : panel_.controls())
+        if (control->kind() == ControlKind::MenuItem)
+            parents.insert(static_cast<MenuItem*>(control)->parent());
     for (Control* control : panel_.controls()) {
         if (control->kind() != ControlKind::MenuItem) continue;
         auto& item = static_cast<MenuItem&>(*control);
-        if (item.parent() == nullptr) {
-            QMenu* menu = menuBar()->addMenu(QString());
+        if (item.parent() == nullptr || parents.count(&item) > 0) {
+            QMenu* menu = item.parent() == nullptr ? menuBar()->addMenu(QString())
+                                                   : menus[item.parent()]->addMenu(QString());
+            menu->setToolTipsVisible(&item == &panel_.RecentMenu);  // the paths
             menus[&item] = menu;
             binder_.bind(item, menu->menuAction());
         } else if (item.Caption.get() == "-") {
@@ -134,7 +178,7 @@ void MainWindow::buildMenus() {
 }
 
 void MainWindow::addThemeMenu(ThemeChoice now, const std::function<void(ThemeChoice)>& choose) {
-    auto* menu = new QMenu("View", this);
+    auto* menu = new QMenu("&View", this);
     auto* help = qobject_cast<QAction*>(binder_.widgetOf(panel_.HelpMenu));
     menuBar()->insertMenu(help, menu);
     auto* group = new QActionGroup(menu);
@@ -168,10 +212,13 @@ void MainWindow::buildStatusLine() {
     auto* clock = new QLabel;
     statusBar()->addWidget(activity_);
     statusBar()->addWidget(state_, 1);
+    auto* progress = new QLabel;
+    statusBar()->addPermanentWidget(progress);
     statusBar()->addPermanentWidget(busy_);
     statusBar()->addPermanentWidget(clock);
     statusBar()->setSizeGripEnabled(false);
     binder_.bind(panel_.TimeLabel, clock);
+    binder_.bind(panel_.FileLabel, progress);
     for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
         binder_.bindShow(*picture, state_, [this] { showState(); });
     activityOff_.setSingleShot(true);
@@ -207,31 +254,8 @@ void MainWindow::showState() {
     setCursor(busy && !panel_.ContinuosLoopActive ? Qt::BusyCursor : Qt::ArrowCursor);
 }
 
-void MainWindow::shortcut(const QKeySequence& keys, Button& control) {
-    auto* action = new QShortcut(keys, this);
-    connect(action, &QShortcut::activated, this, [this, &control] {
-        const auto* widget = qobject_cast<QPushButton*>(binder_.widgetOf(control));
-        if (widget != nullptr && widget->isVisible() && widget->isEnabled() &&
-            !mustNotDisturb(control))
-            control.Click();
-    });
-}
-
-void MainWindow::buildShortcuts() {
-    for (int i = 0; i < panel_.SoftKey.count(); ++i)
-        shortcut(QKeySequence(Qt::Key_F2 + i), panel_.SoftKey(i));
-    shortcut(QKeySequence(Qt::Key_F9), panel_.PlaySingleButton);
-    shortcut(QKeySequence(Qt::Key_F10), panel_.PlayContinuousButton);
-    shortcut(QKeySequence(Qt::Key_Escape), panel_.StopButton);
-    const std::pair<Qt::Key, Button*> hardKeys[] = {
-        {Qt::Key_F, &panel_.FrequencyButton}, {Qt::Key_S, &panel_.SpanButton},
-        {Qt::Key_A, &panel_.AmplitudeButton}, {Qt::Key_B, &panel_.BWButton},
-        {Qt::Key_W, &panel_.SweepButton},     {Qt::Key_T, &panel_.TraceButton},
-        {Qt::Key_M, &panel_.MeasButton},      {Qt::Key_G, &panel_.TrackButton1},
-        {Qt::Key_K, &panel_.MarkerButton},    {Qt::Key_Z, &panel_.cmdZoom},
-        {Qt::Key_P, &panel_.MarkPkButton},    {Qt::Key_N, &panel_.NextPeakButton},
-    };
-    for (const auto& [key, control] : hardKeys) shortcut(QKeySequence(Qt::CTRL | key), *control);
+void MainWindow::keyPressEvent(QKeyEvent* event) {
+    if (!terminators_->typeAhead(*event)) QMainWindow::keyPressEvent(event);
 }
 
 void MainWindow::showNow() {

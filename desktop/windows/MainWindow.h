@@ -9,6 +9,7 @@
 #include "desktop/binders/Binder.h"
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/windows/FormWindow.h"
+#include "desktop/windows/Terminators.h"
 #include "desktop/windows/Theme.h"
 #include "shell/Program.h"
 
@@ -28,20 +29,22 @@ class MainWindow : public QMainWindow {
 
   protected:
     void closeEvent(QCloseEvent* event) override;
+    /// Digits that nobody took begin an entry.
+    void keyPressEvent(QKeyEvent* event) override;
 
   private:
     QWidget* graphSide();
     void buildMenus();
     void buildStatusLine();
-    void buildShortcuts();
     void showState();
+    void drawImage(const std::string& path, std::string& problem);
     bool mustNotDisturb(const Control& control) const;
-    void shortcut(const QKeySequence& keys, Button& control);
 
     Program& program_;
     ControllerForm& panel_;
     Binder binder_;
     GraphWidget* graph_ = nullptr;
+    TerminatorRow* terminators_ = nullptr;
     QLabel* state_ = nullptr;
     QLabel* activity_ = nullptr;
     QProgressBar* busy_ = nullptr;

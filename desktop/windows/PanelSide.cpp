@@ -5,12 +5,15 @@
 #include <QHBoxLayout>
 #include <QVBoxLayout>
 
+#include "desktop/windows/KeyPictures.h"
+
 namespace zel {
 namespace {
 
 constexpr int kSpacing = 5;
-constexpr int kTallest = 84;
+constexpr int kTallest = 112;
 constexpr int kFieldWidth = 120;
+constexpr int kLongestList = 16;  // no list of the panel is longer
 
 QFrame* group() {
     auto* frame = new QFrame;
@@ -34,8 +37,12 @@ QLabel* smallCaption(const QString& text = {}) {
 
 }  // namespace
 
-PanelSide::PanelSide(ControllerForm& panel, Binder& binder, QWidget* parent)
-    : QWidget(parent), panel_(panel), binder_(binder) {
+PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder& binder,
+                     QWidget* parent)
+    : QWidget(parent),
+      panel_(panel),
+      binder_(binder),
+      terminators_(new TerminatorRow(panel, mirror, binder)) {
     auto* layout = new QVBoxLayout(this);
     layout->setSpacing(kSpacing);
     layout->setContentsMargins(0, 0, 0, 0);
@@ -45,8 +52,8 @@ PanelSide::PanelSide(ControllerForm& panel, Binder& binder, QWidget* parent)
     middle->addWidget(softPositions(), 5);
     auto* right = new QVBoxLayout;
     right->setSpacing(kSpacing);
-    right->addWidget(hardKeys(), 3);
-    right->addWidget(modeKeys(), 5);
+    right->addWidget(hardKeys(), 5);
+    right->addWidget(modeKeys(), 6);
     middle->addLayout(right, 5);
     layout->addLayout(middle, 1);
     layout->addWidget(markerKeys());
@@ -54,7 +61,10 @@ PanelSide::PanelSide(ControllerForm& panel, Binder& binder, QWidget* parent)
 }
 
 QPushButton* PanelSide::key(Button& control, bool tall) {
-    auto* button = new QPushButton;
+    return fitted(new QPushButton, control, tall);
+}
+
+QPushButton* PanelSide::fitted(QPushButton* button, Button& control, bool tall) {
     button->setMinimumWidth(30);
     button->setSizePolicy(QSizePolicy::Preferred,
                           tall ? QSizePolicy::Expanding : QSizePolicy::Fixed);
@@ -94,13 +104,14 @@ QWidget* PanelSide::softPositions() {
         auto* row = new QGridLayout;
         row->setSpacing(3);
         auto* button = key(panel_.SoftKey(i), true);
-        button->setFixedWidth(78);
-        button->setMinimumHeight(40);
+        button->setMinimumSize(78, 40);
         QSizePolicy policy = button->sizePolicy();
+        policy.setHorizontalPolicy(QSizePolicy::Ignored);
         policy.setRetainSizeWhenHidden(true);
         button->setSizePolicy(policy);
         row->addWidget(button, 0, 0, 2, 1);
         QLabel* caption = smallCaption();
+        caption->setMinimumWidth(kFieldWidth);
         row->addWidget(caption, 0, 1, 1, 2, Qt::AlignBottom);
         auto* fields = new QWidget;
         auto* places = new QHBoxLayout(fields);
@@ -108,6 +119,7 @@ QWidget* PanelSide::softPositions() {
         places->setSpacing(3);
         auto* box = new PanelLineEdit;
         auto* list = new QComboBox;
+        list->setMaxVisibleItems(kLongestList);
         // What a menu shows here does not move the keys: the place is the same for all.
         for (QWidget* field : {static_cast<QWidget*>(box), static_cast<QWidget*>(list)}) {
             field->setMinimumWidth(40);
@@ -119,10 +131,12 @@ QWidget* PanelSide::softPositions() {
         binder_.bind(panel_.ChoiceBox(i), list);
         binder_.bind(panel_.SoftFrame(i), fields, caption);
         row->addWidget(fields, 1, 1, 1, 2, Qt::AlignTop);
-        row->setColumnStretch(1, 1);
+        row->setColumnStretch(0, 2);
+        row->setColumnStretch(1, 3);
         row->setColumnMinimumWidth(1, kFieldWidth);
         layout->addLayout(row, 1);
     }
+    layout->addWidget(terminators_);
     return frame;
 }
 
@@ -134,7 +148,7 @@ QWidget* PanelSide::hardKeys() {
                       &panel_.MeasButton,      &panel_.TrackButton1, &panel_.MarkerButton};
     int place = 0;
     for (Button* control : keys) {
-        layout->addWidget(key(*control, true), place / 3, place % 3);
+        layout->addWidget(fitted(new PictureKey, *control, true), place / 3, place % 3);
         ++place;
     }
     return frame;

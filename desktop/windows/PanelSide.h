@@ -4,7 +4,9 @@
 #include <QWidget>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/windows/Terminators.h"
 #include "forms/ControllerForm.h"
+#include "model/ZEL3Variables.h"
 
 class QGridLayout;
 class QHBoxLayout;
@@ -14,7 +16,9 @@ namespace zel {
 
 class PanelSide : public QWidget {
   public:
-    PanelSide(ControllerForm& panel, Binder& binder, QWidget* parent = nullptr);
+    PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder& binder,
+              QWidget* parent = nullptr);
+    TerminatorRow& terminators() { return *terminators_; }
 
   private:
     QWidget* playKeys();
@@ -24,9 +28,11 @@ class PanelSide : public QWidget {
     QWidget* markerKeys();
     QWidget* instrumentKeys();
     QPushButton* key(Button& control, bool tall = false);
+    QPushButton* fitted(QPushButton* button, Button& control, bool tall);
 
     ControllerForm& panel_;
     Binder& binder_;
+    TerminatorRow* terminators_;
 };
 
 }  // namespace zel

@@ -23,16 +23,16 @@ struct ThemeColors {
     const char* accentText;
     const char* yellow;
     const char* yellowText;
+    const char* yellowEdge;
     const char* red;
     const char* green;
-    const char* locked;
 };
 constexpr ThemeColors kDark = {"#1b2027", "#11151a", "#e6ebf0", "#7d8894", "#aab4bf",
                                "#2c343e", "#38424e", "#46525f", "#2873c6", "#ffffff",
-                               "#4a4220", "#ffe08a", "#c0392b", "#1e8449", "#191e24"};
+                               "#35321f", "#ffd966", "#8f7a30", "#c0392b", "#1e8449"};
 constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#48525c",
                                 "#ffffff", "#e3e9f0", "#9aa5b1", "#1d6fc4", "#ffffff",
-                                "#fbeeb8", "#5c4a00", "#c0392b", "#1e8449", "#e4e8ec"};
+                                "#fdf1bf", "#574600", "#c9a93f", "#c0392b", "#1e8449"};
 
 constexpr const char* kStyleSheet = R"(
 QWidget { font-size: 9pt; }
@@ -41,10 +41,16 @@ QPushButton { background: @button; color: @text; border: 1px solid @border; bord
 QPushButton:hover { background: @buttonHover; }
 QPushButton:pressed { background: @accent; color: @accentText; }
 QPushButton:focus { border: 2px solid @accent; padding: 1px 5px; }
+QPushButton:default { border-color: @accent; background: @accent; color: @accentText; }
+QPushButton:default:hover { border-color: @text; }
+QPushButton:default:focus { border-color: @text; }
 QPushButton:disabled { color: @dim; background: @window; }
 QPushButton[face="red"] { background: @red; color: #ffffff; font-weight: bold; }
 QPushButton[face="green"] { background: @green; color: #ffffff; font-weight: bold; }
-QPushButton[face="yellow"] { background: @yellow; color: @yellowText; font-weight: bold; }
+QPushButton[face="yellow"] { background: @yellow; color: @yellowText; font-weight: bold;
+    border-color: @yellowEdge; }
+QPushButton[face="yellow"]:hover { border-color: @yellowText; }
+QPushButton[face="yellow"]:pressed { background: @accent; color: @accentText; }
 QPushButton[face="blue"] { background: @accent; color: @accentText; font-weight: bold; }
 QPushButton[face]:disabled { color: @dim; background: @window; font-weight: normal; }
 QPushButton[face]:focus { border: 2px solid @text; }
@@ -52,12 +58,20 @@ QPushButton#StopButton { background: @red; color: #ffffff; font-weight: bold; }
 QLineEdit, QComboBox { background: @base; color: @text; border: 1px solid @border;
     border-radius: 3px; padding: 1px 4px; min-height: 20px; }
 QLineEdit:focus, QComboBox:focus { border: 2px solid @accent; padding: 0px 3px; }
+QComboBox QAbstractItemView { background: @base; color: @text; border: 1px solid @border;
+    selection-background-color: @accent; selection-color: @accentText; }
 QComboBox::drop-down { border: none; width: 18px; }
 QComboBox::down-arrow { width: 0; height: 0; border-left: 4px solid @base;
     border-right: 4px solid @base; border-top: 5px solid @caption; }
 QComboBox::down-arrow:disabled { border-left-color: @window; border-right-color: @window;
     border-top-color: @dim; }
-QLineEdit[face="locked"] { background: @locked; }
+QLineEdit[face="locked"] { background: transparent; border: 1px dashed @border; }
+QComboBox[face="locked"] { background: transparent; border: 1px dashed @border; }
+QComboBox[face="locked"]::down-arrow { border: none; }
+QLineEdit[face="locked"]:focus, QComboBox[face="locked"]:focus { border: 2px dashed @accent; }
+QPushButton[face="terminator"] { background: @base; padding: 1px 2px; font-size: 8pt; }
+QPushButton[face="terminator"]:hover { background: @buttonHover; }
+QPushButton[face="terminator"]:pressed { background: @accent; color: @accentText; }
 QLineEdit:disabled, QComboBox:disabled { color: @dim; background: @window; }
 QLabel#caption { color: @caption; font-size: 8pt; }
 QLabel#readout, QLabel[readout="true"] { font-size: 10pt; font-weight: bold; }
@@ -83,9 +97,9 @@ QString styled(const ThemeColors& c) {
         {"@accent", c.accent},
         {"@border", c.border},
         {"@yellowText", c.yellowText},
+        {"@yellowEdge", c.yellowEdge},
         {"@yellow", c.yellow},
         {"@window", c.window},
-        {"@locked", c.locked},
         {"@base", c.base},
         {"@text", c.text},
         {"@dim", c.dim},

@@ -52,6 +52,17 @@ TEST(InProcessPort, UnpacedAnswer_IsThereAtOnce) {
     EXPECT_EQ(bench.clock.micros(), 0);
 }
 
+TEST(InProcessPort, InstrumentThatTakesItsTime_LetsTimePassOnAnUnpacedLine) {
+    WireSetup setup;
+    setup.answering = 0.002;
+    Bench bench(setup);
+    ASSERT_TRUE(bench.open());
+    bench.port.output("GET\r");
+    EXPECT_EQ(bench.port.input(), "");
+    EXPECT_EQ(bench.read(2), "0\r");
+    EXPECT_NEAR(static_cast<double>(bench.clock.micros()), 2000, 5);
+}
+
 TEST(InProcessPort, Answer_FiresTheDataEventInsideThePump) {
     Bench bench;
     ASSERT_TRUE(bench.open());

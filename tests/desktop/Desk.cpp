@@ -1,5 +1,7 @@
 #include "tests/desktop/Desk.h"
 
+#include <QDir>
+
 namespace zel {
 
 QApplication& testApplication() {
@@ -9,6 +11,11 @@ QApplication& testApplication() {
     // Left standing: the toolkit's own statics end first.
     static auto* application = new QApplication(count, arguments);
     return *application;
+}
+
+bool savePicture(QWidget& widget, const QString& name) {
+    const QString folder = QApplication::applicationDirPath() + "/pictures";
+    return QDir().mkpath(folder) && widget.grab().save(folder + "/" + name + ".png");
 }
 
 Desk::Desk() {

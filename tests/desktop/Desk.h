@@ -17,6 +17,9 @@ namespace zel {
 /// The one application of the test program.
 QApplication& testApplication();
 
+/// A picture beside the test's program, to be looked at.
+bool savePicture(QWidget& widget, const QString& name);
+
 class Desk : public testing::Test {
   protected:
     Desk();

@@ -72,6 +72,51 @@ TEST_F(GraphDesk, ShownCursor_IsDraggedAndSnapsToTheTrace) {
     EXPECT_EQ(panel().MarkerLabel.Caption.get().rfind("Marker:", 0), 0U);
 }
 
+TEST_F(GraphDesk, LabelsOfADraggedMarker_FollowBeforeItIsLetGo) {
+    panel().MarkerCheckBox.Click();
+    window->showNow();
+    GraphWidget& graph = window->graph();
+    QTest::mousePress(&graph, Qt::LeftButton, {}, at(panel().CWGraph1.cursor(1).X, -60));
+    std::vector<std::string> texts;
+    for (const double x : {5e8, 1e9, 2e9}) {
+        QTest::mouseMove(&graph, at(x, -60));
+        texts.push_back(panel().MarkerLabel.Caption);
+        EXPECT_NEAR(panel().MarkerValue, x, 2e7);
+        EXPECT_EQ(widgetOf<QLabel>(panel().MarkerLabel)->text().toStdString(), texts.back());
+    }
+    EXPECT_NE(texts[0], texts[1]);
+    EXPECT_NE(texts[1], texts[2]);
+    QTest::mouseRelease(&graph, Qt::LeftButton, {}, at(2e9, -60));
+    QTest::mouseMove(&graph, at(1e9, -60));
+    EXPECT_EQ(panel().MarkerLabel.Caption.get(), texts[2]);
+}
+
+TEST_F(GraphDesk, DeltaMarker_IsDraggedByItself) {
+    panel().MarkerCheckBox.Click();
+    panel().DeltaCheckBox.Click();
+    window->showNow();
+    const Graph& graph = panel().CWGraph1;
+    drag(at(graph.cursor(1).X, -60), at(5e8, -60));
+    window->showNow();
+    const double marker = graph.cursor(1).X;
+    drag(at(graph.cursor(2).X, -60), at(2.2e9, -60));
+    EXPECT_EQ(graph.cursor(1).X, marker);
+    EXPECT_NEAR(graph.cursor(2).X, 2.2e9, 2e7);
+    EXPECT_EQ(panel().DeltaLabel.Caption.get().rfind("Delta:", 0), 0U)
+        << panel().DeltaLabel.Caption.get();
+}
+
+TEST_F(GraphDesk, PointerOverAMarker_ShowsThatItCanBeDragged) {
+    panel().MarkerCheckBox.Click();
+    window->showNow();
+    GraphWidget& graph = window->graph();
+    const double x = panel().CWGraph1.cursor(1).X;
+    QTest::mouseMove(&graph, at(x, -60));
+    EXPECT_EQ(graph.cursor().shape(), Qt::SplitHCursor);
+    QTest::mouseMove(&graph, at(x, -60) + QPoint(x > 1.5e9 ? -60 : 60, 0));
+    EXPECT_NE(graph.cursor().shape(), Qt::SplitHCursor);
+}
+
 TEST_F(GraphDesk, ArrowKey_MovesTheCursorByOnePoint) {
     panel().MarkerCheckBox.Click();
     window->showNow();
@@ -159,7 +204,7 @@ TEST_F(GraphDesk, Svg_IsWellFormedAndKeepsTheZoomedTraceInside) {
 TEST_F(GraphDesk, PictureOfAnUnknownKind_IsRefusedInWords) {
     QString error;
     EXPECT_FALSE(saveGraphImage(panel().CWGraph1, {}, "graph.xyz", &error));
-    EXPECT_EQ(error, "Unknown kind of picture: .xyz (png or svg)");
+    EXPECT_EQ(error, "Unknown kind of picture: .xyz (wmf, svg, png or pdf)");
 }
 
 TEST_F(GraphDesk, PictureThatCannotBeWritten_SaysWhichAndWhy) {

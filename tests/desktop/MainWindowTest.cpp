@@ -1,7 +1,6 @@
 // The panel's window: every control bound, shown as its form says, reachable by keyboard.
 
 #include <QClipboard>
-#include <QDir>
 #include <QMenu>
 #include <QSet>
 #include <QTest>
@@ -192,12 +191,6 @@ TEST_F(Desk, ClosingTheWindow_AsksAndStaysOnNo) {
     EXPECT_TRUE(program->ended());
 }
 
-/// A picture beside the test's program, to be looked at.
-bool savePicture(QWidget& widget, const QString& name) {
-    const QString folder = QApplication::applicationDirPath() + "/pictures";
-    return QDir().mkpath(folder) && widget.grab().save(folder + "/" + name + ".png");
-}
-
 TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
     show();
     platform.ports.ports = {"/dev/ttyUSB0", "/dev/ttyS0"};
@@ -218,11 +211,11 @@ TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
 
 TEST_F(Desk, ToolTipOfTheForm_TakesTheWidgetsPlace) {
     auto* key = widgetOf<QPushButton>(panel().SpanButton);
-    EXPECT_EQ(key->toolTip(), "Span menu");
+    EXPECT_EQ(key->toolTip(), "Span menu (Ctrl+S)");
     EXPECT_EQ(key->accessibleName(), "Span menu");
     panel().SpanButton.ToolTip = "not now";
     window->binder().flush();
-    EXPECT_EQ(key->toolTip(), "not now");
+    EXPECT_EQ(key->toolTip(), "not now (Ctrl+S)");
     EXPECT_EQ(key->accessibleName(), "not now");
 }
 
@@ -323,42 +316,6 @@ TEST_F(Desk, ThemeMenu_DrawsColouredTextsAnew) {
     EXPECT_EQ(chosen, std::vector<ThemeChoice>{ThemeChoice::Light});
     EXPECT_NE(label->styleSheet(), dark);
 }
-
-struct Look {
-    const char* name;
-    ThemeChoice theme;
-    QSize size;
-};
-
-class Looks : public Desk, public testing::WithParamInterface<Look> {};
-
-TEST_P(Looks, Window_FitsItsSizeWithNothingCut) {
-    applyTheme(testApplication(), GetParam().theme);
-    connect();
-    window->resize(GetParam().size);
-    show();
-    EXPECT_EQ(window->size(), GetParam().size);
-    for (const Control* control : panel().controls()) {
-        const auto* button = widgetOf<QPushButton>(*control);
-        if (button == nullptr || !button->isVisible()) continue;
-        const QRect inside(button->mapTo(window.get(), QPoint()), button->size());
-        EXPECT_TRUE(window->rect().contains(inside)) << control->name();
-        QSize needed;
-        for (const QString& line : button->text().split('\n'))
-            needed = needed.expandedTo(button->fontMetrics().size(0, line));
-        EXPECT_LE(needed.width(), button->width()) << control->name();
-    }
-    EXPECT_TRUE(savePicture(*window, GetParam().name));
-}
-
-INSTANTIATE_TEST_SUITE_P(Sizes, Looks,
-                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
-                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
-                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
-                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
-                         [](const auto& look) {
-                             return QString(look.param.name).replace('-', '_').toStdString();
-                         });
 
 }  // namespace
 }  // namespace zel

@@ -134,21 +134,21 @@ TEST_F(SeriesTest, SecondFileMeanwhile_IsNotBegun) {
     EXPECT_EQ(levels.size(), 3U);
 }
 
-TEST_F(SeriesTest, Position_IsToldAndTheSliderShownForASeriesOnly) {
+TEST_F(SeriesTest, Position_IsToldAndThePlaybackShownForASeriesOnly) {
     forms.specialMeas.sldSpeed.Value = 5;
     Texts told;
     platform.events.schedule(100, [&] {
         told.push_back(panel.FileLabel.Caption);
-        EXPECT_TRUE(forms.specialMeas.sldSpeed.Visible);
+        EXPECT_TRUE(panel.PlaybackFrame.Visible);
     });
     load(record(4));
     ASSERT_EQ(told.size(), 1U);
     EXPECT_EQ(told[0].substr(0, 22), "Trace 1 of series.csv,");
     EXPECT_EQ(panel.FileLabel.Caption.get(), "");
-    EXPECT_FALSE(forms.specialMeas.sldSpeed.Visible);
+    EXPECT_FALSE(panel.PlaybackFrame.Visible);
     told.clear();
     load(record(1));
-    EXPECT_FALSE(forms.specialMeas.sldSpeed.Visible);
+    EXPECT_FALSE(panel.PlaybackFrame.Visible);
 }
 
 TEST_F(SeriesTest, LongSeries_KeepsTheArraysSmall) {

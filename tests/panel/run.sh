@@ -26,8 +26,8 @@ if [ ! -e "$base.expected" ]; then
 fi
 
 status=0
-"$zelctl" --connect sim: --home "$scratch/home" ${arguments[@]+"${arguments[@]}"} \
-    panel "$session" > "$scratch/output" 2> "$scratch/errors" < /dev/null || status=$?
+(cd "$scratch" && "$zelctl" --connect sim: --home "$scratch/home" ${arguments[@]+"${arguments[@]}"} \
+    panel "$session" > "$scratch/output" 2> "$scratch/errors" < /dev/null) || status=$?
 
 failed=0
 if ! cmp -s "$base.expected" "$scratch/output"; then

@@ -1,0 +1,194 @@
+#include "desktop/windows/Terminators.h"
+
+#include <QApplication>
+#include <QHBoxLayout>
+#include <QKeyEvent>
+#include <QRegularExpression>
+#include <QShortcut>
+
+#include "desktop/binders/ShortcutTable.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+const std::vector<Terminator> kHertz = {
+    {"GHz", "G", 'G'}, {"MHz", "M", 'M'}, {"kHz", "k", 'K'}, {"Hz", "", 0}};
+const std::vector<Terminator> kSeconds = {{"s", "", 0}, {"ms", "m", 'M'}, {"µs", "u", 'U'}};
+const std::vector<Terminator> kWholeSeconds = {{"s", "", 0}};
+const std::vector<Terminator> kLevel = {{"dBm", "", 0}};
+const std::vector<Terminator> kDecibels = {{"dB", "", 0}};
+const std::vector<Terminator> kMetres = {{"m", "", 0}};
+const std::vector<Terminator> kLengths = {{"m", "", 0}, {"cm", "cm", 'C'}, {"mm", "mm", 'M'}};
+const std::vector<Terminator> kEnter = {{"Enter", "", 0}};
+
+struct UnitRow {
+    std::int16_t state;
+    int position;  ///< -1: every one
+    const std::vector<Terminator>& terminators;
+};
+const UnitRow kUnits[] = {
+    {CF::Freq, -1, kHertz},   {CF::SPAN, -1, kHertz},       {CF::AMPT, 0, kLevel},
+    {CF::AMPT, 3, kDecibels}, {CF::SWEEP, 0, kSeconds},     {CF::POWER, 1, kHertz},
+    {CF::OCCBW, 2, kHertz},   {CF::TDMA, 2, kWholeSeconds}, {CF::DISTFAULT, 1, kMetres},
+};
+
+constexpr int kSweepTrigger = 4;
+constexpr const char* kLevelCaption = "TRIGGER\r\nLEVEL";
+
+}  // namespace
+
+const std::vector<Terminator>& terminatorsOf(const ControllerForm& panel,
+                                             const ZEL3Variables& mirror, int position) {
+    if (panel.State == CF::Marker && position < 2) {
+        if (panel.InstrumentMode == CF::DISTTOFAULTMEASURE) return kLengths;
+        return mirror.Span != 0 ? kHertz : kSeconds;
+    }
+    if (panel.State == CF::SWEEP && position == kSweepTrigger)
+        return panel.SoftKey(position).Caption.get() == kLevelCaption ? kLevel : kSeconds;
+    for (const UnitRow& row : kUnits)
+        if (row.state == panel.State && (row.position < 0 || row.position == position))
+            return row.terminators;
+    return kEnter;
+}
+
+bool isBareNumber(const QString& text) {
+    static const QRegularExpression number(R"(^\s*[-+]?(\d+(\.\d*)?|\.\d+)(E[-+]?\d+)?\s*$)",
+                                           QRegularExpression::CaseInsensitiveOption);
+    return number.match(text).hasMatch();
+}
+
+TerminatorRow::TerminatorRow(ControllerForm& panel, const ZEL3Variables& mirror, Binder& binder,
+                             QWidget* parent)
+    : QWidget(parent), panel_(panel), mirror_(mirror), binder_(binder) {
+    setObjectName("TerminatorRow");
+    auto* layout = new QHBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(3);
+    for (std::size_t i = 0; i < keys_.size(); ++i) {
+        auto* key = new QPushButton;
+        key->setProperty("face", "terminator");
+        key->setMinimumWidth(0);
+        key->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+        // The box keeps the focus; from the keyboard the letters with Alt do the same.
+        key->setFocusPolicy(Qt::NoFocus);
+        QSizePolicy policy = key->sizePolicy();
+        policy.setRetainSizeWhenHidden(true);
+        key->setSizePolicy(policy);
+        connect(key, &QPushButton::clicked, this, [this, i] { press(i); });
+        layout->addWidget(key, 1);
+        keys_.at(i) = key;
+    }
+    connect(qApp, &QApplication::focusChanged, this, [this] { refresh(); });
+    followPositions();
+    refresh();
+}
+
+void TerminatorRow::followPositions() {
+    changed_.setSingleShot(true);
+    connect(&changed_, &QTimer::timeout, this, [this] { refresh(); });
+    const auto follow = [this](Control& control) {
+        control.Changed.connect([self = QPointer<TerminatorRow>(this)] {
+            if (self && !self->changed_.isActive()) self->changed_.start(0);
+        });
+    };
+    for (int i = 0; i < panel_.SoftKey.count(); ++i) {
+        follow(panel_.SoftKey(i));
+        follow(panel_.SoftTextBox(i));
+    }
+}
+
+PanelLineEdit* TerminatorRow::boxOf(int position) const {
+    return static_cast<PanelLineEdit*>(
+        qobject_cast<QLineEdit*>(binder_.widgetOf(panel_.SoftTextBox(position))));
+}
+
+int TerminatorRow::position() const {
+    const auto takes = [this](int i) {
+        const TextBox& box = panel_.SoftTextBox(i);
+        return box.Visible && box.Enabled && !box.Locked && panel_.SoftFrame(i).Visible;
+    };
+    int red = -1;
+    int first = -1;
+    for (int i = panel_.SoftTextBox.count() - 1; i >= 0; --i) {
+        if (!takes(i)) continue;
+        if (const QWidget* box = boxOf(i); box != nullptr && box->hasFocus()) return i;
+        if (panel_.SoftKey(i).BackColor == kRed) red = i;
+        first = i;
+    }
+    return red >= 0 ? red : first;
+}
+
+void TerminatorRow::refresh() {
+    const int at = position();
+    static const std::vector<Terminator> none;
+    const std::vector<Terminator>& terminators = at < 0 ? none : terminatorsOf(panel_, mirror_, at);
+    for (std::size_t i = 0; i < keys_.size(); ++i) {
+        QPushButton& key = *keys_.at(i);
+        key.setVisible(i < terminators.size());
+        if (i >= terminators.size()) continue;
+        const Terminator& row = terminators[i];
+        key.setText(row.caption);
+        const QString keys = row.letter != 0 ? QString("Alt+") + row.letter : QString("Enter");
+        key.setToolTip("Ends the number in " + QString::fromUtf8(row.caption) + " (" + keys + ")");
+        if (std::string_view(row.caption) == "Enter") key.setToolTip("Sends the entry (Enter)");
+        key.setAccessibleName(row.caption);
+    }
+}
+
+void TerminatorRow::press(std::size_t index) {
+    const int at = position();
+    if (at < 0) return;
+    const std::vector<Terminator>& terminators = terminatorsOf(panel_, mirror_, at);
+    if (index >= terminators.size()) return;
+    PanelLineEdit* box = boxOf(at);
+    box->setFocus(Qt::OtherFocusReason);
+    // A value that was only read is not sent again, and a unit alone is no value.
+    const bool typed = panel_.SoftBoxFirstKey != 1 && !box->text().isEmpty();
+    const bool plainEntry = &terminators == &kEnter;
+    if (!typed || (!plainEntry && !isBareNumber(box->text()))) return box->selectAll();
+    const QString unit = terminators[index].typed;
+    box->deselect();
+    box->end(false);
+    for (const QChar letter : unit) {
+        QKeyEvent key(QEvent::KeyPress, letter.toUpper().unicode(), Qt::NoModifier,
+                      QString(letter));
+        QApplication::sendEvent(box, &key);
+    }
+    QKeyEvent enter(QEvent::KeyPress, Qt::Key_Return, Qt::NoModifier, "\r");
+    QApplication::sendEvent(box, &enter);
+}
+
+void TerminatorRow::pressLetter(char letter) {
+    const int at = position();
+    if (at < 0) return;
+    const std::vector<Terminator>& terminators = terminatorsOf(panel_, mirror_, at);
+    for (std::size_t i = 0; i < terminators.size(); ++i)
+        if (terminators[i].letter == letter) return press(i);
+}
+
+void TerminatorRow::buildShortcuts(QWidget& window) {
+    for (const char* letter = kTerminatorLetters; *letter != 0; ++letter) {
+        auto* shortcut =
+            new QShortcut(QKeySequence(QString("Alt+") + QLatin1Char(*letter)), &window);
+        shortcut->setAutoRepeat(false);
+        connect(shortcut, &QShortcut::activated, this, [this, key = *letter] { pressLetter(key); });
+    }
+}
+
+bool TerminatorRow::typeAhead(const QKeyEvent& event) {
+    static const QString entry = "0123456789.-+";
+    const bool plain = (event.modifiers() & (Qt::ControlModifier | Qt::AltModifier)) == 0;
+    if (!plain || event.text().size() != 1 || !entry.contains(event.text())) return false;
+    const int at = position();
+    if (at < 0 || (binder_.refuses && binder_.refuses(panel_.SoftTextBox(at)))) return false;
+    PanelLineEdit* box = boxOf(at);
+    if (box == nullptr || !box->isVisible()) return false;
+    box->setFocus(Qt::OtherFocusReason);
+    QKeyEvent key(QEvent::KeyPress, event.key(), event.modifiers(), event.text());
+    QApplication::sendEvent(box, &key);
+    return true;
+}
+
+}  // namespace zel

@@ -1,0 +1,114 @@
+// The verbs that write and read files, over the simulator in virtual time.
+
+#include <gtest/gtest.h>
+
+#include <sstream>
+
+#include "console/Fronts.h"
+#include "console/PanelSession.h"
+#include "console/Tool.h"
+#include "tests/files/FileSession.h"
+
+namespace zel {
+namespace {
+
+struct FileVerbsTest : ::testing::Test {
+    int run(std::vector<std::string> words) {
+        words.insert(words.begin(), {"zelctl", "--home", folder.file("home")});
+        std::vector<const char*> list;
+        for (const std::string& word : words) list.push_back(word.c_str());
+        out.str("");
+        errors.str("");
+        Options options;
+        if (const auto status =
+                parseOptions(static_cast<int>(list.size()), list.data(), options, out, errors))
+            return *status;
+        const bool simulated = options.address && options.address->simulated;
+        const auto front =
+            simulated ? makeSimulatorFront(options.home) : makePortFront(options.home);
+        return runTool(options, *front, out, errors);
+    }
+    int runConnected(std::vector<std::string> words) {
+        words.insert(words.begin(), {"--connect", "sim:"});
+        return run(std::move(words));
+    }
+    Texts printed() const {
+        Texts lines;
+        std::istringstream in(out.str());
+        for (std::string line; std::getline(in, line);) lines.push_back(line);
+        return lines;
+    }
+    Folder folder;
+    std::ostringstream out;
+    std::ostringstream errors;
+};
+
+TEST_F(FileVerbsTest, Sweep_SavesTheViewBesideTheRows) {
+    EXPECT_EQ(runConnected({"sweep", "--output", folder.file("view.csv")}), kDone);
+    EXPECT_EQ(printed().size(), 302U);
+    const Texts lines = linesOf(folder.read("view.csv"));
+    ASSERT_GT(lines.size(), 301U);
+    EXPECT_EQ(lines[0], "Trace Name;Analyzer");
+    EXPECT_EQ(errors.str(), "");
+}
+
+TEST_F(FileVerbsTest, Show_PrintsWhatSweepSaved) {
+    ASSERT_EQ(runConnected({"sweep", "--output", folder.file("view.csv")}), kDone);
+    const Texts swept = printed();
+    EXPECT_EQ(run({"show", folder.file("view.csv")}), kDone);
+    const Texts shown = printed();
+    ASSERT_EQ(shown.size(), swept.size());
+    EXPECT_EQ(shown[0], "x,value1,value2");
+    EXPECT_EQ(shown[1], swept[1]);
+    EXPECT_EQ(shown[301], swept[301]);
+}
+
+TEST_F(FileVerbsTest, Show_ClipsAsTheGraphDoes) {
+    folder.write("view.csv",
+                 "Reference Unit;dBm\r\nReference Range;10 dB/div\r\nReference Level;-20\r\n"
+                 "Trace Write Pointer;301\r\n\r\n1.000;5; \r\n2.000;-300; \r\n");
+    EXPECT_EQ(run({"show", folder.file("view.csv")}), kDone);
+    EXPECT_EQ(printed(), (Texts{"x,value", "1,-20", "2,-120"}));
+}
+
+TEST_F(FileVerbsTest, Record_WritesTracesAndShowPrintsEach) {
+    EXPECT_EQ(runConnected({"record", "--interval", "0.5", "--count", "3", "--output",
+                            folder.file("trace.csv")}),
+              kDone);
+    EXPECT_EQ(out.str(), "");
+    EXPECT_EQ(run({"show", folder.file("trace.csv")}), kDone);
+    const Texts shown = printed();
+    ASSERT_EQ(shown.size(), 1U + 3 * 301 + 2);
+    EXPECT_EQ(shown[302], "");
+    EXPECT_NE(shown[303], "");
+}
+
+TEST_F(FileVerbsTest, WhatCannotBeWritten_IsAFailure) {
+    EXPECT_EQ(runConnected({"sweep", "--output", folder.file("gone/view.csv")}), kLinkFailed);
+    EXPECT_NE(errors.str().find("box[critical] ZELRemote | The file "), std::string::npos);
+    EXPECT_EQ(runConnected({"record", "--interval", "1", "--count", "2", "--output",
+                            folder.file("gone/view.csv")}),
+              kLinkFailed);
+}
+
+TEST_F(FileVerbsTest, WhatCannotBeRead_IsAFailure) {
+    EXPECT_EQ(run({"show", folder.file("gone.csv")}), kLinkFailed);
+    EXPECT_NE(errors.str().find("No such file or directory"), std::string::npos);
+    folder.write("empty.csv", "");
+    EXPECT_EQ(run({"show", folder.file("empty.csv")}), kLinkFailed);
+    EXPECT_NE(errors.str().find("holds no rows"), std::string::npos);
+}
+
+TEST_F(FileVerbsTest, WrongUse_IsTold) {
+    EXPECT_EQ(run({"show"}), kWrongUse);
+    EXPECT_EQ(runConnected({"record", "--interval", "1", "--count", "2"}), kWrongUse);
+    EXPECT_EQ(runConnected({"record", "--interval", "0", "--count", "2", "--output", "x"}),
+              kWrongUse);
+    EXPECT_EQ(runConnected({"record", "--interval", "1", "--count", "0", "--output", "x"}),
+              kWrongUse);
+    EXPECT_EQ(run({"record", "--interval", "1", "--count", "1", "--output", "x"}), kWrongUse);
+    EXPECT_EQ(run({"show", "x", "--image", "x.gif"}), kWrongUse);
+}
+
+}  // namespace
+}  // namespace zel

@@ -1,0 +1,188 @@
+// The panel in every menu and mode, in both themes, from the smallest window to a large one:
+// nothing is cut, nothing lies on anything else. The pictures are left beside the test's program.
+
+#include <QAbstractItemView>
+
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+namespace {
+
+struct Look {
+    const char* name;
+    ThemeChoice theme;
+    QSize size;
+};
+
+struct Scene {
+    const char* name;
+    Button ControllerForm::*key;  ///< null: as it stands behind the connection
+    std::int16_t state;
+};
+
+using CF = ControllerForm;
+const Scene kScenes[] = {
+    {"frequency", nullptr, CF::Freq},
+    {"span", &CF::SpanButton, CF::SPAN},
+    {"amplitude", &CF::AmplitudeButton, CF::AMPT},
+    {"bandwidth", &CF::BWButton, CF::BW},
+    {"sweep", &CF::SweepButton, CF::SWEEP},
+    {"trace", &CF::TraceButton, CF::TRACE},
+    {"measurement", &CF::MeasButton, CF::MEAS},
+    {"marker", &CF::MarkerButton, CF::Marker},
+    {"tracking", &CF::TrackButton1, CF::TRACKINGGEN},
+    {"power", &CF::PwrButton, CF::POWER},
+    {"channel", &CF::ChnPwrButton, CF::CHNPOWER},
+    {"occupied", &CF::OccBWButton, CF::OCCBW},
+    {"tdma", &CF::TDMAButton, CF::TDMA},
+    {"fault", &CF::DistFaultButton, CF::DISTFAULT},
+};
+
+class Looks : public Desk, public testing::WithParamInterface<Look> {
+  protected:
+    void SetUp() override {
+        applyTheme(testApplication(), GetParam().theme);
+        connect();
+        window->resize(GetParam().size);
+        show();
+    }
+    ~Looks() override { applyTheme(testApplication(), ThemeChoice::Dark); }
+
+    /// The controls that can be seen, of the kinds that have a place of their own.
+    std::vector<QWidget*> seen() {
+        std::vector<QWidget*> widgets;
+        for (const Control* control : panel().controls()) {
+            if (control->kind() == ControlKind::Picture || control->kind() == ControlKind::Frame)
+                continue;
+            auto* widget = widgetOf<QWidget>(*control);
+            if (widget != nullptr && widget->isVisible()) widgets.push_back(widget);
+        }
+        return widgets;
+    }
+
+    QRect placeOf(const QWidget& widget) {
+        return {widget.mapTo(window.get(), QPoint()), widget.size()};
+    }
+
+    void expectSound(const char* scene) {
+        EXPECT_EQ(window->size(), GetParam().size) << scene;
+        const std::vector<QWidget*> widgets = seen();
+        for (const QWidget* widget : widgets) {
+            const std::string name = std::string(scene) + ": " + widget->objectName().toStdString();
+            EXPECT_TRUE(window->rect().contains(placeOf(*widget))) << name;
+            if (const auto* button = qobject_cast<const QPushButton*>(widget)) {
+                QSize needed;
+                for (const QString& line : button->text().split('\n'))
+                    needed = needed.expandedTo(button->fontMetrics().size(0, line));
+                EXPECT_LE(needed.width(), button->width()) << name;
+                EXPECT_LE(needed.height() * (button->text().count('\n') + 1), button->height())
+                    << name;
+            }
+            if (const auto* label = qobject_cast<const QLabel*>(widget)) {
+                const QSize text = label->fontMetrics().size(0, label->text());
+                EXPECT_LE(text.width(), label->width()) << name;
+                EXPECT_LE(text.height(), label->height()) << name;
+            }
+            for (const QWidget* other : widgets) {
+                const bool apart =
+                    other == widget || other->isAncestorOf(widget) || widget->isAncestorOf(other);
+                EXPECT_TRUE(apart || !placeOf(*widget).intersects(placeOf(*other)))
+                    << name << " on " << other->objectName().toStdString();
+            }
+        }
+    }
+};
+
+TEST_P(Looks, EveryMenu_FitsTheWindowWithNothingCut) {
+    for (const Scene& scene : kScenes) {
+        if (scene.key != nullptr) {
+            if (panel().InstrumentMode != CF::ANALYZER) panel().AnalyzerButton.Click();
+            (panel().*scene.key).Click();
+        }
+        ASSERT_EQ(panel().State, scene.state) << scene.name;
+        show();
+        expectSound(scene.name);
+        EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-" + scene.name));
+    }
+}
+
+TEST_P(Looks, SubMenus_FitTheWindowWithNothingCut) {
+    panel().MeasButton.Click();
+    panel().SoftKey(1).Click();
+    ASSERT_EQ(panel().State, CF::MEAS_TRD);
+    show();
+    expectSound("transducers");
+    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-transducers"));
+    panel().SoftKey(4).Click();
+    panel().SoftKey(2).Click();
+    ASSERT_EQ(panel().State, CF::MEAS_LLINES);
+    show();
+    expectSound("limits");
+    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-limits"));
+}
+
+TEST_P(Looks, MarkersAndTheirKeys_FitTheWindowWithNothingCut) {
+    panel().MarkerCheckBox.Click();
+    panel().DeltaCheckBox.Click();
+    panel().MarkPkButton.Click();
+    show();
+    ASSERT_FALSE(panel().DeltaLabel.Caption.get().empty());
+    expectSound("markers");
+    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-markers"));
+}
+
+TEST_P(Looks, OpenList_ShowsEveryEntryWhole) {
+    panel().BWButton.Click();
+    show();
+    auto* list = widgetOf<QComboBox>(panel().ChoiceBox(2));
+    list->showPopup();
+    QApplication::processEvents();
+    const QAbstractItemView& view = *list->view();
+    ASSERT_EQ(list->count(), 13);
+    for (int i = 0; i < list->count(); ++i) {
+        const QRect place = view.visualRect(list->model()->index(i, 0));
+        EXPECT_GE(place.top(), 0) << i;
+        EXPECT_LE(place.bottom(), view.viewport()->height()) << i;
+        EXPECT_LE(view.fontMetrics().horizontalAdvance(list->itemText(i)), view.viewport()->width())
+            << i;
+    }
+    EXPECT_TRUE(savePicture(*view.window(), QString(GetParam().name) + "-list"));
+    list->hidePopup();
+}
+
+TEST_P(Looks, ContinuousView_FitsTheWindowWithNothingCut) {
+    platform.events.schedule(900, [this] {
+        show();
+        ASSERT_TRUE(panel().ContinuosLoopActive);
+        expectSound("continuous");
+        EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-continuous"));
+        panel().StopButton.Click();
+    });
+    panel().PlayContinuousButton.Click();
+    EXPECT_FALSE(panel().ContinuosLoopActive);
+}
+
+TEST_P(Looks, PlaybackBarAndProgress_FitTheWindowWithNothingCut) {
+    panel().PlaybackFrame.Visible = true;
+    panel().FileLabel.Caption = "Trace 117 of 300 (12/24/2026 11:59:59)";
+    panel().StopButton.Visible = true;
+    panel().ManualCommandText.Text = "TRACEDET";
+    panel().ManualCommandTextAnsw.Text = "0";
+    panel().ManualCommandTextAnsw.ForeColor = 32896;
+    show();
+    expectSound("playback");
+    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-playback"));
+}
+
+INSTANTIATE_TEST_SUITE_P(Sizes, Looks,
+                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
+                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
+                                         Look{"dark-1280x760", ThemeChoice::Dark, {1280, 760}},
+                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
+                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
+                         [](const auto& look) {
+                             return QString(look.param.name).replace('-', '_').toStdString();
+                         });
+
+}  // namespace
+}  // namespace zel

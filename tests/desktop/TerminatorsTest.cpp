@@ -1,0 +1,168 @@
+// Numeric entry: terminator keys, digits without a focus, pastes.
+
+#include <QClipboard>
+#include <QTest>
+
+#include "desktop/windows/Terminators.h"
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+namespace {
+
+class EntryDesk : public Desk {
+  protected:
+    void SetUp() override {
+        connect();
+        show();
+    }
+    TerminatorRow& row() {
+        return *static_cast<TerminatorRow*>(window->findChild<QWidget*>("TerminatorRow"));
+    }
+    QLineEdit* box(int position) { return widgetOf<QLineEdit>(panel().SoftTextBox(position)); }
+    QStringList captions() {
+        row().refresh();
+        QStringList texts;
+        for (const QPushButton* key : row().keys())
+            if (key->isVisible()) texts << key->text();
+        return texts;
+    }
+    void press(const char* keys) { QTest::keySequence(window.get(), QKeySequence(keys)); }
+};
+
+TEST_F(EntryDesk, NumberAndAltM_SendMegahertz) {
+    box(0)->setFocus();
+    QTest::keyClicks(box(0), "900");
+    press("Alt+M");
+    EXPECT_EQ(program->variables().CenterFrequency, 900e6);
+    window->binder().flush();
+    EXPECT_EQ(widgetOf<QLabel>(panel().CFLabel)->text(), "Center: 900 MHz");
+}
+
+TEST_F(EntryDesk, EachTerminator_HasItsFactor) {
+    const std::pair<const char*, double> cases[] = {{"Alt+G", 2e9}, {"Alt+M", 2e6}, {"Alt+K", 2e3}};
+    for (const auto& [keys, value] : cases) {
+        box(0)->setFocus();
+        QTest::keyClicks(box(0), "2");
+        press(keys);
+        EXPECT_EQ(program->variables().CenterFrequency, value) << keys;
+    }
+}
+
+TEST_F(EntryDesk, ClickedTerminator_SendsAndLeavesTheFocusInTheBox) {
+    box(0)->setFocus();
+    QTest::keyClicks(box(0), "1.25");
+    QTest::mouseClick(row().keys()[0], Qt::LeftButton);
+    EXPECT_EQ(program->variables().CenterFrequency, 1.25e9);
+    EXPECT_EQ(window->focusWidget(), box(0));
+}
+
+TEST_F(EntryDesk, TerminatorWithoutANumber_SendsNothing) {
+    const double before = program->variables().CenterFrequency;
+    panel().SpanButton.Click();
+    show();
+    press("Alt+M");
+    EXPECT_EQ(program->variables().Span, 3e9);
+    EXPECT_EQ(program->variables().CenterFrequency, before);
+    EXPECT_EQ(panel().SoftTextBox(0).Text.get(), "3 GHz");
+    EXPECT_EQ(window->focusWidget(), box(0));
+}
+
+TEST_F(EntryDesk, TerminatorBehindANumberWithAUnit_SendsNothing) {
+    box(0)->setFocus();
+    QTest::keyClicks(box(0), "900M");
+    press("Alt+G");
+    EXPECT_EQ(program->variables().CenterFrequency, 1.5e9);
+    EXPECT_EQ(panel().SoftTextBox(0).Text.get(), "900M");
+}
+
+TEST_F(EntryDesk, TimesLevelsAndTexts_HaveTerminatorsOfTheirOwn) {
+    EXPECT_EQ(captions(), QStringList({"GHz", "MHz", "kHz", "Hz"}));
+    panel().SweepButton.Click();
+    show();
+    EXPECT_EQ(captions(), QStringList({"s", "ms", "µs"}));
+    panel().AmplitudeButton.Click();
+    show();
+    EXPECT_EQ(captions(), QStringList({"dBm"}));
+    box(3)->setFocus();
+    EXPECT_EQ(captions(), QStringList({"dB"}));
+    panel().DistFaultButton.Click();
+    show();
+    box(0)->setFocus();
+    EXPECT_EQ(captions(), QStringList({"Enter"}));
+    panel().TrackButton1.Click();
+    show();
+    EXPECT_EQ(captions(), QStringList());
+}
+
+TEST_F(EntryDesk, AltMInATime_SendsMilliseconds) {
+    panel().SweepButton.Click();
+    show();
+    box(0)->setFocus();
+    QTest::keyClicks(box(0), "50");
+    press("Alt+M");
+    EXPECT_NEAR(program->variables().SweepTime, 0.05, 1e-12);
+}
+
+TEST_F(EntryDesk, MarkerInDistanceToFault_IsALength) {
+    panel().State = ControllerForm::Marker;
+    panel().InstrumentMode = ControllerForm::DISTTOFAULTMEASURE;
+    QStringList texts;
+    for (const Terminator& key : terminatorsOf(panel(), program->variables(), 0))
+        texts << key.caption;
+    EXPECT_EQ(texts, QStringList({"m", "cm", "mm"}));
+}
+
+TEST_F(EntryDesk, TriggerLevel_IsALevelAndTriggerDelayATime) {
+    panel().SweepButton.Click();
+    panel().SoftKey(4).Caption = "TRIGGER\r\nLEVEL";
+    EXPECT_STREQ(terminatorsOf(panel(), program->variables(), 4)[0].caption, "dBm");
+    panel().SoftKey(4).Caption = "TRIGGER\r\nDELAY";
+    EXPECT_STREQ(terminatorsOf(panel(), program->variables(), 4)[0].caption, "s");
+}
+
+TEST_F(EntryDesk, DigitsTypedAnywhere_GoToTheBoxOfTheRedKey) {
+    panel().SoftKey(1).Click();
+    show();
+    widgetOf<QWidget>(panel().SpanButton)->setFocus();
+    QTest::keyClick(widgetOf<QWidget>(panel().SpanButton), Qt::Key_5);
+    EXPECT_EQ(window->focusWidget(), box(1));
+    EXPECT_EQ(panel().SoftTextBox(1).Text.get(), "5");
+    QTest::keyClick(box(1), Qt::Key_0);
+    press("Alt+M");
+    EXPECT_EQ(program->variables().Span, 50e6);
+}
+
+TEST_F(EntryDesk, LettersTypedAnywhere_BeginNoEntry) {
+    const std::string before = panel().SoftTextBox(0).Text;
+    QTest::keyClick(&window->graph(), Qt::Key_X);
+    EXPECT_EQ(panel().SoftTextBox(0).Text.get(), before);
+    EXPECT_EQ(window->focusWidget(), &window->graph());
+}
+
+TEST_F(EntryDesk, DigitWithoutAnyBox_IsDropped) {
+    panel().TrackButton1.Click();
+    show();
+    window->graph().setFocus();
+    QTest::keyClick(&window->graph(), Qt::Key_5);
+    EXPECT_EQ(window->focusWidget(), &window->graph());
+}
+
+TEST_F(EntryDesk, PastedValue_StaysForItsEnter) {
+    box(0)->setFocus();
+    box(0)->selectAll();
+    QApplication::clipboard()->setText("850M");
+    QTest::keySequence(box(0), QKeySequence::Paste);
+    EXPECT_EQ(panel().SoftTextBox(0).Text.get(), "850M");
+    QTest::keyClick(box(0), Qt::Key_Return);
+    EXPECT_EQ(program->variables().CenterFrequency, 850e6);
+}
+
+TEST(BareNumber, IsANumberWithoutAUnit) {
+    for (const char* text : {"900", " 1.5", "15. ", "-35", "+2", ".5", "1e3"})
+        EXPECT_TRUE(isBareNumber(text)) << text;
+    for (const char* text : {"", "-", ".", "900M", "1.5 GHz", "1 2", "abc", "1.2.3", "1,5"})
+        EXPECT_FALSE(isBareNumber(text)) << text;
+}
+
+}  // namespace
+}  // namespace zel
