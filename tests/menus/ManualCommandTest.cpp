@@ -71,6 +71,7 @@ TEST_P(StatusAnswer, StatusLine_IsTranslated) {
 
 INSTANTIATE_TEST_SUITE_P(Answers, StatusAnswer,
                          ::testing::Values(AnswerRow{"GET", "0", "<Ack>: 0"},
+                                           AnswerRow{"set", "0", "<Ack>: 0"},
                                            AnswerRow{"cmd", "1", "<Rejected>: 1"},
                                            AnswerRow{"Set", "2", "<Wrong Modus>: 2"},
                                            AnswerRow{"WAIT", "5", "5"}));
@@ -80,6 +81,41 @@ TEST_F(ManualCommandTest, DataLine_ReadsTwoAnswersAndDropsTheStatus) {
     send("FREQ");
     expectPlayed();
     EXPECT_EQ(shown(), "1500000000");
+}
+
+TEST_F(ManualCommandTest, DataLine_WhoseAnswerIsASingleZero_IsShownAsAnAcknowledgement) {
+    port.expect("FREQ\r").answer("0\r");  // no value comes behind the status
+    send("FREQ");
+    EXPECT_EQ(shown(), "Ack>: 0");  // the first character goes, as of any data
+    EXPECT_EQ(panel.MousePointer.get(), 0);
+}
+
+TEST_F(ManualCommandTest, DataLineOnTcp_TakesTheRestOfTheBuffer) {
+    panel.ConnectionState = CF::TCPCON;
+    port.close();
+    platform.tcpSocket.connectTo("host", 2277);
+    platform.events.pump();
+    platform.tcpSocket.expect("FREQ\r").answer("0\r1500000000\r");
+    platform.tcpSocket.expect("GET\r").answer("0\r");
+    send("FREQ");
+    EXPECT_EQ(shown(), "1500000000");
+    send("GET");
+    EXPECT_EQ(shown(), "<Ack>: 0");
+    EXPECT_EQ(platform.tcpSocket.failure(), "");
+    EXPECT_EQ(platform.tcpSocket.leftOver(), "");
+}
+
+TEST_F(ManualCommandTest, ConnectionThatGoesWhileEventsRun_IsToldInItsOwnWords) {
+    platform.events.schedule(0, [this] { panel.isConnected = false; });
+    send("WAIT");
+    EXPECT_EQ(boxes.texts(), Texts{"Please Connect to the Instrument first."});
+    EXPECT_EQ(port.written(), "");
+    EXPECT_EQ(panel.MousePointer.get(), 0);
+}
+
+TEST_F(ManualCommandTest, FirstKeyStates_BeginAtOne) {
+    EXPECT_EQ(panel.ManualFirstKey, 1);
+    EXPECT_EQ(panel.SoftBoxFirstKey, 1);
 }
 
 TEST_F(ManualCommandTest, LineBehindSet_IsReadAsAStatus) {
@@ -165,6 +201,11 @@ TEST_F(ManualCommandTest, Typing_ReplacesTheDefaultTextAndEnterSends) {
     typeText(panel.ManualCommandText, "WAIT\r");
     expectPlayed();
     EXPECT_EQ(shown(), "<Ack>: 0");
+}
+
+TEST_F(ManualCommandTest, AnyKeyDown_TakesTheDefaultTextAway) {
+    pressKey(panel.ManualCommandText, kKeyRight);
+    EXPECT_EQ(panel.ManualCommandText.Text.get(), "");
 }
 
 TEST_F(ManualCommandTest, EditKey_KeepsTheText) {

@@ -395,6 +395,16 @@ TEST_F(SoftKeyTest, TransducerKeys_AskAndSwitchOff) {
     EXPECT_EQ(panel.SoftTextBox(0).Text.get(), "0");
 }
 
+TEST_F(SoftKeyTest, TransducerOff_WithSetSelected_SendsNothing) {
+    open(kMeas);
+    get("TRD2", "0");
+    panel.SoftKey(1).Click();
+    panel.SetOption.setValue(true);
+    panel.SoftKey(2).Click();
+    panel.SoftKey(3).Click();
+    expectPlayed();
+}
+
 TEST_F(SoftKeyTest, LimitKeys_AskTheirLines) {
     open(kMeas);
     get("LIMPASS", "1");

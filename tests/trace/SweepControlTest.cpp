@@ -208,6 +208,14 @@ TEST_F(SweepControlTest, Stop_EndsARecordingToo) {
     EXPECT_FALSE(panel.STOPFlag);
 }
 
+TEST_F(SweepControlTest, Stop_BringsTheKeyOfTheViewBackEnabled) {
+    panel.PlayContinuousButton.Visible = false;
+    panel.PlayContinuousButton.Enabled = false;
+    panel.StopButton.Click();
+    EXPECT_TRUE(panel.PlayContinuousButton.Visible);
+    EXPECT_TRUE(panel.PlayContinuousButton.Enabled);
+}
+
 TEST_F(SweepControlTest, Stop_InThePowerMenu_ClosesItsDialog) {
     panel.State = ControllerForm::POWER;
     forms.powerAndRefl.Show();
@@ -321,6 +329,20 @@ TEST_F(PowerReadoutTest, Continuous_AsksInTheDialogAndReadsUntilStop) {
     expectIdle();
     EXPECT_TRUE(panel.PlaySingleButton.Enabled);
     EXPECT_TRUE(panel.CWGraph1.values().empty());
+}
+
+TEST_F(PowerReadoutTest, Continuous_DuringAReading_TheSingleKeyIsDisabled) {
+    choose(false);
+    get("PWR", "1");
+    bool enabled = true;
+    panel.SoftTextBox(0).Changed.connect([&] {
+        enabled = panel.PlaySingleButton.Enabled;
+        if (panel.StopButton.Visible) panel.StopButton.Click();
+    });
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_FALSE(enabled);
+    EXPECT_TRUE(panel.PlaySingleButton.Enabled);
 }
 
 TEST_F(PowerReadoutTest, Continuous_WithReflection_ReadsBothInEachRound) {
