@@ -88,17 +88,23 @@ std::string BareLine::get(std::string_view word) {
     return std::string(line());
 }
 
-void BareLine::command(std::string_view word) {
+void BareLine::order(std::string_view kind, std::string_view text) {
     buffer_.clear();
     taken_ = 0;
-    write("cmd\r");
+    write(kind);
     accepted();
-    write(std::string(word) + "\r");
+    write(std::string(text) + "\r");
     accepted();
 }
 
+void BareLine::set(std::string_view setting) { order("set\r", setting); }
+
 void BareLine::sweep() {
     for (const char* word : kSettings) get(word);
+    pass();
+}
+
+void BareLine::pass() {
     command("WAIT");
     buffer_.clear();
     taken_ = 0;

@@ -18,12 +18,17 @@ class BareLine {
 
     /// The words of a full read cycle, in its order; the samples are read and not looked at.
     void sweep();
+    /// The words of a pass of the continuous view: the wait for the sweep, and its samples.
+    void pass();
+    std::string get(std::string_view word);
+    /// Keyword, comma, value.
+    void set(std::string_view setting);
     /// Bytes on the line so far, both ways.
     std::size_t bytes() const { return bytes_; }
 
   private:
-    std::string get(std::string_view word);
-    void command(std::string_view word);
+    void command(std::string_view word) { order("cmd\r", word); }
+    void order(std::string_view kind, std::string_view text);
     void write(std::string_view bytes);
     void readMore();
     std::string_view line();

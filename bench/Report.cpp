@@ -11,6 +11,7 @@
 #include "bench/Conversion.h"
 #include "bench/Figures.h"
 #include "bench/Files.h"
+#include "bench/PanelWork.h"
 #include "bench/Redraw.h"
 #include "bench/SweepRate.h"
 #include "bench/Windows.h"
@@ -62,6 +63,10 @@ int main(int argc, char** argv) {
         {'d', "redraw", [] { return zelbench::graphRedraw(); }},
         {'e', "idle", [&] { return zelbench::idleShare(panel, simulator); }},
         {'f', "first paint", [&] { return zelbench::firstPaint(panel, empty); }},
+        {'g', "setting", [&] { return zelbench::settingCost(simulator); }},
+        {'h', "menus", [&] { return zelbench::menusAgain(simulator); }},
+        {'i', "view", [&] { return zelbench::continuousPaced(simulator); }},
+        {'i', "view", [&] { return zelbench::continuousUnpaced(simulator); }},
         {'j', "load", [] { return zelbench::loadRate(); }},
         {'j', "load", [] { return zelbench::loadBesidePlainPass(); }},
         {'k', "view", [] { return zelbench::viewWriting(); }},
