@@ -28,6 +28,7 @@ constexpr double kIntervals = 300;
 constexpr int kShownBytes = 4 * 1024 * 1024;
 constexpr int kFirstLogEntry = 3;
 
+constexpr const char* kFaultLocation = "Fault Location";
 constexpr const char* kAutoPeak = "Auto Peak";
 constexpr const char* kLinear = "lin 0 - 100%";
 
@@ -170,19 +171,21 @@ ViewReader::Header ViewReader::readHeader(const std::string& text, const FieldLi
     if (time >= 0)
         header.rowLabel = std::string(lines[time + 1]) + " " + fileTime.substr(0, kDayLength);
     rememberShown(lines, header.mark);
+    const bool distance = panel_.Shown.mode == kFaultLocation;
+    panel_.Shown.xUnit = distance ? "m" : header.zeroSpan ? "s" : "Hz";
     return header;
 }
 
 void ViewReader::rememberShown(const FieldList& lines, int end) {
     struct Entry {
         const char* name;
-        std::string ShownFile::*text;
+        std::string ShownView::*text;
     };
-    constexpr Entry kEntries[] = {{kMeasurementType, &ShownFile::mode},
-                                  {kResolutionBandwidth, &ShownFile::rbw},
-                                  {kVideoBandwidth, &ShownFile::vbw},
-                                  {kSweepTime, &ShownFile::sweepTime},
-                                  {kTraceDetector, &ShownFile::detector}};
+    constexpr Entry kEntries[] = {{kMeasurementType, &ShownView::mode},
+                                  {kResolutionBandwidth, &ShownView::rbw},
+                                  {kVideoBandwidth, &ShownView::vbw},
+                                  {kSweepTime, &ShownView::sweepTime},
+                                  {kTraceDetector, &ShownView::detector}};
     panel_.Shown = {};
     panel_.Shown.fromFile = true;
     for (int i = 0; i < end; ++i)
@@ -334,6 +337,7 @@ void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
     if (zeroSpan) mirror_.Span = 0;
     panel_.Shown = {};
     panel_.Shown.fromFile = true;
+    panel_.Shown.xUnit = zeroSpan ? "s" : "Hz";
     panel_.RawTraceData = values;
     mirror_.TraceDetector = pairs ? DETAUTOPEAK : DETSAMPLE;
     const double increment = xs.size() > 1 ? (xs[1] - xs[0]) / perRow : 0;

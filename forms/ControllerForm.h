@@ -10,9 +10,12 @@
 
 namespace zel {
 
-/// What a loaded file says about the view that is shown. The mirror stays the instrument's, but
-/// for the fields that a file sets; there its range is dB a division and no code.
-struct ShownFile {
+/// What holds for the view on the graph, whatever the instrument does meanwhile. Of a loaded file
+/// it is what the file says: the mirror stays the instrument's, but for the fields that a file
+/// sets, and its range is then dB a division and no code.
+struct ShownView {
+    std::string xUnit;                ///< "Hz", "s", "m"; empty ahead of the first view
+    std::int16_t instrumentMode = 0;  ///< of a sweep; 0 for none
     bool fromFile = false;
     std::string mode;       ///< as the file names it; empty when it does not
     std::string rbw;        ///< Hz
@@ -120,7 +123,7 @@ class ControllerForm : public Form {
     std::vector<double> XVector;
     std::vector<double> YVector;
     std::int16_t YVectorVal = 0;  ///< row number of the current trace in the waterfall
-    ShownFile Shown;              ///< of the view on the graph
+    ShownView Shown;              ///< of the view on the graph
 
     /// Saves the trace just read: "trace" or "power".
     Event<const std::string&> SaveView;
@@ -176,7 +179,7 @@ class ControllerForm : public Form {
     Label SpanLabel{*this, "SpanLabel"};
     Label MarkerLabel{*this, "MarkerLabel"};
     Label DeltaLabel{*this, "DeltaLabel"};
-    Label PaceLabel{*this, "PaceLabel"};  ///< age of the trace, sweeps a second
+    Label PaceLabel{*this, "PaceLabel"};          ///< age of the trace, sweeps a second
     Frame PlaybackFrame{*this, "PlaybackFrame"};  ///< shown while a series of traces is played
     Label FileLabel{*this, "FileLabel"};  ///< progress of a recording or of a file that loads
     TextBox DebugTextBox{*this, "DebugTextBox"};

@@ -155,6 +155,8 @@ bool TraceReader::ReadTraceData(double& /*xFirstRef*/, double& /*xLastRef*/) {
 
 void TraceReader::scaleAndConvert() {
     panel_.Shown = {};
+    panel_.Shown.xUnit = GetDimension(panel_, mirror_);
+    panel_.Shown.instrumentMode = panel_.InstrumentMode;
     conversion_.SelectRawScale();
     panel_.ViewXOffset = panel_.ViewSpan == 0 ? 0 : panel_.ViewStart;
     scaling_.setGraphAxes(panel_.ViewStart, panel_.ViewStop, mirror_.ReferenceLevel,

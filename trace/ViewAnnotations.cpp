@@ -7,8 +7,6 @@
 namespace zel {
 namespace {
 
-constexpr const char* kFaultLocation = "Fault Location";
-
 std::string choiceText(CodeTable table, double code) {
     const CodeRow* row = findCode(table, code);
     if (row == nullptr) return "";
@@ -32,7 +30,7 @@ std::string fileText(const char* name, const std::string& value, const char* uni
 }
 
 /// What only the file knows; the mirror holds the instrument's own state.
-void annotateFile(const ShownFile& shown, ViewAnnotations& view) {
+void annotateFile(const ShownView& shown, ViewAnnotations& view) {
     view.rbw = fileText("RBW ", shown.rbw, "Hz");
     view.vbw = fileText("VBW ", shown.vbw, "Hz");
     view.sweepTime = fileText("SWT ", shown.sweepTime, "s");
@@ -54,8 +52,8 @@ ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& m
     ViewAnnotations view;
     const Graph& graph = panel.CWGraph1;
     view.ok = !graph.values().empty();
-    const bool faultFile = panel.Shown.fromFile && panel.Shown.mode == kFaultLocation;
-    view.xUnit = faultFile ? "m" : GetDimension(panel, mirror);
+    const ShownView& shown = panel.Shown;
+    view.xUnit = shown.xUnit.empty() ? GetDimension(panel, mirror) : shown.xUnit;
     const double range = shownRangeCode(panel, mirror);
     view.unit = verticalUnit(mirror, range);
     if (!view.ok) return view;
@@ -66,9 +64,11 @@ ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& m
     view.vbw = "VBW " + choiceText(CodeTable::VideoBandwidth, mirror.VideoBandwidth);
     view.sweepTime = "SWT " + FormatValue(mirror.SweepTime, "s");
     view.detector = "Det " + choiceText(CodeTable::Detector, mirror.TraceDetector);
-    const CodeRow* mode = findCode(CodeTable::MeasurementMode, panel.InstrumentMode);
+    const CodeRow* mode =
+        findCode(CodeTable::MeasurementMode,
+                 shown.instrumentMode != 0 ? shown.instrumentMode : panel.InstrumentMode);
     if (mode != nullptr) view.mode = std::string(mode->text);
-    if (panel.Shown.fromFile) annotateFile(panel.Shown, view);
+    if (shown.fromFile) annotateFile(shown, view);
     const double left = graph.xAxis().Minimum;
     const double right = graph.xAxis().Maximum;
     view.left = "Start " + FormatValue(left, view.xUnit);

@@ -75,6 +75,17 @@ TEST_F(ShownFileTest, DistanceToFault_IsDrawnOverMetres) {
     EXPECT_EQ(annotateView(panel, mirror).mode, "Fault Location");
 }
 
+TEST_F(ShownFileTest, SweepOfAnotherMode_KeepsItsOwnAxisAndName) {
+    startConnected();
+    fullCycle();
+    bool success = false;
+    program.traces().ReadSingleTrace(success);
+    ASSERT_TRUE(success);
+    panel.InstrumentMode = CF::DISTTOFAULTMEASURE;
+    EXPECT_EQ(annotateView(panel, mirror).xUnit, "Hz");
+    EXPECT_EQ(annotateView(panel, mirror).mode, "Analyzer");
+}
+
 TEST_F(ShownFileTest, NextSelectiveCycle_AsksEverythingOnce) {
     startConnected();
     show(text);
