@@ -23,6 +23,7 @@ constexpr const char* kOtherImages =
 constexpr int kImageFilter = 2;
 constexpr const char* kScriptFolder = "specialMeas";
 constexpr std::size_t kChunk = 4 * 1024 * 1024;
+constexpr std::size_t kLeastRead = 4096;
 
 struct Closer {
     void operator()(std::FILE* file) const { std::fclose(file); }
@@ -91,11 +92,11 @@ std::string FileOps::ReadWholeFile(const std::string& path, const Progress& prog
     const std::uint64_t size = problem ? 0 : told;
     if (size > kLargestFile) fail(path, "it is larger than 2 GB");
     std::string bytes;
-    bytes.reserve(size);
+    bytes.reserve(size + kLeastRead);  // the last read finds the end
     for (std::size_t got = 1; got > 0;) {
         const std::size_t before = bytes.size();
         const std::size_t left = size > before ? static_cast<std::size_t>(size) - before : 0;
-        bytes.resize(before + std::min(kChunk, std::max<std::size_t>(left, 4096)));
+        bytes.resize(before + std::min(kChunk, std::max(left, kLeastRead)));
         got = std::fread(bytes.data() + before, 1, bytes.size() - before, file.get());
         bytes.resize(before + got);
         if (bytes.size() > kLargestFile) fail(path, "it is larger than 2 GB");
