@@ -3,7 +3,7 @@
 namespace zel {
 namespace {
 
-constexpr std::size_t kYieldEvery = 4 * 1024 * 1024;
+constexpr std::size_t kYieldEvery = std::size_t{4} * 1024 * 1024;
 constexpr std::size_t kUsualField = 8;
 
 bool isSeparator(char c) { return c == ';' || c == '\r' || c == '\n'; }

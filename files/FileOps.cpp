@@ -22,7 +22,7 @@ constexpr const char* kOtherImages =
     "|SVG Files (*.svg)|*.svg|PDF Files (*.pdf)|*.pdf|PNG Files (*.png)|*.png";
 constexpr int kImageFilter = 2;
 constexpr const char* kScriptFolder = "specialMeas";
-constexpr std::size_t kChunk = 4 * 1024 * 1024;
+constexpr std::size_t kChunk = std::size_t{4} * 1024 * 1024;
 constexpr std::size_t kLeastRead = 4096;
 
 struct Closer {
@@ -75,7 +75,7 @@ std::string FileOps::ShowOpenDataDialog(int filterIndex) {
     request.filter = kOpenFilter;
     request.filterIndex = filterIndex;
     request.folder = LastOpenFolder;
-    const std::string path = finish(dialogs_.open(request));
+    std::string path = finish(dialogs_.open(request));
     if (!path.empty()) LastOpenFolder = std::filesystem::path(path).parent_path().string();
     return path;
 }

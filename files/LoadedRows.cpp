@@ -60,13 +60,13 @@ int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startInd
     std::vector<double>& xs = panel_.DataXAxisArrayToLoad;
     std::vector<double>& values = panel_.DataValArrayToLoad;
     std::vector<double>& raw = panel_.RawTraceData;
-    const int perRow = autoPeak ? 2 : 1;
+    const std::size_t perRow = autoPeak ? 2 : 1;
     xs.assign(kRows, 0);
-    values.assign(static_cast<std::size_t>(kRows * perRow), 0);
+    values.assign(kRows * perRow, 0);
     raw.assign(values.size(), 0);
     const Scale how = scale();
     const int last = lines.last();
-    int rows = 0;
+    std::size_t rows = 0;
     int i = startIndex;
     while (rows < kRows) {
         while (i <= last && lines[i] == kBlank) ++i;
@@ -75,23 +75,23 @@ int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startInd
             i = last + 1;
             break;
         }
-        if (i + perRow > last) {  // the file ends in the middle of this row
+        if (i + static_cast<int>(perRow) > last) {  // the file ends in the middle of this row
             i = last + 1;
             break;
         }
-        xs[static_cast<std::size_t>(rows)] = fieldNumber(lines[i++]);
-        for (int k = 0; k < perRow; ++k, ++i) {
-            const auto slot = static_cast<std::size_t>(rows * perRow + k);
+        xs[rows] = fieldNumber(lines[i++]);
+        for (std::size_t k = 0; k < perRow; ++k, ++i) {
+            const std::size_t slot = rows * perRow + k;
             raw[slot] = fieldNumber(lines[i]);
             values[slot] = converted(raw[slot], how);
         }
         ++rows;
     }
     nextIndex = i > last ? -1 : i;
-    xs.resize(static_cast<std::size_t>(rows));
-    values.resize(static_cast<std::size_t>(rows * perRow));
+    xs.resize(rows);
+    values.resize(rows * perRow);
     raw.resize(values.size());
-    return rows;
+    return static_cast<int>(rows);
 }
 
 }  // namespace zel

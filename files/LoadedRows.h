@@ -24,7 +24,7 @@ class LoadedRows {
     /// A value of the file in the reference unit, as the graph shows it.
     double ConvertLoadedValue(double value) const;
 
-    static constexpr int kRows = 301;
+    static constexpr std::size_t kRows = 301;
 
   private:
     /// How the values of a trace become what the graph shows.

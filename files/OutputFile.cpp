@@ -73,7 +73,7 @@ std::string OutputFile::replace() const {
 }
 
 std::string OutputFile::close() {
-    const std::string problem = mode_ == Mode::Append ? append() : replace();
+    std::string problem = mode_ == Mode::Append ? append() : replace();
     text_.clear();
     return problem;
 }

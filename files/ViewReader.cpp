@@ -324,7 +324,7 @@ void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
     xs.clear();
     values.clear();
     const int perRow = pairs ? 2 : 1;
-    for (int i = start; static_cast<int>(xs.size()) < LoadedRows::kRows;) {
+    for (int i = start; xs.size() < LoadedRows::kRows;) {
         // A blank closes a row; behind the rows stands the end of the log.
         while (i <= lines.last() && trimmed(lines[i]).empty()) ++i;
         if (i + perRow > lines.last() || contains(lines[i], "END OF LOG")) break;
