@@ -6,6 +6,7 @@
 #include <limits>
 
 #include "model/CodeTables.h"
+#include "platform/KeyInput.h"
 #include "support/NumberText.h"
 #include "support/TimeText.h"
 
@@ -15,6 +16,7 @@ namespace {
 using CF = ControllerForm;
 
 constexpr int kCsvFilter = 4;
+constexpr int kHelpTopic = 1114;
 constexpr int kHourglass = 11;
 constexpr int kResyncMs = 300;
 constexpr int kPassFillStyle = 3;
@@ -63,6 +65,9 @@ Recording::Recording(Forms& forms, ZEL3Variables& mirror, ByteLink& link, Answer
     dialog_.SubmitTimeButton.Clicked.connect([this] { SubmitTimeButton_Click(); });
     dialog_.CancelTimeButton.Clicked.connect([this] { dialog_.unload(1); });
     dialog_.X.Tick.connect([this] { X_Timer(); });
+    dialog_.TimeIntervalBox.KeyDown.connect([this](int key, int) {
+        if (key == kKeyF1) panel_.ShowHelp(kHelpTopic);
+    });
     panel_.UpNow.Tick.connect([this] { showProgress(); });
     // Stop need not wait for the next tick, which may be hours away.
     panel_.StopButton.Clicked.connect([this] {

@@ -21,6 +21,7 @@
 #include "link/CommandExchange.h"
 #include "model/FrequencyLabels.h"
 #include "panel/HardKeys.h"
+#include "panel/HelpKeys.h"
 #include "panel/ManualCommand.h"
 #include "panel/MarkerKeys.h"
 #include "panel/MarkerReadout.h"
@@ -34,6 +35,7 @@
 #include "shell/ProgramEnd.h"
 #include "shell/ServerMode.h"
 #include "shell/StartUp.h"
+#include "support/RoboHelp_CSH.h"
 #include "trace/GraphInteraction.h"
 #include "trace/GraphScaling.h"
 #include "trace/ManualScale.h"
@@ -85,6 +87,8 @@ struct Program::Rooms {
           modeKeys(forms, mirror, exchange, softPanel, fill, scaling, p.events, p.boxes),
           markerKeys(panel, mirror, exchange, markerReadout, traces, p.events, p.boxes),
           manualCommand(panel, line, link, reader, p.events, p.boxes),
+          helpKeys(panel),
+          help(p.folder, p.launcher, p.boxes),
           sessionClock(panel, p.clock),
           profiles(panel, forms.main, p.settings),
           handshake(forms, mirror, line, link, reader, exchange, labels, softPanel, fill, p.events,
@@ -102,6 +106,7 @@ struct Program::Rooms {
           end(forms, p.boxes) {
         panel.CommandLine = std::move(commandLine);
         timers.attach(panel.UpNow);
+        panel.ShowHelp.connect([this](int context) { help.showTopic(context); });
         timers.attach(panel.PaceTimer);
         timers.attach(forms.time.X);
         viewReader.FileLoaded.connect([this](const std::string& path) { recent.add(path); });
@@ -147,6 +152,8 @@ struct Program::Rooms {
     ModeKeys modeKeys;
     MarkerKeys markerKeys;
     ManualCommand manualCommand;
+    HelpKeys helpKeys;
+    RoboHelp_CSH help;
     SessionClock sessionClock;
     Profiles profiles;
     Handshake handshake;
