@@ -93,7 +93,11 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     graph_->setFocus();
 }
 
-MainWindow::~MainWindow() { windows_.clear(); }
+MainWindow::~MainWindow() {
+    windows_.clear();
+    // The widgets outlive the binder, and the focus wanders while they go.
+    QObject::disconnect(qApp, nullptr, terminators_, nullptr);
+}
 
 void MainWindow::drawImage(const std::string& path, std::string& problem) {
     QString error;
