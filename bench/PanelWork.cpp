@@ -105,10 +105,11 @@ Figure settingCost(const std::string& simulator) {
                 desk.paint();
             }
         });
-        if (desk.session.bytes() - before != leastBytes)
+        if (desk.session.bytes() - before != leastBytes) {
             throw std::runtime_error(
                 "the two loops differ in bytes: " + std::to_string(desk.session.bytes() - before) +
                 " and " + std::to_string(leastBytes));
+        }
         whole.push_back(full / kSettings);
         bare.push_back(least / kSettings);
         extra.push_back((full - least) / kSettings);

@@ -16,6 +16,7 @@ struct FileVerbsTest : ::testing::Test {
     int run(std::vector<std::string> words) {
         words.insert(words.begin(), {"zelctl", "--home", folder.file("home")});
         std::vector<const char*> list;
+        list.reserve(words.size());
         for (const std::string& word : words) list.push_back(word.c_str());
         out.str("");
         errors.str("");

@@ -177,10 +177,12 @@ TEST_F(GraphDesk, Png_IsWrittenWithThePlot) {
     const QImage image(file);
     EXPECT_EQ(image.size(), QSize(2000, 1240));
     int tracePixels = 0;
-    for (int y = 0; y < image.height(); y += 2)
-        for (int x = 0; x < image.width(); x += 2)
-            if (const QColor c = image.pixelColor(x, y); c.red() > 200 && c.blue() < 120)
-                ++tracePixels;
+    for (int y = 0; y < image.height(); y += 2) {
+        for (int x = 0; x < image.width(); x += 2) {
+            const QColor c = image.pixelColor(x, y);
+            if (c.red() > 200 && c.blue() < 120) ++tracePixels;
+        }
+    }
     EXPECT_GT(tracePixels, 1000);
 }
 

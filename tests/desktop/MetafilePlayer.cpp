@@ -128,6 +128,7 @@ class Player {
 
     std::vector<QPoint> counted() {
         std::vector<QPoint> points;
+        points.reserve(static_cast<std::size_t>(p(0)));
         if (end_ != parameters_ + 2 + qsizetype{p(0)} * 4) fault("count of points");
         for (int i = 0; i < p(0); ++i) points.emplace_back(p(1 + 2 * i), p(2 + 2 * i));
         return points;

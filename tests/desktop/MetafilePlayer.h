@@ -52,7 +52,7 @@ struct PlayedMetafile {
     std::vector<Drawn> drawn;
 
     std::vector<Drawn> of(Drawn::Kind kind) const;
-    const Drawn* text(const std::string& text) const;
+    const Drawn* text(const std::string& wanted) const;
 };
 
 PlayedMetafile playMetafile(const QByteArray& file);

@@ -183,21 +183,21 @@ TEST(Windows1252, EachSign_HasItsByteOrASensibleStandIn) {
 TEST(PolylineClip, Line_IsCutWhereItCrossesTheEdge) {
     const auto parts = clipPolyline({{-10, 5}, {5, 5}, {5, 20}}, {0, 0, 10, 10});
     ASSERT_EQ(parts.size(), 1U);
-    EXPECT_EQ(parts[0], QPolygonF({{0, 5}, {5, 5}, {5, 10}}));
+    EXPECT_EQ(parts[0], (QPolygonF{QPointF{0, 5}, QPointF{5, 5}, QPointF{5, 10}}));
 }
 
 TEST(PolylineClip, LineThatComesBack_HasTwoParts) {
     const auto parts = clipPolyline({{2, 5}, {2, 50}, {4, 50}, {4, 5}}, {0, 0, 10, 10});
     ASSERT_EQ(parts.size(), 2U);
-    EXPECT_EQ(parts[0], QPolygonF({{2, 5}, {2, 10}}));
-    EXPECT_EQ(parts[1], QPolygonF({{4, 10}, {4, 5}}));
+    EXPECT_EQ(parts[0], (QPolygonF{QPointF{2, 5}, QPointF{2, 10}}));
+    EXPECT_EQ(parts[1], (QPolygonF{QPointF{4, 10}, QPointF{4, 5}}));
 }
 
 TEST(PolylineClip, PeakPastTheEdge_KeepsItsSlopes) {
     const auto parts = clipPolyline({{0, 0}, {5, 20}, {10, 0}}, {0, 0, 10, 10});
     ASSERT_EQ(parts.size(), 2U);
-    EXPECT_EQ(parts[0], QPolygonF({{0, 0}, {2.5, 10}}));
-    EXPECT_EQ(parts[1], QPolygonF({{7.5, 10}, {10, 0}}));
+    EXPECT_EQ(parts[0], (QPolygonF{QPointF{0, 0}, QPointF{2.5, 10}}));
+    EXPECT_EQ(parts[1], (QPolygonF{QPointF{7.5, 10}, QPointF{10, 0}}));
 }
 
 TEST(PolylineClip, LineThatIsSeenBetweenItsPointsOnly_Remains) {
@@ -222,15 +222,16 @@ TEST(PolylineClip, PointThatIsNoNumber_InterruptsTheLine) {
     const auto parts =
         clipPolyline({{1, 1}, {2, 2}, {nan, 3}, {4, 4}, {5, 5}, {6, inf}}, {0, 0, 10, 10});
     ASSERT_EQ(parts.size(), 2U);
-    EXPECT_EQ(parts[0], QPolygonF({{1, 1}, {2, 2}}));
-    EXPECT_EQ(parts[1], QPolygonF({{4, 4}, {5, 5}}));
+    EXPECT_EQ(parts[0], (QPolygonF{QPointF{1, 1}, QPointF{2, 2}}));
+    EXPECT_EQ(parts[1], (QPolygonF{QPointF{4, 4}, QPointF{5, 5}}));
 }
 
 TEST(MetafileEngine, Polyline_StaysInsideOfTheClip) {
     const PlayedMetafile played = painted([](QPainter& painter) {
         painter.setClipRect(QRect(50, 50, 100, 80));
         painter.setPen(QPen(QColor(1, 2, 3), 2));
-        painter.drawPolyline(QPolygonF({{0, 0}, {100, 100}, {1e7, 90}, {60, -1e7}, {60, 60}}));
+        painter.drawPolyline((QPolygonF{QPointF{0, 0}, QPointF{100, 100}, QPointF{1e7, 90},
+                                        QPointF{60, -1e7}, QPointF{60, 60}}));
     });
     const QRect clip(QPoint(50 * kUnits, 50 * kUnits), QPoint(150 * kUnits, 130 * kUnits));
     ASSERT_GE(played.drawn.size(), 2U);
@@ -314,7 +315,7 @@ TEST(MetafileEngine, Polygon_IsFilledAndClosed) {
     const PlayedMetafile played = painted([](QPainter& painter) {
         painter.setPen(Qt::black);
         painter.setBrush(Qt::green);
-        painter.drawPolygon(QPolygonF({{10, 10}, {50, 10}, {50, 50}}));
+        painter.drawPolygon((QPolygonF{QPointF{10, 10}, QPointF{50, 10}, QPointF{50, 50}}));
     });
     ASSERT_EQ(played.drawn.size(), 2U);
     EXPECT_EQ(played.drawn[0].kind, Drawn::Kind::Polygon);

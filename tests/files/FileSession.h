@@ -50,7 +50,8 @@ class Folder {
 inline Texts linesOf(const std::string& text) {
     Texts lines;
     std::size_t start = 0;
-    for (std::size_t end; (end = text.find("\r\n", start)) != std::string::npos; start = end + 2)
+    for (std::size_t end = 0; (end = text.find("\r\n", start)) != std::string::npos;
+         start = end + 2)
         lines.push_back(text.substr(start, end - start));
     if (start < text.size()) lines.push_back(text.substr(start));
     return lines;

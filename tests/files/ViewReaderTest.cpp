@@ -256,11 +256,10 @@ TEST_F(ViewReaderTest, NoWords_LeaveTheOldValuesAndShowTheRows) {
 
 TEST_F(ViewReaderTest, LineEnds_OfEveryKindReadAlike) {
     for (const char* end : {"\r\n", "\n", "\r"}) {
-        std::string text = kHead + rowsText(301);
         std::string other;
-        for (std::size_t i = 0; i < text.size(); ++i) {
-            if (text[i] == '\r') continue;
-            other += text[i] == '\n' ? std::string(end) : std::string(1, text[i]);
+        for (const char c : kHead + rowsText(301)) {
+            if (c == '\r') continue;
+            other += c == '\n' ? std::string(end) : std::string(1, c);
         }
         panel.CWGraph1.clearPlot();
         load(other);

@@ -209,10 +209,11 @@ class DeadLine : public ::testing::TestWithParam<Handler> {
         // A transfer that comes short is drawn as far as it came.
         const bool quiet = end == End::Silent && rig.line.lastLine() == "TRACEBIN\r";
         EXPECT_TRUE(quiet || !texts.empty());
-        for (const std::string& text : texts)
+        for (const std::string& text : texts) {
             EXPECT_TRUE(text == GetParam().failure ||
                         std::find(kWords.begin(), kWords.end(), text) != kWords.end())
                 << text;
+        }
         if (line > 2 || GetParam().failure.empty()) return;
         EXPECT_NE(std::find(texts.begin(), texts.end(), GetParam().failure), texts.end());
     }

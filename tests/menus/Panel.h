@@ -15,7 +15,7 @@ using Texts = std::vector<std::string>;
 
 /// A menu by its key; a mode's menu comes with its mode.
 struct Menu {
-    Button CF::*key;
+    Button CF::*key = nullptr;
     std::int16_t mode = CF::ANALYZER;
     std::int16_t state = 0;
 };
