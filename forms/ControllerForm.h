@@ -131,7 +131,7 @@ class ControllerForm : public Form {
     Event<const std::string&> OpenFile;
     std::string DebugLogName = "debug.log";  ///< in the application's folder
     Event<> CloseDebugLog;                   ///< ahead of its deletion
-    Event<int> ShowHelp;  ///< opens the help topic of that context number
+    Event<int> ShowHelp;                     ///< opens the help topic of that context number
     Event<> TraceLoaded;  ///< behind each trace of a file that was read and drawn
     /// The front draws the graph into the file of that path, its ending names the kind. The second
     /// text takes what went wrong.

@@ -121,6 +121,7 @@ TEST(MetafileWriter, NextClip_TakesThePlaceOfTheLast) {
 TEST(MetafileWriter, LongPolyline_IsSplitWhereThePartsMeet) {
     MetafileWriter writer(30000, 500, 1440);
     std::vector<MetafilePoint> line;
+    line.reserve(10000);
     for (int i = 0; i < 10000; ++i) line.push_back({i, i % 7});
     writer.polyline(line);
     const PlayedMetafile played = finished(writer);
