@@ -37,6 +37,7 @@ class FileOps {
     /// Takes a name as if a dialog had given it.
     void note(const std::string& path);
 
+    static constexpr int kCsvFilter = 4;
     static constexpr std::uint64_t kLargestFile = 2'000'000'000;
 
   private:

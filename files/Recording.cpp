@@ -15,13 +15,10 @@ namespace {
 
 using CF = ControllerForm;
 
-constexpr int kCsvFilter = 4;
 constexpr int kHelpTopic = 1114;
 constexpr int kHourglass = 11;
 constexpr int kResyncMs = 300;
-constexpr int kPassFillStyle = 3;
 constexpr int kRetryMs = 10;
-constexpr std::int16_t kLastRow = 32767;
 constexpr double kDaySeconds = 86400;
 
 template <class Whole>
@@ -114,7 +111,7 @@ void Recording::abandon() {
 }
 
 bool Recording::chooseFile() {
-    panel_.DataFileName = files_.ShowSaveDataDialog(kCsvFilter);
+    panel_.DataFileName = files_.ShowSaveDataDialog(FileOps::kCsvFilter);
     if (panel_.DataFileName.empty()) return false;
     // Emptied once; each trace is then appended to it.
     OutputFile file(panel_.DataFileName, OutputFile::Mode::Output);
@@ -166,12 +163,7 @@ bool Recording::takeTrace() {
         sweeps_.PlaySingleButton_Click();
         return true;
     }
-    if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
-    if (!forms_.waterfall.Graph3D.plots().empty()) {
-        GraphCurve3D& newest = forms_.waterfall.Graph3D.plots().back();
-        newest.lineVisible = false;
-        newest.fillStyle = kPassFillStyle;
-    }
+    sweeps_.nextRow();
     bool success = false;
     traces_.ReadSingleTrace2({}, success);
     return success;

@@ -16,7 +16,6 @@ namespace {
 
 using CF = ControllerForm;
 
-constexpr int kCsvFilter = 4;
 constexpr int kHourglass = 11;
 /// What one trace's header and 301 rows come to.
 constexpr int kLargestSingle = 970;
@@ -39,7 +38,7 @@ int findEntry(const FieldList& lines, std::string_view word, int from = 0) {
     return -1;
 }
 
-std::string rangeNumber(double percent) { return generalNumber(std::floor(percent * 100)) + " %"; }
+std::string percentText(double part) { return generalNumber(std::floor(part * 100)) + " %"; }
 
 /// Runs something at the end of a scope, whatever way it is left.
 template <class Action>
@@ -71,6 +70,7 @@ ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, Grap
       rows_(forms.controller, mirror, conversion) {
     panel_.LoadData.Clicked.connect([this] { LoadData_Click(); });
     panel_.OpenFile.connect([this](const std::string& path) {
+        if (loading_) return;
         files_.note(path);
         loadFile(path);
     });
@@ -79,7 +79,7 @@ ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, Grap
 
 void ViewReader::LoadData_Click() {
     if (loading_) return;
-    const std::string path = files_.ShowOpenDataDialog(kCsvFilter);
+    const std::string path = files_.ShowOpenDataDialog(FileOps::kCsvFilter);
     if (!path.empty()) loadFile(path);
 }
 
@@ -110,7 +110,7 @@ void ViewReader::loadFile(const std::string& path) {
 }
 
 void ViewReader::progress(const std::string& what, double part) {
-    panel_.FileLabel.Caption = what + " " + name_ + ": " + rangeNumber(part);
+    panel_.FileLabel.Caption = what + " " + name_ + ": " + percentText(part);
     events_.pump();
 }
 
@@ -124,14 +124,10 @@ void ViewReader::takeRange(std::string_view entry) {
         return;
     }
     const double number = leadingNumber(entry);
-    int code = -1;
-    if (number == std::floor(number) && std::fabs(number) < kSlowestMs)
-        MapRangeCode(static_cast<int>(number), true, code);
     // A range that no number names, as those of the reflection are saved, is drawn at 10 dB.
-    const bool known = code >= RANGE10DB && code <= RANGE1DB && number >= 1;
-    mirror_.ReferenceRange = known && (number == 10 || number == 5 || number == 2 || number == 1)
-                                 ? number
-                                 : decibelsPerDivision(RANGE10DB);
+    mirror_.ReferenceRange = decibelsPerDivision(RANGE10DB);
+    for (int code = RANGE10DB; code <= RANGE1DB; ++code)
+        if (decibelsPerDivision(code) == number) mirror_.ReferenceRange = number;
 }
 
 ViewReader::Header ViewReader::readHeader(const std::string& text, const FieldList& lines,
@@ -241,7 +237,7 @@ void ViewReader::showTraces(const FieldList& lines, const Header& header, bool s
         panel_.PlaybackFrame.Visible = true;
         panel_.FileLabel.Caption =
             "Trace " + std::to_string(shown) + " of " + name_ + ", " +
-            rangeNumber(start < 0 ? 1 : static_cast<double>(start) / lines.count());
+            percentText(start < 0 ? 1 : static_cast<double>(start) / lines.count());
         if (start >= 0 && !pause()) break;
     }
 }

@@ -14,7 +14,6 @@ namespace {
 
 using CF = ControllerForm;
 
-constexpr int kCsvFilter = 4;
 constexpr const char* kXFormat = "#.000";
 
 struct AutoBandwidth {
@@ -46,7 +45,7 @@ ViewWriter::ViewWriter(Forms& forms, ZEL3Variables& mirror, CommandExchange& exc
 
 void ViewWriter::SaveCurrentView_Click() {
     panel_.DataFileName = panel_.isSpecMeas ? forms_.specialMeas.DataFileNameSpec
-                                            : files_.ShowSaveDataDialog(kCsvFilter);
+                                            : files_.ShowSaveDataDialog(FileOps::kCsvFilter);
     if (panel_.DataFileName.empty()) return;
     fromMenu_ = true;
     SaveView(panel_.InstrumentMode == CF::POWERSENSOR ? "power" : "trace");

@@ -118,15 +118,19 @@ bool SweepControl::firstPass() {
 bool SweepControl::laterPass() {
     const Pass kind = passKind();
     if (kind != Pass::Trace) return powerPass(kind);
+    nextRow();
+    bool success = false;
+    traces_.ReadSingleTrace2({}, success);
+    return success;
+}
+
+void SweepControl::nextRow() {
     if (!forms_.waterfall.Graph3D.plots().empty()) {
         GraphCurve3D& newest = forms_.waterfall.Graph3D.plots().back();
         newest.lineVisible = false;
         newest.fillStyle = kPassFillStyle;
     }
     if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
-    bool success = false;
-    traces_.ReadSingleTrace2({}, success);
-    return success;
 }
 
 void SweepControl::StopButton_Click() {

@@ -23,6 +23,8 @@ class SweepControl {
     /// Sweep after sweep until `STOPFlag` is cleared or a pass fails; the sweep and the transfer
     /// set the pace.
     void RunContinuousView();
+    /// The newest plot of the waterfall is done, and the next trace has a row of its own.
+    void nextRow();
     void SetStopFlag(bool value) { panel_.STOPFlag = value; }
 
   private:
