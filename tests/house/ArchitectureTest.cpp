@@ -48,6 +48,14 @@ TEST_F(Architecture, SourceFile_IsInARoomOfTheTable) {
     EXPECT_EQ(lines(homelessFiles(house_, files_)), "");
 }
 
+TEST_F(Architecture, Room_IsThereOrMarkedAsComing) {
+    EXPECT_EQ(lines(missingRooms(house_, files_)), "");
+}
+
+TEST_F(Architecture, Tests_MirrorTheRooms) {
+    EXPECT_EQ(lines(unmirroredRooms(house_, files_)), "");
+}
+
 TEST_F(Architecture, QuotedInclude_IsAPathFromTheRoot) {
     EXPECT_EQ(lines(unknownIncludes(files_)), "");
 }

@@ -120,7 +120,8 @@ House readHouse(const std::string& markdown) {
         if (name.size() != 1) throw std::runtime_error("a row of the arrows names no room");
         house.rooms.push_back({name[0], namesIn(row.at(1)),
                                row.at(1).find("everything") != std::string::npos,
-                               row.at(2).find("yes") != std::string::npos});
+                               row.at(2).find("yes") != std::string::npos,
+                               row.at(0).find("(coming)") != std::string::npos});
     }
     for (const Room& room : house.rooms) {
         for (const std::string& other : room.mayInclude) {
@@ -143,6 +144,42 @@ std::vector<std::string> homelessFiles(const House& house, const std::vector<Sou
     std::vector<std::string> breaches;
     for (const SourceFile& file : files) {
         if (house.roomOf(file.path) == nullptr) breaches.push_back(file.path);
+    }
+    return breaches;
+}
+
+std::vector<std::string> missingRooms(const House& house, const std::vector<SourceFile>& files) {
+    std::set<std::string> standing;
+    for (const SourceFile& file : files) {
+        if (const Room* room = house.roomOf(file.path)) standing.insert(room->name);
+    }
+    std::vector<std::string> breaches;
+    for (const Room& room : house.rooms) {
+        const bool stands = standing.count(room.name) != 0;
+        if (!stands && !room.coming) breaches.push_back(room.name + " has no file");
+        if (stands && room.coming) breaches.push_back(room.name + " is not coming, it is there");
+    }
+    return breaches;
+}
+
+std::vector<std::string> unmirroredRooms(const House& house, const std::vector<SourceFile>& files) {
+    const std::string tests = "tests/";
+    std::set<std::string> mirrored;
+    for (const SourceFile& file : files) {
+        if (!startsWith(file.path, tests)) continue;
+        const std::size_t end = file.path.rfind('/');
+        if (end >= tests.size())
+            mirrored.insert(file.path.substr(tests.size(), end - tests.size()));
+    }
+    std::vector<std::string> breaches;
+    for (const std::string& folder : mirrored) {
+        if (folder != "house" && roomNamed(house.rooms, folder) == nullptr)
+            breaches.push_back(tests + folder + " mirrors no room");
+    }
+    for (const Room& room : house.rooms) {
+        const bool tested = mirrored.count(room.name) != 0;
+        if (!tested && !room.coming && !room.mayIncludeAll)
+            breaches.push_back(tests + room.name + " is missing");
     }
     return breaches;
 }

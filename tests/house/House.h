@@ -15,6 +15,7 @@ struct Room {
     std::vector<std::string> mayInclude;  ///< names of other rooms
     bool mayIncludeAll = false;           ///< the row says "everything"
     bool standardOnly = false;            ///< standard C++ and nothing else
+    bool coming = false;                  ///< the row says that it has no file yet
 };
 
 /// A row of the table of exceptions.
@@ -42,6 +43,11 @@ House readHouse(const std::string& markdown);
 
 /// Files outside of all rooms.
 std::vector<std::string> homelessFiles(const House& house, const std::vector<SourceFile>& files);
+/// Rooms without a file that are not marked as coming, and rooms with files that are.
+std::vector<std::string> missingRooms(const House& house, const std::vector<SourceFile>& files);
+/// Rooms of the product without a folder below `tests`, and folders there that bear the name of no
+/// room and are not `house`.
+std::vector<std::string> unmirroredRooms(const House& house, const std::vector<SourceFile>& files);
 /// Quoted includes that are no path of the tree from its root.
 std::vector<std::string> unknownIncludes(const std::vector<SourceFile>& files);
 /// Includes from a room into one that its row does not name, exceptions left out.

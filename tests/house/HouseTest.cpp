@@ -71,6 +71,44 @@ TEST(HomelessFiles, FileOutsideOfAllRooms_IsNamed) {
               Breaches{"attic/A.h"});
 }
 
+TEST(MissingRooms, RoomWithoutAFile_IsNamed) {
+    EXPECT_EQ(missingRooms(readHouse(kTables),
+                           {{"low/A.h", ""}, {"low/deep/A.h", ""}, {"tests/low/T.cpp", ""}}),
+              Breaches{"high has no file"});
+}
+
+TEST(MissingRooms, RoomMarkedAsComing_MayHaveNoFile) {
+    std::string tables = kTables;
+    tables.insert(tables.find("`high` | `low`") + 6, " (coming)");
+    const std::vector<SourceFile> tree{{"low/A.h", ""}, {"low/deep/A.h", ""}, {"tests/T.cpp", ""}};
+    EXPECT_EQ(missingRooms(readHouse(tables), tree), Breaches{});
+}
+
+TEST(MissingRooms, MarkOfARoomThatStands_IsNamed) {
+    std::string tables = kTables;
+    tables.insert(tables.find("`high` | `low`") + 6, " (coming)");
+    EXPECT_EQ(missingRooms(
+                  readHouse(tables),
+                  {{"low/A.h", ""}, {"low/deep/A.h", ""}, {"high/H.h", ""}, {"tests/T.cpp", ""}}),
+              Breaches{"high is not coming, it is there"});
+}
+
+TEST(UnmirroredRooms, RoomWithoutTests_IsNamed) {
+    EXPECT_EQ(unmirroredRooms(readHouse(kTables), {{"tests/low/T.cpp", ""},
+                                                   {"tests/house/T.cpp", ""},
+                                                   {"tests/low/deep/T.cpp", ""}}),
+              Breaches{"tests/high is missing"});
+}
+
+TEST(UnmirroredRooms, TestsOfNoRoom_AreNamed) {
+    EXPECT_EQ(unmirroredRooms(readHouse(kTables), {{"tests/low/T.cpp", ""},
+                                                   {"tests/low/deep/T.cpp", ""},
+                                                   {"tests/high/T.cpp", ""},
+                                                   {"tests/lower/T.cpp", ""},
+                                                   {"tests/Session.h", ""}}),
+              Breaches{"tests/lower mirrors no room"});
+}
+
 TEST(UnknownIncludes, PathFromTheOwnFolder_IsNamed) {
     EXPECT_EQ(unknownIncludes({including("low/A.cpp", "A.h"), {"low/A.h", ""}}),
               Breaches{"low/A.cpp includes \"A.h\""});

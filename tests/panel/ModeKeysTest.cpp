@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "tests/menus/Panel.h"
+#include "tests/panel/Panel.h"
 
 namespace zel {
 namespace {

@@ -5,7 +5,7 @@
 #include <array>
 #include <vector>
 
-#include "tests/menus/DeadLine.h"
+#include "tests/panel/DeadLine.h"
 
 namespace zel {
 namespace {

@@ -13,7 +13,7 @@
 #include "link/CommandExchange.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
-#include "tests/menus/Panel.h"
+#include "tests/panel/Panel.h"
 
 namespace zel {
 

@@ -4,7 +4,7 @@
 #include <vector>
 
 #include "platform/KeyInput.h"
-#include "tests/menus/Panel.h"
+#include "tests/panel/Panel.h"
 
 namespace zel {
 namespace {

@@ -1,4 +1,4 @@
-#include "tests/desktop/MetafilePlayer.h"
+#include "tests/desktop/graph/MetafilePlayer.h"
 
 #include <algorithm>
 #include <cstdint>

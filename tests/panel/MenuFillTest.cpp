@@ -6,7 +6,7 @@
 #include <ostream>
 #include <string>
 
-#include "tests/menus/Panel.h"
+#include "tests/panel/Panel.h"
 
 namespace zel {
 namespace {

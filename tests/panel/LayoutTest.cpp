@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "panel/SoftPanel.h"
-#include "tests/menus/Panel.h"
+#include "tests/panel/Panel.h"
 
 namespace zel {
 namespace {

@@ -5,7 +5,7 @@
 
 #include "panel/ManualCommand.h"
 #include "platform/KeyInput.h"
-#include "tests/menus/Panel.h"
+#include "tests/panel/Panel.h"
 
 namespace zel {
 namespace {

@@ -15,7 +15,7 @@
 
 #include "desktop/graph/GraphImage.h"
 #include "tests/desktop/Desk.h"
-#include "tests/desktop/MetafilePlayer.h"
+#include "tests/desktop/graph/MetafilePlayer.h"
 
 namespace zel {
 namespace {

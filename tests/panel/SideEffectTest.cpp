@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/menus/DeadLine.h"
+#include "tests/panel/DeadLine.h"
 
 namespace zel {
 namespace {
