@@ -26,18 +26,17 @@ bool IsPrintableAnswer(const std::string& text) {
     });
 }
 
-AnswerReader::AnswerReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
-                           const double& SweepTime, const Clock& clock, Events& events,
-                           MessageBoxes& boxes)
-    : panel_(panel),
-      dialog_(dialog),
+AnswerReader::AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const double& SweepTime,
+                           const Session& session)
+    : panel_(forms.controller),
+      dialog_(forms.main),
       state_(state),
       link_(link),
       SweepTime_(SweepTime),
-      events_(events),
-      boxes_(boxes),
-      StopwatchA_(clock),
-      sinceGrowth_(clock) {}
+      events_(session.events),
+      boxes_(session.boxes),
+      StopwatchA_(session.clock),
+      sinceGrowth_(session.clock) {}
 
 std::string AnswerReader::ReadAnswer() {
     double timeout =

@@ -4,13 +4,10 @@
 #include <cstdint>
 #include <string>
 
-#include "forms/ControllerForm.h"
-#include "forms/MainForm.h"
+#include "forms/Forms.h"
 #include "link/ByteLink.h"
 #include "link/ZELBas.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Session.h"
 
 namespace zel {
 
@@ -21,8 +18,8 @@ bool IsPrintableAnswer(const std::string& text);
 class AnswerReader {
   public:
     /// `SweepTime` is the mirror's sweep time, in seconds.
-    AnswerReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
-                 const double& SweepTime, const Clock& clock, Events& events, MessageBoxes& boxes);
+    AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const double& SweepTime,
+                 const Session& session);
 
     /// One line without its CR, or the empty text. A silence in session sets `ExchangeFailed`
     /// and tells "No response received!" once; while connecting it takes the connection down.

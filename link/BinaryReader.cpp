@@ -1,6 +1,5 @@
 #include "link/BinaryReader.h"
 
-#include "link/DebugLine.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 
@@ -27,18 +26,16 @@ void PrependBytes(std::string& bytes, std::size_t count, char byte) {
     bytes.insert(0, head);
 }
 
-BinaryReader::BinaryReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
-                           const Socket& TCPSocket, const Clock& clock, Events& events,
-                           MessageBoxes& boxes)
-    : panel_(panel),
-      dialog_(dialog),
+BinaryReader::BinaryReader(Forms& forms, ZELBas& state, ByteLink& link, const Socket& TCPSocket,
+                           const Session& session)
+    : panel_(forms.controller),
+      dialog_(forms.main),
       state_(state),
       link_(link),
       socket_(TCPSocket),
-      events_(events),
-      boxes_(boxes),
-      StopwatchB_(clock),
-      tail_(clock) {}
+      session_(session),
+      StopwatchB_(session.clock),
+      tail_(session.clock) {}
 
 bool BinaryReader::linkLost() const {
     if (!link_.isTcp()) return !link_.portOpen();
@@ -50,10 +47,10 @@ std::string BinaryReader::ReadBinaryBuffer(std::int16_t length) {
     if (link_.usable()) {
         bytes = ReadBinaryBytes(length);
     } else {
-        boxes_.show({BoxIcon::Critical, "Port is not open!"});
+        session_.boxes.show({BoxIcon::Critical, "Port is not open!"});
     }
-    events_.pump();
-    DebugLine(panel_, "BIN-BUFFER-LEN: " + numberText(static_cast<double>(bytes.size()) - 1));
+    session_.events.pump();
+    session_.DebugLine("BIN-BUFFER-LEN: " + numberText(static_cast<double>(bytes.size()) - 1));
     return bytes;
 }
 
@@ -61,7 +58,7 @@ std::string BinaryReader::ReadBinaryChunk(std::int16_t seconds) {
     StopwatchB_.Reset();
     std::string chunk = link_.takeBytes();
     while (chunk.empty() && StopwatchB_.Elapsed() <= seconds * 1000 && !linkLost()) {
-        events_.wait(kPollMs);
+        session_.events.wait(kPollMs);
         chunk = link_.takeBytes();
     }
     return chunk;
@@ -71,7 +68,7 @@ std::string BinaryReader::takeTail(std::size_t missing) {
     std::string tail;
     tail_.Reset();
     while (tail.size() < missing && tail_.Elapsed() <= kTailMs && !linkLost()) {
-        events_.wait(kPollMs);
+        session_.events.wait(kPollMs);
         tail += link_.takeBytes();
     }
     return tail;
@@ -83,7 +80,7 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
     const bool serialUsable = dialog_.IsConnectedToPort && link_.portOpen();
     if (!link_.isTcp() && !serialUsable) {
         if (!panel_.ErrorFlag) {
-            boxes_.show({BoxIcon::Critical, "Not Connected To Port!"});
+            session_.boxes.show({BoxIcon::Critical, "Not Connected To Port!"});
             panel_.ErrorFlag = true;
         }
         state_.TCPDataArrived = false;
@@ -107,11 +104,11 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
             if (result.size() > wanted) result.resize(wanted);
             chunk = link_.takeBytes();
             if (chunk.empty() && result.size() + 3 < wanted) chunk = ReadBinaryChunk(kChunkSeconds);
-            events_.pump();
+            session_.events.pump();
             if (StopwatchB_.Elapsed() > kStallMs) break;
             if (result.size() + 2 >= wanted) break;
             if (chunk.empty() && linkLost()) break;
-            if (chunk.empty()) events_.wait(kPollMs);
+            if (chunk.empty()) session_.events.wait(kPollMs);
         }
         // The end of the block is near or the instrument has stopped: the chunk at hand and the
         // last bytes still belong to the samples.
@@ -123,8 +120,8 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
     state_.TCPDataArrived = false;
     if (link_.isTcp() && linkLost() && result.size() < wanted) {
         if (panel_.ErrorFlag)
-            boxes_.show({BoxIcon::Critical, std::string("TCP/IP Socket error") + kCrLf +
-                                                "Please make a new connection."});
+            session_.boxes.show({BoxIcon::Critical, std::string("TCP/IP Socket error") + kCrLf +
+                                                        "Please make a new connection."});
         return "";
     }
     return result;

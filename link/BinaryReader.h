@@ -4,12 +4,10 @@
 #include <cstdint>
 #include <string>
 
-#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
 #include "link/ByteLink.h"
 #include "link/ZELBas.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "platform/Socket.h"
 
 namespace zel {
@@ -19,8 +17,8 @@ void PrependBytes(std::string& bytes, std::size_t count, char byte);
 
 class BinaryReader {
   public:
-    BinaryReader(ControllerForm& panel, MainForm& dialog, ZELBas& state, ByteLink& link,
-                 const Socket& TCPSocket, const Clock& clock, Events& events, MessageBoxes& boxes);
+    BinaryReader(Forms& forms, ZELBas& state, ByteLink& link, const Socket& TCPSocket,
+                 const Session& session);
 
     /// The checked entry to `ReadBinaryBytes`; tells a closed port.
     std::string ReadBinaryBuffer(std::int16_t length);
@@ -39,8 +37,7 @@ class BinaryReader {
     ZELBas& state_;
     ByteLink& link_;
     const Socket& socket_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
     Stopwatch StopwatchB_;
     Stopwatch tail_;
 };

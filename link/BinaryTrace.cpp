@@ -1,7 +1,6 @@
 #include "link/BinaryTrace.h"
 
 #include "link/CommandExchange.h"
-#include "link/DebugLine.h"
 #include "link/InstrumentErrors.h"
 #include "support/ByteCast.h"
 #include "support/NumberText.h"
@@ -17,26 +16,23 @@ constexpr int kPollMs = 20;
 }  // namespace
 
 BinaryTrace::BinaryTrace(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
-                         BinaryReader& bytes, const Clock& clock, Events& events,
-                         MessageBoxes& boxes)
+                         BinaryReader& bytes, const Session& session)
     : panel_(panel),
       state_(state),
       link_(link),
       reader_(reader),
       bytes_(bytes),
-      clock_(clock),
-      events_(events),
-      boxes_(boxes),
-      StopwatchA_(clock) {}
+      session_(session),
+      StopwatchA_(session.clock) {}
 
 void BinaryTrace::delay(DelayPlace place) {
     const int ms = linkDelay(place, panel_.ConnectionState);
-    if (ms > 0) events_.sleep(ms);
+    if (ms > 0) session_.events.sleep(ms);
 }
 
 void BinaryTrace::startingError(int status, const char* keyword) {
-    boxes_.show({BoxIcon::Information, "GET error" + numberText(status) + " for command <" +
-                                           keyword + "> (while starting)"});
+    session_.boxes.show({BoxIcon::Information, "GET error" + numberText(status) + " for command <" +
+                                                   keyword + "> (while starting)"});
 }
 
 BinaryTrace::Round BinaryTrace::beginRound() const {
@@ -54,8 +50,8 @@ bool BinaryTrace::GetTraceBinary(std::vector<double>& values, bool doubleBlock) 
     const DialogueScope scope(state_);
     const Round round = beginRound();
     for (;;) {
-        DebugLine(panel_, "Binary trace transfer starting");
-        const auto t0 = static_cast<float>(clock_.secondsOfDay());
+        session_.DebugLine("Binary trace transfer starting");
+        const auto t0 = static_cast<float>(session_.clock.secondsOfDay());
         bool success = false;
         switch (readOnce(values, doubleBlock, success)) {
             case Outcome::AskAgain:
@@ -66,9 +62,9 @@ bool BinaryTrace::GetTraceBinary(std::vector<double>& values, bool doubleBlock) 
             case Outcome::Done:
                 break;
         }
-        if (success) DebugLine(panel_, "Trace complete");
-        DebugLine(panel_,
-                  "Binary trace transfer finished (" + elapsedSecondsText(clock_, t0) + " s)");
+        if (success) session_.DebugLine("Trace complete");
+        session_.DebugLine("Binary trace transfer finished (" +
+                           elapsedSecondsText(session_.clock, t0) + " s)");
         return success;
     }
 }
@@ -93,14 +89,14 @@ BinaryTrace::Outcome BinaryTrace::readOnce(std::vector<double>& values, bool dou
         status = bytes[0] - '0';
         if (status == 1) return Outcome::AskAgain;
         if (status > 1 && status <= 7) {
-            ReportInstrumentError(state_, boxes_, status, "TRACEBIN");
+            ReportInstrumentError(state_, session_.boxes, status, "TRACEBIN");
             return Outcome::Done;
         }
     }
     if (!link_.usable()) {  // the device has gone in the middle
         std::string text = "Port is not open!";
         if (!link_.problem().empty()) text += kCrLf + link_.problem();
-        if (open) boxes_.show({BoxIcon::Critical, text});
+        if (open) session_.boxes.show({BoxIcon::Critical, text});
         state_.ExchangeFailed = true;
         return Outcome::Failed;
     }
@@ -126,10 +122,10 @@ void BinaryTrace::decode(const std::string& bytes, bool doubleBlock, std::vector
 bool BinaryTrace::GetCTraceBinary(std::vector<double>& values) {
     const DialogueScope scope(state_);
     const Round round = beginRound();
-    DebugLine(panel_, "Binary ctrace transfer starting");
+    session_.DebugLine("Binary ctrace transfer starting");
     for (;;) {
         state_.ComplexTraceActive = true;
-        const auto t0 = static_cast<float>(clock_.secondsOfDay());
+        const auto t0 = static_cast<float>(session_.clock.secondsOfDay());
         bool success = false;
         const Outcome outcome = readComplexOnce(values, success);
         if (outcome == Outcome::Failed) return false;
@@ -138,8 +134,8 @@ bool BinaryTrace::GetCTraceBinary(std::vector<double>& values) {
             if (mayAskAgain(round)) continue;
             return false;
         }
-        DebugLine(panel_,
-                  "Binary trace transfer finished (" + elapsedSecondsText(clock_, t0) + " s)");
+        session_.DebugLine("Binary trace transfer finished (" +
+                           elapsedSecondsText(session_.clock, t0) + " s)");
         state_.ComplexTraceActive = false;
         return success;
     }
@@ -164,8 +160,8 @@ BinaryTrace::Outcome BinaryTrace::readComplexOnce(std::vector<double>& values, b
         std::string text =
             "CMD error" + numberText(status) + " for command <CTRACEBIN> (while executing)";
         if (status == 2) text += std::string(kCrLf) + "Command not allowed in currend mode";
-        boxes_.show({BoxIcon::Information, text});
-        ReportInstrumentError(state_, boxes_, status, panel_.CommandLine);
+        session_.boxes.show({BoxIcon::Information, text});
+        ReportInstrumentError(state_, session_.boxes, status, panel_.CommandLine);
         return Outcome::Done;
     }
     std::string bytes = ReadLiteralBytes(kDoubleBytes);
@@ -176,7 +172,7 @@ BinaryTrace::Outcome BinaryTrace::readComplexOnce(std::vector<double>& values, b
         values[i] =
             int32FromLittleEndian(reinterpret_cast<const unsigned char*>(bytes.data()) + 4 * i);
     success = true;
-    DebugLine(panel_, "Trace complete");
+    session_.DebugLine("Trace complete");
     return Outcome::Done;
 }
 
@@ -187,14 +183,14 @@ std::string BinaryTrace::ReadLiteralBytes(std::int32_t count) {
     state_.ComplexTraceRequested = false;
     for (;;) {
         if (!link_.usable()) {
-            boxes_.show({BoxIcon::Critical, "Port is not open!"});
+            session_.boxes.show({BoxIcon::Critical, "Port is not open!"});
             return "";
         }
         if (!mayAskAgain(round)) return "";
         state_.InputBuffer += link_.ReadFromLink(true);
-        events_.pump();
+        session_.events.pump();
         const auto length = static_cast<double>(state_.InputBuffer.size());
-        DebugLine(panel_, "BIN-BUFFER-LEN: " + numberText(length));
+        session_.DebugLine("BIN-BUFFER-LEN: " + numberText(length));
         if (state_.InputBuffer.size() >= wanted) break;
         if (StopwatchA_.Elapsed() > kReRequestMs) {
             link_.WriteToLink("get\r");
@@ -208,11 +204,11 @@ std::string BinaryTrace::ReadLiteralBytes(std::int32_t count) {
             continue;
         }
         if (link_.isTcp()) continue;  // its read waits by itself
-        events_.wait(kPollMs);
+        session_.events.wait(kPollMs);
     }
     std::string result = state_.InputBuffer.substr(0, wanted);
     state_.InputBuffer.erase(0, wanted);
-    DebugLine(panel_, "MY INBUFFER LEN IS: " + numberText(static_cast<double>(result.size())));
+    session_.DebugLine("MY INBUFFER LEN IS: " + numberText(static_cast<double>(result.size())));
     return result;
 }
 

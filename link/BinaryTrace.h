@@ -11,9 +11,7 @@
 #include "link/ByteLink.h"
 #include "link/LinkDelays.h"
 #include "link/ZELBas.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Session.h"
 
 namespace zel {
 
@@ -27,7 +25,7 @@ class BinaryTrace {
     static constexpr std::size_t kDoubleSamples = 602;
 
     BinaryTrace(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
-                BinaryReader& bytes, const Clock& clock, Events& events, MessageBoxes& boxes);
+                BinaryReader& bytes, const Session& session);
 
     /// TRACEBIN: 301 or 602 raw samples. A transfer that stops leaves the tail of `values` as it
     /// was and is a success all the same; a refusal or a lost link is none.
@@ -60,9 +58,7 @@ class BinaryTrace {
     ByteLink& link_;
     AnswerReader& reader_;
     BinaryReader& bytes_;
-    const Clock& clock_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
     Stopwatch StopwatchA_;
 };
 

@@ -18,19 +18,18 @@ constexpr double kHighestPort = 32767;
 
 }  // namespace
 
-ByteLink::ByteLink(ControllerForm& panel, MainForm& dialog, ZELBas& state, SerialPort& ZELCommC,
-                   Socket& TCPSocket, const Clock& clock, Events& events, MessageBoxes& boxes,
-                   DebugChannel& debug)
-    : panel_(panel),
-      dialog_(dialog),
+ByteLink::ByteLink(Forms& forms, ZELBas& state, SerialPort& ZELCommC, Socket& TCPSocket,
+                   const Session& session, DebugChannel& debug)
+    : panel_(forms.controller),
+      dialog_(forms.main),
       state_(state),
       port_(ZELCommC),
       socket_(TCPSocket),
-      events_(events),
-      boxes_(boxes),
+      events_(session.events),
+      boxes_(session.boxes),
       debug_(debug),
-      StopwatchB_(clock) {
-    socket_.DataArrival.connect([this] { state_.TCPDataArrived = true; });
+      StopwatchB_(session.clock) {
+    handlers_.on(socket_.DataArrival, [this] { state_.TCPDataArrived = true; });
 }
 
 bool ByteLink::isTcp() const { return panel_.ConnectionState == ControllerForm::TCPCON; }

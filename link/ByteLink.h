@@ -3,14 +3,11 @@
 
 #include <string>
 
-#include "forms/ControllerForm.h"
-#include "forms/MainForm.h"
+#include "forms/Forms.h"
 #include "link/ZELBas.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
 #include "platform/SerialPort.h"
 #include "platform/Services.h"
+#include "platform/Session.h"
 #include "platform/Socket.h"
 
 namespace zel {
@@ -18,9 +15,8 @@ namespace zel {
 /// `ConnectionState` chooses the link: the socket for TCPCON, the serial port for any other kind.
 class ByteLink {
   public:
-    ByteLink(ControllerForm& panel, MainForm& dialog, ZELBas& state, SerialPort& ZELCommC,
-             Socket& TCPSocket, const Clock& clock, Events& events, MessageBoxes& boxes,
-             DebugChannel& debug);
+    ByteLink(Forms& forms, ZELBas& state, SerialPort& ZELCommC, Socket& TCPSocket,
+             const Session& session, DebugChannel& debug);
 
     /// Opens the port at 8 data bits, no parity, 1 stop bit, no flow control; `port` is a device
     /// name. False when it cannot be had; nothing is told.
@@ -58,6 +54,7 @@ class ByteLink {
     MessageBoxes& boxes_;
     DebugChannel& debug_;
     Stopwatch StopwatchB_;
+    Handlers handlers_;
 };
 
 /// The device that a port name of the dialog means: "COM" and a number in either case becomes

@@ -1,6 +1,5 @@
 #include "link/CommandExchange.h"
 
-#include "link/DebugLine.h"
 #include "link/InstrumentErrors.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
@@ -28,44 +27,37 @@ std::string elapsedSecondsText(const Clock& clock, float t0) {
 }
 
 CommandExchange::CommandExchange(ControllerForm& panel, ZELBas& state, ByteLink& link,
-                                 AnswerReader& reader, const Clock& clock, Events& events,
-                                 MessageBoxes& boxes)
-    : panel_(panel),
-      state_(state),
-      link_(link),
-      reader_(reader),
-      clock_(clock),
-      events_(events),
-      boxes_(boxes) {}
+                                 AnswerReader& reader, const Session& session)
+    : panel_(panel), state_(state), link_(link), reader_(reader), session_(session) {}
 
 void CommandExchange::beginLine(const char* kind, const std::string& text, float& t0) {
-    DebugLine(panel_, std::string(kind) + " <" + text + "> starting");
-    t0 = static_cast<float>(clock_.secondsOfDay());
+    session_.DebugLine(std::string(kind) + " <" + text + "> starting");
+    t0 = static_cast<float>(session_.clock.secondsOfDay());
     state_.InputBuffer.clear();
 }
 
 void CommandExchange::finishLine(const char* kind, const std::string& text, float t0) {
-    DebugLine(panel_, std::string(kind) + " <" + text + "> finished (" +
-                          elapsedSecondsText(clock_, t0) + " s)");
+    session_.DebugLine(std::string(kind) + " <" + text + "> finished (" +
+                       elapsedSecondsText(session_.clock, t0) + " s)");
 }
 
 void CommandExchange::delay(DelayPlace place) {
     const int ms = linkDelay(place, panel_.ConnectionState);
-    if (ms > 0) events_.sleep(ms);
+    if (ms > 0) session_.events.sleep(ms);
 }
 
 void CommandExchange::report(int status, const std::string& keyword) {
-    ReportInstrumentError(state_, boxes_, status, keyword);
+    ReportInstrumentError(state_, session_.boxes, status, keyword);
 }
 
 bool CommandExchange::finishCommand(const std::string& keyword, const std::string& firstAnswer,
                                     int status, float t0) {
-    DebugLine(panel_, "<" + keyword + "> response: " + wireToUtf8(firstAnswer));
+    session_.DebugLine("<" + keyword + "> response: " + wireToUtf8(firstAnswer));
     if (status == 2) {
         report(status, keyword);
     } else if (status != 0) {
-        DebugLine(panel_, "CMD error" + numberText(status) + " for command <" + keyword +
-                              "> (while executing)");
+        session_.DebugLine("CMD error" + numberText(status) + " for command <" + keyword +
+                           "> (while executing)");
     }
     finishLine("CMD", keyword, t0);
     return status == 0;
@@ -85,10 +77,10 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
     link_.WriteToLink("cmd\r");
     delay(DelayPlace::AfterModeWord);
     state_.InputBuffer.clear();
-    const Stopwatch firstAnswer(clock_);
+    const Stopwatch firstAnswer(session_.clock);
     std::string answer = reader_.ReadAnswer();
     while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs) {
-        events_.wait(kRetryPauseMs);
+        session_.events.wait(kRetryPauseMs);
         answer = reader_.ReadAnswer();
     }
     if (state_.ExchangeFailed || !reader_.answered()) return false;
@@ -105,10 +97,10 @@ bool CommandExchange::CmdInstrumentTriggered(const std::string& keyword,
                                              std::int32_t timeoutSeconds) {
     const DialogueScope scope(state_);
     panel_.MousePointer = 11;
-    events_.pump();
+    session_.events.pump();
     const bool success = triggeredDialogue(keyword, timeoutSeconds);
     panel_.MousePointer = 0;
-    events_.pump();
+    session_.events.pump();
     return success;
 }
 
@@ -147,7 +139,7 @@ bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
     delay(DelayPlace::AfterSetKeyword);
     status = statusNumber(reader_.ReadAnswer());
     if (!reader_.answered()) return false;
-    DebugLine(panel_, "<" + keywordAndValue + "> response: " + numberText(status));
+    session_.DebugLine("<" + keywordAndValue + "> response: " + numberText(status));
     if (status != 0) report(status, keywordAndValue);
     finishLine("SET", keywordAndValue, t0);
     return status == 0;
@@ -163,8 +155,9 @@ bool CommandExchange::GetInstrument(const std::string& keyword, std::string& val
     int status = statusNumber(reader_.ReadAnswer());
     if (state_.ExchangeFailed || !reader_.answered()) return false;
     if (status != 0) {
-        boxes_.show({BoxIcon::Information, "GET error" + numberText(status) + " for command <" +
-                                               keyword + "> (while starting)"});
+        session_.boxes.show(
+            {BoxIcon::Information,
+             "GET error" + numberText(status) + " for command <" + keyword + "> (while starting)"});
         report(status, keyword);
         finishLine("GET", keyword, t0);
         return false;
@@ -183,7 +176,7 @@ bool CommandExchange::GetInstrument(const std::string& keyword, std::string& val
     std::string answer;
     if (!readValue(answer)) return false;
     value = wireToUtf8(answer);
-    DebugLine(panel_, "<" + keyword + "> response: " + value);
+    session_.DebugLine("<" + keyword + "> response: " + value);
     finishLine("GET", keyword, t0);
     return true;
 }
@@ -194,10 +187,10 @@ bool CommandExchange::readValue(std::string& value) {
         return reader_.answered();
     }
     // On TCP the value came in one packet with the status line, and a read would throw it away.
-    Stopwatch waited(clock_);
+    Stopwatch waited(session_.clock);
     auto end = state_.InputBuffer.find('\r');
     while (end == std::string::npos && waited.Elapsed() <= kValueWaitMs) {
-        events_.wait(kValuePollMs);
+        session_.events.wait(kValuePollMs);
         state_.InputBuffer += link_.takeBytes();
         end = state_.InputBuffer.find('\r');
     }

@@ -9,9 +9,7 @@
 #include "link/ByteLink.h"
 #include "link/LinkDelays.h"
 #include "link/ZELBas.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Session.h"
 
 namespace zel {
 
@@ -21,7 +19,7 @@ namespace zel {
 class CommandExchange {
   public:
     CommandExchange(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
-                    const Clock& clock, Events& events, MessageBoxes& boxes);
+                    const Session& session);
 
     /// Carries out a keyword that needs no value. After "WAIT" the time-out of every read follows
     /// the sweep time, until the next command.
@@ -52,9 +50,7 @@ class CommandExchange {
     ZELBas& state_;
     ByteLink& link_;
     AnswerReader& reader_;
-    const Clock& clock_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
 };
 
 /// The number that a status line starts with; junk gives 0.

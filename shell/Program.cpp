@@ -19,6 +19,7 @@
 #include "link/BinaryTrace.h"
 #include "link/ByteLink.h"
 #include "link/CommandExchange.h"
+#include "link/InstrumentLink.h"
 #include "model/FrequencyLabels.h"
 #include "panel/HardKeys.h"
 #include "panel/HelpKeys.h"
@@ -52,12 +53,12 @@ struct Program::Rooms {
     Rooms(const Platform& p, std::string commandLine)
         : platform(p),
           timers(p.events),
-          link(panel, forms.main, line, p.serialPort, p.tcpSocket, p.clock, p.events, p.boxes,
-               p.debug),
-          reader(panel, forms.main, line, link, mirror.SweepTime, p.clock, p.events, p.boxes),
-          exchange(panel, line, link, reader, p.clock, p.events, p.boxes),
-          bytes(panel, forms.main, line, link, p.tcpSocket, p.clock, p.events, p.boxes),
-          binary(panel, line, link, reader, bytes, p.clock, p.events, p.boxes),
+          link(forms, line, p.serialPort, p.tcpSocket, session, p.debug),
+          reader(forms, line, link, mirror.SweepTime, session),
+          exchange(panel, line, link, reader, session),
+          bytes(forms, line, link, p.tcpSocket, session),
+          binary(panel, line, link, reader, bytes, session),
+          instrument{line, link, reader, exchange, binary},
           labels(panel, forms.main, mirror, exchange, p.events),
           conversion(panel, mirror, forms.waterfall.Graph3D),
           scaling(panel, forms.waterfall, mirror, p.clock),
@@ -119,6 +120,7 @@ struct Program::Rooms {
     Platform platform;
     Forms forms;
     ControllerForm& panel = forms.controller;
+    Session session{platform.clock, platform.events, platform.boxes, panel.DebugTextBox};
     ZEL3Variables mirror;
     ZELBas line;
     TimerDriver timers;
@@ -127,6 +129,7 @@ struct Program::Rooms {
     CommandExchange exchange;
     BinaryReader bytes;
     BinaryTrace binary;
+    InstrumentLink instrument;
     FrequencyLabels labels;
     TraceConversion conversion;
     GraphScaling scaling;

@@ -28,10 +28,10 @@ inline std::string levelBlock(std::int32_t sample) {
     return traceBlock(std::vector<std::int32_t>(301, sample));
 }
 
-struct Session {
-    explicit Session(const std::string& commandLine = "")
+struct TestSession {
+    explicit TestSession(const std::string& commandLine = "")
         : program(platform.bundle(), commandLine) {}
-    virtual ~Session() = default;
+    virtual ~TestSession() = default;
 
     VirtualPlatform platform;
     Program program;

@@ -66,8 +66,8 @@ class Page {
     Others others_;
 };
 
-struct Bench : Session {
-    explicit Bench(const std::string& commandLine = "") : Session(commandLine) {
+struct Bench : TestSession {
+    explicit Bench(const std::string& commandLine = "") : TestSession(commandLine) {
         platform.ports.ports = {"COM1", "COM3"};
         program.start();
     }

@@ -57,8 +57,8 @@ inline Texts linesOf(const std::string& text) {
     return lines;
 }
 
-struct FileSession : Session {
-    explicit FileSession(const std::string& commandLine = "") : Session(commandLine) {
+struct FileSession : TestSession {
+    explicit FileSession(const std::string& commandLine = "") : TestSession(commandLine) {
         program.start();
         mirror.ResolutionBandwidth = 7;
         mirror.VideoBandwidth = 9;

@@ -73,11 +73,12 @@ struct LineRig {
     MainForm& dialog = forms.main;
     ZELBas state;
     double SweepTime = 0;
-    ByteLink link{panel, dialog, state, port, socket, platform.clock, events, boxes, debug};
-    AnswerReader reader{panel, dialog, state, link, SweepTime, platform.clock, events, boxes};
-    CommandExchange exchange{panel, state, link, reader, platform.clock, events, boxes};
-    BinaryReader byteReader{panel, dialog, state, link, socket, platform.clock, events, boxes};
-    BinaryTrace binary{panel, state, link, reader, byteReader, platform.clock, events, boxes};
+    Session session{platform.clock, events, boxes, panel.DebugTextBox};
+    ByteLink link{forms, state, port, socket, session, debug};
+    AnswerReader reader{forms, state, link, SweepTime, session};
+    CommandExchange exchange{panel, state, link, reader, session};
+    BinaryReader byteReader{forms, state, link, socket, session};
+    BinaryTrace binary{panel, state, link, reader, byteReader, session};
 
     /// The same session over a socket, whose script is `socket`.
     void overTcp() {

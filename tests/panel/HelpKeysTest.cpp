@@ -9,7 +9,7 @@
 namespace zel {
 namespace {
 
-struct HelpKeysTest : Session, ::testing::Test {
+struct HelpKeysTest : TestSession, ::testing::Test {
     HelpKeysTest() {
         program.start();
         platform.folder.folder = own.file("");

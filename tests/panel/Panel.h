@@ -39,7 +39,7 @@ inline const char* const kContinuousView =
     "Please exit the continuous View Mode first\r\n"
     "Use the red stop button in the upper right corner.";
 
-struct PanelSession : Session {
+struct PanelSession : TestSession {
     PanelSession() {
         startConnected();
         mirror.TraceDetector = 3;

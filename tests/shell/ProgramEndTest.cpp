@@ -11,7 +11,7 @@ namespace {
 
 using Texts = std::vector<std::string>;
 
-struct ProgramEndTest : Session, ::testing::Test {
+struct ProgramEndTest : TestSession, ::testing::Test {
     Texts unloaded;
 
     ProgramEndTest() {

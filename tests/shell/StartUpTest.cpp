@@ -9,7 +9,7 @@
 namespace zel {
 namespace {
 
-struct StartUpTest : Session, ::testing::Test {};
+struct StartUpTest : TestSession, ::testing::Test {};
 
 TEST_F(StartUpTest, Rest_HasNoConnectionAndAShownPanel) {
     program.start();
@@ -121,7 +121,7 @@ struct CommandLineRow {
 class CommandLine : public ::testing::TestWithParam<CommandLineRow> {};
 
 TEST_P(CommandLine, Words_AreFoundAnywhereInEitherCase) {
-    Session session(GetParam().line);
+    TestSession session(GetParam().line);
     bool serverShown = false;
     bool quickAtServer = false;
     session.forms.server.Changed.connect([&] {
@@ -150,7 +150,7 @@ INSTANTIATE_TEST_SUITE_P(Lines, CommandLine,
                                            CommandLineRow{"butt on serv er", false, false}));
 
 TEST(ServerStartTest, ServerWindowClosed_EndsTheProgram) {
-    Session session("server");
+    TestSession session("server");
     bool modal = false;
     session.platform.events.schedule(10, [&] {
         modal = session.forms.server.Modal;

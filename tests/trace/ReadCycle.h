@@ -19,7 +19,7 @@ inline constexpr Setting kSettings[] = {
     {"FREQ", "1500000000"}, {"SPAN", "1000000"}, {"REFLVL", "-20"}, {"UNIT", "0"},
     {"RANGE", "1"},         {"DYNRANGE", "1"},   {"TRACEDET", "3"}, {"SWPTIME", "0.02"}};
 
-struct ReadCycle : Session, ::testing::Test {
+struct ReadCycle : TestSession, ::testing::Test {
     ReadCycle() { startConnected(); }
 
     /// The first `count` queries of a full cycle, some with other answers.
