@@ -1,8 +1,7 @@
 #include "connection/Disconnection.h"
 
-#include "connection/Handshake.h"
 #include "link/DebugLine.h"
-#include "panel/Interlock.h"
+#include "support/CommandWord.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -145,29 +144,6 @@ void Disconnection::ClosePortAndClearIdentity() {
     dialog_.IDText.Text = "";
     dialog_.IsConnectedToPort = false;
     panel_.isConnected = false;
-}
-
-RemoteToggle::RemoteToggle(ControllerForm& panel, CommandExchange& exchange, Events& events,
-                           MessageBoxes& boxes)
-    : panel_(panel), exchange_(exchange), events_(events), boxes_(boxes) {
-    panel_.OnOffButton.Clicked.connect([this] { OnOffButton_Click(); });
-    panel_.LocalButton.Clicked.connect([this] { LocalButton_Click(); });
-}
-
-bool RemoteToggle::mayAct() {
-    return !refusedUnconnected(panel_, boxes_) && !refusedByContinuousView(panel_, boxes_);
-}
-
-void RemoteToggle::OnOffButton_Click() {
-    if (!mayAct()) return;
-    const Hourglass busy(panel_, events_);
-    const bool toRemote = panel_.OnOffButton.Caption.get() == "R";
-    exchange_.CmdInstrument(toRemote ? "REMOTE" : "LOCAL");
-    panel_.OnOffButton.Caption = toRemote ? "L" : "R";
-}
-
-void RemoteToggle::LocalButton_Click() {
-    if (mayAct()) exchange_.CmdInstrument("LOCAL");
 }
 
 }  // namespace zel

@@ -6,6 +6,7 @@
 #include "link/DebugLine.h"
 #include "panel/MenuTables.h"
 #include "panel/ModeOptions.h"
+#include "support/CommandWord.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 
@@ -19,11 +20,6 @@ constexpr int kBeforeFirstCrMs = 500;
 constexpr std::size_t kIdentityShown = 13;  // characters
 
 }  // namespace
-
-bool testCommandWord(ControllerForm& panel, const char* word) {
-    panel.STAT = upperCase(panel.CommandLine).find(word) != std::string::npos;
-    return panel.STAT;
-}
 
 Handshake::Handshake(Forms& forms, ZEL3Variables& mirror, ZELBas& state, ByteLink& link,
                      AnswerReader& reader, CommandExchange& exchange, FrequencyLabels& labels,

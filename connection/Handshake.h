@@ -7,18 +7,14 @@
 #include "link/AnswerReader.h"
 #include "link/ByteLink.h"
 #include "link/CommandExchange.h"
-#include "model/FrequencyLabels.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
 #include "panel/SoftPanel.h"
 #include "platform/Events.h"
 #include "platform/MessageBox.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
-
-/// Whether the program was started with that word, anywhere in its command line and in either
-/// case; the result is kept as the last word test's.
-bool testCommandWord(ControllerForm& panel, const char* word);
 
 class Handshake {
   public:

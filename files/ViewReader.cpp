@@ -7,9 +7,9 @@
 
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
-#include "model/FrequencyLabels.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {

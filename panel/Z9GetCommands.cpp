@@ -3,10 +3,10 @@
 #include <algorithm>
 #include <cmath>
 
-#include "model/FrequencyLabels.h"
 #include "model/Numeric.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {

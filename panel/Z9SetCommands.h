@@ -7,12 +7,12 @@
 
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
-#include "model/FrequencyLabels.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MarkerReadout.h"
 #include "panel/SoftPanel.h"
 #include "panel/Z9GetCommands.h"
 #include "platform/Events.h"
+#include "trace/FrequencyLabels.h"
 #include "trace/GraphScaling.h"
 #include "trace/TraceReader.h"
 

@@ -1,9 +1,8 @@
 #include "shell/StartUp.h"
 
-#include "connection/Handshake.h"
 #include "connection/Profiles.h"
-#include "link/TCPIPOps.h"
 #include "panel/MenuTables.h"
+#include "support/CommandWord.h"
 #include "support/TimeText.h"
 
 namespace zel {
@@ -71,20 +70,6 @@ void StartUp::hideUnused() {
     dialog.AirBaudRateText.Locked = true;
     forms_.tcpConnection.IDTextBox.Locked = true;
     forms_.server.txtDebug.Locked = true;
-}
-
-SecondTimer::SecondTimer(Forms& forms, Socket& serverSocket, SessionClock& sessionClock)
-    : forms_(forms), socket_(serverSocket), sessionClock_(sessionClock) {
-    forms_.controller.UpNow.Tick.connect([this] { UpNow_Timer(); });
-}
-
-void SecondTimer::UpNow_Timer() {
-    if (socket_.state() == SocketState::Error) {
-        socket_.close();
-        ListenOnPort(socket_, forms_.server.localPortTextBox.Text);
-        forms_.server.txtDebug.Text = "Connection broken";
-    }
-    sessionClock_.show();
 }
 
 }  // namespace zel

@@ -1,13 +1,11 @@
 #pragma once
 // What happens from the start of the program until the panel waits for the user.
 
-#include "connection/SessionClock.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
 #include "panel/SoftPanel.h"
 #include "platform/Clock.h"
 #include "platform/Services.h"
-#include "platform/Socket.h"
 #include "shell/ServerMode.h"
 #include "shell/VersionInfo.h"
 #include "trace/GraphInteraction.h"
@@ -34,19 +32,6 @@ class StartUp {
     ServerMode& server_;
     const Clock& clock_;
     SettingsStore& settings_;
-};
-
-/// The one second timer: a server whose socket is in error goes back to listening, and the
-/// session's time is shown.
-class SecondTimer {
-  public:
-    SecondTimer(Forms& forms, Socket& serverSocket, SessionClock& sessionClock);
-    void UpNow_Timer();
-
-  private:
-    Forms& forms_;
-    Socket& socket_;
-    SessionClock& sessionClock_;
 };
 
 }  // namespace zel

@@ -4,8 +4,8 @@
 #include <cmath>
 
 #include "model/CodeTables.h"
-#include "model/FrequencyLabels.h"
 #include "support/NumberText.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {

@@ -3,11 +3,11 @@
 #include <algorithm>
 
 #include "connection/Handshake.h"
-#include "model/FrequencyLabels.h"
 #include "panel/MenuFill.h"
 #include "panel/SoftPanel.h"
 #include "tests/connection/Bench.h"
 #include "tests/link/Line.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {

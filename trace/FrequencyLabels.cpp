@@ -1,4 +1,4 @@
-#include "model/FrequencyLabels.h"
+#include "trace/FrequencyLabels.h"
 
 #include "model/Numeric.h"
 #include "support/NumberText.h"

@@ -1,0 +1,12 @@
+#include "support/CommandWord.h"
+
+#include "support/Text.h"
+
+namespace zel {
+
+bool testCommandWord(ControllerForm& panel, const char* word) {
+    panel.STAT = upperCase(panel.CommandLine).find(word) != std::string::npos;
+    return panel.STAT;
+}
+
+}  // namespace zel
