@@ -1,17 +1,19 @@
 #include "bench/Figures.h"
 
 #include <algorithm>
+#include <array>
+#include <charconv>
 #include <chrono>
 #include <cmath>
-#include <cstdio>
 
 namespace zelbench {
 namespace {
 
 std::string fixed(double value, int decimals) {
-    char room[64];
-    std::snprintf(room, sizeof room, "%.*f", decimals, value);
-    return room;
+    std::array<char, 400> room{};
+    const auto end = std::to_chars(room.data(), room.data() + room.size(), value,
+                                   std::chars_format::fixed, decimals);
+    return {room.data(), end.ptr};
 }
 
 }  // namespace

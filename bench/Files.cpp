@@ -5,6 +5,7 @@
 #include <charconv>
 #include <filesystem>
 #include <fstream>
+#include <locale>
 #include <random>
 #include <stdexcept>
 
@@ -79,6 +80,7 @@ double loadSeconds(Bench& bench, const std::string& path) {
 double plainSeconds(const std::string& path, double& sum) {
     return timeOf([&] {
         std::ifstream in(path, std::ios::binary);
+        in.imbue(std::locale::classic());
         std::string text(std::filesystem::file_size(path), '\0');
         in.read(text.data(), static_cast<std::streamsize>(text.size()));
         const char* at = text.data();

@@ -1,6 +1,7 @@
 #include "bench/Windows.h"
 
 #include "bench/Process.h"
+#include "support/NumberText.h"
 
 namespace zelbench {
 namespace {
@@ -22,7 +23,7 @@ double startOf(const std::string& program) {
 Figure idleShare(const std::string& panel, const std::string& simulator) {
     const Simulator instrument(simulator, {});
     Process process(panel, {instrument.device(), std::to_string(kIdleSeconds)});
-    const double share = std::stod(process.line(kIdlePatience));
+    const double share = zel::leadingNumber(process.line(kIdlePatience));
     return {"(e) idle program, connected, CPU time",
             timeText(share * kIdleSeconds),
             std::to_string(kIdleSeconds) + " s of a core",

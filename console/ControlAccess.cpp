@@ -1,7 +1,6 @@
 #include "console/ControlAccess.h"
 
 #include <algorithm>
-#include <charconv>
 #include <type_traits>
 
 #include "platform/Controls.h"
@@ -88,12 +87,7 @@ constexpr Row kRows[] = {
 std::optional<int> listIndex(std::string_view property) {
     constexpr std::string_view head = "List(";
     if (!startsWith(property, head) || property.back() != ')') return std::nullopt;
-    const std::string_view digits = property.substr(head.size(), property.size() - head.size() - 1);
-    int index = 0;
-    const char* const end = digits.data() + digits.size();
-    const auto result = std::from_chars(digits.data(), end, index);
-    if (digits.empty() || result.ec != std::errc() || result.ptr != end) return std::nullopt;
-    return index;
+    return wholeNumber(property.substr(head.size(), property.size() - head.size() - 1));
 }
 
 std::optional<std::string> listEntry(const Control& control, std::string_view property) {

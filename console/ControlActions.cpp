@@ -1,11 +1,11 @@
 #include "console/ControlActions.h"
 
-#include <charconv>
 #include <optional>
 
 #include "platform/Controls.h"
 #include "platform/Graph.h"
 #include "platform/KeyInput.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {
@@ -25,14 +25,6 @@ const NamedKey* namedKey(std::string_view name) {
     for (const NamedKey& key : kKeys)
         if (key.name == name) return &key;
     return nullptr;
-}
-
-std::optional<int> wholeNumber(std::string_view text) {
-    int number = 0;
-    const char* const end = text.data() + text.size();
-    const auto result = std::from_chars(text.data(), end, number);
-    if (text.empty() || result.ec != std::errc() || result.ptr != end) return std::nullopt;
-    return number;
 }
 
 bool locked(const Control& control) {

@@ -5,6 +5,7 @@
 
 #include "console/ControlAccess.h"
 #include "console/GraphText.h"
+#include "support/NumberText.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -224,15 +225,11 @@ void PanelSession::disconnect(std::string_view) { click("Disconnect"); }
 void PanelSession::answer(std::string_view rest) { m_.answers.add(std::string(rest)); }
 
 void PanelSession::pump(std::string_view rest) {
-    const std::string text = trimmed(rest);
-    const bool digits = !text.empty() && text.size() <= 8 &&
-                        text.find_first_not_of("0123456789") == std::string::npos;
-    const int ms = digits ? std::stoi(text) : -1;
-    if (ms < 0 || ms > kLongestPumpMs)
-        return complain("pump takes milliseconds, at most a day of them");
-    if (ms == 0) return m_.events.pump();
+    const std::optional<int> ms = wholeNumber(trimmed(rest), 0, kLongestPumpMs);
+    if (!ms) return complain("pump takes milliseconds, at most a day of them");
+    if (*ms == 0) return m_.events.pump();
     // The time passes between the commands, or where the command around this one waits.
-    pumpUntil_ = m_.clock.micros() + std::int64_t{ms} * 1000;
+    pumpUntil_ = m_.clock.micros() + std::int64_t{*ms} * 1000;
 }
 
 void PanelSession::quit(std::string_view) { ended_ = true; }

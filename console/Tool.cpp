@@ -3,6 +3,7 @@
 #include <unistd.h>
 
 #include <fstream>
+#include <locale>
 #include <memory>
 
 #include "console/ConsoleDialogs.h"
@@ -56,6 +57,7 @@ void drawBar(std::ostream& stream, int done, int wanted) {
 
 int runPanel(const Options& options, Front& front, LineOutput& output, LineOutput& errors) {
     std::ifstream file;
+    file.imbue(std::locale::classic());
     std::unique_ptr<LineInput> input;
     if (options.argument.empty()) {
         input = std::make_unique<DescriptorLines>(STDIN_FILENO);

@@ -5,6 +5,7 @@
 #include <QTimer>
 #include <cstdio>
 #include <cstdlib>
+#include <iostream>
 
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/MainWindow.h"
@@ -51,9 +52,7 @@ Options parse(const QApplication& application) {
         options.address = zel::linkAddressOf(parser.value("connect").toStdString());
         options.valid = options.address.has_value();
         if (!options.valid) {
-            std::fprintf(stderr,
-                         "zelremote: --connect takes serial:DEVICE[@BAUD] or "
-                         "tcp:HOST:PORT\n");
+            std::cerr << "zelremote: --connect takes serial:DEVICE[@BAUD] or tcp:HOST:PORT\n";
         }
     }
     return options;
@@ -62,7 +61,7 @@ Options parse(const QApplication& application) {
 bool saveWindow(zel::MainWindow& window, const QString& file) {
     window.showNow();
     if (window.grab().save(file)) return true;
-    std::fprintf(stderr, "zelremote: cannot write %s\n", qPrintable(file));
+    std::cerr << "zelremote: cannot write " << file.toStdString() << '\n';
     return false;
 }
 

@@ -7,14 +7,13 @@
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "support/Text.h"
 
 namespace zel {
 namespace {
 
 constexpr std::string_view kBlank = " ";
 constexpr double kMostRange = 255;
-
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
 
 }  // namespace
 

@@ -82,7 +82,7 @@ double scaledNumber(const std::string& text, std::size_t stop, double factor) {
     // Without a prefix the whole text has to be a number.
     const std::string number = factor == 1 ? text : text.substr(0, stop);
     double value = 0;
-    if (!IsNumericText(number) || !parseLocaleNumber(number, value)) return 0;
+    if (!IsNumericText(number) || !parsePlainNumber(number, value)) return 0;
     return value * factor;
 }
 
@@ -135,7 +135,7 @@ double ParseLength(const std::string& text, std::string& unit) {
     const std::string number = factor == 1 ? plain : plain.substr(0, stop);
     double value = 0;
     if (!IsNumericText(number)) return 0;
-    if (!parseLocaleNumber(number, value)) throw std::invalid_argument(plain);
+    if (!parsePlainNumber(number, value)) throw std::invalid_argument(plain);
     return value * factor;
 }
 

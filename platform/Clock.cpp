@@ -1,8 +1,6 @@
 #include "platform/Clock.h"
 
-#include <array>
 #include <chrono>
-#include <cstdio>
 
 namespace zel {
 namespace {
@@ -20,23 +18,28 @@ std::pair<int, int> daysAndSeconds(double date) {
     return {days, second};
 }
 
+/// With zeros in front, up to the width.
+std::string padded(int number, std::size_t width) {
+    std::string text = std::to_string(number);
+    if (text.size() < width) text.insert(0, width - text.size(), '0');
+    return text;
+}
+
 }  // namespace
+
+std::string clockText(int secondOfDay) {
+    return padded(secondOfDay / 3600, 2) + ":" + padded(secondOfDay / 60 % 60, 2) + ":" +
+           padded(secondOfDay % 60, 2);
+}
 
 std::string Clock::dateText(double date) const {
     using namespace std::chrono;
     const year_month_day day = sys_days(year(1899) / 12 / 30) + days(daysAndSeconds(date).first);
-    std::array<char, 16> text{};
-    std::snprintf(text.data(), text.size(), "%04d-%02u-%02u", static_cast<int>(day.year()),
-                  static_cast<unsigned>(day.month()), static_cast<unsigned>(day.day()));
-    return text.data();
+    return padded(static_cast<int>(day.year()), 4) + "-" +
+           padded(static_cast<int>(static_cast<unsigned>(day.month())), 2) + "-" +
+           padded(static_cast<int>(static_cast<unsigned>(day.day())), 2);
 }
 
-std::string Clock::timeText(double date) const {
-    const int second = daysAndSeconds(date).second;
-    std::array<char, 16> text{};
-    std::snprintf(text.data(), text.size(), "%02d:%02d:%02d", second / 3600, second / 60 % 60,
-                  second % 60);
-    return text.data();
-}
+std::string Clock::timeText(double date) const { return clockText(daysAndSeconds(date).second); }
 
 }  // namespace zel

@@ -8,6 +8,9 @@
 
 namespace zel {
 
+/// "23:59:59" of a second of the day.
+std::string clockText(int secondOfDay);
+
 class Clock {
   public:
     virtual ~Clock() = default;

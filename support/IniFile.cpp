@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <locale>
 #include <utility>
 
 #include "support/Text.h"
@@ -54,6 +55,7 @@ std::optional<std::string> bytesOf(const std::string& fileName) {
     std::error_code error;
     if (!std::filesystem::is_regular_file(fileName, error)) return std::nullopt;
     std::ifstream stream(fileName, std::ios::binary);
+    stream.imbue(std::locale::classic());
     if (!stream) return std::nullopt;
     std::string bytes(kLargestFile + 1, '\0');
     stream.read(bytes.data(), static_cast<std::streamsize>(bytes.size()));
@@ -201,6 +203,7 @@ bool IniFile::save(const std::string& fileName) const {
     if (!readable_ || bytes.size() > kLargestFile) return false;
     const std::string beside = fileName + ".new";
     std::ofstream stream(beside, std::ios::binary | std::ios::trunc);
+    stream.imbue(std::locale::classic());
     stream << bytes;
     stream.close();
     std::error_code error;

@@ -4,8 +4,8 @@
 #include <array>
 #include <charconv>
 #include <cmath>
-#include <cstdio>
-#include <cstdlib>
+
+#include "support/Text.h"
 
 namespace zel {
 namespace {
@@ -15,8 +15,6 @@ constexpr int kMostDecimals = 15;
 constexpr double kFixedLimit = 1e15;
 constexpr int kMostRounding = 15;  // finer steps than a double has
 constexpr int kMostPatternDecimals = 20;
-
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
 
 /// Length of the number at the head of a text that begins with sign, digit or point; 0 for none.
 std::size_t numberLength(std::string_view text) {
@@ -41,10 +39,12 @@ std::size_t numberLength(std::string_view text) {
     return end;
 }
 
-std::string printed(const char* format, int precision, double value) {
+/// That many decimals, correctly rounded.
+std::string printed(double value, std::chars_format format, int decimals) {
     std::array<char, 512> buffer{};
-    const int length = std::snprintf(buffer.data(), buffer.size(), format, precision, value);
-    return length > 0 ? std::string(buffer.data()) : std::string("0");
+    const auto end =
+        std::to_chars(buffer.data(), buffer.data() + buffer.size(), value, format, decimals);
+    return {buffer.data(), end.ptr};
 }
 
 void dropTrailingZeros(std::string& text) {
@@ -77,9 +77,11 @@ double leadingNumber(std::string_view text) {
 std::string generalNumber(double value) {
     if (!std::isfinite(value) || value == 0) return "0";
     // The 15 significant digits and the exponent decide the form.
-    std::string digits = printed("%.*E", kSignificant - 1, value);
-    const auto mark = digits.find('E');
-    const int exponent = std::atoi(digits.c_str() + mark + 1);
+    const std::string digits = printed(value, std::chars_format::scientific, kSignificant - 1);
+    const auto mark = digits.find('e');
+    // The exponent comes with its sign and with at least two digits, as it is shown.
+    const std::string tail = digits.substr(mark + 1);
+    const int exponent = static_cast<int>(leadingNumber(tail));
     std::string mantissa = digits.substr(0, mark);
     dropTrailingZeros(mantissa);
     const auto point = mantissa.find('.');
@@ -88,13 +90,8 @@ std::string generalNumber(double value) {
     const int decimals = mantissaDecimals - exponent;
     const bool fixed =
         std::fabs(value) < kFixedLimit && exponent < kSignificant && decimals <= kMostDecimals;
-    if (!fixed) {
-        std::array<char, 16> text{};
-        std::snprintf(text.data(), text.size(), "E%c%02d", exponent < 0 ? '-' : '+',
-                      std::abs(exponent));
-        return mantissa + text.data();
-    }
-    return printed("%.*f", decimals > 0 ? decimals : 0, value);
+    if (!fixed) return mantissa + "E" + tail;
+    return printed(value, std::chars_format::fixed, std::max(decimals, 0));
 }
 
 std::string numberText(double value) {
@@ -124,7 +121,7 @@ std::string formatPattern(double value, std::string_view pattern) {
     const double scaled = magnitude * scale;
     const double rounded =
         scaled < 1e15 ? std::floor(scaled + 0.5 + scaled * 1e-15) / scale : magnitude;
-    std::string text = printed("%.*f", decimals, rounded);
+    std::string text = printed(rounded, std::chars_format::fixed, decimals);
     std::string digits = text.substr(0, text.find('.'));
     std::string tail = decimals > 0 ? text.substr(text.find('.') + 1) : "";
     while (static_cast<int>(tail.size()) > fractionZeros && tail.back() == '0') tail.pop_back();
@@ -149,6 +146,15 @@ std::string shortestNumber(double value) {
     std::array<char, 64> buffer{};
     const auto result = std::to_chars(buffer.data(), buffer.data() + buffer.size(), value);
     return {buffer.data(), result.ptr};
+}
+
+std::optional<int> wholeNumber(std::string_view text, int lowest, int highest) {
+    int number = 0;
+    const char* const end = text.data() + text.size();
+    const auto result = std::from_chars(text.data(), end, number);
+    const bool whole = result.ec == std::errc() && result.ptr == end;
+    if (!whole || number < lowest || number > highest) return std::nullopt;
+    return number;
 }
 
 }  // namespace zel

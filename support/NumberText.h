@@ -1,6 +1,8 @@
 #pragma once
 // Numbers as texts and back, always with a point as the decimal mark.
 
+#include <limits>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -20,5 +22,8 @@ std::string formatPattern(double value, std::string_view pattern);
 double roundHalfEven(double value, int digits);
 /// The shortest text that reads back as the same number.
 std::string shortestNumber(double value);
+/// The whole number that the text is, from `lowest` to `highest`; nothing for any other text.
+std::optional<int> wholeNumber(std::string_view text, int lowest = std::numeric_limits<int>::min(),
+                               int highest = std::numeric_limits<int>::max());
 
 }  // namespace zel

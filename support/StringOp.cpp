@@ -8,8 +8,6 @@
 namespace zel {
 namespace {
 
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
-
 bool isNumericWithout(std::string_view text, char mark) {
     return IsNumericText(replaceAll(text, std::string_view(&mark, 1), ""));
 }
@@ -24,7 +22,7 @@ std::string TrimControlChars(std::string_view text) {
     return blanksGone.substr(first, blanksGone.find_last_not_of(kControls) - first + 1);
 }
 
-bool parseLocaleNumber(std::string_view text, double& value) {
+bool parsePlainNumber(std::string_view text, double& value) {
     const std::string plain = trimmed(text);
     std::string digits;
     std::size_t i = 0;
@@ -59,9 +57,9 @@ bool parseLocaleNumber(std::string_view text, double& value) {
 
 bool IsNumericText(std::string_view text) {
     double ignored = 0;
-    if (parseLocaleNumber(text, ignored)) return true;
+    if (parsePlainNumber(text, ignored)) return true;
     for (const std::string_view head : {".", "-."})
-        if (startsWith(text, head) && parseLocaleNumber(text.substr(head.size()), ignored))
+        if (startsWith(text, head) && parsePlainNumber(text.substr(head.size()), ignored))
             return true;
     bool numeric = false;
     if (contains(text, "s")) numeric = isNumericWithout(text, 's');

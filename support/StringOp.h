@@ -10,9 +10,10 @@ namespace zel {
 std::string TrimControlChars(std::string_view text);
 /// A number as the panel reads one: blanks around it, commas that group ahead of the point, also
 /// "." or "-." ahead of a number, also with letters "s" or signs "%" anywhere. So it passes texts
-/// that `parseLocaleNumber` does not read.
+/// that `parsePlainNumber` does not read.
 bool IsNumericText(std::string_view text);
-/// Reads a text that is a number by the locale's rule alone; false where it is none.
-bool parseLocaleNumber(std::string_view text, double& value);
+/// Reads a text that is a number by the strict rule: a point, commas only as groups. False where
+/// it is none.
+bool parsePlainNumber(std::string_view text, double& value);
 
 }  // namespace zel

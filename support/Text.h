@@ -10,6 +10,8 @@ namespace zel {
 /// Joins two lines of a caption or a message.
 inline constexpr const char* kCrLf = "\r\n";
 
+/// One of 0 to 9.
+constexpr bool isDigit(char c) { return c >= '0' && c <= '9'; }
 /// ASCII letters only; all else stays.
 std::string upperCase(std::string_view text);
 std::string lowerCase(std::string_view text);

@@ -8,7 +8,7 @@
 
 #include <QApplication>
 #include <QTemporaryDir>
-#include <cstdio>
+#include <iostream>
 #include <string>
 
 #include "bench/Figures.h"
@@ -17,6 +17,7 @@
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
 #include "shell/Program.h"
+#include "support/NumberText.h"
 
 namespace {
 
@@ -43,8 +44,7 @@ int idleShare(zel::Program& program, const std::string& device, int seconds) {
     const double cpu = cpuSeconds();
     const double start = zelbench::now();
     runFor(seconds * 1000);
-    std::printf("%.6f\n", (cpuSeconds() - cpu) / (zelbench::now() - start));
-    std::fflush(stdout);
+    std::cout << zel::shortestNumber((cpuSeconds() - cpu) / (zelbench::now() - start)) << std::endl;
     program.disconnect();
     return 0;
 }
@@ -61,11 +61,10 @@ int main(int argc, char** argv) {
     if (argc == 3) {
         program.start();
         window.show();
-        return idleShare(program, argv[1], std::stoi(argv[2]));
+        return idleShare(program, argv[1], zel::wholeNumber(argv[2]).value_or(1));
     }
     const zelbench::FirstPaint watch(window, [] {
-        std::puts("painted");
-        std::fflush(stdout);
+        std::cout << "painted" << std::endl;
         QApplication::exit();
     });
     QTimer::singleShot(0, &application, [&] {

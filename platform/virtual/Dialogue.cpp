@@ -1,8 +1,9 @@
 #include "platform/virtual/Dialogue.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <memory>
+
+#include "platform/ByteText.h"
 
 namespace zel {
 
@@ -11,8 +12,7 @@ std::string hexAndText(std::string_view bytes) {
     std::string hex;
     std::string text;
     for (const char byte : bytes) {
-        char code[8];
-        std::snprintf(code, sizeof code, "%02X", static_cast<unsigned>(byte) & 0xFFU);
+        const std::string code = hexOf(byte);
         hex += hex.empty() ? "" : " ";
         hex += code;
         if (byte == '\r') {
@@ -20,7 +20,7 @@ std::string hexAndText(std::string_view bytes) {
         } else if (byte == '\n') {
             text += "\\n";
         } else if (byte < ' ' || byte > '~') {
-            text += std::string("\\x") + code;
+            text += "\\x" + code;
         } else {
             text += byte;
         }

@@ -15,6 +15,7 @@
 #include "platform/virtual/FaultyPort.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
+#include "support/NumberText.h"
 #include "tests/Told.h"
 #include "trace/TraceReader.h"
 
@@ -113,7 +114,7 @@ struct FaultRig {
     /// The centre frequency as the instrument has it.
     bool asksRightCentre() {
         std::string value;
-        return get("FREQ", value) && std::stod(value) == instrument.device().settings().centre;
+        return get("FREQ", value) && leadingNumber(value) == instrument.device().settings().centre;
     }
 };
 

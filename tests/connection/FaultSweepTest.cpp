@@ -115,7 +115,7 @@ TEST(FaultSweep, Get_EveryByte_TheNextExchangeWorks) {
 void begin(FaultRig& rig, const std::string& detector) {
     ASSERT_TRUE(rig.connect());
     ASSERT_TRUE(rig.set("TRACEDET," + detector));
-    rig.program.variables().TraceDetector = static_cast<std::uint8_t>(std::stoi(detector));
+    rig.program.variables().TraceDetector = static_cast<std::uint8_t>(leadingNumber(detector));
 }
 
 void sweepTrace(const std::string& detector, long blockBytes, std::size_t samples) {

@@ -16,6 +16,7 @@
 #include "console/LineOutput.h"
 #include "console/Options.h"
 #include "console/PanelSession.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {
@@ -286,8 +287,8 @@ TEST(SweepRows, OtherDetector_GivesOneValueARowAndReadsBackExactly) {
     const auto rows = sweepRows(panel, false);
     ASSERT_EQ(rows.size(), 301U);
     const auto comma = rows[1].find(',');
-    EXPECT_EQ(std::stod(rows[1].substr(0, comma)), 1.0 / 3);
-    EXPECT_EQ(std::stod(rows[1].substr(comma + 1)), 0.1 + 0.2);
+    EXPECT_EQ(leadingNumber(rows[1].substr(0, comma)), 1.0 / 3);
+    EXPECT_EQ(leadingNumber(rows[1].substr(comma + 1)), 0.1 + 0.2);
 }
 
 TEST(SweepRows, NoTrace_GivesNoRows) {

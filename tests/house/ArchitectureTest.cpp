@@ -77,6 +77,10 @@ TEST_F(Architecture, RealTime_IsUsedInItsPlacesOnly) {
     EXPECT_EQ(lines(realTimeUses(house_, files_)), "");
 }
 
+TEST_F(Architecture, LanguageOfTheUser_IsAskedInItsPlacesOnly) {
+    EXPECT_EQ(lines(localeUses(house_, files_)), "");
+}
+
 TEST_F(Architecture, Core_IncludesStandardHeadersOnly) {
     EXPECT_EQ(lines(foreignHeaders(house_, files_)), "");
 }

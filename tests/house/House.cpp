@@ -97,6 +97,19 @@ std::vector<std::string> circlesIn(const Arrows& arrows) {
     return circles;
 }
 
+bool beginsWithOneOf(std::string_view path, const std::vector<std::string>& places) {
+    return std::any_of(places.begin(), places.end(),
+                       [&](const std::string& place) { return startsWith(path, place); });
+}
+
+/// The paths in the first column of the table below a heading.
+std::vector<std::string> placesBelow(const std::string& markdown, const std::string& heading) {
+    std::vector<std::string> places;
+    for (const Row& row : tableBelow(markdown, heading))
+        for (const std::string& place : namesIn(row.at(0))) places.push_back(place);
+    return places;
+}
+
 }  // namespace
 
 const Room* House::roomOf(std::string_view path) const {
@@ -109,8 +122,11 @@ const Room* House::roomOf(std::string_view path) const {
 }
 
 bool House::isSystemPlace(std::string_view path) const {
-    return std::any_of(systemPlaces.begin(), systemPlaces.end(),
-                       [&](const std::string& place) { return startsWith(path, place); });
+    return beginsWithOneOf(path, systemPlaces);
+}
+
+bool House::isLocalePlace(std::string_view path) const {
+    return beginsWithOneOf(path, localePlaces);
 }
 
 House readHouse(const std::string& markdown) {
@@ -134,9 +150,8 @@ House readHouse(const std::string& markdown) {
         const std::vector<std::string> to = namesIn(row.at(1));
         if (from.size() == 1 && to.size() == 1) house.exceptions.push_back({from[0], to[0]});
     }
-    for (const Row& row : tableBelow(markdown, "The system and its clock")) {
-        for (const std::string& place : namesIn(row.at(0))) house.systemPlaces.push_back(place);
-    }
+    house.systemPlaces = placesBelow(markdown, "The system and its clock");
+    house.localePlaces = placesBelow(markdown, "The language of the user");
     return house;
 }
 

@@ -27,16 +27,20 @@ struct ArrowException {
 struct House {
     std::vector<Room> rooms;
     std::vector<ArrowException> exceptions;
+    std::vector<std::string> localePlaces;  ///< how the paths of files begin that may ask the
+                                            ///< settings of the user's language
     std::vector<std::string> systemPlaces;  ///< how the paths of files begin that may use the
                                             ///< system and its clock
 
     /// The room with the longest name that is a folder above the path; null if there is none.
     const Room* roomOf(std::string_view path) const;
     bool isSystemPlace(std::string_view path) const;
+    bool isLocalePlace(std::string_view path) const;
 };
 
-/// Reads the tables below the headings "Allowed arrows", "Exceptions" and "The system and its
-/// clock". Throws std::runtime_error when one of them has no table, or names a room that is none.
+/// Reads the tables below the headings "Allowed arrows", "Exceptions", "The system and its clock"
+/// and "The language of the user". Throws std::runtime_error when one of them has no table, or
+/// names a room that is none.
 House readHouse(const std::string& markdown);
 
 /// Each of these gives one line a breach, empty when all is in order.
@@ -61,6 +65,9 @@ std::vector<std::string> circlesOfIncludes(const House& house,
 std::vector<std::string> circlesOfTable(const House& house);
 /// Uses of real time outside of the places for it.
 std::vector<std::string> realTimeUses(const House& house, const std::vector<SourceFile>& files);
+/// Calls whose result depends on the language of the user, outside of the places for it and of the
+/// tests.
+std::vector<std::string> localeUses(const House& house, const std::vector<SourceFile>& files);
 /// Headers that rooms of standard C++ include and that are none of the language's.
 std::vector<std::string> foreignHeaders(const House& house, const std::vector<SourceFile>& files);
 /// Files of more lines than `limit`.

@@ -29,7 +29,11 @@ const char* const kTables =
     "## The system and its clock\n\n"
     "| place | why |\n"
     "| --- | --- |\n"
-    "| `low/Port` | the port |\n";
+    "| `low/Port` | the port |\n"
+    "## The language of the user\n\n"
+    "| place | why |\n"
+    "| --- | --- |\n"
+    "| `low/Date` | the date |\n";
 
 SourceFile including(const std::string& path, const std::string& included) {
     return {path, "#include \"" + included + "\"\n"};
@@ -47,6 +51,7 @@ TEST(ReadHouse, Row_GivesNameArrowsAndKind) {
     ASSERT_EQ(house.exceptions.size(), 1u);
     EXPECT_EQ(house.exceptions[0].included, "high/H.h");
     EXPECT_EQ(house.systemPlaces, Breaches{"low/Port"});
+    EXPECT_EQ(house.localePlaces, Breaches{"low/Date"});
 }
 
 TEST(ReadHouse, MissingTable_Throws) {
@@ -189,6 +194,54 @@ TEST(RealTimeUses, TimeOfTheProgramAndTalkOfClocks_AreInOrder) {
         "/* usleep(1) */ events.sleep(5); clock.now(); const char* t = \"usleep\";\n"
         "void VirtualEvents::sleep(int ms) {}\n";
     EXPECT_EQ(realTimeUses(readHouse(kTables), {{"low/A.cpp", text}}), Breaches{});
+}
+
+class LocaleWord : public ::testing::TestWithParam<const char*> {};
+
+TEST_P(LocaleWord, InCode_IsNamed) {
+    const std::string text = std::string("void f() {\n    ") + GetParam() + ";\n}\n";
+    const Breaches breaches = localeUses(readHouse(kTables), {{"high/A.cpp", text}});
+    ASSERT_EQ(breaches.size(), 1u);
+    EXPECT_EQ(breaches[0].rfind("high/A.cpp:2: ", 0), 0u) << breaches[0];
+}
+
+TEST_P(LocaleWord, InItsPlaceOrInATest_IsInOrder) {
+    const House house = readHouse(kTables);
+    EXPECT_EQ(localeUses(house, {{"low/DateA.cpp", GetParam()}}), Breaches{});
+    EXPECT_EQ(localeUses(house, {{"tests/low/A.cpp", GetParam()}}), Breaches{});
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    LocaleUses, LocaleWord,
+    ::testing::Values(
+        "std::printf(\"%f\", x)", "std::fprintf(file, \"%g\", x)", "std::sprintf(room, \"%e\", x)",
+        "std::snprintf(room, sizeof room, \"%.*f\", 3, x)", "vsnprintf(room, 9, format, list)",
+        "std::vfprintf(file, format, list)", "dprintf(1, \"%f\", x)", "asprintf(&text, \"%f\", x)",
+        "swprintf(room, 9, L\"%f\", x)", "QString::asprintf(\"%f\", x)", "std::strtod(text, &end)",
+        "strtof(text, &end)", "strtold(text, &end)", "std::strtol(text, &end, 10)",
+        "std::strtoull(text, &end, 10)", "wcstod(text, &end)", "std::stod(text)", "std::stof(text)",
+        "std::stold(text)", "std::stoi(text)", "std::stoul(text)", "std::stoll(text)",
+        "std::atof(text)", "atoi(text)", "atoll(text)", "std::sscanf(text, \"%lf\", &x)",
+        "fscanf(file, \"%lf\", &x)", "scanf(\"%lf\", &x)", "std::toupper(c)", "tolower(c)",
+        "::toupper(c)", "std::transform(a, b, c, ::tolower)", "towupper(c)", "std::isspace(c)",
+        "isdigit(c)", "std::isalpha(c)", "isalnum(c)", "isupper(c)", "islower(c)", "isprint(c)",
+        "ispunct(c)", "iscntrl(c)", "isxdigit(c)", "isgraph(c)", "isblank(c)", "iswspace(c)",
+        "strcasecmp(a, b)", "strncasecmp(a, b, n)", "std::strcoll(a, b)", "strxfrm(a, b, n)",
+        "std::strftime(room, 9, \"%c\", &t)", "out << std::put_time(&t, \"%c\")",
+        "in >> std::get_time(&t, \"%c\")", "std::setlocale(LC_ALL, \"\")", "localeconv()",
+        "std::locale::global(l)", "std::locale l(\"\")", "out.imbue(std::locale(\"\"))",
+        "std::ostringstream out", "std::istringstream in(text)", "std::stringstream both",
+        "std::ifstream in(path)", "std::ofstream out(path)", "std::fstream both(path)",
+        "QLocale().toString(x)", "QLocale::system().toDouble(text)", "QLocale locale",
+        "a.localeAwareCompare(b)", "QCollator order"));
+
+TEST(LocaleUses, OwnHelpersTalkAndClassicStreams_AreInOrder) {
+    const std::string text =
+        "// std::stod would ask the locale\n"
+        "upperCase(text); QChar(c).isSpace(); isDigit(c); std::to_chars(a, b, x); x.toDouble();\n"
+        "const char* word = \"printf\"; trace.printed(1); std::cout << text;\n"
+        "std::ostringstream out;\nout.imbue(std::locale::classic());\n";
+    EXPECT_EQ(localeUses(readHouse(kTables), {{"low/A.cpp", text}}), Breaches{});
 }
 
 TEST(ForeignHeaders, HeaderOfAToolkitOrTheSystem_IsNamed) {

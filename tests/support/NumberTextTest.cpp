@@ -1,7 +1,6 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
-#include <cstdlib>
 #include <limits>
 #include <string>
 
@@ -138,8 +137,26 @@ TEST(RoundHalfEvenTest, NoNumber_StaysAsItIs) {
 
 TEST(ShortestNumberTest, Value_ReadsBackAsTheSameNumber) {
     for (const double value : {0.1, 1.0 / 3, 1e22, -123.456, 5e-324})
-        EXPECT_EQ(std::strtod(shortestNumber(value).c_str(), nullptr), value) << value;
+        EXPECT_EQ(leadingNumber(shortestNumber(value)), value) << value;
 }
+
+struct WholeRow {
+    std::string text;
+    std::optional<int> expected;
+};
+class WholeNumberTest : public ::testing::TestWithParam<WholeRow> {};
+
+TEST_P(WholeNumberTest, Text_GivesItsNumberInsideTheBoundsOnly) {
+    EXPECT_EQ(wholeNumber(GetParam().text, 1, 65535), GetParam().expected) << GetParam().text;
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Texts, WholeNumberTest,
+    ::testing::Values(WholeRow{"1", 1}, WholeRow{"65535", 65535}, WholeRow{"0", std::nullopt},
+                      WholeRow{"65536", std::nullopt}, WholeRow{"", std::nullopt},
+                      WholeRow{" 1", std::nullopt}, WholeRow{"1 ", std::nullopt},
+                      WholeRow{"+1", std::nullopt}, WholeRow{"1.0", std::nullopt},
+                      WholeRow{"99999999999", std::nullopt}));
 
 TEST(ShortestNumberTest, ShortValue_HasNoSuperfluousDigits) {
     EXPECT_EQ(shortestNumber(0.1), "0.1");

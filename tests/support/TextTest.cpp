@@ -139,16 +139,16 @@ INSTANTIATE_TEST_SUITE_P(Others, IsNumeric,
 
 TEST(ParseLocaleNumberTest, Number_IsReadWithItsGroups) {
     double value = 0;
-    EXPECT_TRUE(parseLocaleNumber(" 1,234.5 ", value));
+    EXPECT_TRUE(parsePlainNumber(" 1,234.5 ", value));
     EXPECT_EQ(value, 1234.5);
-    EXPECT_TRUE(parseLocaleNumber("2E+3", value));
+    EXPECT_TRUE(parsePlainNumber("2E+3", value));
     EXPECT_EQ(value, 2000);
 }
 
 TEST(ParseLocaleNumberTest, OtherText_LeavesTheValue) {
     double value = 7;
-    EXPECT_FALSE(parseLocaleNumber("5 s", value));
-    EXPECT_FALSE(parseLocaleNumber("", value));
+    EXPECT_FALSE(parsePlainNumber("5 s", value));
+    EXPECT_FALSE(parsePlainNumber("", value));
     EXPECT_EQ(value, 7);
 }
 
