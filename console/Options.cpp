@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "console/PanelSession.h"
+#include "link/WireText.h"
 #include "shell/VersionInfo.h"
 #include "support/Text.h"
 
@@ -28,7 +29,11 @@ std::string keywordProblem(const std::string& keyword) {
 std::string settingProblem(const std::string& setting) {
     const auto comma = setting.find(',');
     if (comma == 0 || comma == std::string::npos) return "takes KEYWORD,VALUE";
-    return keywordProblem(setting);
+    const bool oneLine = std::none_of(setting.begin(), setting.end(),
+                                      [](char c) { return (c >= 0 && c < ' ') || c == '\x7F'; });
+    if (!oneLine) return "is no setting: " + setting;
+    const std::string keyword = keywordProblem(setting.substr(0, comma));
+    return keyword.empty() ? wireProblem(setting) : keyword;
 }
 
 std::string imageProblem(const std::string& file) {

@@ -95,6 +95,10 @@ bool PanelSession::whileWaiting(int ms) {
 
 /// False when no line has come yet.
 bool PanelSession::readAndExecute() {
+    if (!m_.output.problem().empty()) {  // nobody sees what further lines would do
+        ended_ = true;
+        return true;
+    }
     std::string line;
     switch (m_.input.next(line, m_.virtualTime)) {
         case LineInput::Got::Nothing:
@@ -110,7 +114,7 @@ bool PanelSession::readAndExecute() {
             break;
     }
     if (++line_ == 1 && startsWith(line, kUtf8Mark)) line.erase(0, kUtf8Mark.size());
-    execute(wireToUtf8(line));
+    execute(bytesToUtf8(line));
     return true;
 }
 

@@ -84,18 +84,27 @@ int runPanel(const Options& options, Front& front, LineOutput& output, LineOutpu
     return session.run();
 }
 
-}  // namespace
-
-int runTool(const Options& options, Front& front, std::ostream& out, std::ostream& errorStream) {
-    LineOutput output(out);
-    LineOutput errors(errorStream);
-    if (options.verb == Verb::Panel) return runPanel(options, front, output, errors);
+int runOneVerb(const Options& options, Front& front, const Streams& streams, LineOutput& output,
+               LineOutput& errors) {
     Stage stage(options, front, errors, errors);
     ProgressBar progress;
-    if (isatty(STDERR_FILENO) != 0)
-        progress = [&errorStream](int done, int wanted) { drawBar(errorStream, done, wanted); };
+    if (streams.errorsAreTerminal)
+        progress = [&streams](int done, int wanted) { drawBar(streams.errors, done, wanted); };
     return runVerb(options, {stage.program, stage.events, stage.answers, stage.boxes, output,
                              errors, writeGraphImage, progress});
+}
+
+}  // namespace
+
+int runTool(const Options& options, Front& front, const Streams& streams) {
+    LineOutput output(streams.out, streams.outIsTerminal);
+    LineOutput errors(streams.errors, streams.errorsAreTerminal);
+    const int status = options.verb == Verb::Panel
+                           ? runPanel(options, front, output, errors)
+                           : runOneVerb(options, front, streams, output, errors);
+    if (output.problem().empty()) return status;
+    errors.line("zelctl: the output cannot be written: " + output.problem());
+    return kLinkFailed;
 }
 
 }  // namespace zel

@@ -8,8 +8,16 @@
 
 namespace zel {
 
-/// Results go to `out`, all else to `errors`. Lines of a panel session without a file come from
-/// standard input.
-int runTool(const Options& options, Front& front, std::ostream& out, std::ostream& errors);
+/// Where a run writes.
+struct Streams {
+    std::ostream& out;     ///< results
+    std::ostream& errors;  ///< all else
+    bool outIsTerminal = false;
+    bool errorsAreTerminal = false;
+};
+
+/// The exit status. Results that cannot be written end the run with 1. Lines of a panel session
+/// without a file come from standard input.
+int runTool(const Options& options, Front& front, const Streams& streams);
 
 }  // namespace zel

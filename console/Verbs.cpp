@@ -72,7 +72,7 @@ int cmd(const Run& run) {
 
 int sweep(const Run& run) {
     const ControllerForm& panel = run.panel();
-    for (int i = 0; i < run.options.count; ++i) {
+    for (int i = 0; i < run.options.count && run.output().problem().empty(); ++i) {
         bool success = false;
         run.program().traces().ReadSingleTrace(success);
         if (!success) return run.fail("sweep " + std::to_string(i + 1) + " could not be read");

@@ -1,5 +1,8 @@
 // zelctl, the program without a window.
 
+#include <unistd.h>
+
+#include <csignal>
 #include <exception>
 #include <iostream>
 
@@ -10,8 +13,10 @@
 
 int main(int argc, char** argv) {
     zel::Options options;
+    // A reader that went away is a failed write, not the end of the program.
+    std::signal(SIGPIPE, SIG_IGN);
     if (const auto status = zel::parseOptions(argc, argv, options, std::cout, std::cerr))
-        return *status;
+        return std::cout.flush() ? *status : zel::kLinkFailed;
     try {
         // In a session each menu can be used, that of the picture too.
         const bool pictures = !options.image.empty() || options.verb == zel::Verb::Panel;
@@ -19,7 +24,9 @@ int main(int argc, char** argv) {
         const bool simulated = options.address && options.address->simulated;
         const auto front =
             simulated ? zel::makeSimulatorFront(options.home) : zel::makePortFront(options.home);
-        return zel::runTool(options, *front, std::cout, std::cerr);
+        return zel::runTool(
+            options, *front,
+            {std::cout, std::cerr, isatty(STDOUT_FILENO) != 0, isatty(STDERR_FILENO) != 0});
     } catch (const std::exception& problem) {
         std::cerr << "zelctl: " << problem.what() << '\n';
         return zel::kLinkFailed;

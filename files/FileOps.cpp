@@ -103,7 +103,7 @@ std::string FileOps::ReadWholeFile(const std::string& path, const Progress& prog
         if (progress) progress(bytes.size(), std::max<std::uint64_t>(size, bytes.size()));
     }
     if (std::ferror(file.get()) != 0) fail(path, std::generic_category().message(errno));
-    if (!isValidUtf8(bytes)) return wireToUtf8(bytes);
+    if (!isValidUtf8(bytes)) return bytesToUtf8(bytes);
     return bytes;
 }
 

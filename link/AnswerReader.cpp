@@ -4,6 +4,7 @@
 #include <cmath>
 
 #include "support/Text.h"
+#include "support/Windows1252.h"
 
 namespace zel {
 namespace {
@@ -103,7 +104,7 @@ void AnswerReader::judgeNoise() {
     if (!settled || IsPrintableAnswer(state_.InputBuffer)) return;
     boxes_.show({BoxIcon::Information,
                  "Incorrect baud rate for the connection!" + std::string(kCrLf) +
-                     "Received: " + wireToUtf8(state_.InputBuffer),
+                     "Received: " + fromWindows1252(state_.InputBuffer),
                  "Incorrect baud rate"});
     panel_.ErrorFlag = true;
     noiseTold_ = true;

@@ -5,6 +5,7 @@
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
+#include "support/Windows1252.h"
 
 namespace zel {
 namespace {
@@ -81,10 +82,12 @@ void ByteLink::OpenPortFromDialog() {
 }
 
 void ByteLink::WriteToLink(const std::string& text) {
+    const std::optional<std::string> bytes = toWindows1252(text);
+    if (!bytes) return;
     if (isTcp()) {
-        socket_.sendData(text);
+        socket_.sendData(*bytes);
     } else if (dialog_.IsConnectedToPort) {
-        port_.output(text);
+        port_.output(*bytes);
         debug_.output("-> " + text);
     }
 }

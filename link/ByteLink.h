@@ -23,7 +23,8 @@ class ByteLink {
     bool OpenSerialPort(const std::string& port, long baud);
     /// Takes port and baud rate from the dialog's lists and tells what is wrong with them.
     void OpenPortFromDialog();
-    /// Sends the text as it stands; dropped silently when the port was not opened.
+    /// Sends the text, a byte a character; dropped silently when the port was not opened, and when
+    /// `wireProblem` names a character of it.
     void WriteToLink(const std::string& text);
     /// What has arrived, possibly nothing. Serial never waits; TCP waits up to 0.1 s with `wait`
     /// and reads nothing without.

@@ -1,8 +1,10 @@
 #include "link/CommandExchange.h"
 
 #include "link/InstrumentErrors.h"
+#include "link/WireText.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "support/Windows1252.h"
 
 namespace zel {
 namespace {
@@ -52,7 +54,7 @@ void CommandExchange::report(int status, const std::string& keyword) {
 
 bool CommandExchange::finishCommand(const std::string& keyword, const std::string& firstAnswer,
                                     int status, float t0) {
-    session_.DebugLine("<" + keyword + "> response: " + wireToUtf8(firstAnswer));
+    session_.DebugLine("<" + keyword + "> response: " + fromWindows1252(firstAnswer));
     if (status == 2) {
         report(status, keyword);
     } else if (status != 0) {
@@ -71,6 +73,7 @@ bool CommandExchange::refuseCommand(const std::string& keyword, int status, floa
 
 bool CommandExchange::CmdInstrument(const std::string& keyword) {
     const DialogueScope scope(state_);
+    if (!sendable(keyword, session_.boxes)) return false;
     float t0 = 0;
     beginLine("CMD", keyword, t0);
     link_.drain(kDrainReads);
@@ -123,6 +126,7 @@ bool CommandExchange::triggeredDialogue(const std::string& keyword, std::int32_t
 
 bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
     const DialogueScope scope(state_);
+    if (!sendable(keywordAndValue, session_.boxes)) return false;
     float t0 = 0;
     beginLine("SET", keywordAndValue, t0);
     link_.drain(kDrainReads);
@@ -147,6 +151,7 @@ bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
 
 bool CommandExchange::GetInstrument(const std::string& keyword, std::string& value) {
     const DialogueScope scope(state_);
+    if (!sendable(keyword, session_.boxes)) return false;
     float t0 = 0;
     beginLine("GET", keyword, t0);
     link_.drain(kDrainReads);
@@ -175,7 +180,7 @@ bool CommandExchange::GetInstrument(const std::string& keyword, std::string& val
     delay(DelayPlace::BetweenStatusAndValue);
     std::string answer;
     if (!readValue(answer)) return false;
-    value = wireToUtf8(answer);
+    value = fromWindows1252(answer);
     session_.DebugLine("<" + keyword + "> response: " + value);
     finishLine("GET", keyword, t0);
     return true;

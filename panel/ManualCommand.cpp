@@ -3,8 +3,10 @@
 #include <algorithm>
 #include <string_view>
 
+#include "link/WireText.h"
 #include "panel/Interlock.h"
 #include "support/Text.h"
+#include "support/Windows1252.h"
 
 namespace zel {
 namespace {
@@ -79,6 +81,7 @@ void ManualCommand::SendButton_Click() {
         return;
     }
     if (refusedByContinuousView(panel_, boxes_)) return;
+    if (!sendable(panel_.ManualCommandText.Text.get(), boxes_)) return;
     const Hourglass busy(panel_, events_);
     std::string line = panel_.ManualCommandText.Text;
     if (line == "SET" || line == "set") SetLinePending_ = true;
@@ -100,7 +103,7 @@ std::string ManualCommand::readAnswer(const std::string& upperLine, bool statusO
     text += reader_.ReadAnswer();
     if (link_.isTcp() && upperLine != "GET" && upperLine != "SET" && upperLine != "CMD")
         text += state_.InputBuffer;
-    return wireToUtf8(text);
+    return fromWindows1252(text);
 }
 
 void ManualCommand::showAnswer(std::string text, bool statusOnly) {

@@ -71,7 +71,7 @@ IniFile IniFile::load(const std::string& fileName) {
     if (std::filesystem::status(fileName, error).type() == std::filesystem::file_type::not_found)
         return {};
     if (const std::optional<std::string> bytes = bytesOf(fileName))
-        return parse(wireToUtf8(*bytes));
+        return parse(bytesToUtf8(*bytes));
     IniFile unknown;
     unknown.readable_ = false;
     return unknown;
@@ -128,7 +128,7 @@ bool IniFile::setValue(std::string_view section, std::string_view key, std::stri
     if (!fitsALine(section) || !fitsAKey(key)) return false;
     // A line end in a value would begin a line of its own, and a byte that is no UTF-8 would
     // change how the whole file is read.
-    std::string plain = replaceAll(replaceAll(wireToUtf8(value), "\r", " "), "\n", " ");
+    std::string plain = replaceAll(replaceAll(bytesToUtf8(value), "\r", " "), "\n", " ");
     const bool needsQuotes = unquoted(withoutBlanks(plain)) != plain;
     const std::string written = needsQuotes ? "\"" + plain + "\"" : plain;
     Section* found = find(section);

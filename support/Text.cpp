@@ -3,27 +3,12 @@
 #include <cstdint>
 #include <cstring>
 
+#include "support/Windows1252.h"
+
 namespace zel {
 namespace {
 
-// Windows-1252 from 0x80 to 0x9F; 0 where nothing is assigned.
-constexpr std::uint16_t kWindows1252[32] = {
-    0x20AC, 0,      0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021, 0x02C6, 0x2030, 0x0160,
-    0x2039, 0x0152, 0,      0x017D, 0,      0,      0x2018, 0x2019, 0x201C, 0x201D, 0x2022,
-    0x2013, 0x2014, 0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0,      0x017E, 0x0178};
-
-void append(std::string& text, std::uint32_t code) {
-    if (code < 0x80) {
-        text += static_cast<char>(code);
-    } else if (code < 0x800) {
-        text += static_cast<char>(0xC0 | (code >> 6));
-        text += static_cast<char>(0x80 | (code & 0x3F));
-    } else {
-        text += static_cast<char>(0xE0 | (code >> 12));
-        text += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
-        text += static_cast<char>(0x80 | (code & 0x3F));
-    }
-}
+constexpr char32_t kReplacement = 0xFFFD;
 
 /// Length of the UTF-8 sequence at the position; 0 where none begins.
 std::size_t sequenceLength(std::string_view bytes, std::size_t at) {
@@ -112,16 +97,38 @@ bool isValidUtf8(std::string_view bytes) {
     return true;
 }
 
-std::string wireToUtf8(std::string_view bytes) {
-    if (isValidUtf8(bytes)) return std::string(bytes);
-    std::string text;
-    for (const char c : bytes) {
-        const auto code = static_cast<unsigned char>(c);
-        const bool special = code >= 0x80 && code < 0xA0;
-        const std::uint32_t mapped = special ? kWindows1252[code - 0x80] : code;
-        append(text, mapped == 0 ? 0xFFFD : mapped);
+char32_t takeCharacter(std::string_view& text) {
+    constexpr unsigned kLeadBits[] = {0x7F, 0x7F, 0x1F, 0x0F, 0x07};
+    const std::size_t length = sequenceLength(text, 0);
+    if (length == 0) {
+        text.remove_prefix(1);
+        return kReplacement;
     }
-    return text;
+    char32_t character = static_cast<unsigned char>(text.front()) & kLeadBits[length];
+    for (std::size_t i = 1; i < length; ++i)
+        character = character << 6 | (static_cast<unsigned char>(text[i]) & 0x3FU);
+    text.remove_prefix(length);
+    return character;
+}
+
+void appendCharacter(std::string& text, char32_t character) {
+    const auto tail = [&](int shift) {
+        return static_cast<char>(0x80 | (character >> shift & 0x3F));
+    };
+    if (character < 0x80) {
+        text += static_cast<char>(character);
+    } else if (character < 0x800) {
+        text += {static_cast<char>(0xC0 | character >> 6), tail(0)};
+    } else if (character < 0x10000) {
+        text += {static_cast<char>(0xE0 | character >> 12), tail(6), tail(0)};
+    } else {
+        text += {static_cast<char>(0xF0 | character >> 18), tail(12), tail(6), tail(0)};
+    }
+}
+
+std::string bytesToUtf8(std::string_view bytes) {
+    if (isValidUtf8(bytes)) return std::string(bytes);
+    return fromWindows1252(bytes);
 }
 
 }  // namespace zel

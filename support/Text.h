@@ -23,7 +23,12 @@ std::string replaceAll(std::string_view text, std::string_view what, std::string
 bool contains(std::string_view text, std::string_view what);
 bool startsWith(std::string_view text, std::string_view head);
 bool isValidUtf8(std::string_view bytes);
-/// Bytes of the wire or of a file: valid UTF-8 as it stands, else read as Windows-1252.
-std::string wireToUtf8(std::string_view bytes);
+/// Takes the first character off a text that is not empty; of bytes that are no UTF-8 one byte, as
+/// the replacement character.
+char32_t takeCharacter(std::string_view& text);
+/// Appends a character as UTF-8.
+void appendCharacter(std::string& text, char32_t character);
+/// Bytes of a file or of an input: valid UTF-8 as it stands, else read as Windows-1252.
+std::string bytesToUtf8(std::string_view bytes);
 
 }  // namespace zel

@@ -8,6 +8,7 @@
 #include <cmath>
 
 #include "desktop/graph/PolylineClip.h"
+#include "support/Windows1252.h"
 
 namespace zel {
 namespace {
@@ -28,7 +29,7 @@ std::string faceOf(const QFont& font) {
     const QString family = QFontInfo(font).family();
     for (const auto& [known, face] : kFaces)
         if (family.compare(QLatin1String(known), Qt::CaseInsensitive) == 0) return face;
-    return toWindows1252(family);
+    return metafileText(family);
 }
 
 MetafileColor colorOf(const QColor& color) {
@@ -231,7 +232,7 @@ void MetafileEngine::drawPolygon(const QPointF* points, int count, PolygonDrawMo
 }
 
 void MetafileEngine::drawTextItem(const QPointF& origin, const QTextItem& item) {
-    const std::string bytes = toWindows1252(item.text());
+    const std::string bytes = metafileText(item.text());
     if (bytes.empty() || pen_.style() == Qt::NoPen || !useClip()) return;
     const QFont font = item.font();
     const double pixels = font.pixelSize() > 0
@@ -246,7 +247,7 @@ void MetafileEngine::drawTextItem(const QPointF& origin, const QTextItem& item) 
     // The place of each character is told, so that the text has its width with any font. Readers
     // differ in what that means in a turned line.
     const QFontMetricsF metrics(font, paintDevice());
-    const QString written = fromWindows1252(bytes);
+    const QString written = QString::fromStdString(fromWindows1252(bytes));
     std::vector<int> advances;
     long before = 0;
     for (qsizetype i = 1; i <= written.size() && transform_.type() <= QTransform::TxScale; ++i) {

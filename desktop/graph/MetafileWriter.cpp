@@ -2,6 +2,9 @@
 
 #include <algorithm>
 #include <limits>
+#include <optional>
+
+#include "support/Windows1252.h"
 
 namespace zel {
 namespace {
@@ -86,25 +89,21 @@ struct Spelling {
     char16_t sign;
     const char* bytes;
 };
-/// Signs whose bytes are not their own number.
+/// What stands for signs that have no byte.
 constexpr Spelling kSpellings[] = {
-    {u'€', "\x80"},      {u'‚', "\x82"}, {u'ƒ', "\x83"},     {u'„', "\x84"}, {u'…', "\x85"},
-    {u'†', "\x86"},      {u'‡', "\x87"}, {u'ˆ', "\x88"},     {u'‰', "\x89"}, {u'Š', "\x8A"},
-    {u'‹', "\x8B"},      {u'Œ', "\x8C"}, {u'Ž', "\x8E"},     {u'‘', "\x91"}, {u'’', "\x92"},
-    {u'“', "\x93"},      {u'”', "\x94"}, {u'•', "\x95"},     {u'–', "\x96"}, {u'—', "\x97"},
-    {u'˜', "\x98"},      {u'™', "\x99"}, {u'š', "\x9A"},     {u'›', "\x9B"}, {u'œ', "\x9C"},
-    {u'ž', "\x9E"},      {u'Ÿ', "\x9F"}, {u'\u2126', "Ohm"},  // ohm sign
-    {u'\u03A9', "Ohm"},                                       // capital omega
-    {u'\u03BC', "\xB5"},                                      // small mu
-    {u'\u2212', "-"},                                         // minus sign
-    {u'\u2009', " "},                                         // thin blank
-    {u'\u202F', " "},                                         // narrow blank
+    {u'\u2126', "Ohm"},   // ohm sign
+    {u'\u03A9', "Ohm"},   // capital omega
+    {u'\u03BC', "\xB5"},  // small mu
+    {u'\u2212', "-"},     // minus sign
+    {u'\u2009', " "},     // thin blank
+    {u'\u202F', " "},     // narrow blank
 };
 
 std::string spelled(QChar sign) {
     const char16_t code = sign.unicode();
-    if ((code >= 0x20 && code < 0x7F) || (code >= 0xA0 && code <= 0xFF))
-        return {static_cast<char>(code)};
+    const std::optional<char> byte = windows1252Byte(code);
+    const bool printable = code >= 0x20 && code != 0x7F;
+    if (byte && printable) return {*byte};
     for (const Spelling& spelling : kSpellings)
         if (spelling.sign == code) return spelling.bytes;
     return "?";
@@ -297,27 +296,13 @@ QByteArray MetafileWriter::finish() {
     return file + records_;
 }
 
-std::string toWindows1252(const QString& text) {
+std::string metafileText(const QString& text) {
     std::string bytes;
     for (const QChar sign : text) {
         if (sign.isLowSurrogate()) continue;  // the first half stands for the sign
         bytes += spelled(sign);
     }
     return bytes;
-}
-
-QString fromWindows1252(const std::string& bytes) {
-    QString text;
-    for (const char byte : bytes) {
-        const auto same = [byte](const Spelling& spelling) {
-            return spelling.bytes[0] == byte && spelling.bytes[1] == '\0';
-        };
-        const bool outside = (byte & 0xE0) == 0x80;  // those whose number is no sign
-        const auto* found = std::ranges::find_if(kSpellings, same);
-        text += outside && found != std::end(kSpellings) ? QChar(found->sign)
-                                                         : QChar(static_cast<uchar>(byte));
-    }
-    return text;
 }
 
 }  // namespace zel

@@ -110,8 +110,6 @@ class MetafileWriter {
 
 /// The bytes of a text in Windows-1252. An ohm sign is spelled out, other signs without a byte
 /// become a question mark.
-std::string toWindows1252(const QString& text);
-/// A byte, a sign.
-QString fromWindows1252(const std::string& bytes);
+std::string metafileText(const QString& text);
 
 }  // namespace zel

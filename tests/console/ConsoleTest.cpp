@@ -114,6 +114,35 @@ INSTANTIATE_TEST_SUITE_P(
                       std::vector<const char*>{"--connect", "sim:", "sweep", "--image", ".png"},
                       std::vector<const char*>{"--connect", "sim:", "--words", "server", "info"}));
 
+TEST(VisibleTextTest, ControlCharactersAndBytesThatAreNoText_AreShownAsNumbers) {
+    EXPECT_EQ(visibleText("1.5 GHz \u00B5"), "1.5 GHz \u00B5");
+    EXPECT_EQ(visibleText("\x1B[2Ja\tb\x7F\n"), "\\x1B[2Ja\\x09b\\x7F\\x0A");
+    EXPECT_EQ(visibleText(std::string("a\0b", 3)), "a\\x00b");
+    EXPECT_EQ(visibleText("\u009B2J \x9B \xE4x"), "\\x9B2J \\x9B \\xE4x");
+}
+
+TEST(LineOutputTest, ControlCharacters_AreShownOnATerminalAndKeptElsewhere) {
+    std::ostringstream stream;
+    LineOutput(stream).line("a\x1B[2J");
+    LineOutput(stream, true).lines({"b\x1B[2J"});
+    EXPECT_EQ(stream.str(), "a\x1B[2J\nb\\x1B[2J\n");
+}
+
+TEST(LineOutputTest, StreamThatFails_IsAProblemThatStays) {
+    std::ostringstream stream;
+    LineOutput output(stream);
+    output.line("a");
+    EXPECT_EQ(output.problem(), "");
+    stream.setstate(std::ios::badbit);
+    output.line("b");
+    EXPECT_NE(output.problem(), "");
+    stream.clear();
+    output.line("c");
+    output.lines({"d"});
+    EXPECT_NE(output.problem(), "");
+    EXPECT_EQ(stream.str(), "a\n");
+}
+
 TEST(LineOutputTest, Repeatable_SameTextAgain_IsCountedUntilAnotherLine) {
     std::ostringstream stream;
     LineOutput output(stream);

@@ -27,7 +27,7 @@ struct FileVerbsTest : ::testing::Test {
         const bool simulated = options.address && options.address->simulated;
         const auto front =
             simulated ? makeSimulatorFront(options.home) : makePortFront(options.home);
-        return runTool(options, *front, out, errors);
+        return runTool(options, *front, {out, errors});
     }
     int runConnected(std::vector<std::string> words) {
         words.insert(words.begin(), {"--connect", "sim:"});
@@ -98,6 +98,28 @@ TEST_F(FileVerbsTest, WhatCannotBeRead_IsAFailure) {
     folder.write("empty.csv", "");
     EXPECT_EQ(run({"show", folder.file("empty.csv")}), kLinkFailed);
     EXPECT_NE(errors.str().find("holds no rows"), std::string::npos);
+}
+
+TEST_F(FileVerbsTest, Set_TextWithACharacterThatTheInstrumentDoesNotKnow_IsWrongUse) {
+    EXPECT_EQ(runConnected({"set", "NAME,5 \u03A9"}), kWrongUse);
+    EXPECT_NE(errors.str().find("The instrument has no character for \"\u03A9\"."),
+              std::string::npos);
+    EXPECT_EQ(runConnected({"set", "NAME,a\rcmd"}), kWrongUse);
+    EXPECT_EQ(runConnected({"set", "N\u00C4ME,1"}), kWrongUse);
+}
+
+TEST_F(FileVerbsTest, Show_SweepsThatCannotBePrinted_EndWithStatus1AndAWord) {
+    struct Full : std::streambuf {
+        int_type overflow(int_type) override { return traits_type::eof(); }
+    } full;
+    std::ostream nowhere(&full);
+    folder.write("view.csv", "Trace Write Pointer;301\r\n\r\n1.000;5; \r\n2.000;-30; \r\n");
+    Options options;
+    options.verb = Verb::Show;
+    options.argument = folder.file("view.csv");
+    const auto front = makePortFront(folder.file("home"));
+    EXPECT_EQ(runTool(options, *front, {nowhere, errors}), kLinkFailed);
+    EXPECT_EQ(errors.str(), "zelctl: the output cannot be written: nothing can be written to it\n");
 }
 
 TEST_F(FileVerbsTest, WrongUse_IsTold) {

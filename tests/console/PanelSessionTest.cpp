@@ -46,6 +46,12 @@ struct PanelSessionTest : ::testing::Test {
     }
 };
 
+TEST_F(PanelSessionTest, OutputThatCannotBeWritten_EndsTheSession) {
+    out.setstate(std::ios::badbit);
+    play("show State\nshow State\nfly\n");
+    EXPECT_EQ(errors.str(), "");  // the third line was not read any more
+}
+
 TEST_F(PanelSessionTest, CommentsAndBlankLines_PrintNothing) {
     EXPECT_EQ(play("# words\n\n   \n  # more\r\n"), "");
     EXPECT_EQ(status, kDone);

@@ -165,6 +165,17 @@ TEST_F(Line, WriteToLink_EverySerialKind_GoesToThePort) {
     EXPECT_EQ(port.written(), "AAAAA");
 }
 
+TEST_F(Line, WriteToLink_Text_IsAByteACharacter) {
+    port.expect("10 \xB5s \x80\r").silence();
+    link.WriteToLink("10 µs €\r");
+    expectPlayed();
+}
+
+TEST_F(Line, WriteToLink_CharacterWithoutAByte_SendsNothing) {
+    link.WriteToLink("5 \u03A9\r");
+    EXPECT_EQ(port.written(), "");
+}
+
 TEST_F(Line, ReadFromLink_Serial_TakesAllAndNeverWaits) {
     port.arrive("0\r12");
     EXPECT_EQ(time([&] {

@@ -25,6 +25,30 @@ TEST_F(Line, Cmd_FinishedLine_NamesTheSeconds) {
     EXPECT_EQ(status(), "CMD <INIT> finished (1.25 s)");
 }
 
+TEST_F(Line, Exchange_CharacterThatTheInstrumentDoesNotKnow_IsRefusedAndNothingIsSent) {
+    const std::string refused =
+        "plain | ZELRemote | The instrument has no character for \"\u03A9\".\r\nNothing was sent.";
+    std::string value = "old";
+    EXPECT_FALSE(exchange.SetInstrument("NAME,5 \u03A9"));
+    EXPECT_FALSE(exchange.GetInstrument("\u03A9", value));
+    EXPECT_FALSE(exchange.CmdInstrument("\u03A9"));
+    EXPECT_EQ(port.written(), "");
+    EXPECT_EQ(shown(), (Texts{refused, refused, refused}));
+    EXPECT_EQ(value, "old");
+    EXPECT_FALSE(state.ExchangeFailed);
+}
+
+TEST_F(Line, Exchange_TextThatGoesOutAndComesBack_IsTheSame) {
+    exchangeOf("set", "NAME,\xE4 \xC3\xA4", "0\r");
+    port.expect("GET\r").answer("0\r");
+    port.expect("NAME\r").answer("0\r\xE4 \xC3\xA4\r");
+    std::string value;
+    EXPECT_TRUE(exchange.SetInstrument("NAME,\u00E4 \u00C3\u00A4"));
+    EXPECT_TRUE(exchange.GetInstrument("NAME", value));
+    expectPlayed();
+    EXPECT_EQ(value, "\u00E4 \u00C3\u00A4");
+}
+
 TEST_F(Line, Cmd_LinesOfTheDialogue_FollowOneAnother) {
     exchangeOf("cmd", "INIT", "0\r");
     Texts lines;

@@ -76,6 +76,16 @@ INSTANTIATE_TEST_SUITE_P(Answers, StatusAnswer,
                                            AnswerRow{"Set", "2", "<Wrong Modus>: 2"},
                                            AnswerRow{"WAIT", "5", "5"}));
 
+TEST_F(ManualCommandTest, CharacterThatTheInstrumentDoesNotKnow_IsRefused) {
+    send("NAME,5 \u03A9");
+    EXPECT_EQ(port.written(), "");
+    EXPECT_EQ(
+        told(platform.boxes),
+        Texts{"plain | ZELRemote | The instrument has no character for \"\u03A9\".\r\nNothing "
+              "was sent."});
+    EXPECT_EQ(panel.MousePointer.get(), 0);
+}
+
 TEST_F(ManualCommandTest, DataLine_ReadsTwoAnswersAndDropsTheStatus) {
     port.expect("FREQ\r").answer("0\r1500000000\r");
     send("FREQ");

@@ -67,15 +67,15 @@ INSTANTIATE_TEST_SUITE_P(
                       Utf8Row{"\xF0\x80\x80\x80", false}, Utf8Row{"\xF4\x90\x80\x80", false},
                       Utf8Row{"\xF8\x88\x80\x80\x80", false}, Utf8Row{"a\xC2\x41", false}));
 
-TEST(WireToUtf8Test, Utf8_StaysAsItIs) { EXPECT_EQ(wireToUtf8("dB\xC2\xB5V"), "dBµV"); }
+TEST(BytesToUtf8Test, Utf8_StaysAsItIs) { EXPECT_EQ(bytesToUtf8("dB\xC2\xB5V"), "dBµV"); }
 
-TEST(WireToUtf8Test, OtherBytes_AreReadAsWindows1252) {
-    EXPECT_EQ(wireToUtf8("dB\xB5V"), "dBµV");
-    EXPECT_EQ(wireToUtf8("\x80 5"), "€ 5");
+TEST(BytesToUtf8Test, OtherBytes_AreReadAsWindows1252) {
+    EXPECT_EQ(bytesToUtf8("dB\xB5V"), "dBµV");
+    EXPECT_EQ(bytesToUtf8("\x80 5"), "€ 5");
 }
 
-TEST(WireToUtf8Test, UnassignedByte_BecomesTheReplacementSign) {
-    EXPECT_EQ(wireToUtf8("\x81"), "\xEF\xBF\xBD");
+TEST(BytesToUtf8Test, UnassignedByte_BecomesTheReplacementSign) {
+    EXPECT_EQ(bytesToUtf8("\x81"), "\xEF\xBF\xBD");
 }
 
 TEST(ByteCastTest, FourBytes_AreLeastSignificantFirst) {

@@ -171,14 +171,13 @@ TEST(MetafileWriter, OddTextAndLongFace_ArePaddedAndCut) {
     EXPECT_EQ(played.drawn[1].advances, std::vector<int>());
 }
 
-TEST(Windows1252, EachSign_HasItsByteOrASensibleStandIn) {
-    EXPECT_EQ(toWindows1252("10dB/DIV"), "10dB/DIV");
-    EXPECT_EQ(toWindows1252("20 \u00B5s 5 \u03BCs"), "20 \xB5s 5 \xB5s");
-    EXPECT_EQ(toWindows1252("50 \u03A9, 75 \u2126"), "50 Ohm, 75 Ohm");
-    EXPECT_EQ(toWindows1252("\u22123 \u20AC \u2026"), "-3 \x80 \x85");
-    EXPECT_EQ(toWindows1252("\u4E2D\U0001F600\tx\u0081"), "???x?");
-    EXPECT_EQ(toWindows1252(""), "");
-    EXPECT_EQ(fromWindows1252("\x80 \xB5 Ohm -"), QString("\u20AC \u00B5 Ohm -"));
+TEST(MetafileText, EachSign_HasItsByteOrASensibleStandIn) {
+    EXPECT_EQ(metafileText("10dB/DIV"), "10dB/DIV");
+    EXPECT_EQ(metafileText("20 \u00B5s 5 \u03BCs"), "20 \xB5s 5 \xB5s");
+    EXPECT_EQ(metafileText("50 \u03A9, 75 \u2126"), "50 Ohm, 75 Ohm");
+    EXPECT_EQ(metafileText("\u22123 \u20AC \u2026"), "-3 \x80 \x85");
+    EXPECT_EQ(metafileText("\u4E2D\U0001F600\tx\u0081"), "???x?");
+    EXPECT_EQ(metafileText(""), "");
 }
 
 TEST(PolylineClip, Line_IsCutWhereItCrossesTheEdge) {
