@@ -2,21 +2,21 @@
 // Numbers as the wire writes them: plain decimal text with a point.
 
 #include <cmath>
-#include <optional>
 #include <string>
 #include <string_view>
 
+#include "support/NumberText.h"
+#include "support/Text.h"
+
 namespace zelsim {
+
+using zel::parseNumber;
+using zel::upperCase;
 
 /// Plain decimal text with at most `decimals` places, no trailing zeros, no exponent.
 std::string numberText(double value, int decimals);
-/// The number that the whole text is (blanks around it allowed); nothing for any other text, for
-/// infinities and for what is no number.
-std::optional<double> parseNumber(std::string_view text);
 /// Without blanks at both ends.
 std::string_view trimmed(std::string_view text);
-/// ASCII upper case.
-std::string upperCase(std::string_view text);
 
 /// 10 to the power of db / 10.
 inline double dbToPower(double db) { return std::exp2(db * 0.33219280948873623); }

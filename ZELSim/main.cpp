@@ -10,11 +10,10 @@
 #include "ZELSim/TransportPty.h"
 #include "ZELSim/TransportTcp.h"
 #include "ZELSim/Wire.h"
+#include "support/ExitStatus.h"
+#include "support/NumberOption.h"
 
 namespace {
-
-constexpr int kFailed = 1;
-constexpr int kWrongUse = 2;
 
 struct Options {
     bool pty = false;
@@ -28,7 +27,7 @@ struct Options {
 
 int fail(const std::string& problem) {
     std::cerr << "ZELSim: " << problem << '\n';
-    return kFailed;
+    return zel::kLinkFailed;
 }
 
 int servePty(const Options& options, zelsim::Wire& wire) {
@@ -59,7 +58,7 @@ int run(Options& options) {
         const auto rule = zelsim::parseFault(text, problem);
         if (!rule) {
             std::cerr << "ZELSim: --fault " << text << ": " << problem << '\n';
-            return kWrongUse;
+            return zel::kWrongUse;
         }
         options.wire.faults.push_back(*rule);
     }
@@ -96,13 +95,13 @@ int main(int argc, char** argv) {
         ->needs(pty);
     app.add_option("--seed", options.device.seed, "Seed of the noise and of the moving signals (1)")
         ->type_name("N");
-    app.add_option("--speed", options.device.speed, "Sweeps take their time divided by F (1)")
-        ->type_name("F")
-        ->check(CLI::Range(1e-3, 1e9));
-    app.add_option("--trigger-period", options.device.triggerPeriod,
-                   "Seconds between edges at the external trigger input (0.5); 0: none ever comes")
-        ->type_name("S")
-        ->check(CLI::Range(0.0, 1e6));
+    zel::numberOption(app, "--speed", options.device.speed, 1e-3, 1e9,
+                      "Sweeps take their time divided by F (1)")
+        ->type_name("F");
+    zel::numberOption(
+        app, "--trigger-period", options.device.triggerPeriod, 0, 1e6,
+        "Seconds between edges at the external trigger input (0.5); 0: none ever comes")
+        ->type_name("S");
     app.add_option("--fault", options.faults, "A fault on purpose, see below")
         ->type_name("KIND[:NAME=VALUE,...]")
         ->allow_extra_args(false);
@@ -112,7 +111,7 @@ int main(int argc, char** argv) {
             throw CLI::RequiredError("--pty or --tcp");
         }
     } catch (const CLI::ParseError& error) {
-        return app.exit(error) == 0 ? 0 : kWrongUse;
+        return app.exit(error) == 0 ? 0 : zel::kWrongUse;
     }
     return run(options);
 }

@@ -14,8 +14,7 @@ struct ConnectAddress {
     LinkAddress link;
 };
 
-/// "serial:DEVICE[@BAUD]", "tcp:HOST:PORT" or "sim:"; nothing when it is none of them. The baud
-/// rate is 57600 unless told.
+/// "sim:", or an address as `parseLinkAddress` takes it; nothing for any other text.
 std::optional<ConnectAddress> parseAddress(std::string_view url);
 
 /// The name of the port behind which the built-in simulator is found.

@@ -7,6 +7,7 @@
 #include "ZELSim/InProcessPort.h"
 #include "console/Address.h"
 #include "desktop/graph/GraphImage.h"
+#include "desktop/platform/Language.h"
 #include "desktop/platform/QtPlatform.h"
 #include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/ScriptedSocket.h"
@@ -86,6 +87,7 @@ ToolkitSession::ToolkitSession(int& argc, char** argv, bool windows)
     } else {
         application_->object = std::make_unique<QCoreApplication>(argc, argv);
     }
+    useEnglishMessages();
 }
 
 ToolkitSession::~ToolkitSession() = default;

@@ -6,15 +6,17 @@
 #include <string>
 #include <vector>
 
-#include "console/PanelSession.h"
+#include "desktop/platform/CommonOptions.h"
 #include "link/WireText.h"
-#include "shell/VersionInfo.h"
+#include "support/NumberOption.h"
 #include "support/Text.h"
 
 namespace zel {
 namespace {
 
 constexpr int kMostSweeps = 1000000;
+constexpr const char* kAddresses =
+    "serial:DEVICE[@BAUD] (57600), tcp:HOST:PORT, or sim: for the built-in simulator";
 constexpr double kShortestInterval = 0.001;
 constexpr double kLongestInterval = 2'000'000;
 constexpr const char* kImageEndings[] = {".wmf", ".svg", ".png", ".pdf"};
@@ -48,19 +50,11 @@ std::string imageProblem(const std::string& file) {
 struct Parser {
     CLI::App app{"ZELRemote without a window: works a ZEL3 spectrum analyser from the console.",
                  "zelctl"};
-    std::string connect;
+    CommonOptions common;
     std::map<const CLI::App*, Verb> verbs;
 
     explicit Parser(Options& options) {
-        app.set_version_flag("--version", "zelctl " + versionText(kVersion));
-        app.add_option("--connect", connect,
-                       "The instrument: serial:DEVICE[@BAUD] (57600), tcp:HOST:PORT, or sim: for "
-                       "the built-in simulator")
-            ->type_name("URL");
-        app.add_option("--home", options.home, "Folder of the program's files and settings")
-            ->type_name("DIR");
-        app.add_option("--words", options.words, "Words of the program's command line")
-            ->type_name("TEXT");
+        addCommonOptions(app, common, kAddresses);
         app.add_flag("--verbose", options.verbose,
                      "Each step of the exchanges on standard error, with the time in ms");
         app.require_subcommand(1);
@@ -85,9 +79,9 @@ struct Parser {
         outputOption(sweep, options, "Saves the view as the panel does");
         imageOption(sweep, options);
         CLI::App* record = verb(Verb::Record, "record", "Records traces by a timer");
-        record->add_option("--interval", options.interval, "Seconds from trace to trace")
-            ->required()
-            ->check(CLI::Range(kShortestInterval, kLongestInterval));
+        numberOption(*record, "--interval", options.interval, kShortestInterval, kLongestInterval,
+                     "Seconds from trace to trace")
+            ->required();
         record->add_option("--count", options.count, "How many traces")
             ->required()
             ->check(CLI::Range(1, kMostSweeps));
@@ -131,26 +125,20 @@ std::string missing(const Options& options) {
 std::optional<int> parseOptions(int argc, const char* const* argv, Options& options,
                                 std::ostream& out, std::ostream& errors) {
     Parser parser(options);
-    try {
-        parser.app.parse(argc, argv);
-    } catch (const CLI::ParseError& problem) {
-        const std::vector<std::string> unknown = parser.app.remaining();
-        if (problem.get_exit_code() != 0 && parser.app.get_subcommands().empty() &&
-            !unknown.empty()) {
-            errors << "zelctl: there is no verb \"" << unknown.front()
-                   << "\"\nRun with --help for more information.\n";
-            return kWrongUse;
-        }
-        return parser.app.exit(problem, out, errors) == 0 ? kDone : kWrongUse;
-    }
+    parser.app.failure_message([](const CLI::App* app, const CLI::Error& problem) {
+        const std::vector<std::string> unknown = app->remaining();
+        if (!app->get_subcommands().empty() || unknown.empty())
+            return CLI::FailureMessage::simple(app, problem);
+        return "zelctl: there is no verb \"" + unknown.front() +
+               "\"\nRun with --help for more information.\n";
+    });
+    if (const auto status = readCommandLine(parser.app, argc, argv, out, errors)) return status;
+    options.home = parser.common.home;
+    options.words = parser.common.words;
     options.verb = parser.verbs.at(parser.app.get_subcommands().front());
-    if (!parser.connect.empty()) {
-        options.address = parseAddress(parser.connect);
-        if (!options.address) {
-            errors << "zelctl: --connect takes serial:DEVICE[@BAUD], tcp:HOST:PORT or sim:, not \""
-                   << parser.connect << "\"\n";
-            return kWrongUse;
-        }
+    if (const std::string& url = parser.common.connect; !url.empty()) {
+        options.address = parseAddress(url);
+        if (!options.address) return refuseAddress(parser.app, kAddresses, url, errors);
     }
     if (const std::string problem = missing(options); !problem.empty()) {
         errors << "zelctl: " << problem << '\n';

@@ -15,11 +15,11 @@
 #include "console/ServingEvents.h"
 #include "platform/Clock.h"
 #include "shell/Program.h"
+#include "support/ExitStatus.h"
 
 namespace zel {
 
 /// Exit statuses of the tool.
-enum Status : int { kDone = 0, kLinkFailed = 1, kWrongUse = 2 };
 
 /// Lines are read between commands, and inside of a command while a modal form, a continuous view,
 /// a recording or a script runs.

@@ -259,7 +259,7 @@ bool ViewReader::pause() {
 void ViewReader::spread(bool zeroSpan, double first, double last) {
     if (zeroSpan) {
         panel_.ViewStop = last;
-        panel_.SpanLabel.Caption = "Span: 0 Hz";
+        panel_.SpanLabel.Caption = spanLabelText(0);
         return;
     }
     mirror_.CenterFrequency = first + (last - first) / 2;

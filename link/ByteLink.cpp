@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "platform/LinkAddress.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
@@ -14,7 +15,6 @@ constexpr int kSocketWaitMs = 100;
 constexpr int kSocketPollMs = 10;
 constexpr int kInBufferSize = 12000;  // holds the largest binary transfer
 constexpr int kOutBufferSize = 2048;
-constexpr long kFastestBaud = 10'000'000;
 constexpr double kHighestPort = 32767;
 
 }  // namespace

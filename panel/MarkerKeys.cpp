@@ -4,6 +4,7 @@
 #include "panel/Interlock.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {
@@ -95,7 +96,7 @@ void MarkerKeys::MarkToCentButton_Click() {
     events_.sleep(kMoveMs);
     std::string answer;
     if (exchange_.GetInstrument("MARK1", answer)) {
-        panel_.CFLabel.Caption = "Center: " + FormatValue(split(answer, ',').front(), "Hz");
+        panel_.CFLabel.Caption = centerLabelText(split(answer, ',').front());
         mirror_.CenterFrequency = leadingNumber(answer);
     }
     readout_.MakeMarkerReadout();
@@ -113,7 +114,7 @@ void MarkerKeys::MarkToRefButton_Click() {
         panel_.MarkerValue = leadingNumber(answer);
         const std::vector<std::string> pieces = split(answer, ',');
         // The centre did not move: the label takes the marker's x all the same.
-        panel_.CFLabel.Caption = "Center: " + FormatValue(pieces.front(), "Hz");
+        panel_.CFLabel.Caption = centerLabelText(pieces.front());
         if (pieces.size() > 1)
             mirror_.ReferenceLevel =
                 leadingNumber(replaceAll(formatPattern(leadingNumber(pieces[1]), "00,0"), ",", ""));

@@ -4,6 +4,7 @@
 #include "panel/Interlock.h"
 #include "panel/MenuTables.h"
 #include "panel/ModeOptions.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {
@@ -180,8 +181,8 @@ void ModeKeys::ResetButton_Click() {
                             mirror_.CenterFrequency + half, 0};
     for (int i = 0; i < panel_.SoftTextBox.count(); ++i)
         panel_.SoftTextBox(i).Text = FormatValue(shown[i], "Hz");
-    panel_.CFLabel.Caption = "Center: " + FormatValue(mirror_.CenterFrequency, "Hz");
-    panel_.SpanLabel.Caption = "Span: " + FormatValue(mirror_.Span, "Hz");
+    panel_.CFLabel.Caption = centerLabelText(mirror_.CenterFrequency);
+    panel_.SpanLabel.Caption = spanLabelText(mirror_.Span);
 }
 
 }  // namespace zel

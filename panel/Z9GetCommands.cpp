@@ -211,8 +211,8 @@ void Z9GetCommands::fullSpan(int index) {
     exchange_.SetInstrument("SPAN," + WireNumber(kFullSpan));
     mirror_.CenterFrequency = kFullCentre;
     mirror_.Span = kFullSpan;
-    panel_.CFLabel.Caption = "Center: " + FormatValue(kFullCentre, "Hz");
-    panel_.SpanLabel.Caption = "Span: " + FormatValue(kFullSpan, "Hz");
+    panel_.CFLabel.Caption = centerLabelText(kFullCentre);
+    panel_.SpanLabel.Caption = spanLabelText(kFullSpan);
     readTrace();
 }
 
@@ -220,7 +220,7 @@ void Z9GetCommands::zeroSpan(int index) {
     softPanel_.SetSoftButtonsColor(index);
     exchange_.SetInstrument("SPAN,0");
     mirror_.Span = 0;
-    panel_.SpanLabel.Caption = "Span: 0 Hz";
+    panel_.SpanLabel.Caption = spanLabelText(0);
     readTrace();
 }
 
@@ -228,7 +228,7 @@ void Z9GetCommands::lastSpan(int index) {
     softPanel_.SetSoftButtonsColor(index);
     exchange_.SetInstrument("SPAN," + WireNumber(panel_.LastSpan));
     mirror_.Span = panel_.LastSpan;
-    panel_.SpanLabel.Caption = "Span: " + FormatValue(mirror_.Span, "Hz");
+    panel_.SpanLabel.Caption = spanLabelText(mirror_.Span);
     readTrace();
 }
 

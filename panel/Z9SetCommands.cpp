@@ -173,9 +173,7 @@ void Z9SetCommands::showEdges() {
     panel_.SoftTextBox(2).Text = FormatValue(mirror_.CenterFrequency - half, "Hz");
 }
 
-void Z9SetCommands::showSpan() {
-    panel_.SpanLabel.Caption = "Span: " + FormatValue(mirror_.Span, "Hz");
-}
+void Z9SetCommands::showSpan() { panel_.SpanLabel.Caption = spanLabelText(mirror_.Span); }
 
 void Z9SetCommands::readTrace() {
     bool success = false;
@@ -186,7 +184,7 @@ void Z9SetCommands::afterCentre(int /*index*/) {
     std::string answer;
     if (exchange_.GetInstrument("SPAN", answer)) mirror_.Span = leadingNumber(answer);
     panel_.SoftTextBox(1).Text = FormatValue(mirror_.Span, "Hz");
-    panel_.CFLabel.Caption = "Center: " + FormatValue(mirror_.CenterFrequency, "Hz");
+    panel_.CFLabel.Caption = centerLabelText(mirror_.CenterFrequency);
     showEdges();
     if (panel_.InstrumentMode != CF::POWERSENSOR) readTrace();
 }
@@ -211,7 +209,7 @@ void Z9SetCommands::edgeFrequency(double span, double centre) {
     mirror_.CenterFrequency = centre;
     exchange_.SetInstrument("SPAN," + generalNumber(span));
     exchange_.SetInstrument("FREQ," + generalNumber(centre));
-    panel_.CFLabel.Caption = "Center: " + FormatValue(centre, "Hz");
+    panel_.CFLabel.Caption = centerLabelText(centre);
     showSpan();
     readTrace();
     pointer(0);
@@ -240,11 +238,11 @@ void Z9SetCommands::zeroSpan(int index) {
     softPanel_.SetSoftButtonsColor(index);
     pointer(11);
     exchange_.SetInstrument("SPAN,0");
-    panel_.SpanLabel.Caption = "Span: 0 Hz";
+    panel_.SpanLabel.Caption = spanLabelText(0);
     mirror_.Span = 0;
     // The centre is rewritten though nothing was sent about it: the key's way leaves it alone.
     mirror_.CenterFrequency = kZeroSpanCentre;
-    panel_.CFLabel.Caption = "Center: " + FormatValue(mirror_.CenterFrequency, "Hz");
+    panel_.CFLabel.Caption = centerLabelText(mirror_.CenterFrequency);
     readTrace();
     pointer(0);
 }

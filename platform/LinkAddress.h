@@ -1,10 +1,12 @@
 #pragma once
 // Where an instrument is to be found.
 
-#include <optional>
 #include <string>
 
 namespace zel {
+
+/// The fastest rate that a serial port is opened at, in bits per second.
+inline constexpr int kFastestBaud = 10'000'000;
 
 struct LinkAddress {
     enum class Kind { Serial, Tcp };
@@ -12,9 +14,5 @@ struct LinkAddress {
     std::string port;  ///< device name, or host
     int number = 0;    ///< baud rate, or TCP port
 };
-
-/// "serial:DEVICE[@BAUD]" (57600 baud when none is given) or "tcp:HOST:PORT"; nothing for any
-/// other text.
-std::optional<LinkAddress> linkAddressOf(const std::string& text);
 
 }  // namespace zel

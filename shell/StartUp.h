@@ -7,7 +7,7 @@
 #include "platform/Clock.h"
 #include "platform/Services.h"
 #include "shell/ServerMode.h"
-#include "shell/VersionInfo.h"
+#include "support/VersionInfo.h"
 #include "trace/GraphInteraction.h"
 
 namespace zel {

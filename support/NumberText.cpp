@@ -74,6 +74,16 @@ double leadingNumber(std::string_view text) {
     return result.ec == std::errc() && std::isfinite(value) ? value : 0;
 }
 
+std::optional<double> parseNumber(std::string_view text) {
+    const std::string plain = trimmed(text);
+    const bool plus = startsWith(plain, "+") && !startsWith(plain, "+-");
+    const char* const end = plain.data() + plain.size();
+    double value = 0;
+    const auto result = std::from_chars(plain.data() + (plus ? 1 : 0), end, value);
+    if (result.ec != std::errc() || result.ptr != end || !std::isfinite(value)) return std::nullopt;
+    return value;
+}
+
 std::string generalNumber(double value) {
     if (!std::isfinite(value) || value == 0) return "0";
     // The 15 significant digits and the exponent decide the form.

@@ -11,6 +11,9 @@ namespace zel {
 /// The number that a text starts with: blanks are skipped, then sign, digits, point, exponent.
 /// Junk gives 0, and so does a number past the range of a double.
 double leadingNumber(std::string_view text);
+/// The number that the whole text is, blanks around it allowed; nothing for any other text, for one
+/// with a comma, and past the range of a double.
+std::optional<double> parseNumber(std::string_view text);
 /// Up to 15 significant digits: fixed below 1e15 while at most 15 decimals are needed, else with
 /// an exponent ("1E+15", "1.5E-16"). What is no number gives "0".
 std::string generalNumber(double value);

@@ -15,5 +15,6 @@ int main(int argc, char** argv) {
         std::cerr << "the locale " << wanted << " was not found\n";
         return 1;
     }
+    std::setlocale(LC_MESSAGES, "C");  // as the programs do
     return RUN_ALL_TESTS();
 }

@@ -5,13 +5,15 @@
 
 namespace zel {
 
+std::string centerLabelText(double hertz) { return "Center: " + FormatValue(hertz, "Hz"); }
+
 std::string centerLabelText(const std::string& answer) {
-    return "Center: " + FormatValue(answer, "Hz");
+    return centerLabelText(GetNumeric(answer));
 }
 
-std::string spanLabelText(const std::string& answer) {
-    return "Span: " + FormatValue(answer, "Hz");
-}
+std::string spanLabelText(double hertz) { return "Span: " + FormatValue(hertz, "Hz"); }
+
+std::string spanLabelText(const std::string& answer) { return spanLabelText(GetNumeric(answer)); }
 
 void FrequencyLabels::GetFreqForLabel(bool& ok) {
     query("FREQ", mirror_.CenterFrequency, panel_.CFLabel, centerLabelText, ok);

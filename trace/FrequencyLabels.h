@@ -11,9 +11,12 @@
 
 namespace zel {
 
-/// "Center: 1.5 GHz" from an answer in hertz.
+/// "Center: 1.5 GHz".
+std::string centerLabelText(double hertz);
+/// The same from an answer in hertz.
 std::string centerLabelText(const std::string& answer);
-/// "Span: 3 GHz" from an answer in hertz.
+/// "Span: 3 GHz".
+std::string spanLabelText(double hertz);
 std::string spanLabelText(const std::string& answer);
 
 class FrequencyLabels {

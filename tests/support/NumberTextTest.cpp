@@ -135,6 +135,21 @@ TEST(RoundHalfEvenTest, NoNumber_StaysAsItIs) {
     EXPECT_TRUE(std::isnan(roundHalfEven(std::nan(""), 2)));
 }
 
+TEST(ParseNumberTest, WholeText_GivesItsNumber) {
+    EXPECT_EQ(parseNumber(" 100000000"), 1e8);
+    EXPECT_EQ(parseNumber(".5"), 0.5);
+    EXPECT_EQ(parseNumber("-.5"), -0.5);
+    EXPECT_EQ(parseNumber("1E+15"), 1e15);
+    EXPECT_EQ(parseNumber("+3"), 3);
+    EXPECT_EQ(parseNumber("0.001 "), 0.001);
+}
+
+TEST(ParseNumberTest, AnythingElse_IsNone) {
+    for (const char* text :
+         {"", " ", "+", "+-1", "5 s", "1,5", "--1", "inf", "nan", "1e999", "0x1"})
+        EXPECT_FALSE(parseNumber(text)) << text;
+}
+
 TEST(ShortestNumberTest, Value_ReadsBackAsTheSameNumber) {
     for (const double value : {0.1, 1.0 / 3, 1e22, -123.456, 5e-324})
         EXPECT_EQ(leadingNumber(shortestNumber(value)), value) << value;
