@@ -60,7 +60,8 @@ struct Bench {
     }
 
     zel::VirtualPlatform platform;
-    zel::Program program{platform.bundle(), ""};
+    zel::SystemFiles disk;
+    zel::Program program{platform.bundle(platform.port, disk), ""};
     zel::ControllerForm& panel = program.forms().controller;
     QTemporaryDir folder;
     std::mt19937 random{1};

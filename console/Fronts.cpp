@@ -33,8 +33,9 @@ class SimulatorFront : public Front {
     const Clock& clock() const override { return clock_; }
     Events& events() override { return events_; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
-        return {clock_,    served, boxes,      port_,     ports_,   tcpSocket_, serverSocket_,
-                settings_, debug_, clipboard_, launcher_, startup_, folder_,    dialogs};
+        return {clock_,     served,        boxes,     port_,   ports_,
+                tcpSocket_, serverSocket_, settings_, debug_,  clipboard_,
+                launcher_,  startup_,      folder_,   dialogs, files_};
     }
 
   private:
@@ -51,6 +52,7 @@ class SimulatorFront : public Front {
     MemoryClipboard clipboard_;
     MemoryLauncher launcher_;
     MemoryStartupFolder startup_;
+    SystemFiles files_;
 };
 
 class PortFront : public Front {
@@ -61,7 +63,7 @@ class PortFront : public Front {
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
         return {qt_.clock,     served,           boxes,        qt_.serialPort, qt_.serialPorts,
                 qt_.tcpSocket, qt_.serverSocket, qt_.settings, qt_.debug,      clipboard_,
-                qt_.launcher,  qt_.startup,      qt_.folder,   dialogs};
+                qt_.launcher,  qt_.startup,      qt_.folder,   dialogs,        qt_.files};
     }
 
   private:

@@ -4,26 +4,52 @@ namespace zel {
 namespace {
 
 constexpr std::size_t kYieldEvery = std::size_t{4} * 1024 * 1024;
+constexpr int kStep = 16;
 constexpr std::size_t kUsualField = 8;
 
 bool isSeparator(char c) { return c == ';' || c == '\r' || c == '\n'; }
 
 }  // namespace
 
+std::size_t FieldList::endOf(std::size_t start) const {
+    while (start < text_.size() && !isSeparator(text_[start])) ++start;
+    return start;
+}
+
+/// The start of the entry after the separator at `end`.
+std::size_t FieldList::next(std::size_t end) const {
+    const bool pair = text_[end] == '\r' && end + 1 < text_.size() && text_[end + 1] == '\n';
+    return end + (pair ? 2 : 1);
+}
+
 FieldList::FieldList(std::string_view text, const std::function<void(double)>& yield)
     : text_(text) {
-    ends_.reserve(text.size() / kUsualField + 1);
-    const std::size_t size = text.size();
+    starts_.reserve(text.size() / (kUsualField * kStep) + 1);
     std::size_t nextYield = kYieldEvery;
-    for (std::size_t at = 0; at < size; ++at) {
-        if (!isSeparator(text[at])) continue;
-        ends_.push_back(static_cast<std::uint32_t>(at));
-        if (text[at] == '\r' && at + 1 < size && text[at + 1] == '\n') ++at;
-        if (at < nextYield) continue;
-        nextYield = at + kYieldEvery;
-        if (yield) yield(static_cast<double>(at) / static_cast<double>(size));
+    for (std::size_t start = 0;;) {
+        if (count_ % kStep == 0) starts_.push_back(static_cast<std::uint32_t>(start));
+        ++count_;
+        const std::size_t end = endOf(start);
+        if (end == text.size()) break;
+        start = next(end);
+        if (end < nextYield) continue;
+        nextYield = end + kYieldEvery;
+        if (yield) yield(static_cast<double>(end) / static_cast<double>(text.size()));
     }
-    ends_.push_back(static_cast<std::uint32_t>(size));
+}
+
+std::string_view FieldList::at(int index) const {
+    if (index < 0 || index > last()) return {};
+    std::size_t start = 0;
+    if (index_ >= 0 && index == index_ + 1) {
+        start = next(end_);
+    } else {
+        start = starts_[static_cast<std::size_t>(index / kStep)];
+        for (int i = index % kStep; i > 0; --i) start = next(endOf(start));
+    }
+    index_ = index;
+    end_ = endOf(start);
+    return text_.substr(start, end_ - start);
 }
 
 }  // namespace zel

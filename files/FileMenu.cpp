@@ -1,12 +1,10 @@
 #include "files/FileMenu.h"
 
+#include <algorithm>
 #include <filesystem>
-#include <system_error>
 
 namespace zel {
 namespace {
-
-namespace fs = std::filesystem;
 
 constexpr const char* kImageExtension = "wmf";
 
@@ -28,17 +26,14 @@ void FileMenu::MenuFileSaveImage_Click() {
 }
 
 void FileMenu::DelLogFile_Click() {
-    std::error_code problem;
-    for (const fs::directory_entry& entry : fs::directory_iterator(folder_.path(), problem)) {
-        if (entry.path().filename() != panel_.DebugLogName) continue;
-        panel_.CloseDebugLog();
-        std::error_code refused;
-        fs::remove(entry.path(), refused);
-        if (refused)
-            boxes_.show({BoxIcon::Critical, "The file " + entry.path().string() +
-                                                " cannot be deleted: " + refused.message()});
-        return;
-    }
+    FileService& files = files_.service();
+    const std::vector<std::string> names = files.list(folder_.path());
+    if (std::find(names.begin(), names.end(), panel_.DebugLogName) == names.end()) return;
+    panel_.CloseDebugLog();
+    const std::string path = (std::filesystem::path(folder_.path()) / panel_.DebugLogName).string();
+    const FileProblem why = files.remove(path);
+    if (!why.empty())
+        boxes_.show({BoxIcon::Critical, "The file " + path + " cannot be deleted: " + why});
 }
 
 }  // namespace zel

@@ -1,12 +1,9 @@
 #include "files/FileOps.h"
 
 #include <algorithm>
-#include <cerrno>
-#include <cstdio>
 #include <filesystem>
-#include <memory>
 #include <stdexcept>
-#include <system_error>
+#include <utility>
 
 #include "support/Text.h"
 
@@ -22,16 +19,8 @@ constexpr const char* kOtherImages =
     "|SVG Files (*.svg)|*.svg|PDF Files (*.pdf)|*.pdf|PNG Files (*.png)|*.png";
 constexpr int kImageFilter = 2;
 constexpr const char* kScriptFolder = "specialMeas";
-constexpr std::size_t kChunk = std::size_t{4} * 1024 * 1024;
-constexpr std::size_t kLeastRead = 4096;
-
-struct Closer {
-    void operator()(std::FILE* file) const { std::fclose(file); }
-};
-
-[[noreturn]] void fail(const std::string& path, const std::string& why) {
-    throw std::runtime_error("The file " + path + " cannot be read: " + why);
-}
+/// Up to this size a file is read whatever its bytes are.
+constexpr std::size_t kAnyText = std::size_t{1} << 20;
 
 }  // namespace
 
@@ -80,37 +69,25 @@ std::string FileOps::ShowOpenDataDialog(int filterIndex) {
     return path;
 }
 
-std::string FileOps::ReadWholeFile(const std::string& path, const Progress& progress) const {
+std::string FileOps::ReadWholeFile(const std::string& path, const ReadProgress& progress) const {
     if (path.empty()) return {};
-    std::error_code problem;
-    if (std::filesystem::is_directory(path, problem)) fail(path, "it is a folder");
-    errno = 0;
-    const std::unique_ptr<std::FILE, Closer> file(std::fopen(path.c_str(), "rb"));
-    if (!file) fail(path, std::generic_category().message(errno));
-    // A device or a pipe has no size; it is read to the same limit.
-    const auto told = std::filesystem::file_size(path, problem);
-    const std::uint64_t size = problem ? 0 : told;
-    if (size > kLargestFile) fail(path, "it is larger than 2 GB");
-    std::string bytes;
-    bytes.reserve(size + kLeastRead);  // the last read finds the end
-    for (std::size_t got = 1; got > 0;) {
-        const std::size_t before = bytes.size();
-        const std::size_t left = size > before ? static_cast<std::size_t>(size) - before : 0;
-        bytes.resize(before + std::min(kChunk, std::max(left, kLeastRead)));
-        got = std::fread(bytes.data() + before, 1, bytes.size() - before, file.get());
-        bytes.resize(before + got);
-        if (bytes.size() > kLargestFile) fail(path, "it is larger than 2 GB");
-        if (progress) progress(bytes.size(), std::max<std::uint64_t>(size, bytes.size()));
-    }
-    if (std::ferror(file.get()) != 0) fail(path, std::generic_category().message(errno));
-    if (!isValidUtf8(bytes)) return bytesToUtf8(bytes);
-    return bytes;
+    FileProblem problem;
+    std::optional<std::string> bytes = readFile(files_, path, kLargestFile, problem, progress);
+    if (!bytes) throw std::runtime_error(readProblem(path, problem));
+    if (isValidUtf8(*bytes)) return std::move(*bytes);
+    // Both forms stand in memory for a moment. No measured data is mostly of letters that have
+    // several bytes in UTF-8.
+    const auto wide = std::count_if(bytes->begin(), bytes->end(),
+                                    [](char c) { return static_cast<unsigned char>(c) >= 0x80; });
+    if (bytes->size() > kAnyText && static_cast<std::size_t>(wide) > bytes->size() / 4)
+        throw std::runtime_error(readProblem(path, "it holds no text"));
+    return bytesToUtf8(*bytes);
 }
 
 std::string FileOps::LastFileDateTime() const {
     if (LastDialogFileName.empty()) return " ";
-    const std::optional<double> date = clock_.modified(LastDialogFileName);
-    return date ? clock_.dateTimeText(*date) : " ";
+    const FileStatus file = files_.stat(LastDialogFileName);
+    return file.exists() ? clock_.dateTimeText(file.modified) : " ";
 }
 
 }  // namespace zel

@@ -1,24 +1,24 @@
 #pragma once
 // The file dialogs of the panel and the reading of whole files.
 
-#include <functional>
+#include <cstdint>
+#include <optional>
 #include <string>
 
 #include "forms/ControllerForm.h"
 #include "platform/Clock.h"
+#include "platform/Files.h"
 #include "platform/Services.h"
+#include "support/FileText.h"
 
 namespace zel {
 
 /// All dialogs return the chosen path, or the empty text when cancelled.
 class FileOps {
   public:
-    /// Called with the bytes read so far and the size of the file.
-    using Progress = std::function<void(std::uint64_t done, std::uint64_t size)>;
-
     FileOps(ControllerForm& panel, FileDialogs& dialogs, ApplicationFolder& folder,
-            const Clock& clock)
-        : panel_(panel), dialogs_(dialogs), folder_(folder), clock_(clock) {}
+            FileService& files, const Clock& clock)
+        : panel_(panel), dialogs_(dialogs), folder_(folder), files_(files), clock_(clock) {}
 
     std::string LastDialogFileName;  ///< what the last dialog gave; empty if none yet
     std::string LastOpenFolder;      ///< where the open dialog begins; empty at the start
@@ -30,15 +30,17 @@ class FileOps {
     std::string ShowOpenDataDialog(int filterIndex);
     /// The file's text; bytes that are no UTF-8 count as Windows-1252. Throws
     /// std::runtime_error with a text for the user when the file cannot be read or is larger
-    /// than `kLargestFile`. An empty path or file gives the empty text.
-    std::string ReadWholeFile(const std::string& path, const Progress& progress = {}) const;
+    /// than `kLargestFile`. An empty path or file gives the empty text. Takes less memory than
+    /// three times the file.
+    std::string ReadWholeFile(const std::string& path, const ReadProgress& progress = {}) const;
     /// Day and time at which the last dialog's file was written; " " without one.
     std::string LastFileDateTime() const;
     /// Takes a name as if a dialog had given it.
     void note(const std::string& path);
+    FileService& service() const { return files_; }
 
     static constexpr int kCsvFilter = 4;
-    static constexpr std::uint64_t kLargestFile = 2'000'000'000;
+    static constexpr std::uint64_t kLargestFile = 1ULL << 30;  ///< 1 GiB
 
   private:
     std::string finish(const std::optional<std::string>& chosen);
@@ -46,6 +48,7 @@ class FileOps {
     ControllerForm& panel_;
     FileDialogs& dialogs_;
     ApplicationFolder& folder_;
+    FileService& files_;
     const Clock& clock_;
 };
 

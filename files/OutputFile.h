@@ -4,6 +4,8 @@
 #include <string>
 #include <string_view>
 
+#include "platform/Files.h"
+
 namespace zel {
 
 /// Lines gather in memory and reach the file in `close`, so that a failure halfway leaves either
@@ -12,7 +14,8 @@ class OutputFile {
   public:
     enum class Mode { Output, Append };
 
-    OutputFile(std::string path, Mode mode) : path_(std::move(path)), mode_(mode) {}
+    OutputFile(FileService& files, std::string path, Mode mode)
+        : files_(files), path_(std::move(path)), mode_(mode) {}
 
     const std::string& path() const { return path_; }
     /// Adds text and CR LF.
@@ -25,15 +28,10 @@ class OutputFile {
     std::string close();
 
   private:
-    std::string append() const;
-    std::string replace() const;
-
+    FileService& files_;
     std::string path_;
     Mode mode_;
     std::string text_;
 };
-
-/// "The file NAME cannot be written: No space left on device".
-std::string writeProblem(const std::string& path, int errorNumber);
 
 }  // namespace zel

@@ -7,6 +7,7 @@
 
 #include "model/CodeTables.h"
 #include "platform/KeyInput.h"
+#include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/TimeText.h"
 
@@ -25,15 +26,6 @@ template <class Whole>
 Whole wholeNumber(double value) {
     constexpr double kMost = std::numeric_limits<Whole>::max();
     return static_cast<Whole>(std::clamp(std::nearbyint(value), 0.0, kMost));
-}
-
-/// "118 kB".
-std::string sizeText(std::uintmax_t bytes) {
-    constexpr const char* kUnits[] = {" B", " kB", " MB", " GB"};
-    auto size = static_cast<double>(bytes);
-    std::size_t unit = 0;
-    while (size >= 1000 && unit < 3) size /= 1000, ++unit;
-    return formatPattern(size, size < 10 && unit > 0 ? "0.0" : "0") + kUnits[unit];
 }
 
 }  // namespace
@@ -114,7 +106,7 @@ bool Recording::chooseFile() {
     panel_.DataFileName = files_.ShowSaveDataDialog(FileOps::kCsvFilter);
     if (panel_.DataFileName.empty()) return false;
     // Emptied once; each trace is then appended to it.
-    OutputFile file(panel_.DataFileName, OutputFile::Mode::Output);
+    OutputFile file(files_.service(), panel_.DataFileName, OutputFile::Mode::Output);
     const std::string problem = file.close();
     if (problem.empty()) return true;
     boxes_.show({BoxIcon::Critical, problem});
@@ -261,12 +253,11 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
 
 std::string Recording::progressText() const {
     if (writer_.RecordingFileName.empty() || !panel_.RecordData.Checked) return {};
-    std::error_code missing;
-    const auto bytes = std::filesystem::file_size(writer_.RecordingFileName, missing);
+    const std::uint64_t bytes = files_.service().stat(writer_.RecordingFileName).size;
     const double count = dialog_.RecordedCount;
     std::string text = std::filesystem::path(writer_.RecordingFileName).filename().string() + ": " +
                        generalNumber(count) + (count == 1 ? " trace, " : " traces, ") +
-                       sizeText(missing ? 0 : bytes) + ", " +
+                       sizeText(bytes) + ", " +
                        timeOfDayText(std::nearbyint(running_.Elapsed() / 1000.0) / kDaySeconds);
     if (mirror_.ExternalTriggerActive) return text + ", waits for the trigger";
     if (dialog_.X.Interval == 0) return text + ", the interval of 0 s takes no trace";

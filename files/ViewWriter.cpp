@@ -59,10 +59,10 @@ void ViewWriter::SaveView(const std::string& kind) {
 
 OutputFile ViewWriter::target() const {
     using Mode = OutputFile::Mode;
-    if (panel_.isSpecMeas) return {panel_.DataFileName, Mode::Append};
+    if (panel_.isSpecMeas) return {files_.service(), panel_.DataFileName, Mode::Append};
     const bool timed = forms_.time.ContinuousRecording;
     const bool recording = timed && !fromMenu_ && !RecordingFileName.empty();
-    return {recording ? RecordingFileName : panel_.CommonDialog1FileName,
+    return {files_.service(), recording ? RecordingFileName : panel_.CommonDialog1FileName,
             timed ? Mode::Append : Mode::Output};
 }
 
@@ -129,7 +129,8 @@ void ViewWriter::WriteFooterAndCloseFileZELViewFormat(OutputFile& file) { finish
 
 void ViewWriter::savePowerValues() {
     const bool recording = !fromMenu_ && !panel_.isSpecMeas && !RecordingFileName.empty();
-    OutputFile file(recording ? RecordingFileName : panel_.DataFileName, OutputFile::Mode::Append);
+    OutputFile file(files_.service(), recording ? RecordingFileName : panel_.DataFileName,
+                    OutputFile::Mode::Append);
     file.line("Power at: " + nowText() + ": " + panel_.LastPowerText);
     if (forms_.powerAndRefl.ReadPowerAndRefl)
         file.line("VSWR:" + std::string(26, ' ') + panel_.LastReflectionText);

@@ -19,7 +19,8 @@ struct SavedFiles {
     VirtualPlatform platform;
     Forms forms;
     ZEL3Variables mirror;
-    FileOps files{forms.controller, platform.fileDialogs, platform.folder, platform.clock};
+    FileOps files{forms.controller, platform.fileDialogs, platform.folder, platform.files,
+                  platform.clock};
     GraphScaling scaling{forms.controller, forms.waterfall, mirror, platform.clock};
     TraceConversion conversion{forms.controller, mirror, forms.waterfall.Graph3D};
     ViewReader reader{forms,      mirror,         files,           scaling,

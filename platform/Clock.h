@@ -3,7 +3,6 @@
 
 #include <cmath>
 #include <cstdint>
-#include <optional>
 #include <string>
 
 namespace zel {
@@ -22,8 +21,6 @@ class Clock {
     virtual std::string dateText(double date) const;
     /// The time of day of a date as a text, "23:59:59".
     virtual std::string timeText(double date) const;
-    /// When a file was last written, as `date`; nothing for a file that is not there.
-    virtual std::optional<double> modified(const std::string& path) const = 0;
 
     /// Day and time of day.
     std::string dateTimeText(double date) const { return dateText(date) + " " + timeText(date); }

@@ -3,6 +3,7 @@
 
 #include "platform/Clock.h"
 #include "platform/Events.h"
+#include "platform/Files.h"
 #include "platform/MessageBox.h"
 #include "platform/SerialPort.h"
 #include "platform/Services.h"
@@ -26,6 +27,7 @@ struct Platform {
     StartupFolder& startup;
     ApplicationFolder& folder;
     FileDialogs& fileDialogs;
+    FileService& files;
 };
 
 }  // namespace zel

@@ -17,8 +17,7 @@ void RoboHelp_CSH::showTopic(int context) {
 
 bool RoboHelp_CSH::RH_ShowHelp(int /*parent*/, const std::string& helpFile, int command,
                                int context) {
-    std::error_code missing;
-    if (command != kContextHelp || !std::filesystem::exists(helpFile, missing)) return false;
+    if (command != kContextHelp || !files_.stat(helpFile).exists()) return false;
     return launcher_.start(helpFile, {std::to_string(context)});
 }
 

@@ -3,6 +3,7 @@
 
 #include <string>
 
+#include "platform/Files.h"
 #include "platform/MessageBox.h"
 #include "platform/Services.h"
 
@@ -13,8 +14,9 @@ class RoboHelp_CSH {
     /// The command of a topic by its context number.
     static constexpr int kContextHelp = 15;
 
-    RoboHelp_CSH(ApplicationFolder& folder, Launcher& launcher, MessageBoxes& boxes)
-        : folder_(folder), launcher_(launcher), boxes_(boxes) {}
+    RoboHelp_CSH(ApplicationFolder& folder, FileService& files, Launcher& launcher,
+                 MessageBoxes& boxes)
+        : folder_(folder), files_(files), launcher_(launcher), boxes_(boxes) {}
 
     /// The topic of that context number in the program's own book.
     void showTopic(int context);
@@ -23,6 +25,7 @@ class RoboHelp_CSH {
 
   private:
     ApplicationFolder& folder_;
+    FileService& files_;
     Launcher& launcher_;
     MessageBoxes& boxes_;
 };

@@ -42,6 +42,11 @@ std::optional<std::string> toWindows1252(std::string_view text) {
 
 std::string fromWindows1252(std::string_view bytes) {
     std::string text;
+    // Room at once: to grow would take the memory of several files.
+    constexpr std::size_t kMore = 2;  // bytes that a letter takes at most besides its first
+    const auto wide = std::count_if(bytes.begin(), bytes.end(),
+                                    [](char c) { return static_cast<unsigned char>(c) >= kFirst; });
+    text.reserve(bytes.size() + kMore * static_cast<std::size_t>(wide));
     for (const char byte : bytes) {
         const auto number = static_cast<unsigned char>(byte);
         const bool special = number >= kFirst && number <= kLast;

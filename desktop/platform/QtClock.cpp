@@ -1,11 +1,9 @@
 #include "desktop/platform/QtClock.h"
 
 #include <QDateTime>
-#include <QFileInfo>
 #include <QLocale>
 #include <chrono>
 #include <cmath>
-#include <ctime>
 
 namespace zel {
 
@@ -36,26 +34,22 @@ std::string QtClock::timeText(double date) const {
     return time.toString("HH:mm:ss").toStdString();
 }
 
-std::optional<double> QtClock::modified(const std::string& path) const {
-    const QFileInfo file(QString::fromStdString(path));
-    if (!file.exists()) return std::nullopt;
-    const QDateTime time = file.lastModified();
-    return static_cast<double>(kFirstDay.daysTo(time.date())) +
-           time.time().msecsSinceStartOfDay() / kDayMilliseconds;
+double QtClock::dateOf(std::time_t seconds, double fraction) {
+    using namespace std::chrono;
+    constexpr sys_days kOrigin = year(1899) / 12 / 30;
+    constexpr double kDaySeconds = 86400;
+    std::tm local{};
+    localtime_r(&seconds, &local);
+    const sys_days day = year(local.tm_year + 1900) / (local.tm_mon + 1) / local.tm_mday;
+    const double second = local.tm_hour * 3600 + local.tm_min * 60 + local.tm_sec + fraction;
+    return static_cast<double>((day - kOrigin).count()) + second / kDaySeconds;
 }
 
 double QtClock::date() const {
     using namespace std::chrono;
-    constexpr sys_days kOrigin = year(1899) / 12 / 30;
-    constexpr double kDaySeconds = 86400;
     const auto now = system_clock::now();
-    const std::time_t whole = system_clock::to_time_t(floor<seconds>(now));
-    std::tm local{};
-    localtime_r(&whole, &local);
-    const sys_days today = year(local.tm_year + 1900) / (local.tm_mon + 1) / local.tm_mday;
-    const double second = local.tm_hour * 3600 + local.tm_min * 60 + local.tm_sec +
-                          duration<double>(now - floor<seconds>(now)).count();
-    return static_cast<double>((today - kOrigin).count()) + second / kDaySeconds;
+    const auto whole = floor<seconds>(now);
+    return dateOf(system_clock::to_time_t(whole), duration<double>(now - whole).count());
 }
 
 }  // namespace zel

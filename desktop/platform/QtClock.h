@@ -1,6 +1,8 @@
 #pragma once
 // The computer's clocks.
 
+#include <ctime>
+
 #include "platform/Clock.h"
 
 namespace zel {
@@ -12,7 +14,9 @@ class QtClock : public Clock {
     /// In the short form of the system's locale, with four digits of the year.
     std::string dateText(double date) const override;
     std::string timeText(double date) const override;
-    std::optional<double> modified(const std::string& path) const override;
+
+    /// The local date and time of a moment of the system, as `date`.
+    static double dateOf(std::time_t seconds, double fraction);
 };
 
 }  // namespace zel

@@ -9,6 +9,7 @@
 #include "desktop/platform/QtSerialPort.h"
 #include "desktop/platform/QtServices.h"
 #include "desktop/platform/QtSocket.h"
+#include "desktop/platform/SystemFiles.h"
 #include "platform/Platform.h"
 
 namespace zel {
@@ -31,12 +32,14 @@ struct QtPlatform {
     QtLauncher launcher;
     QtStartupFolder startup;
     QtFileDialogs fileDialogs;
+    SystemFiles files;
 
     Platform bundle() { return bundle(boxes, fileDialogs); }
     /// With boxes and file dialogs of another front.
     Platform bundle(MessageBoxes& otherBoxes, FileDialogs& otherDialogs) {
-        return {clock,    events, otherBoxes, serialPort, serialPorts, tcpSocket, serverSocket,
-                settings, debug,  clipboard,  launcher,   startup,     folder,    otherDialogs};
+        return {clock,     events,       otherBoxes, serialPort,   serialPorts,
+                tcpSocket, serverSocket, settings,   debug,        clipboard,
+                launcher,  startup,      folder,     otherDialogs, files};
     }
 };
 

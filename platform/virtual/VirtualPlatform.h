@@ -6,6 +6,7 @@
 #include "platform/virtual/RecordedBoxes.h"
 #include "platform/virtual/ScriptedPort.h"
 #include "platform/virtual/ScriptedSocket.h"
+#include "platform/virtual/VirtualFiles.h"
 #include "platform/virtual/VirtualTime.h"
 
 namespace zel {
@@ -25,13 +26,16 @@ struct VirtualPlatform {
     MemoryStartupFolder startup;
     FixedApplicationFolder folder;
     QueuedFileDialogs fileDialogs;
+    VirtualFiles files{clock};
 
     /// The bundle with the scripted port.
     Platform bundle() { return bundle(port); }
     /// The bundle with another port on this time, such as a simulated instrument.
-    Platform bundle(SerialPort& other) {
-        return {clock,    events, boxes,     other,    ports,   tcpSocket, serverSocket,
-                settings, debug,  clipboard, launcher, startup, folder,    fileDialogs};
+    Platform bundle(SerialPort& other) { return bundle(other, files); }
+    /// The same on another disk.
+    Platform bundle(SerialPort& other, FileService& disk) {
+        return {clock, events,    boxes,    other,   ports,  tcpSocket,   serverSocket, settings,
+                debug, clipboard, launcher, startup, folder, fileDialogs, disk};
     }
 };
 

@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <chrono>
 #include <cmath>
-#include <filesystem>
 #include <vector>
 
 namespace zel {
@@ -29,12 +28,6 @@ double dateOf(int year, int month, int day, int hour, int minute, double second)
 }
 
 VirtualClock::VirtualClock() : VirtualClock(dateOf(2026, 1, 1, 12)) {}
-
-std::optional<double> VirtualClock::modified(const std::string& path) const {
-    std::error_code missing;
-    if (!std::filesystem::exists(path, missing)) return std::nullopt;
-    return date();
-}
 
 double VirtualClock::date() const {
     return startDate_ + static_cast<double>(micros_) / kMicrosPerDay;

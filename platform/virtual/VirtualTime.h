@@ -23,8 +23,6 @@ class VirtualClock : public Clock {
 
     std::int64_t micros() const override { return micros_; }
     double date() const override;
-    /// The present date for every file that is there.
-    std::optional<double> modified(const std::string& path) const override;
 
     /// Sets the date of this moment, as a user who sets his clock; `micros` goes on unmoved.
     void setDate(double date);

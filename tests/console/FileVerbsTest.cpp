@@ -7,6 +7,7 @@
 #include "console/Fronts.h"
 #include "console/PanelSession.h"
 #include "console/Tool.h"
+#include "tests/files/DiskFolder.h"
 #include "tests/files/FileSession.h"
 
 namespace zel {
@@ -39,7 +40,7 @@ struct FileVerbsTest : ::testing::Test {
         for (std::string line; std::getline(in, line);) lines.push_back(line);
         return lines;
     }
-    Folder folder;
+    DiskFolder folder;
     std::ostringstream out;
     std::ostringstream errors;
 };

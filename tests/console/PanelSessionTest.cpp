@@ -35,7 +35,7 @@ struct PanelSessionTest : ::testing::Test {
         Program program(
             {platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
              platform.serverSocket, platform.settings, platform.debug, platform.clipboard,
-             platform.launcher, platform.startup, platform.folder, dialogs},
+             platform.launcher, platform.startup, platform.folder, dialogs, platform.files},
             words);
         PanelSession session(program,
                              {platform.clock, events, input, output, errorOutput, answers, true},

@@ -143,10 +143,10 @@ TEST_F(ExternalTriggerTest, FileThatCannotBeWritten_EndsIt) {
     settings();
     sweep();
     // The chosen file vanishes with its folder behind the choice.
-    std::filesystem::create_directory(folder.file("sub"));
+    platform.files.putFolder(folder.file("sub"));
     platform.fileDialogs = {};
     platform.fileDialogs.answer(folder.file("sub/trace.csv"));
-    platform.events.schedule(0, [this] { std::filesystem::remove_all(folder.file("sub")); });
+    platform.events.schedule(0, [this] { platform.files.vanish(folder.file("sub")); });
     submit();
     EXPECT_EQ(boxes.texts(), Texts{"The file " + folder.file("sub/trace.csv") +
                                    " cannot be written: No such file or directory\r\n"

@@ -1,11 +1,6 @@
 #pragma once
 // A session with a folder of its own for files, and traces to put into them.
 
-#include <unistd.h>
-
-#include <filesystem>
-#include <fstream>
-#include <sstream>
 #include <string>
 #include <vector>
 
@@ -16,34 +11,22 @@ namespace zel {
 
 using Texts = std::vector<std::string>;
 
+/// A folder on the disk in memory.
 class Folder {
   public:
-    Folder() {
-        std::string pattern = (std::filesystem::temp_directory_path() / "views-XXXXXX").string();
-        path_ = ::mkdtemp(pattern.data());
-    }
-    ~Folder() {
-        std::error_code ignored;
-        std::filesystem::remove_all(path_, ignored);
-    }
-    Folder(const Folder&) = delete;
-    Folder& operator=(const Folder&) = delete;
+    explicit Folder(VirtualFiles& disk) : disk_(disk) { disk_.putFolder(kPath); }
 
-    std::string file(const std::string& name) const { return (path_ / name).string(); }
-    std::string read(const std::string& name) const {
-        std::ifstream in(file(name), std::ios::binary);
-        std::ostringstream text;
-        text << in.rdbuf();
-        return text.str();
-    }
+    std::string file(const std::string& name) const { return std::string(kPath) + "/" + name; }
+    std::string read(const std::string& name) const { return disk_.bytes(file(name)); }
     std::string write(const std::string& name, const std::string& text) const {
-        std::ofstream(file(name), std::ios::binary) << text;
+        disk_.put(file(name), text);
         return file(name);
     }
-    bool has(const std::string& name) const { return std::filesystem::exists(file(name)); }
+    bool has(const std::string& name) const { return disk_.has(file(name)); }
 
   private:
-    std::filesystem::path path_;
+    static constexpr const char* kPath = "/views";
+    VirtualFiles& disk_;
 };
 
 /// Without their CR LF; a last line that is not ended counts.
@@ -117,7 +100,7 @@ struct FileSession : TestSession {
     }
     void open(const std::string& name) { panel.OpenFile(folder.file(name)); }
 
-    Folder folder;
+    Folder folder{platform.files};
 };
 
 }  // namespace zel

@@ -32,8 +32,8 @@ struct RecordingTest : ::testing::Test {
     void set(const std::string& setting) { ASSERT_TRUE(program.exchange().SetInstrument(setting)); }
     std::size_t traces() { return count(folder.read("trace.csv"), "Trace Name;"); }
 
-    Folder folder;
     VirtualPlatform platform;
+    Folder folder{platform.files};
     zelsim::InProcessPort port{platform.clock, platform.events, {}, {.answering = 0.0001}};
     Program program{platform.bundle(port), ""};
     Forms& forms = program.forms();
@@ -224,17 +224,17 @@ TEST_F(RecordingTest, OtherFileDialogs_DoNotTurnItAside) {
 }
 
 TEST_F(RecordingTest, VanishedFolder_IsToldAndEndsIt) {
-    std::filesystem::create_directory(folder.file("sub"));
+    platform.files.putFolder(folder.file("sub"));
     begin("1", "sub/trace.csv");
     platform.events.runFor(1500);
-    std::filesystem::rename(folder.file("sub"), folder.file("moved"));
+    platform.files.vanish(folder.file("sub"));
     platform.events.runFor(3000);
     EXPECT_EQ(boxes.texts(), Texts{"The file " + folder.file("sub/trace.csv") +
                                    " cannot be written: No such file or directory\r\n"
                                    "The recording was stopped."});
     EXPECT_FALSE(panel.RecordData.Checked);
     EXPECT_FALSE(forms.time.X.Enabled);
-    EXPECT_EQ(count(folder.read("moved/trace.csv"), "Trace Name;"), 1U);
+    EXPECT_EQ(count(folder.read("sub/trace.csv"), "Trace Name;"), 1U);
     EXPECT_TRUE(panel.PlayContinuousButton.Enabled);
 }
 

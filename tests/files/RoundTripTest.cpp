@@ -40,9 +40,10 @@ TEST_P(RoundTripTest, LoadedView_IsDrawnAsItWas) {
     live.mirror.TraceDetector = static_cast<std::uint8_t>(detector);
     live.sweepOf(FileSession::ramp(view.first, detector == 0 ? view.step / 2 : view.step,
                                    detector == 0 ? 602 : 301));
-    live.save("view.csv");
+    const std::string saved = live.save("view.csv");
 
     FileSession other;
+    other.folder.write("view.csv", saved);
     other.panel.OpenFile(live.folder.file("view.csv"));
     const std::vector<double>& drawn = live.drawn();
     const std::vector<double>& loaded = other.panel.CWGraph1.values();
@@ -71,8 +72,9 @@ TEST(RoundTrip, EveryModeLoadsItsTrace) {
         live.mirror.TraceDetector = 3;
         live.panel.InstrumentMode = mode;
         live.sweepOf(FileSession::ramp(-35000, -100));
-        live.save("view.csv");
+        const std::string saved = live.save("view.csv");
         FileSession other;
+        other.folder.write("view.csv", saved);
         other.panel.OpenFile(live.folder.file("view.csv"));
         EXPECT_EQ(other.panel.CWGraph1.values(), live.drawn()) << "mode " << mode;
         EXPECT_EQ(other.panel.DataXAxisArrayToLoad.size(), 301U) << "mode " << mode;
@@ -89,9 +91,10 @@ TEST(RoundTrip, LinearRangeWithAHighLevel_IsLiftedByTheRangeAsANumber) {
     live.mirror.ReferenceLevel = 87;
     live.mirror.ReferenceRange = 4;
     live.sweepOf(std::vector<double>(301, 50000));
-    live.save("view.csv");
+    const std::string saved = live.save("view.csv");
     EXPECT_NEAR(live.drawn()[0], DbmToPercent(50, 87), 1e-9);
     FileSession other;
+    other.folder.write("view.csv", saved);
     other.panel.OpenFile(live.folder.file("view.csv"));
     EXPECT_EQ(other.panel.CWGraph1.values()[0], 87 - 40);
 }
@@ -102,8 +105,9 @@ TEST(RoundTrip, LoadedView_SavesAsItWas) {
     live.mirror.TraceDetector = 3;
     live.mirror.ReferenceRange = 1;
     live.sweepOf(FileSession::ramp(-10000, -400));
-    live.save("view.csv");
+    const std::string saved = live.save("view.csv");
     FileSession other;
+    other.folder.write("view.csv", saved);
     other.panel.OpenFile(live.folder.file("view.csv"));
     other.save("again.csv");
     const Texts first = linesOf(live.folder.read("view.csv"));

@@ -238,7 +238,7 @@ TEST_F(ViewReaderTest, NameWithDat_GoesToTheOldReader) {
 }
 
 TEST_F(ViewReaderTest, FolderWithDat_DoesNotDecide) {
-    std::filesystem::create_directory(folder.file("data"));
+    platform.files.putFolder(folder.file("data"));
     load(kHead + rowsText(301), "data/view.csv");
     EXPECT_EQ(mirror.ReferenceLevel, -20);
 }
@@ -318,7 +318,7 @@ TEST_F(ViewReaderTest, MissingFile_IsTold) {
 }
 
 TEST_F(ViewReaderTest, FolderInsteadOfAFile_IsTold) {
-    std::filesystem::create_directory(folder.file("sub"));
+    platform.files.putFolder(folder.file("sub"));
     open("sub");
     EXPECT_EQ(boxes.texts(),
               Texts{"The file " + folder.file("sub") + " cannot be read: it is a folder"});

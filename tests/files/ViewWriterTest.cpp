@@ -1,7 +1,4 @@
 #include <gtest/gtest.h>
-#include <sys/resource.h>
-
-#include <csignal>
 
 #include "files/ViewWriter.h"
 #include "tests/files/FileSession.h"
@@ -88,7 +85,6 @@ TEST_F(ViewWriterTest, SecondSave_ReplacesTheFile) {
     sweepOf(ramp(-35250, 0));
     const std::string first = save("view.csv");
     EXPECT_EQ(save("view.csv").size(), first.size());
-    EXPECT_FALSE(folder.has("view.csv.part"));
 }
 
 TEST_F(ViewWriterTest, WhileRecording_ASaveAppends) {
@@ -150,7 +146,7 @@ struct LogHead {
 
 TEST_F(ViewWriterTest, OldLog_NamesSpanDetectorAndRange) {
     // A writer beside the program's own: no menu reaches the older format.
-    FileOps files(panel, platform.fileDialogs, platform.folder, platform.clock);
+    FileOps files(panel, platform.fileDialogs, platform.folder, platform.files, platform.clock);
     ViewWriter writer(forms, mirror, program.exchange(), files, platform.clock, boxes);
     const LogHead heads[] = {{3, 3, 1, "Data at;"},
                              {3, 4, 1, "Data(LIN) at;"},
@@ -161,7 +157,7 @@ TEST_F(ViewWriterTest, OldLog_NamesSpanDetectorAndRange) {
         mirror.TraceDetector = static_cast<std::uint8_t>(row.detector);
         mirror.ReferenceRange = row.range;
         mirror.Span = row.span;
-        OutputFile file(folder.file("log.dat"), OutputFile::Mode::Output);
+        OutputFile file(platform.files, folder.file("log.dat"), OutputFile::Mode::Output);
         writer.WriteLogHeader(file);
         writer.WriteFooterAndCloseFile(file);
         EXPECT_EQ(
@@ -182,53 +178,29 @@ TEST_F(ViewWriterTest, MissingFolder_IsToldAndNamesTheFile) {
 
 TEST_F(ViewWriterTest, FullDisk_IsTold) {
     sweepOf(ramp(-35250, 0));
-    platform.fileDialogs.answer("/dev/full");
-    panel.SaveCurrentView.Click();
-    EXPECT_EQ(boxes.texts(),
-              Texts{"The file /dev/full cannot be written: No space left on device"});
+    platform.files.room = 0;
+    EXPECT_EQ(save("view.csv"), "");
+    EXPECT_FALSE(folder.has("view.csv"));
+    EXPECT_EQ(boxes.texts(), Texts{"The file " + folder.file("view.csv") +
+                                   " cannot be written: No space left on device"});
 }
-
-/// No file of this process grows beyond a size.
-class FileLimit {
-  public:
-    explicit FileLimit(rlim_t bytes) : handler_(std::signal(SIGXFSZ, SIG_IGN)) {
-        getrlimit(RLIMIT_FSIZE, &before_);
-        rlimit limit = before_;
-        limit.rlim_cur = bytes;
-        setrlimit(RLIMIT_FSIZE, &limit);
-    }
-    ~FileLimit() {
-        setrlimit(RLIMIT_FSIZE, &before_);
-        std::signal(SIGXFSZ, handler_);
-    }
-    FileLimit(const FileLimit&) = delete;
-    FileLimit& operator=(const FileLimit&) = delete;
-
-  private:
-    void (*handler_)(int);
-    rlimit before_{};
-};
 
 TEST_F(ViewWriterTest, AppendThatRunsOutOfRoom_LeavesTheTracesBeforeIt) {
     sweepOf(ramp(-35250, 0));
     const std::string first = save("view.csv");
     forms.time.ContinuousRecording = true;
-    {
-        const FileLimit limit(first.size() + 2000);
-        save("view.csv");
-    }
+    platform.files.room = first.size() - 1;
+    save("view.csv");
     EXPECT_EQ(folder.read("view.csv"), first);
-    EXPECT_EQ(boxes.texts(),
-              Texts{"The file " + folder.file("view.csv") + " cannot be written: File too large"});
+    EXPECT_EQ(boxes.texts(), Texts{"The file " + folder.file("view.csv") +
+                                   " cannot be written: No space left on device"});
 }
 
 TEST_F(ViewWriterTest, SaveThatRunsOutOfRoom_LeavesTheOlderFile) {
     sweepOf(ramp(-35250, 0));
     folder.write("view.csv", "older");
-    {
-        const FileLimit limit(2000);
-        save("view.csv");
-    }
+    platform.files.room = 2000;
+    save("view.csv");
     EXPECT_EQ(folder.read("view.csv"), "older");
     EXPECT_EQ(boxes.texts().size(), 1U);
 }

@@ -1,7 +1,5 @@
 #include <gtest/gtest.h>
 
-#include <cstdio>
-
 #include "panel/HelpKeys.h"
 #include "platform/KeyInput.h"
 #include "tests/files/FileSession.h"
@@ -12,7 +10,7 @@ namespace {
 struct HelpKeysTest : TestSession, ::testing::Test {
     HelpKeysTest() {
         program.start();
-        platform.folder.folder = own.file("");
+        platform.folder.folder = "/views";
         book = own.write("ZELRemoteHelp.chm", "book");
     }
     /// The topics that were opened, and nothing more.
@@ -24,7 +22,7 @@ struct HelpKeysTest : TestSession, ::testing::Test {
         }
         return topics;
     }
-    Folder own;
+    Folder own{platform.files};
     std::string book;
 };
 
@@ -61,7 +59,7 @@ TEST_F(HelpKeysTest, HelpMenu_OpensTheContents) {
 }
 
 TEST_F(HelpKeysTest, MissingBook_IsTold) {
-    std::remove(book.c_str());
+    platform.files.remove(book);
     panel.HelpHelp.Click();
     ASSERT_EQ(boxes.texts().size(), 1U);
     EXPECT_NE(boxes.texts()[0].find("ZELRemoteHelp.chm cannot be opened."), std::string::npos);

@@ -32,6 +32,7 @@ struct ReadCycle : TestSession, ::testing::Test {
     /// Recording is on, and its file takes all and keeps none.
     void recordIntoNothing() {
         panel.RecordDataFlag = true;
+        platform.files.putOther("/dev/null");
         panel.CommonDialog1FileName = "/dev/null";
         mirror.ResolutionBandwidth = mirror.VideoBandwidth = 1;
     }
