@@ -192,9 +192,10 @@ std::string analysisCsvRow(const AnalysisResult& result, const AnalysisRequest& 
     return csvLine(fields);
 }
 
-std::string analysisText(const AnalysisResult& result, const AnalysisRequest& request) {
-    std::string text;
-    const auto line = [&text](const std::string& what) { text += what + "\n"; };
+std::vector<std::string> analysisText(const AnalysisResult& result,
+                                      const AnalysisRequest& request) {
+    std::vector<std::string> text;
+    const auto line = [&text](const std::string& what) { text.push_back(what); };
     const std::string& x = result.xUnit;
     const std::string& unit = result.unit;
     if (result.trace == 0) {

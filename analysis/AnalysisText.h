@@ -3,6 +3,7 @@
 
 #include <cstddef>
 #include <string>
+#include <vector>
 
 #include "analysis/TraceAnalysis.h"
 
@@ -19,7 +20,7 @@ std::string analysisCsvHeader(const AnalysisRequest& request, std::size_t sample
 /// A row of the same length; a missing figure is an empty field.
 std::string analysisCsvRow(const AnalysisResult& result, const AnalysisRequest& request);
 
-/// Lines for a person, ended by LF each.
-std::string analysisText(const AnalysisResult& result, const AnalysisRequest& request);
+/// Lines for a person.
+std::vector<std::string> analysisText(const AnalysisResult& result, const AnalysisRequest& request);
 
 }  // namespace zel
