@@ -38,6 +38,11 @@ int findEntry(const FieldList& lines, std::string_view word, int from = 0) {
     return -1;
 }
 
+/// Time of day of a trace and the day of its file.
+std::string rowLabelOf(const FieldList& lines, int timeEntry, const std::string& fileTime) {
+    return std::string(lines[timeEntry + 1]) + " " + fileTime.substr(0, kDayLength);
+}
+
 std::string percentText(double part) { return generalNumber(std::floor(part * 100)) + " %"; }
 
 /// Runs something at the end of a scope, whatever way it is left.
@@ -164,8 +169,8 @@ ViewReader::Header ViewReader::readHeader(const std::string& text, const FieldLi
         if (unit >= 0 && !row.saved.empty() && lines[unit + 1] == row.saved)
             mirror_.ReferenceUnit = row.code;
     const int time = findEntry(lines, kTime);
-    if (time >= 0)
-        header.rowLabel = std::string(lines[time + 1]) + " " + fileTime.substr(0, kDayLength);
+    if (time >= 0) header.rowLabel = rowLabelOf(lines, time, fileTime);
+    header.fileTime = fileTime;
     rememberShown(lines, header.mark);
     const bool distance = panel_.Shown.mode == kFaultLocation;
     panel_.Shown.xUnit = distance ? "m" : header.zeroSpan ? "s" : "Hz";
@@ -206,6 +211,7 @@ void ViewReader::LoadTheData(const std::string& text, const std::string& fileTim
     const Header header = readHeader(text, lines, fileTime);
     const bool series = rowNumber == 0 && lines.last() > kLargestSingle;
     showTraces(lines, header, series);
+    if (series) forms_.waterfall.styleLastRow();
 
     panel_.PlaybackFrame.Visible = false;
     panel_.STOPFlag = false;
@@ -218,7 +224,7 @@ void ViewReader::LoadTheData(const std::string& text, const std::string& fileTim
     events_.pump();
 }
 
-void ViewReader::showTraces(const FieldList& lines, const Header& header, bool series) {
+void ViewReader::showTraces(const FieldList& lines, Header header, bool series) {
     const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
     int start = header.mark + kRowsBehindMark;
     if (header.mark < 0) {
@@ -233,6 +239,9 @@ void ViewReader::showTraces(const FieldList& lines, const Header& header, bool s
         showTrace(header, series);
         panel_.TraceLoaded();
         start = mark < 0 ? -1 : mark + kRowsBehindMark;
+        // The next trace bears its own time.
+        const int time = mark < 0 ? -1 : findEntry(lines, kTime, next);
+        if (time >= 0 && time < mark) header.rowLabel = rowLabelOf(lines, time, header.fileTime);
         if (start < 0 && shown == 1) break;
         panel_.PlaybackFrame.Visible = true;
         panel_.FileLabel.Caption =
@@ -302,7 +311,7 @@ void ViewReader::showTrace(const Header& header, bool series) {
     conversion_.colour(values);
     forms_.waterfall.Graph3D.plotCurve(panel_.YVector, panel_.XVector, values, panel_.TraceColours);
     panel_.CWGraph1.Old = false;
-    constexpr std::int16_t kLastRow = 32767;
+    constexpr std::int32_t kLastRow = 2147483647;
     if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
 }
 

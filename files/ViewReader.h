@@ -42,13 +42,14 @@ class ViewReader {
         bool zeroSpan = false;
         int mark = -1;  ///< entry of the data mark
         std::string_view markWord;
-        std::string rowLabel;
+        std::string rowLabel;  ///< of the trace at hand
+        std::string fileTime;
     };
 
     Header readHeader(const std::string& text, const FieldList& lines, const std::string& fileTime);
     void takeRange(std::string_view entry);
     void rememberShown(const FieldList& lines, int end);
-    void showTraces(const FieldList& lines, const Header& header, bool series);
+    void showTraces(const FieldList& lines, Header header, bool series);
     void showTrace(const Header& header, bool series);
     void spread(bool zeroSpan, double first, double last);
     bool pause();

@@ -122,7 +122,7 @@ class ControllerForm : public Form {
     double RawScale = 1000;
     std::vector<double> XVector;
     std::vector<double> YVector;
-    std::int16_t YVectorVal = 0;  ///< row number of the current trace in the waterfall
+    std::int32_t YVectorVal = 0;  ///< row number of the current trace in the waterfall
     ShownView Shown;              ///< of the view on the graph
 
     /// Saves the trace just read: "trace" or "power".
@@ -132,6 +132,8 @@ class ControllerForm : public Form {
     std::string DebugLogName = "debug.log";  ///< in the application's folder
     Event<> CloseDebugLog;                   ///< ahead of its deletion
     Event<int> ShowHelp;                     ///< opens the help topic of that context number
+    /// A row of the spectrogram is to be shown as the trace; 0 is the newest.
+    Event<int> SpectrogramRow;
     Event<> TraceLoaded;  ///< behind each trace of a file that was read and drawn
     /// The front draws the graph into the file of that path, its ending names the kind. The second
     /// text takes what went wrong.
@@ -164,12 +166,18 @@ class ControllerForm : public Form {
     MenuItem UtilityStartup{*this, "UtilityStartup", "Run on Startup", &Utility};
     MenuItem UtilityTrouble{*this, "UtilityTrouble", "Instrument Simulator", &Utility};
     MenuItem DelLogFile{*this, "DelLogFile", "Delete Log File", &Utility};
+    MenuItem ViewMenu{*this, "ViewMenu", "View"};
+    MenuItem SpectrogramShow{*this, "SpectrogramShow", "Spectrogram", &ViewMenu};
+    MenuItem SpectrogramPause{*this, "SpectrogramPause", "Pause Spectrogram", &ViewMenu};
+    MenuItem SpectrogramSave{*this, "SpectrogramSave", "Save Spectrogram as Recording...",
+                             &ViewMenu};
     MenuItem HelpMenu{*this, "HelpMenu", "Help"};
     MenuItem HelpHelp{*this, "HelpHelp", "Contents", &HelpMenu};
     MenuItem HelpAbout{*this, "HelpAbout", "About ZELRemote...", &HelpMenu};
 
     // The graph and the readouts under it.
     Graph CWGraph1{*this, "CWGraph1"};
+    Picture SpectrogramPicture{*this, "SpectrogramPicture"};  ///< earlier sweeps, time downwards
     Button cmdZoom{*this, "cmdZoom", "Zoom"};
     Button cmd3D{*this, "cmd3D", "3D"};
     Button cmdSpecial{*this, "cmdSpecial", "Script"};

@@ -7,8 +7,8 @@
 
 #include "forms/ControllerForm.h"
 #include "forms/MainForm.h"
+#include "forms/WaterfallForm.h"
 #include "platform/Controls.h"
-#include "platform/Graph.h"
 
 namespace zel {
 
@@ -55,21 +55,6 @@ class TimeForm : public Form {
     Button SubmitTimeButton{*this, "SubmitTimeButton", "OK"};
     Button CancelTimeButton{*this, "CancelTimeButton", "Cancel"};
     Timer X{*this, "X", 0};
-};
-
-/// The waterfall's window. Its row calls are events that the waterfall's room handles.
-class WaterfallForm : public Form {
-  public:
-    WaterfallForm() : Form("WaterfallForm") { Caption = "Waterfall"; }
-    zel::Graph3D Graph3D{*this, "Graph3D"};
-    Label lblMin{*this, "lblMin"};
-    Label lblMAX{*this, "lblMAX"};
-    Event<> clearGraph;  ///< all rows go
-    Event<> resetRowCount;
-    Event<int> limitRows;                ///< keeps at most so many rows
-    Event<const std::string&> stampRow;  ///< counts a row; the text is the time of day
-    Event<> styleLastRow;
-    Event<> saveGraphView;
 };
 
 class SpecialMeasForm : public Form {

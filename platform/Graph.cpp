@@ -27,6 +27,7 @@ void Graph::plotY(const std::vector<double>& values, double firstX, double incre
     firstX_ = firstX;
     increment_ = increment;
     ++plotSerial_;
+    Note = "";
     noteChange();
 }
 
@@ -70,45 +71,6 @@ void Graph::showCursor(int index, bool visible) {
 
 void Graph::setTrigger(const GraphAnnotation& annotation) {
     trigger_ = annotation;
-    noteChange();
-}
-
-void Graph3D::setRange(int index, double minimum, double maximum) {
-    auto& axis = axes_.at(static_cast<std::size_t>(index - 1));
-    axis.Minimum = minimum;
-    axis.Maximum = maximum;
-    noteChange();
-}
-
-void Graph3D::setFormat(int index, const std::string& format) {
-    axes_.at(static_cast<std::size_t>(index - 1)).Format = format;
-    noteChange();
-}
-
-void Graph3D::setLabelColor(int index, Color color) {
-    axes_.at(static_cast<std::size_t>(index - 1)).LabelColor = color;
-    noteChange();
-}
-
-void Graph3D::clearValueLabels(int index) {
-    valuePairs(index).clear();
-    noteChange();
-}
-
-void Graph3D::removePlot(int position) {
-    if (position < 1 || position > plotCount()) return;
-    plots_.erase(plots_.begin() + (position - 1));
-    noteChange();
-}
-
-void Graph3D::plotCurve(const std::vector<double>& depth, const std::vector<double>& x,
-                        const std::vector<double>& level, const std::vector<double>& colour) {
-    if (plots_.empty()) plots_.emplace_back();
-    GraphCurve3D& curve = plots_.back();
-    curve.depth = depth;
-    curve.x = x;
-    curve.level = level;
-    curve.colour = colour;
     noteChange();
 }
 

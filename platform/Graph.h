@@ -1,9 +1,6 @@
 #pragma once
-// The two-dimensional graph and the three-dimensional graph as data.
+// The two-dimensional graph as data.
 
-#include <array>
-#include <cstddef>
-#include <deque>
 #include <string>
 #include <utility>
 #include <vector>
@@ -61,6 +58,8 @@ class Graph : public Control {
     Property<int> TrackMode{this, 1};
     /// The picture is older than it should be, and says so.
     Property<bool> Old{this, false};
+    /// What the trace is, where it is not the last sweep; the next plot takes it away.
+    Property<std::string> Note{this, ""};
 
     int cursorCount() const { return static_cast<int>(cursors_.size()); }
     /// 1-based as the panel counts them; an index out of range gives a cursor that nobody sees.
@@ -91,64 +90,6 @@ class Graph : public Control {
     unsigned long plotSerial_ = 0;
     std::vector<GraphCursor> cursors_;
     GraphAnnotation trigger_;
-};
-
-/// A curve of the three-dimensional graph, four arrays of one length.
-struct GraphCurve3D {
-    std::vector<double> depth;
-    std::vector<double> x;
-    std::vector<double> level;
-    std::vector<double> colour;  ///< 0 to 100
-    bool lineVisible = true;
-    int fillStyle = 0;
-    int colorMapStyle = 0;
-};
-
-/// A label of an axis: a text at a value.
-struct ValuePair {
-    std::string Name;
-    double Value = 0;
-};
-
-/// Axis 1 is depth or frequency as the waterfall sets it, axis 2 follows the x axis of the
-/// two-dimensional graph, axis 3 its y axis. It always holds at least one plot.
-class Graph3D : public Control {
-  public:
-    Graph3D(Form& form, std::string name)
-        : Control(form, std::move(name), ControlKind::Graph3D), plots_(1) {
-        axes_[2].Minimum = -120;
-        axes_[2].Maximum = -20;
-    }
-
-    const GraphAxis& axis(int index) const { return axes_.at(static_cast<std::size_t>(index - 1)); }
-    void setRange(int index, double minimum, double maximum);
-    void setFormat(int index, const std::string& format);
-    void setLabelColor(int index, Color color);
-
-    std::vector<ValuePair>& valuePairs(int index) {
-        return pairs_.at(static_cast<std::size_t>(index - 1));
-    }
-    void clearValueLabels(int index);
-
-    int plotCount() const { return static_cast<int>(plots_.size()); }
-    std::deque<GraphCurve3D>& plots() { return plots_; }
-    void removePlots() {
-        plots_.clear();
-        noteChange();
-    }
-    void removePlot(int position);  ///< 1-based
-    void addPlot() {
-        plots_.emplace_back();
-        noteChange();
-    }
-    /// Plots a curve into the newest plot.
-    void plotCurve(const std::vector<double>& depth, const std::vector<double>& x,
-                   const std::vector<double>& level, const std::vector<double>& colour);
-
-  private:
-    std::array<GraphAxis, 3> axes_;
-    std::array<std::vector<ValuePair>, 3> pairs_;
-    std::deque<GraphCurve3D> plots_;
 };
 
 }  // namespace zel

@@ -12,6 +12,7 @@
 #include "files/FileOps.h"
 #include "files/RecentFiles.h"
 #include "files/Recording.h"
+#include "files/ViewHeader.h"
 #include "files/ViewReader.h"
 #include "files/ViewWriter.h"
 #include "link/AnswerReader.h"
@@ -30,6 +31,8 @@
 #include "panel/RemoteToggle.h"
 #include "panel/SoftKeys.h"
 #include "panel/SoftPanel.h"
+#include "panel/SpectrogramKeys.h"
+#include "panel/WaterfallKeys.h"
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
 #include "platform/TimerDriver.h"
@@ -47,6 +50,10 @@
 #include "trace/SweepControl.h"
 #include "trace/TraceConversion.h"
 #include "trace/TraceReader.h"
+#include "waterfall/Graph3dOps.h"
+#include "waterfall/PictureOptions.h"
+#include "waterfall/SweepHistory.h"
+#include "waterfall/WaterfallView.h"
 
 namespace zel {
 
@@ -65,6 +72,10 @@ struct Program::Rooms {
           conversion(panel, mirror, forms.waterfall.Graph3D),
           scaling(panel, forms.waterfall, mirror, p.clock),
           graph(panel, mirror),
+          rows(forms.waterfall),
+          waterfall(forms, rows, p.folder),
+          pictureOptions(forms.waterfall),
+          history(forms),
           manualScale(panel, forms.manualScale, p.boxes),
           pace(panel, p.clock),
           traces(forms, mirror, line, exchange, binary, conversion, scaling, pace, p.events,
@@ -78,6 +89,8 @@ struct Program::Rooms {
                     p.events, p.boxes),
           recent(panel, p.settings),
           fileMenu(panel, files, p.folder, p.boxes),
+          spectrogram(panel, history, files, p.boxes),
+          waterfallKeys(forms.waterfall, files, p.boxes),
           softPanel(panel),
           fill(panel, mirror, exchange),
           markerReadout(panel, mirror, exchange),
@@ -108,6 +121,12 @@ struct Program::Rooms {
           second(forms, p.serverSocket, sessionClock),
           end(forms, p.boxes) {
         panel.CommandLine = std::move(commandLine);
+        history.describe = [this] {
+            OutputFile header(files.service(), "", OutputFile::Mode::Output);
+            // What the instrument has on automatic is not asked for with each sweep.
+            ViewHeader{panel, mirror, platform.clock, [](const char*, double&) {}}.write(header);
+            return header.text();
+        };
         timers.attach(panel.UpNow);
         panel.ShowHelp.connect([this](int context) { help.showTopic(context); });
         timers.attach(panel.PaceTimer);
@@ -136,6 +155,10 @@ struct Program::Rooms {
     TraceConversion conversion;
     GraphScaling scaling;
     GraphInteraction graph;
+    Graph3dOps rows;
+    WaterfallView waterfall;
+    PictureOptions pictureOptions;
+    SweepHistory history;
     ManualScale manualScale;
     PaceMonitor pace;
     TraceReader traces;
@@ -147,6 +170,8 @@ struct Program::Rooms {
     Recording recording;
     RecentFiles recent;
     FileMenu fileMenu;
+    SpectrogramKeys spectrogram;
+    WaterfallKeys waterfallKeys;
     SoftPanel softPanel;
     MenuFill fill;
     MarkerReadout markerReadout;
@@ -184,9 +209,12 @@ ZEL3Variables& Program::variables() { return rooms_->mirror; }
 ZELBas& Program::link() { return rooms_->line; }
 CommandExchange& Program::exchange() { return rooms_->exchange; }
 TraceReader& Program::traces() { return rooms_->traces; }
+SweepHistory& Program::history() { return rooms_->history; }
 
 void Program::start() {
     rooms_->recent.load();
+    // Ahead of the first row: loading sets its axes.
+    rooms_->forms.waterfall.load();
     if (!rooms_->startUp.Form_Load(kVersion)) rooms_->end.end();
 }
 

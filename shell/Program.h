@@ -13,6 +13,7 @@
 namespace zel {
 
 class CommandExchange;
+class SweepHistory;
 class TraceReader;
 
 class Program {
@@ -28,6 +29,8 @@ class Program {
     ZELBas& link();
     CommandExchange& exchange();
     TraceReader& traces();
+    /// The sweeps of the last while.
+    SweepHistory& history();
 
     /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
     /// the server's window is closed; `ended` is then true.

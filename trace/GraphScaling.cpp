@@ -32,9 +32,9 @@ constexpr UnitFormat kUnitFormats[] = {
     {8, "k\"V/m\""},
 };
 
-/// The unit in a format: without its first two characters and its last.
+/// The unit in a format: without its first two characters and its last; "%" is one itself.
 std::string formatUnit(const std::string& format) {
-    return format.size() <= 3 ? "" : format.substr(2, format.size() - 3);
+    return format.size() <= 3 ? format : format.substr(2, format.size() - 3);
 }
 
 }  // namespace
@@ -60,9 +60,9 @@ void GraphScaling::setGraphXAxis(double xStart, double xStop) {
     panel_.ViewStop = xStop;
     if (!panel_.GraphZoomed) {
         panel_.CWGraph1.setXRange(xStart, xStop);
-        waterfall_.Graph3D.setRange(2, xStart, xStop);
+        waterfall_.Graph3D.setRange(1, xStart, xStop);
     }
-    waterfall_.Graph3D.setFormat(2, mirror_.Span != 0 ? "k\"Hz\"" : "k\"s\"");
+    waterfall_.Graph3D.setFormat(1, mirror_.Span != 0 ? "k\"Hz\"" : "k\"s\"");
 }
 
 void GraphScaling::setLevelRange(double minimum, double maximum) {
@@ -101,7 +101,9 @@ void GraphScaling::setGraphYAxis(double level, int rangeByte, bool useRangeCode)
     SetYAxisFormat();
     if (!useRangeCode) mirror_.ReferenceRange = perDivision;
     const GraphAxis& axis = graph3D.axis(3);
-    const std::string unitText = formatUnit(axis.Format);
+    // The numbers of volts and watts on a logarithmic range are dBm, whatever the format says.
+    const bool inDbm = logarithmic && (unit == UNITV || unit == UNITW);
+    const std::string unitText = inDbm ? "dBm" : formatUnit(axis.Format);
     waterfall_.lblMin.Caption = generalNumber(axis.Minimum) + " " + unitText;
     waterfall_.lblMAX.Caption = generalNumber(axis.Maximum) + " " + unitText;
 }
@@ -126,7 +128,16 @@ void GraphScaling::DisplayDataOnGraph(double xStart, double xStop, double interv
                                       : (xStop - xStart) / (pairs * intervals);
     panel_.CWGraph1.plotY(data, first, increment);
     if (autoPeak || zeroSpan) BuildXYVectors(increment);
-    waterfall_.Graph3D.plotCurve(panel_.YVector, panel_.XVector, data, panel_.TraceColours);
+    // The full read cycle sizes the vectors ahead of the new range: a row stands at its own x.
+    std::vector<double> xs = panel_.XVector;
+    const bool stale = xs.size() < data.size() || xs.empty() || xs.front() != first;
+    if (stale || std::fabs(xs.back() - xs.front() -
+                           increment * static_cast<double>(xs.size() - 1)) > increment / 2) {
+        xs.resize(data.size());
+        for (std::size_t i = 0; i < xs.size(); ++i)
+            xs[i] = first + static_cast<double>(i) * increment;
+    }
+    waterfall_.Graph3D.plotCurve(panel_.YVector, xs, data, panel_.TraceColours);
 }
 
 void GraphScaling::SetAnnotation(double percent) {

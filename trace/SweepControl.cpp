@@ -8,8 +8,7 @@ namespace {
 using CF = ControllerForm;
 
 constexpr int kPowerBox = 0;
-constexpr int kPassFillStyle = 3;
-constexpr std::int16_t kLastRow = 32767;
+constexpr std::int32_t kLastRow = 2147483647;
 
 /// Says that an acquisition is under way for as long as it lives.
 class Running {
@@ -82,6 +81,9 @@ void SweepControl::RunContinuousView() {
     panel_.StopButton.Visible = true;
     SetStopFlag(true);
     panel_.ContinuosLoopActive = true;
+    // Rows of an earlier view stay, this one goes on behind the last of them.
+    const GraphCurve3D* last = forms_.waterfall.Graph3D.lastRow();
+    if (last != nullptr && last->depth.front() >= panel_.YVectorVal) countRow();
     bool good = firstPass();
     while (good && panel_.STOPFlag) {
         forms_.waterfall.styleLastRow();
@@ -93,6 +95,7 @@ void SweepControl::RunContinuousView() {
     if (good) {
         panel_.Connection.Enabled = true;
         panel_.Utility.Enabled = true;
+        forms_.waterfall.styleLastRow();
     }
     panel_.RecordData.Visible = true;
     panel_.ContinuosLoopActive = false;
@@ -125,11 +128,12 @@ bool SweepControl::laterPass() {
 }
 
 void SweepControl::nextRow() {
-    if (!forms_.waterfall.Graph3D.plots().empty()) {
-        GraphCurve3D& newest = forms_.waterfall.Graph3D.plots().back();
-        newest.lineVisible = false;
-        newest.fillStyle = kPassFillStyle;
-    }
+    if (!forms_.waterfall.Graph3D.plots().empty())
+        forms_.waterfall.Graph3D.plots().back().lineVisible = false;
+    countRow();
+}
+
+void SweepControl::countRow() {
     if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
 }
 

@@ -25,6 +25,7 @@ class SweepControl {
     void RunContinuousView();
     /// The newest plot of the waterfall is done, and the next trace has a row of its own.
     void nextRow();
+    void countRow();
     void SetStopFlag(bool value) { panel_.STOPFlag = value; }
 
   private:

@@ -172,6 +172,8 @@ void TraceReader::waterfallRow() {
     if (!timed && !checked) {
         forms_.waterfall.Graph3D.removePlots();
         forms_.waterfall.Graph3D.addPlot();
+        // The axis of rows that are gone would not show this one.
+        scaling_.addWaterfallRowLimit();
     } else if (checked && !timed) {
         forms_.waterfall.styleLastRow();
     }
@@ -205,7 +207,7 @@ void TraceReader::ReadSingleTrace(bool& success) {
     viewRange();
     if (!panel_.ContinuosLoopActive) {
         forms_.waterfall.resetRowCount();
-        forms_.waterfall.Graph3D.clearValueLabels(1);
+        forms_.waterfall.Graph3D.clearValueLabels(2);
     }
     scaleAndConvert();
     waterfallRow();

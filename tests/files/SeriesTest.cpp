@@ -44,13 +44,29 @@ TEST_F(SeriesTest, EveryTrace_IsShown) {
     EXPECT_EQ(panel.YVectorVal, 5);
 }
 
+TEST_F(SeriesTest, EachTrace_BearsItsOwnTime) {
+    Texts stamps;
+    forms.waterfall.stampRow.connect([&](const std::string& text) { stamps.push_back(text); });
+    std::string text = record(3);
+    std::size_t at = 0;
+    for (const char* time : {"10:00:01", "10:00:02", "10:00:03"}) {
+        at = text.find("\nTime;", at) + 6;
+        text.replace(at, 8, time);
+    }
+    load(text);
+    ASSERT_EQ(stamps.size(), 3U);
+    EXPECT_EQ(stamps[0].substr(0, 9), "10:00:01 ");
+    EXPECT_EQ(stamps[1].substr(0, 9), "10:00:02 ");
+    EXPECT_EQ(stamps[2].substr(0, 9), "10:00:03 ");
+}
+
 TEST_F(SeriesTest, EachTraceIsStyledAndStamped) {
     int styled = 0;
     int stamped = 0;
     forms.waterfall.styleLastRow.connect([&] { ++styled; });
     forms.waterfall.stampRow.connect([&](const std::string&) { ++stamped; });
     load(record(3));
-    EXPECT_EQ(styled, 3);
+    EXPECT_EQ(styled, 4);  // ahead of each, and the last one at the end
     EXPECT_EQ(stamped, 3);
 }
 

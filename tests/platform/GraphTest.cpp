@@ -8,7 +8,6 @@ namespace {
 struct GraphTest : ::testing::Test {
     Form form{"TestForm"};
     Graph graph{form, "graph"};
-    Graph3D graph3D{form, "graph3D"};
     int changes = 0;
 
     GraphTest() {
@@ -69,29 +68,6 @@ TEST_F(GraphTest, RemoveCursors_LeavesNone) {
     graph.addCursor({});
     graph.removeCursors();
     EXPECT_EQ(graph.cursorCount(), 0);
-}
-
-TEST_F(GraphTest, Graph3D_PlotCurve_GoesIntoTheNewestPlot) {
-    graph3D.addPlot();
-    graph3D.plotCurve({1}, {2}, {3}, {4});
-    EXPECT_EQ(graph3D.plotCount(), 2);
-    EXPECT_TRUE(graph3D.plots()[0].x.empty());
-    EXPECT_EQ(graph3D.plots()[1].x, std::vector<double>{2});
-}
-
-TEST_F(GraphTest, Graph3D_RemovePlot_CountsFromOne) {
-    graph3D.plotCurve({1}, {1}, {1}, {1});
-    graph3D.addPlot();
-    graph3D.removePlot(1);
-    graph3D.removePlot(5);
-    EXPECT_EQ(graph3D.plotCount(), 1);
-    EXPECT_TRUE(graph3D.plots()[0].x.empty());
-}
-
-TEST_F(GraphTest, Graph3D_PlotCurveBehindRemovePlots_HasAPlotToGoTo) {
-    graph3D.removePlots();
-    graph3D.plotCurve({1}, {1}, {1}, {1});
-    EXPECT_EQ(graph3D.plotCount(), 1);
 }
 
 }  // namespace

@@ -62,8 +62,8 @@ TEST_F(GraphScalingTest, SetGraphXAxis_ScalesBothGraphsAndStoresTheView) {
     EXPECT_EQ(panel.ViewStop, 2e9);
     EXPECT_EQ(graph.xAxis().Minimum, 1e9);
     EXPECT_EQ(graph.xAxis().Maximum, 2e9);
-    EXPECT_EQ(graph3D.axis(2).Minimum, 1e9);
-    EXPECT_EQ(graph3D.axis(2).Maximum, 2e9);
+    EXPECT_EQ(graph3D.axis(1).Minimum, 1e9);
+    EXPECT_EQ(graph3D.axis(1).Maximum, 2e9);
 }
 
 TEST_F(GraphScalingTest, SetGraphXAxis_WhileZoomed_LeavesTheAxesAlone) {
@@ -72,17 +72,17 @@ TEST_F(GraphScalingTest, SetGraphXAxis_WhileZoomed_LeavesTheAxesAlone) {
     mirror.Span = 0;
     scaling.setGraphXAxis(0, 0.02);
     EXPECT_EQ(graph.xAxis().Maximum, 2e9);
-    EXPECT_EQ(graph3D.axis(2).Maximum, 2e9);
+    EXPECT_EQ(graph3D.axis(1).Maximum, 2e9);
     EXPECT_EQ(panel.ViewStop, 0.02);
-    EXPECT_EQ(graph3D.axis(2).Format, "k\"s\"");
+    EXPECT_EQ(graph3D.axis(1).Format, "k\"s\"");
 }
 
 TEST_F(GraphScalingTest, SetGraphXAxis_FormatIsHertzUnlessTheSpanIsZero) {
     scaling.setGraphXAxis(0, 1);
-    EXPECT_EQ(graph3D.axis(2).Format, "k\"Hz\"");
+    EXPECT_EQ(graph3D.axis(1).Format, "k\"Hz\"");
     mirror.Span = 0;
     scaling.setGraphXAxis(0, 1);
-    EXPECT_EQ(graph3D.axis(2).Format, "k\"s\"");
+    EXPECT_EQ(graph3D.axis(1).Format, "k\"s\"");
 }
 
 struct RangeRow {
@@ -222,7 +222,8 @@ INSTANTIATE_TEST_SUITE_P(Units, UnitFormat,
                                            FormatRow{UNITDBUVM, "k\"dBuV/m\"", "dBuV/m"},
                                            FormatRow{UNITDBUAM, "k\"dBuA/m\"", "dBuA/m"},
                                            FormatRow{UNITDB, "k\"dB\"", "dB"},
-                                           FormatRow{UNITV, "%", ""}, FormatRow{UNITW, "%", ""},
+                                           FormatRow{UNITV, "%", "dBm"},
+                                           FormatRow{UNITW, "%", "dBm"},
                                            FormatRow{8, "k\"V/m\"", "V/m"}));
 
 TEST_F(GraphScalingTest, SetYAxisFormat_UnknownUnit_LeavesTheFormat) {
@@ -232,11 +233,11 @@ TEST_F(GraphScalingTest, SetYAxisFormat_UnknownUnit_LeavesTheFormat) {
     EXPECT_EQ(graph3D.axis(3).Format, "k\"dB\"");
 }
 
-TEST_F(GraphScalingTest, SetGraphYAxis_LinearRange_WritesTheBoundsWithoutAUnit) {
+TEST_F(GraphScalingTest, SetGraphYAxis_LinearRange_WritesTheBoundsInPercent) {
     mirror.ReferenceRange = RANGELIN;
     scaling.setGraphYAxis(-20, RANGELIN, true);
-    EXPECT_EQ(waterfall.lblMin.Caption.get(), "0 ");
-    EXPECT_EQ(waterfall.lblMAX.Caption.get(), "100 ");
+    EXPECT_EQ(waterfall.lblMin.Caption.get(), "0 %");
+    EXPECT_EQ(waterfall.lblMAX.Caption.get(), "100 %");
 }
 
 TEST_F(GraphScalingTest, SetGraphAxes_CallsTheWaterfallInItsOrder) {

@@ -326,7 +326,7 @@ struct WaterfallCycleTest : ReadCycle {
         forms.waterfall.resetRowCount.connect([this] { ++resets; });
         forms.waterfall.styleLastRow.connect([this] { ++styled; });
         forms.waterfall.Graph3D.addPlot();
-        forms.waterfall.Graph3D.valuePairs(1).push_back({"12:00:00", 1});
+        forms.waterfall.Graph3D.setValuePair(2, 1, {"12:00:00", 1});
         askSettings();
         cmd("WAIT");
         trace(levelBlock(-35250));
@@ -336,7 +336,8 @@ struct WaterfallCycleTest : ReadCycle {
 TEST_F(WaterfallCycleTest, SingleTrace_StandsAlone) {
     EXPECT_TRUE(readFull());
     EXPECT_EQ(forms.waterfall.Graph3D.plotCount(), 1);
-    EXPECT_TRUE(forms.waterfall.Graph3D.valuePairs(1).empty());
+    EXPECT_EQ(forms.waterfall.Graph3D.valuePairs(2).count(), 1);
+    EXPECT_NE(forms.waterfall.Graph3D.valuePairs(2).item(1).Name, "12:00:00");
     EXPECT_EQ(resets, 1);
     EXPECT_EQ(styled, 0);
 }
@@ -360,7 +361,7 @@ TEST_F(WaterfallCycleTest, PassOfTheContinuousView_KeepsPlotsAndRows) {
     panel.ContinuosLoopActive = true;
     EXPECT_TRUE(readFull());
     EXPECT_EQ(forms.waterfall.Graph3D.plotCount(), 2);
-    EXPECT_EQ(forms.waterfall.Graph3D.valuePairs(1).size(), 1U);
+    EXPECT_EQ(forms.waterfall.Graph3D.valuePairs(2).count(), 1);
     EXPECT_EQ(resets, 0);
     EXPECT_EQ(styled, 0);
 }

@@ -125,14 +125,14 @@ TEST_F(SweepControlTest, Continuous_WhileItRuns_LocksTheMenusAndShowsStop) {
     EXPECT_TRUE(locked);
 }
 
-TEST_F(SweepControlTest, Stop_DuringTheFirstPass_EndsAheadOfTheWaterfallsRow) {
+TEST_F(SweepControlTest, Stop_DuringTheFirstPass_StylesItsRowAtTheEndOnly) {
     int styled = 0;
     forms.waterfall.styleLastRow.connect([&] { ++styled; });
     fullCycle();
     stopAtPlot(1);
     panel.PlayContinuousButton.Click();
     expectPlayed();
-    EXPECT_EQ(styled, 0);
+    EXPECT_EQ(styled, 1);
     expectIdle();
 }
 
@@ -143,9 +143,28 @@ TEST_F(SweepControlTest, LaterPass_StylesTheNewestPlotAndTheLastRow) {
     selectiveCycle();
     stopAtPlot(2);
     panel.PlayContinuousButton.Click();
-    EXPECT_EQ(styled, 1);
-    EXPECT_FALSE(forms.waterfall.Graph3D.plots().back().lineVisible);
-    EXPECT_EQ(forms.waterfall.Graph3D.plots().back().fillStyle, 3);
+    EXPECT_EQ(styled, 2);  // ahead of the later pass, and at the end of the view
+    EXPECT_FALSE(forms.waterfall.Graph3D.plots().front().lineVisible);
+    EXPECT_EQ(forms.waterfall.Graph3D.plots().front().fillStyle, 2);
+}
+
+TEST_F(SweepControlTest, SecondView_GoesOnBehindTheLastRow) {
+    panel.YVectorVal = 4;
+    forms.waterfall.Graph3D.plotCurve({4, 4}, {1, 2}, {-50, -40}, {0, 100});
+    fullCycle();
+    stopAtPlot(1);
+    panel.PlayContinuousButton.Click();
+    EXPECT_EQ(panel.YVectorVal, 5);
+    EXPECT_EQ(forms.waterfall.Graph3D.plots().back().depth.front(), 5);
+}
+
+TEST_F(SweepControlTest, ViewBehindALoadedSeries_LeavesNoGap) {
+    panel.YVectorVal = 4;  // raised for the next row already
+    forms.waterfall.Graph3D.plotCurve({3, 3}, {1, 2}, {-50, -40}, {0, 100});
+    fullCycle();
+    stopAtPlot(1);
+    panel.PlayContinuousButton.Click();
+    EXPECT_EQ(forms.waterfall.Graph3D.plots().back().depth.front(), 4);
 }
 
 TEST_F(SweepControlTest, FailedFirstPass_LeavesStopAsTheWayBack) {

@@ -1,0 +1,51 @@
+#include "panel/SpectrogramKeys.h"
+
+#include "files/OutputFile.h"
+
+namespace zel {
+
+SpectrogramKeys::SpectrogramKeys(ControllerForm& panel, const SweepHistory& history, FileOps& files,
+                                 MessageBoxes& boxes)
+    : panel_(panel), history_(history), files_(files), boxes_(boxes) {
+    panel_.SpectrogramShow.Clicked.connect([this] { SpectrogramShow_Click(); });
+    panel_.SpectrogramPause.Clicked.connect([this] { SpectrogramPause_Click(); });
+    panel_.SpectrogramSave.Clicked.connect([this] { SpectrogramSave_Click(); });
+    panel_.SpectrogramRow.connect([this](int back) { showRow(back); });
+    panel_.SpectrogramPicture.Visible = false;
+    panel_.SpectrogramPause.Enabled = false;
+}
+
+void SpectrogramKeys::SpectrogramShow_Click() {
+    const bool shown = !panel_.SpectrogramPicture.Visible;
+    panel_.SpectrogramPicture.Visible = shown;
+    panel_.SpectrogramShow.Checked = shown;
+    panel_.SpectrogramPause.Enabled = shown;
+    panel_.SpectrogramPause.Checked = false;
+}
+
+void SpectrogramKeys::SpectrogramPause_Click() {
+    panel_.SpectrogramPause.Checked = !panel_.SpectrogramPause.Checked;
+}
+
+void SpectrogramKeys::SpectrogramSave_Click() {
+    const std::string text = history_.recording();
+    if (text.empty()) {
+        boxes_.show({BoxIcon::Information, "There are no sweeps to save."});
+        return;
+    }
+    const std::string path = files_.ShowSaveDataDialog(FileOps::kCsvFilter);
+    if (path.empty()) return;
+    OutputFile file(files_.service(), path, OutputFile::Mode::Output);
+    file.text() = text;
+    const std::string problem = file.close();
+    if (!problem.empty()) boxes_.show({BoxIcon::Critical, problem});
+}
+
+void SpectrogramKeys::showRow(int back) {
+    if (back < 0 || back >= history_.count()) return;
+    const HistoryRow& row = history_.row(back);
+    panel_.CWGraph1.plotY(row.levels(), row.firstX, row.increment);
+    panel_.CWGraph1.Note = "SWEEP OF " + row.time;
+}
+
+}  // namespace zel
