@@ -3,16 +3,20 @@
 #include <QApplication>
 #include <QCoreApplication>
 #include <QLoggingCategory>
+#include <algorithm>
 
 #include "ZELSim/InProcessPort.h"
 #include "console/Address.h"
 #include "desktop/graph/GraphImage.h"
+#include "desktop/graph/SpectrogramPicture.h"
+#include "desktop/graph/WaterfallImage.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtPlatform.h"
 #include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/ScriptedSocket.h"
 #include "platform/virtual/VirtualTime.h"
 #include "trace/ViewAnnotations.h"
+#include "waterfall/PictureOptions.h"
 
 namespace zel {
 namespace {
@@ -113,6 +117,32 @@ std::string drawGraphImage(Program& program, const std::string& file) {
 std::string writeGraphImage(Program& program, const std::string& file) {
     const std::string problem = drawGraphImage(program, file);
     return problem.empty() ? std::string() : "the image could not be written: " + problem;
+}
+
+std::string drawWaterfallImage(Program& program, const std::string& file) {
+    QString problem;
+    const WaterfallForm& form = program.forms().waterfall;
+    saveWaterfallImage(form, pictureStyle(form), QString::fromStdString(file), &problem);
+    return problem.toStdString();
+}
+
+std::string writeRowsImage(Program& program, const std::string& file, bool spectrogram) {
+    WaterfallForm& form = program.forms().waterfall;
+    QString problem;
+    if (spectrogram) {
+        saveSpectrogramImage(form, program.history(), QString::fromStdString(file), &problem);
+    } else {
+        // The design's view, whatever the user's own was, with the rows that there are.
+        form.ViewWaterfall.Click();
+        PictureStyle style;
+        style.view = GraphView3D();
+        int rows = 0;
+        for (const GraphCurve3D& plot : form.Graph3D.plots()) rows += plot.level.empty() ? 0 : 1;
+        style.depthRows = std::max(rows, 1);
+        saveWaterfallImage(form, style, QString::fromStdString(file), &problem);
+    }
+    return problem.isEmpty() ? std::string()
+                             : "the image could not be written: " + problem.toStdString();
 }
 
 }  // namespace zel

@@ -40,5 +40,9 @@ std::unique_ptr<Front> makePortFront(const std::string& home);
 std::string drawGraphImage(Program& program, const std::string& file);
 /// The same, in words that stand alone.
 std::string writeGraphImage(Program& program, const std::string& file);
+/// Draws the waterfall as its window shows it; what went wrong, else an empty text.
+std::string drawWaterfallImage(Program& program, const std::string& file);
+/// Draws all its rows, in depth or from above, in words that stand alone.
+std::string writeRowsImage(Program& program, const std::string& file, bool spectrogram);
 
 }  // namespace zel

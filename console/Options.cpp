@@ -20,6 +20,7 @@ constexpr const char* kAddresses =
 constexpr double kShortestInterval = 0.001;
 constexpr double kLongestInterval = 2'000'000;
 constexpr const char* kImageEndings[] = {".wmf", ".svg", ".png", ".pdf"};
+constexpr const char* kRowsEndings[] = {".svg", ".png", ".pdf"};
 
 /// A keyword goes over the wire as a line of its own, so it may hold no line end.
 std::string keywordProblem(const std::string& keyword) {
@@ -38,13 +39,20 @@ std::string settingProblem(const std::string& setting) {
     return keyword.empty() ? wireProblem(setting) : keyword;
 }
 
-std::string imageProblem(const std::string& file) {
+template <std::size_t N>
+bool endsIn(const std::string& file, const char* const (&endings)[N]) {
     const std::string name = lowerCase(file);
-    for (const std::string ending : kImageEndings) {
-        const bool longer = name.size() > ending.size();
-        if (longer && name.substr(name.size() - ending.size()) == ending) return {};
-    }
-    return "takes a file that ends in .wmf, .svg, .png or .pdf";
+    return std::any_of(std::begin(endings), std::end(endings), [&name](const std::string ending) {
+        return name.size() > ending.size() && name.substr(name.size() - ending.size()) == ending;
+    });
+}
+
+std::string imageProblem(const std::string& file) {
+    return endsIn(file, kImageEndings) ? "" : "takes a file that ends in .wmf, .svg, .png or .pdf";
+}
+
+std::string rowsProblem(const std::string& file) {
+    return endsIn(file, kRowsEndings) ? "" : "takes a file that ends in .svg, .png or .pdf";
 }
 
 struct Parser {
@@ -78,6 +86,7 @@ struct Parser {
             ->check(CLI::Range(1, kMostSweeps));
         outputOption(sweep, options, "Saves the view as the panel does");
         imageOption(sweep, options);
+        rowsOptions(sweep, options);
         CLI::App* record = verb(Verb::Record, "record", "Records traces by a timer");
         numberOption(*record, "--interval", options.interval, kShortestInterval, kLongestInterval,
                      "Seconds from trace to trace")
@@ -89,6 +98,7 @@ struct Parser {
         CLI::App* show = verb(Verb::Show, "show", "Loads a saved view and prints its rows");
         show->add_option("FILE", options.argument, "Saved view, recording or log")->required();
         imageOption(show, options);
+        rowsOptions(show, options);
         CLI::App* panel =
             verb(Verb::Panel, "panel", "Works the panel by the names of its controls");
         panel->add_option("FILE", options.argument, "Lines of commands; standard input without it");
@@ -103,6 +113,17 @@ struct Parser {
                          "Draws the graph into a file: wmf, svg, png or pdf by its ending")
             ->type_name("FILE")
             ->check(imageProblem, "");
+    }
+
+    static void rowsOptions(CLI::App* verb, Options& options) {
+        verb->add_option("--waterfall", options.waterfall,
+                         "Draws the rows in depth into a file: svg, png or pdf by its ending")
+            ->type_name("FILE")
+            ->check(rowsProblem, "");
+        verb->add_option("--spectrogram", options.spectrogram,
+                         "Draws the rows from above into a file: svg, png or pdf by its ending")
+            ->type_name("FILE")
+            ->check(rowsProblem, "");
     }
 
     CLI::App* verb(Verb which, const std::string& name, const std::string& what) {

@@ -17,11 +17,13 @@ struct Options {
     std::string words;  ///< the program's command line
     bool verbose = false;
     Verb verb = Verb::Info;
-    std::string argument;  ///< keyword of get, set, cmd; file of show and panel
-    int count = 1;         ///< sweeps, traces
-    double interval = 0;   ///< of a recording, s
-    std::string output;    ///< file of the saved view or the recording; empty for none
-    std::string image;     ///< file of the graph's picture; empty for none
+    std::string argument;     ///< keyword of get, set, cmd; file of show and panel
+    int count = 1;            ///< sweeps, traces
+    double interval = 0;      ///< of a recording, s
+    std::string output;       ///< file of the saved view or the recording; empty for none
+    std::string image;        ///< file of the graph's picture; empty for none
+    std::string waterfall;    ///< file of the rows in depth; empty for none
+    std::string spectrogram;  ///< file of the rows from above; empty for none
 };
 
 /// Fills the options. An exit status when the run is over with that: 0 behind a help text on

@@ -4,6 +4,8 @@
 #include <utility>
 
 #include "console/ControlAccess.h"
+#include "console/Graph3DCommands.h"
+#include "console/Graph3DText.h"
 #include "console/GraphText.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
@@ -39,7 +41,7 @@ const PanelSession::CommandRow PanelSession::kCommands[] = {
     {"set", &PanelSession::set},         {"show", &PanelSession::show},
     {"connect", &PanelSession::connect}, {"disconnect", &PanelSession::disconnect},
     {"answer", &PanelSession::answer},   {"pump", &PanelSession::pump},
-    {"quit", &PanelSession::quit},
+    {"image3d", &PanelSession::image3d}, {"quit", &PanelSession::quit},
 };
 
 PanelSession::PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address)
@@ -123,6 +125,11 @@ void PanelSession::execute(std::string_view line) {
     line.remove_prefix(std::min(line.find_first_not_of(kBlanks), line.size()));
     if (line.empty() || line.front() == '#') return;
     const auto [word, rest] = firstWord(line);
+    std::string problem;
+    if (runGraph3DCommand(program_.forms().waterfall.Graph3D, word, rest, problem)) {
+        if (!problem.empty()) complain(problem);
+        return;
+    }
     for (const CommandRow& row : kCommands) {
         if (row.word != word) continue;
         live_.beginCommand();
@@ -203,12 +210,27 @@ void PanelSession::show(std::string_view rest) {
             m_.output.line(line);
         return;
     }
+    if (path == "graph3d") {
+        for (const std::string& line : graph3DLines(program_.forms().waterfall.Graph3D))
+            m_.output.line(line);
+        return;
+    }
     const std::optional<std::string> text = textOf(program_.forms(), program_.variables(), path);
     if (text) {
         m_.output.line(*text);
     } else {
         complain("there is nothing to show as \"" + path + "\"");
     }
+}
+
+void PanelSession::image3d(std::string_view rest) {
+    const std::string file = trimmed(rest);
+    if (file.empty()) return complain("image3d takes FILE");
+    std::string problem = "pictures cannot be drawn here";
+    program_.forms().waterfall.DrawImage(file, problem);
+    if (problem.empty()) return;
+    m_.errors.line("zelctl: line " + std::to_string(line_) + ": " + problem);
+    if (status_ == kDone) status_ = kLinkFailed;
 }
 
 void PanelSession::connect(std::string_view) {

@@ -67,6 +67,7 @@ class PanelSession {
     void disconnect(std::string_view rest);
     void answer(std::string_view rest);
     void pump(std::string_view rest);
+    void image3d(std::string_view rest);
     void quit(std::string_view rest);
 
     Control* find(std::string_view name);

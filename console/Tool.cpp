@@ -29,6 +29,10 @@ struct Stage {
             [this](const std::string& file, std::string& problem) {
                 problem = drawGraphImage(program, file);
             });
+        program.forms().waterfall.DrawImage.connect(
+            [this](const std::string& file, std::string& problem) {
+                problem = drawWaterfallImage(program, file);
+            });
         watch.onExchange = [&boxOutput] { boxOutput.settle(); };
         if (!options.verbose) return;
         const Clock& clock = front.clock();
@@ -91,7 +95,7 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
     if (streams.errorsAreTerminal)
         progress = [&streams](int done, int wanted) { drawBar(streams.errors, done, wanted); };
     return runVerb(options, {stage.program, stage.events, stage.answers, stage.boxes, output,
-                             errors, writeGraphImage, progress});
+                             errors, writeGraphImage, writeRowsImage, progress});
 }
 
 }  // namespace

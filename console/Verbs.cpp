@@ -23,12 +23,17 @@ struct Run {
         stage.errors.line("zelctl: " + what);
         return kLinkFailed;
     }
-    /// Draws the picture that was asked for, if one was.
+    /// Draws the pictures that were asked for.
     int drawImage() const {
-        if (options.image.empty()) return kDone;
-        const std::string problem = stage.image(program(), options.image);
+        std::string problem;
+        if (!options.image.empty()) problem = stage.image(program(), options.image);
+        if (problem.empty() && !options.waterfall.empty())
+            problem = stage.rows(program(), options.waterfall, false);
+        if (problem.empty() && !options.spectrogram.empty())
+            problem = stage.rows(program(), options.spectrogram, true);
         return problem.empty() ? kDone : fail(problem);
     }
+    bool wantsRows() const { return !options.waterfall.empty() || !options.spectrogram.empty(); }
 };
 
 int info(const Run& run) {
@@ -71,10 +76,16 @@ int cmd(const Run& run) {
 }
 
 int sweep(const Run& run) {
-    const ControllerForm& panel = run.panel();
+    ControllerForm& panel = run.panel();
+    WaterfallForm& waterfall = run.program().forms().waterfall;
     for (int i = 0; i < run.options.count && run.output().problem().empty(); ++i) {
         bool success = false;
+        // As passes of one view the sweeps stand behind each other in the waterfall.
+        panel.ContinuosLoopActive = run.wantsRows();
+        panel.YVectorVal = i;
         run.program().traces().ReadSingleTrace(success);
+        panel.ContinuosLoopActive = false;
+        if (run.wantsRows()) waterfall.styleLastRow();
         if (!success) return run.fail("sweep " + std::to_string(i + 1) + " could not be read");
         const bool autoPeak = run.program().variables().TraceDetector == 0;
         run.output().line(i == 0 ? sweepHeader(autoPeak) : std::string());

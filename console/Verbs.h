@@ -15,6 +15,9 @@ namespace zel {
 /// Draws the panel's graph into a file; what went wrong, else an empty text.
 using ImageWriter = std::function<std::string(Program&, const std::string& file)>;
 
+/// Draws the rows of the waterfall, in depth or as a spectrogram.
+using RowsWriter = std::function<std::string(Program&, const std::string& file, bool spectrogram)>;
+
 /// Shows how far a recording has come: traces taken, traces wanted.
 using ProgressBar = std::function<void(int done, int wanted)>;
 
@@ -26,6 +29,7 @@ struct VerbStage {
     LineOutput& output;
     LineOutput& errors;
     ImageWriter image;
+    RowsWriter rows;
     ProgressBar progress;  ///< may be empty
 };
 

@@ -19,7 +19,8 @@ int main(int argc, char** argv) {
         return std::cout.flush() ? *status : zel::kLinkFailed;
     try {
         // In a session each menu can be used, that of the picture too.
-        const bool pictures = !options.image.empty() || options.verb == zel::Verb::Panel;
+        const bool pictures = !options.image.empty() || !options.waterfall.empty() ||
+                              !options.spectrogram.empty() || options.verb == zel::Verb::Panel;
         const zel::ToolkitSession toolkit(argc, argv, pictures);
         const bool simulated = options.address && options.address->simulated;
         const auto front =

@@ -174,7 +174,9 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
         items.point->setPen(QPen(color, 2));
         items.point->position->setCoords(cursor.X, cursor.Y);
     }
-    old_->setVisible(graph.Old);
+    const std::string& note = graph.Note;
+    old_->setText(note.empty() ? "OLD TRACE" : text(note));
+    old_->setVisible(graph.Old || !note.empty());
     QColor ink = colors_.trace;
     if (graph.Old) ink = ink.darker(200);
     if (trace_->pen().color() != ink) trace_->setPen(QPen(ink, trace_->pen().widthF()));

@@ -20,6 +20,8 @@ class GraphWidget : public QCustomPlot {
     void refresh();
     /// Draws at once.
     void drawNow();
+    /// Where the trace is drawn, in pixels of the widget.
+    QRect plotArea() const { return picture_->axisRect().rect(); }
 
   protected:
     void mousePressEvent(QMouseEvent* event) override;

@@ -1,0 +1,208 @@
+#include "desktop/graph/WaterfallCanvas.h"
+
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QWheelEvent>
+#include <algorithm>
+#include <cmath>
+
+#include "desktop/graph/WaterfallDrawing.h"
+
+namespace zel {
+namespace {
+
+constexpr double kDegreesPerPixel = 0.4;
+constexpr double kKeyPixels = 12;
+constexpr double kZoomStep = 0.9;
+constexpr double kNearestZoom = 0.1;
+constexpr double kFarthestZoom = 100;
+constexpr int kPointerMs = 40;
+constexpr int kWheelEndMs = 250;
+constexpr double kHighestLatitude = 180;
+
+/// The graph's own angles may be any; those that the mouse makes stay within a turn.
+double withinTurn(double degrees) { return std::remainder(degrees, 360.0); }
+
+}  // namespace
+
+WaterfallCanvas::WaterfallCanvas(WaterfallForm& form, QWidget* parent)
+    : QWidget(parent), form_(form) {
+    setFocusPolicy(Qt::StrongFocus);
+    setMouseTracking(true);
+    setMinimumSize(240, 180);
+    setAttribute(Qt::WA_OpaquePaintEvent);
+    pointerRead_.setSingleShot(true);
+    connect(&pointerRead_, &QTimer::timeout, this, [this] { readPointer(); });
+    wheelEnd_.setSingleShot(true);
+    connect(&wheelEnd_, &QTimer::timeout, this, [this] { form_.Graph3D.ZoomEnded(); });
+}
+
+void WaterfallCanvas::refresh() {
+    if (isVisible()) update();
+    setCursor(placesCursors() ? Qt::CrossCursor : Qt::ArrowCursor);
+}
+
+void WaterfallCanvas::setColors(const GraphColors& colors) {
+    colors_ = colors;
+    update();
+}
+
+bool WaterfallCanvas::placesCursors() const {
+    return form_.Graph3D.MouseMode == MouseMode3D::PlaceCursor;
+}
+
+void WaterfallCanvas::paintEvent(QPaintEvent*) {
+    QPainter painter(this);
+    painter.fillRect(rect(), colors_.background);
+    painter.setFont(waterfallFont());
+    const double line = painter.fontMetrics().height();
+    const double dots = devicePixelRatioF();
+    const PictureStyle style = pictureStyle(form_);
+    WaterfallPicture picture = drawWaterfall(form_.Graph3D, style, width(), height(), line);
+    if (dots != 1) {
+        picture.rows = drawWaterfall(form_.Graph3D, style, static_cast<int>(width() * dots),
+                                     static_cast<int>(height() * dots), line)
+                           .rows;
+    }
+    paintWaterfall(painter, rect(), picture, colors_);
+    if (form_.Graph3D.hasRows()) return;
+    painter.setPen(colors_.text);
+    painter.drawText(rect(), Qt::AlignCenter,
+                     "No sweeps yet: start the continuous view\nor load a recording");
+}
+
+void WaterfallCanvas::rotate(double right, double down) {
+    GraphView3D view = form_.Graph3D.view();
+    view.Longitude = withinTurn(view.Longitude - right * kDegreesPerPixel);
+    view.Latitude =
+        std::clamp(withinTurn(view.Latitude) - down * kDegreesPerPixel, 0.0, kHighestLatitude);
+    form_.Graph3D.setView(view);
+}
+
+void WaterfallCanvas::move(double right, double down) {
+    GraphView3D view = form_.Graph3D.view();
+    const Camera camera(view, form_.Graph3D.Projection == Projection3D::Perspective, width(),
+                        height());
+    const double x = -right / camera.scale();
+    const double y = down / camera.scale();
+    const auto along = [&camera](const BoxPoint& way) { return camera.step(way); };
+    // The picture's own right and up, in the box.
+    const SeenPoint ways[] = {along({1, 0, 0}), along({0, 1, 0}), along({0, 0, 1})};
+    view.TransX += ways[0].right * x + ways[0].up * y;
+    view.TransY += ways[1].right * x + ways[1].up * y;
+    view.TransZ += ways[2].right * x + ways[2].up * y;
+    form_.Graph3D.setView(view);
+}
+
+void WaterfallCanvas::zoom(double factor) {
+    GraphView3D view = form_.Graph3D.view();
+    view.Distance =
+        std::clamp(std::max(view.Distance, kNearestZoom) * factor, kNearestZoom, kFarthestZoom);
+    form_.Graph3D.setView(view);
+}
+
+void WaterfallCanvas::mousePressEvent(QMouseEvent* event) {
+    setFocus(Qt::MouseFocusReason);
+    last_ = event->position();
+    moved_ = false;
+    if (placesCursors() && event->button() == Qt::LeftButton) {
+        const auto hit =
+            pointAt(form_.Graph3D, pictureStyle(form_), width(), height(), {last_.x(), last_.y()});
+        if (!hit) return;
+        form_.Graph3D.CursorPlaced(hit->plot + 1, hit->sample + 1);
+        form_.Graph3D.Clicked();
+        return;
+    }
+    if (event->button() == Qt::RightButton || (event->modifiers() & Qt::ShiftModifier) != 0) {
+        drag_ = Drag::Move;
+    } else if (event->button() == Qt::LeftButton) {
+        drag_ = Drag::Rotate;
+    }
+}
+
+void WaterfallCanvas::mouseMoveEvent(QMouseEvent* event) {
+    const QPointF way = event->position() - last_;
+    pointer_ = event->position();
+    if (drag_ == Drag::None) {
+        if (!pointerRead_.isActive()) pointerRead_.start(kPointerMs);
+        return;
+    }
+    last_ = event->position();
+    moved_ = true;
+    if (drag_ == Drag::Rotate) {
+        rotate(way.x(), way.y());
+    } else {
+        move(way.x(), way.y());
+    }
+}
+
+void WaterfallCanvas::mouseReleaseEvent(QMouseEvent*) {
+    const Drag ended = drag_;
+    drag_ = Drag::None;
+    if (!moved_) return;
+    if (ended == Drag::Rotate) form_.Graph3D.RotationEnded();
+    if (ended == Drag::Move) form_.Graph3D.TranslationEnded();
+}
+
+void WaterfallCanvas::mouseDoubleClickEvent(QMouseEvent*) {
+    if (!placesCursors()) form_.ViewReset.Click();
+}
+
+void WaterfallCanvas::wheelEvent(QWheelEvent* event) {
+    zoom(std::pow(kZoomStep, event->angleDelta().y() / 120.0));
+    wheelEnd_.start(kWheelEndMs);
+    event->accept();
+}
+
+void WaterfallCanvas::keyPressEvent(QKeyEvent* event) {
+    struct Way {
+        int key;
+        double right;
+        double down;
+    };
+    constexpr Way kWays[] = {{Qt::Key_Left, -kKeyPixels, 0},
+                             {Qt::Key_Right, kKeyPixels, 0},
+                             {Qt::Key_Up, 0, -kKeyPixels},
+                             {Qt::Key_Down, 0, kKeyPixels}};
+    for (const Way& way : kWays) {
+        if (event->key() != way.key) continue;
+        if ((event->modifiers() & Qt::ShiftModifier) != 0) {
+            move(way.right, way.down);
+            form_.Graph3D.TranslationEnded();
+        } else {
+            rotate(way.right, way.down);
+            form_.Graph3D.RotationEnded();
+        }
+        return;
+    }
+    switch (event->key()) {
+        case Qt::Key_Plus:
+        case Qt::Key_Equal:
+            zoom(kZoomStep);
+            form_.Graph3D.ZoomEnded();
+            return;
+        case Qt::Key_Minus:
+            zoom(1 / kZoomStep);
+            form_.Graph3D.ZoomEnded();
+            return;
+        case Qt::Key_Home:
+            form_.ViewReset.Click();
+            return;
+        default:
+            QWidget::keyPressEvent(event);
+    }
+}
+
+void WaterfallCanvas::leaveEvent(QEvent*) {
+    pointerRead_.stop();
+    form_.lblPointer.Caption = "";
+}
+
+void WaterfallCanvas::readPointer() {
+    const auto hit = pointAt(form_.Graph3D, pictureStyle(form_), width(), height(),
+                             {pointer_.x(), pointer_.y()});
+    form_.lblPointer.Caption = hit ? sampleText(form_.Graph3D, *hit) : "";
+}
+
+}  // namespace zel

@@ -1,0 +1,52 @@
+#pragma once
+// The three-dimensional graph on the screen: drawing, mouse and keyboard.
+
+#include <QTimer>
+#include <QWidget>
+
+#include "desktop/graph/GraphPlot.h"
+#include "forms/WaterfallForm.h"
+#include "waterfall/PictureOptions.h"
+
+namespace zel {
+
+/// Left drag rotates, right drag or Shift with the left moves, the wheel zooms, a double click
+/// resets. Arrows, Shift with arrows, plus, minus and Home do the same by the keyboard.
+class WaterfallCanvas : public QWidget {
+  public:
+    explicit WaterfallCanvas(WaterfallForm& form, QWidget* parent = nullptr);
+
+    /// The graph has changed: drawn with the next frame, if anyone sees it.
+    void refresh();
+    void setColors(const GraphColors& colors);
+
+  protected:
+    void paintEvent(QPaintEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void mouseDoubleClickEvent(QMouseEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void leaveEvent(QEvent* event) override;
+
+  private:
+    enum class Drag { None, Rotate, Move };
+
+    void rotate(double right, double down);
+    void move(double right, double down);
+    void zoom(double factor);
+    void readPointer();
+    bool placesCursors() const;
+
+    WaterfallForm& form_;
+    GraphColors colors_;
+    Drag drag_ = Drag::None;
+    bool moved_ = false;
+    QPointF last_;
+    QPointF pointer_;
+    QTimer pointerRead_;
+    QTimer wheelEnd_;
+};
+
+}  // namespace zel
