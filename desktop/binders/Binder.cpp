@@ -20,7 +20,7 @@ struct Face {
     const char* name;
 };
 constexpr Face kFaces[] = {
-    {kRed, "red"}, {kGreen, "green"}, {65280, "green"}, {14737632, "plain"}, {0xE0E0E0, "plain"}};
+    {kRed, "red"}, {kGreen, "green"}, {65280, "green"}, {14737632, "plain"}, {0xE0E0E0, "plain"}, {0x80FF80, "green"}};
 
 QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
 

@@ -67,7 +67,10 @@ const std::vector<ShortcutRow>& shortcutTable() {
         {"FileMenu", "Alt+F"},
         {"Connection", "Alt+N"},
         {"Utility", "Alt+I"},
+        {"ViewMenu", "Alt+V"},
         {"HelpMenu", "Alt+H"},
+        {"SpectrogramShow", "Ctrl+Y"},
+        {"SpectrogramPause", "Ctrl+Shift+Y"},
         {"LoadData", "Ctrl+O"},
         {"ExitObject", "Ctrl+Q"},
     };

@@ -15,7 +15,7 @@ class FormWindow : public QDialog {
 
   protected:
     /// The first field that takes an entry has the focus, else the default button.
-    void focusFirst();
+    virtual void focusFirst();
     /// Behind the building of the window's content.
     void followForm();
     /// The button that Esc stands for, while it can be pressed.

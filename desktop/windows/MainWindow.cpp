@@ -13,10 +13,12 @@
 #include <set>
 
 #include "desktop/graph/GraphImage.h"
+#include "desktop/graph/SpectrogramWidget.h"
 #include "desktop/windows/FileDrop.h"
 #include "desktop/windows/PanelSide.h"
 #include "desktop/windows/PlaybackBar.h"
 #include "desktop/windows/Shortcuts.h"
+#include "desktop/windows/WaterfallWindow.h"
 
 namespace zel {
 namespace {
@@ -74,6 +76,7 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
 
     Forms& forms = program_.forms();
     windows_.push_back(std::make_unique<ConnectionWindow>(forms.main, binder_, this));
+    windows_.push_back(std::make_unique<WaterfallWindow>(forms, binder_, this));
     for (Form* form : {static_cast<Form*>(&forms.manualScale),
                        static_cast<Form*>(&forms.powerAndRefl), static_cast<Form*>(&forms.time),
                        static_cast<Form*>(&forms.tcpConnection), static_cast<Form*>(&forms.server)})
@@ -112,8 +115,12 @@ bool MainWindow::mustNotDisturb(const Control& control) const {
     const bool busy = panel_.MousePointer == kHourglass || panel_.AcquisitionRunning ||
                       program_.forms().main.MousePointer == kHourglass;
     const Forms& forms = program_.forms();
-    const Control* const always[] = {&panel_.StopButton, &panel_.ExitObject,
-                                     &forms.main.CancelButton, &forms.specialMeas.sldSpeed};
+    // What only looks at sweeps that have come disturbs nothing.
+    if (&control.form() == &forms.waterfall) return false;
+    const Control* const always[] = {
+        &panel_.StopButton,          &panel_.ExitObject, &forms.main.CancelButton,
+        &forms.specialMeas.sldSpeed, &panel_.cmd3D,      &panel_.SpectrogramShow,
+        &panel_.SpectrogramPause};
     return busy && std::find(std::begin(always), std::end(always), &control) == std::end(always);
 }
 
@@ -125,7 +132,23 @@ QWidget* MainWindow::graphSide() {
     graph_ = new GraphWidget(panel_.CWGraph1,
                              [this] { return annotateView(panel_, program_.variables()); });
     binder_.bindShow(panel_.CWGraph1, graph_, [this] { graph_->refresh(); });
-    layout->addWidget(graph_, 1);
+    layout->addWidget(graph_, 2);
+    auto* earlier = new SpectrogramWidget(program_.forms(), program_.history(), [this] {
+        const QRect plot = graph_->plotArea();
+        return std::pair(plot.left(), plot.right() + 1);
+    });
+    const auto showEarlier = [this, earlier] {
+        earlier->setVisible(panel_.SpectrogramPicture.Visible);
+        earlier->refresh();
+    };
+    binder_.bindShow(panel_.SpectrogramPicture, earlier, showEarlier);
+    for (Control* control :
+         {static_cast<Control*>(&panel_.SpectrogramPause), static_cast<Control*>(&panel_.CWGraph1)})
+        control->Changed.connect([self = QPointer<MainWindow>(this)] {
+            if (self && self->panel_.SpectrogramPicture.Visible)
+                self->panel_.SpectrogramPicture.noteChange();
+        });
+    layout->addWidget(earlier, 1);
     layout->addWidget(
         new PlaybackBar(panel_.PlaybackFrame, program_.forms().specialMeas.sldSpeed, binder_));
     auto* readouts = new QGridLayout;
@@ -182,9 +205,8 @@ void MainWindow::buildMenus() {
 }
 
 void MainWindow::addThemeMenu(ThemeChoice now, const std::function<void(ThemeChoice)>& choose) {
-    auto* menu = new QMenu("&View", this);
-    auto* help = qobject_cast<QAction*>(binder_.widgetOf(panel_.HelpMenu));
-    menuBar()->insertMenu(help, menu);
+    auto* menu = qobject_cast<QAction*>(binder_.widgetOf(panel_.ViewMenu))->menu();
+    menu->addSeparator();
     auto* group = new QActionGroup(menu);
     constexpr std::pair<ThemeChoice, const char*> kThemes[] = {
         {ThemeChoice::System, "Theme of the System"},

@@ -1,0 +1,33 @@
+#pragma once
+// The window of the waterfall: menus, the graph with its colour bar, how the picture looks.
+
+#include <QMenuBar>
+
+#include "desktop/graph/WaterfallCanvas.h"
+#include "desktop/windows/FormWindow.h"
+#include "forms/Forms.h"
+
+namespace zel {
+
+class WaterfallWindow : public FormWindow {
+  public:
+    WaterfallWindow(Forms& forms, Binder& binder, QWidget* parent);
+    WaterfallCanvas& canvas() { return *canvas_; }
+
+  protected:
+    void focusFirst() override { canvas_->setFocus(); }
+    void reject() override;
+    void keyPressEvent(QKeyEvent* event) override;
+
+  private:
+    QMenuBar* menus();
+    QWidget* colourBar();
+    QWidget* options();
+    void showScreen();
+
+    WaterfallForm& waterfall_;
+    ControllerForm& panel_;
+    WaterfallCanvas* canvas_;
+};
+
+}  // namespace zel
