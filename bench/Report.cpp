@@ -14,6 +14,7 @@
 #include "bench/PanelWork.h"
 #include "bench/Redraw.h"
 #include "bench/SweepRate.h"
+#include "bench/Waterfall.h"
 #include "bench/Windows.h"
 
 namespace {
@@ -71,6 +72,11 @@ int main(int argc, char** argv) {
         {'j', "load", [] { return zelbench::loadBesidePlainPass(); }},
         {'k', "view", [] { return zelbench::viewWriting(); }},
         {'l', "series", [] { return zelbench::seriesPlay(); }},
+        {'m', "waterfall", [] { return zelbench::waterfallFrames(900, 600, 2, 60); }},
+        {'m', "waterfall", [] { return zelbench::waterfallFrames(900, 600, 1, 35); }},
+        {'m', "waterfall", [] { return zelbench::waterfallFrames(1920, 1080, 2, 30); }},
+        {'m', "spectrogram", [] { return zelbench::spectrogramRow(); }},
+        {'m', "growth", [] { return zelbench::waterfallGrowth(); }},
     };
     zelbench::Figures figures;
     bool allMet = true;
