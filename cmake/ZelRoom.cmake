@@ -41,6 +41,28 @@ function(zel_room name)
     set_property(GLOBAL APPEND PROPERTY ZEL_ROOMS zel_${name})
 endfunction()
 
+# zel_check_core()
+#
+# Fails when a room of the core could see a library of a front: what the rooms are linked to, and
+# with it the folders of their headers, are rooms again.
+function(zel_check_core)
+    get_property(rooms GLOBAL PROPERTY ZEL_ROOMS)
+    foreach(room IN LISTS rooms)
+        foreach(property IN ITEMS LINK_LIBRARIES INTERFACE_LINK_LIBRARIES)
+            get_target_property(libraries ${room} ${property})
+            foreach(library IN LISTS libraries)
+                if(library AND NOT library IN_LIST rooms)
+                    message(FATAL_ERROR "${room} is of the core and may not use ${library}")
+                endif()
+            endforeach()
+        endforeach()
+        get_target_property(folders ${room} INTERFACE_INCLUDE_DIRECTORIES)
+        if(NOT folders STREQUAL "${PROJECT_SOURCE_DIR}")
+            message(FATAL_ERROR "${room} is of the core and may not see ${folders}")
+        endif()
+    endforeach()
+endfunction()
+
 # zel_link_core(TARGET VISIBILITY)
 #
 # Links a target to every room of the core that exists.
