@@ -12,6 +12,7 @@
 #include "ZELSim/Wire.h"
 #include "support/ExitStatus.h"
 #include "support/NumberOption.h"
+#include "support/VersionInfo.h"
 
 namespace {
 
@@ -78,6 +79,7 @@ int main(int argc, char** argv) {
         "a pseudo terminal or a TCP port until it is ended. It prints the name of the terminal\n"
         "(and of the link), or the address and port."};
     app.footer(std::string(zelsim::faultHelp()));
+    app.set_version_flag("-v,--version", "ZELSim " + zel::versionText(zel::kVersion));
     auto* pty = app.add_flag("--pty", options.pty, "Serve a pseudo terminal");
     app.add_option("--link", options.link, "Make a symbolic link of this name to the terminal")
         ->type_name("NAME")

@@ -24,6 +24,11 @@ if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
     # GCC 12 sees overlapping copies in plain string concatenations.
     add_compile_options(-Wno-restrict)
 endif()
+# The same sources give the same programs, wherever and whenever they are built.
+add_compile_options(
+    "$<$<CONFIG:Release>:-Wdate-time>"
+    "$<$<CONFIG:Release>:-ffile-prefix-map=${PROJECT_SOURCE_DIR}=.>"
+    "$<$<CONFIG:Release>:-ffile-prefix-map=${PROJECT_BINARY_DIR}=build>")
 if(ZEL_WERROR)
     add_compile_options(-Werror)
 endif()

@@ -43,7 +43,11 @@ QtApplicationFolder::QtApplicationFolder(const QString& home) {
 }
 
 std::string QtApplicationFolder::programPath() {
-    return QCoreApplication::applicationDirPath().toStdString();
+    // The build says where the companions are installed, seen from the program.
+    const QDir program(QCoreApplication::applicationDirPath());
+    const QDir companions(program.absoluteFilePath(ZEL_COMPANIONS));
+    return (companions.exists() ? QDir::cleanPath(companions.path()) : program.path())
+        .toStdString();
 }
 
 QtSettingsStore::QtSettingsStore(ApplicationFolder& folder)
