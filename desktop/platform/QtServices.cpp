@@ -9,18 +9,19 @@
 #include <QLoggingCategory>
 #include <QProcess>
 #include <QSaveFile>
-#include <QSettings>
 #include <QStandardPaths>
 #include <QUrl>
+
+#include "support/IniFile.h"
 
 namespace zel {
 namespace {
 
 Q_LOGGING_CATEGORY(linkLog, "zelremote.link", QtWarningMsg)
 
-QString settingsKey(const std::string& application, const std::string& section,
-                    const std::string& key) {
-    return QString::fromStdString(application + "/" + section + "/" + key);
+/// The key in the application's section.
+std::string settingsKey(const std::string& section, const std::string& key) {
+    return section + "\\" + key;
 }
 
 QString autostartEntry(const std::string& linkName) {
@@ -50,22 +51,17 @@ std::string QtApplicationFolder::programPath() {
         .toStdString();
 }
 
-QtSettingsStore::QtSettingsStore(ApplicationFolder& folder)
-    : file_(QString::fromStdString(folder.path()) + "/user.ini") {}
+QtSettingsStore::QtSettingsStore(ApplicationFolder& folder) : file_(folder.path() + "/user.ini") {}
 
 std::string QtSettingsStore::get(const std::string& application, const std::string& section,
                                  const std::string& key, const std::string& fallback) {
-    const QSettings settings(file_, QSettings::IniFormat);
-    const QVariant value = settings.value(settingsKey(application, section, key));
-    if (!value.isValid()) return fallback;
-    // A text with commas that a hand wrote without quotes comes as a list.
-    return value.toStringList().join(", ").toStdString();
+    return IniFile::load(file_).value(application, settingsKey(section, key)).value_or(fallback);
 }
 
 void QtSettingsStore::set(const std::string& application, const std::string& section,
                           const std::string& key, const std::string& value) {
-    QSettings settings(file_, QSettings::IniFormat);
-    settings.setValue(settingsKey(application, section, key), QString::fromStdString(value));
+    IniFile settings = IniFile::load(file_);
+    if (settings.setValue(application, settingsKey(section, key), value)) settings.save(file_);
 }
 
 void QtDebugChannel::output(const std::string& text) {

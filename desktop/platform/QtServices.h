@@ -30,7 +30,7 @@ class QtSettingsStore : public SettingsStore {
              const std::string& value) override;
 
   private:
-    QString file_;
+    std::string file_;
 };
 
 /// The logging category "zelremote.link", silent unless QT_LOGGING_RULES switches it on.

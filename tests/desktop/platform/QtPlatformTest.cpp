@@ -252,6 +252,14 @@ TEST_F(OnQt, SettingsWrittenByHandWithACommaOrABlank_AreReadAsTheyStand) {
     EXPECT_EQ(later.settings.get("ZELRemote", "DIRECTCON", "Label", ""), "Lab, upstairs");
 }
 
+TEST_F(OnQt, Settings_TextWithSignsOfAnIniFile_IsTheSameAfterwards) {
+    for (const char* const text :
+         {"a;b=c", " blanks ", "\"quoted\"", "#1", "50 \u03A9", "C:\\x", ""}) {
+        platform.settings.set("ZELRemote", "DIRECTCON", "Label", text);
+        EXPECT_EQ(platform.settings.get("ZELRemote", "DIRECTCON", "Label", "none"), text);
+    }
+}
+
 TEST_F(OnQt, Settings_SurviveTheProgram) {
     platform.settings.set("ZELRemote", "DIRECTCON", "CommPort", "3");
     QtPlatform later(home.path());
