@@ -15,8 +15,8 @@ std::string GetISOTimeString(const Clock& clock, RootDebug& log) {
     // A fraction that rounds up to the next day stays within this one.
     const auto part = static_cast<std::int64_t>(std::fmin(parts, kPartsADay - 1));
     const std::string fraction = std::to_string(kParts + part % kParts).substr(1);
-    return clock.Clock::dateText(std::floor(date)) + " " + clockText(static_cast<int>(part / kParts)) + "." +
-           fraction;
+    return clock.Clock::dateText(std::floor(date)) + " " +
+           clockText(static_cast<int>(part / kParts)) + "." + fraction;
 }
 
 }  // namespace zel

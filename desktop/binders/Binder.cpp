@@ -19,8 +19,8 @@ struct Face {
     Color color;
     const char* name;
 };
-constexpr Face kFaces[] = {
-    {kRed, "red"}, {kGreen, "green"}, {65280, "green"}, {14737632, "plain"}, {0xE0E0E0, "plain"}, {0x80FF80, "green"}};
+constexpr Face kFaces[] = {{kRed, "red"},       {kGreen, "green"},   {65280, "green"},
+                           {14737632, "plain"}, {0xE0E0E0, "plain"}, {0x80FF80, "green"}};
 
 QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
 
