@@ -44,6 +44,13 @@ struct Passes {
     double bytes = 0;    ///< a pass, both ways
 };
 
+/// The window of the waterfall and the spectrogram, both seen.
+void openRows(Desk& desk) {
+    desk.panel.SpectrogramShow.Click();
+    desk.panel.cmd3D.Click();
+    QApplication::processEvents();
+}
+
 /// Runs the continuous view for so many passes behind the warm-up.
 Passes runView(Desk& desk, int passes) {
     int plots = 0;
@@ -189,6 +196,45 @@ Figure continuousUnpaced(const std::string& simulator) {
             "bare loop, " + numberText(median(bare)) + " sweeps/s",
             median(ratios),
             0.7,
+            true,
+            ""};
+}
+
+Figure rowsPaced(const std::string& simulator) {
+    const Simulator instrument(simulator, {"--baud", std::to_string(kBaud), "--speed", "1000000"});
+    Desk desk(instrument.device());
+    openRows(desk);
+    const Passes passes = runView(desk, kPacedPasses);
+    const double possible = passes.bytes * 10 / kBaud;
+    return {"(n) continuous view at 57,600 baud, waterfall and spectrogram open",
+            timeText(passes.seconds),
+            numberText(passes.bytes) + " bytes, " + timeText(possible),
+            possible / passes.seconds,
+            0.97,
+            true,
+            ""};
+}
+
+Figure rowsUnpaced(const std::string& simulator) {
+    const Simulator instrument(simulator, {"--speed", "1000000"});
+    std::vector<double> ratios;
+    std::vector<double> open;
+    std::vector<double> closed;
+    for (int round = 0; round < kRounds; ++round) {
+        {
+            Desk desk(instrument.device());
+            closed.push_back(1 / runView(desk, kUnpacedPasses).seconds);
+        }
+        Desk desk(instrument.device());
+        openRows(desk);
+        open.push_back(1 / runView(desk, kUnpacedPasses).seconds);
+        ratios.push_back(open.back() / closed.back());
+    }
+    return {"(n) continuous view, unpaced pty, waterfall and spectrogram open",
+            numberText(median(open)) + " sweeps/s",
+            "both closed, " + numberText(median(closed)) + " sweeps/s",
+            median(ratios),
+            0.5,
             true,
             ""};
 }

@@ -17,4 +17,9 @@ Figure continuousPaced(const std::string& simulator);
 /// The same on an unpaced line against a bare loop of the same words.
 Figure continuousUnpaced(const std::string& simulator);
 
+/// The continuous view with the waterfall's window and the spectrogram open, on a paced line.
+Figure rowsPaced(const std::string& simulator);
+/// The same on an unpaced line beside the view with both closed.
+Figure rowsUnpaced(const std::string& simulator);
+
 }  // namespace zelbench

@@ -77,6 +77,8 @@ int main(int argc, char** argv) {
         {'m', "waterfall", [] { return zelbench::waterfallFrames(1920, 1080, 2, 30); }},
         {'m', "spectrogram", [] { return zelbench::spectrogramRow(); }},
         {'m', "growth", [] { return zelbench::waterfallGrowth(); }},
+        {'n', "view with rows", [&] { return zelbench::rowsPaced(simulator); }},
+        {'n', "view with rows", [&] { return zelbench::rowsUnpaced(simulator); }},
     };
     zelbench::Figures figures;
     bool allMet = true;

@@ -111,11 +111,11 @@ Table cubehelix() {
 const std::vector<ColourMap>& maps() {
     static const std::vector<ColourMap> all{
         {"Aurora", through({{0.22, 0.10, 290},
-                            {0, 0.14, 262},
-                            {0, 0.11, 215},
-                            {0, 0.15, 155},
-                            {0, 0.18, 125},
-                            {0.95, 0.17, 105}})},
+                            {0, 0.13, 253},
+                            {0, 0.10, 216},
+                            {0, 0.11, 179},
+                            {0, 0.15, 142},
+                            {0.95, 0.16, 105}})},
         {"Grey", through({{0.16, 0, 0}, {0.98, 0, 0}})},
         {"Cubehelix", cubehelix()},
         {"Ember", through({{0.15, 0.08, 290},

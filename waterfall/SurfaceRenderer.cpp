@@ -14,7 +14,7 @@ namespace {
 
 /// A row's front stands, its top lies; steeper or flatter than this they are lines.
 constexpr double kEdgeOn = 1e-4;
-constexpr double kOverlap = 1e-3;
+constexpr double kOverlap = 0.02;
 constexpr int kStripesPerThread = 4;
 constexpr long kMostPixels = 128L * 1024 * 1024;
 

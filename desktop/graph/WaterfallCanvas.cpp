@@ -19,6 +19,7 @@ constexpr double kNearestZoom = 0.1;
 constexpr double kFarthestZoom = 100;
 constexpr int kPointerMs = 40;
 constexpr int kWheelEndMs = 250;
+constexpr int kRestMs = 40;
 constexpr double kHighestLatitude = 180;
 
 /// The graph's own angles may be any; those that the mouse makes stay within a turn.
@@ -36,10 +37,17 @@ WaterfallCanvas::WaterfallCanvas(WaterfallForm& form, QWidget* parent)
     connect(&pointerRead_, &QTimer::timeout, this, [this] { readPointer(); });
     wheelEnd_.setSingleShot(true);
     connect(&wheelEnd_, &QTimer::timeout, this, [this] { form_.Graph3D.ZoomEnded(); });
+    rest_.setSingleShot(true);
+    connect(&rest_, &QTimer::timeout, this, [this] {
+        if (waits_) update();
+    });
 }
 
 void WaterfallCanvas::refresh() {
-    if (isVisible()) update();
+    // A hand that moves the picture sees it move at once.
+    const bool atOnce = drag_ != Drag::None || wheelEnd_.isActive() || !rest_.isActive();
+    waits_ = !atOnce;
+    if (atOnce && isVisible()) update();
     setCursor(placesCursors() ? Qt::CrossCursor : Qt::ArrowCursor);
 }
 
@@ -66,6 +74,8 @@ void WaterfallCanvas::paintEvent(QPaintEvent*) {
                            .rows;
     }
     paintWaterfall(painter, rect(), picture, colors_);
+    waits_ = false;
+    rest_.start(kRestMs);
     if (form_.Graph3D.hasRows()) return;
     painter.setPen(colors_.text);
     painter.drawText(rect(), Qt::AlignCenter,

@@ -47,6 +47,8 @@ class WaterfallCanvas : public QWidget {
     QPointF pointer_;
     QTimer pointerRead_;
     QTimer wheelEnd_;
+    QTimer rest_;         ///< behind a picture, so that sweeps have the processor as well
+    bool waits_ = false;  ///< a change came meanwhile
 };
 
 }  // namespace zel
