@@ -134,5 +134,45 @@ TEST_F(FileVerbsTest, WrongUse_IsTold) {
     EXPECT_EQ(run({"show", "x", "--image", "x.gif"}), kWrongUse);
 }
 
+struct RowsPictureTest : FileVerbsTest {
+    // One application in a process.
+    static void SetUpTestSuite() {
+        static int count = 1;
+        static char name[] = "test_console";
+        static char* arguments[] = {name, nullptr};
+        static const ToolkitSession toolkit(count, arguments, true);
+    }
+};
+
+TEST_F(RowsPictureTest, Sweep_DrawsItsRowsInEachKind) {
+    for (const char* ending : {"png", "svg", "pdf"}) {
+        const std::string depth = folder.file(std::string("w.") + ending);
+        const std::string above = folder.file(std::string("s.") + ending);
+        EXPECT_EQ(
+            runConnected({"sweep", "--count", "3", "--waterfall", depth, "--spectrogram", above}),
+            kDone);
+        EXPECT_EQ(printed().size(), 1U + 3 * 301 + 2);
+        EXPECT_EQ(errors.str(), "");
+        EXPECT_GT(folder.read(std::string("w.") + ending).size(), 5000U) << ending;
+        EXPECT_GT(folder.read(std::string("s.") + ending).size(), 5000U) << ending;
+    }
+    EXPECT_NE(folder.read("w.svg").find("3 sweeps"), std::string::npos);
+    EXPECT_NE(folder.read("s.svg").find("3 sweeps"), std::string::npos);
+}
+
+TEST_F(RowsPictureTest, Show_DrawsTheRowsOfASeries) {
+    ASSERT_EQ(runConnected({"record", "--interval", "1", "--count", "4", "--output",
+                            folder.file("series.csv")}),
+              kDone);
+    EXPECT_EQ(run({"show", folder.file("series.csv"), "--waterfall", folder.file("w.svg")}), kDone);
+    EXPECT_NE(folder.read("w.svg").find("4 sweeps"), std::string::npos);
+}
+
+TEST_F(RowsPictureTest, AFileThatCannotBeWritten_IsToldAndStatusOne) {
+    EXPECT_EQ(runConnected({"sweep", "--waterfall", folder.file("none/w.png")}), kLinkFailed);
+    EXPECT_NE(errors.str().find("the image could not be written"), std::string::npos);
+    EXPECT_EQ(run({"show", "x", "--spectrogram", "x.wmf"}), kWrongUse);
+}
+
 }  // namespace
 }  // namespace zel

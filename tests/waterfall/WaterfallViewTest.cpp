@@ -92,6 +92,13 @@ TEST_F(WaterfallViewTest, Load_Spectrogram_LeavesTheStoredDistance) {
     EXPECT_TRUE(form.spectrogramZoomed);
 }
 
+TEST_F(WaterfallViewTest, Load_SpectrogramWithoutADistance_ComesNoNearer) {
+    ini("[Mode]\r\nView=1\r\n");
+    form.load();
+    EXPECT_EQ(graph.view().Distance, 2.8);
+    EXPECT_EQ(form.SpectrogramView.Distance, 2.8);
+}
+
 TEST_F(WaterfallViewTest, Load_DistanceIsAppliedLast) {
     ini("[Distance]\r\nZoom=7\r\n[DistanceW]\r\nZoom=3\r\n");
     form.load();
@@ -360,7 +367,7 @@ TEST_F(WaterfallViewTest, CursorName_BeyondTheLabels_IsTheLastStamp) {
 }
 
 TEST_F(WaterfallViewTest, CursorName_FollowsTheRowsNumberWhenRowsHaveGone) {
-    for (int i = 0; i < 105; ++i) row("12:00:" + std::to_string(100 + i), i);
+    for (int i = 0; i < 105; ++i) row("12:00:" + std::to_string(100 + i), i + 20);
     form.ActionMarkers.Click();
     // The first plot left is row 6; row 9 is labelled.
     graph.CursorPlaced(4, 1);
