@@ -135,12 +135,13 @@ TEST_F(FileVerbsTest, WrongUse_IsTold) {
 }
 
 struct RowsPictureTest : FileVerbsTest {
-    // One application in a process.
+    // One application in a process, left standing: its own statics end first.
     static void SetUpTestSuite() {
         static int count = 1;
         static char name[] = "test_console";
         static char* arguments[] = {name, nullptr};
-        static const ToolkitSession toolkit(count, arguments, true);
+        static const auto* toolkit = new ToolkitSession(count, arguments, true);
+        EXPECT_NE(toolkit, nullptr);
     }
 };
 
