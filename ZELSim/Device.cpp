@@ -225,7 +225,7 @@ void Device::fold(double start) {
 const Trace& Device::trace() {
     const std::uint64_t finished = timer_.finished();
     if (finished == 0) {
-        // Ahead of the first sweep's end the display shows the running one.
+        // Before the first sweep's end the display shows the running one.
         if (!traceValid_) {
             fold(timer_.newestStart());
             blockValid_ = false;

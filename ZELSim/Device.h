@@ -40,7 +40,7 @@ class Device {
     const Settings& settings() const { return settings_; }
     /// For a change that has no bearing on the sweep.
     Settings& edit() { return settings_; }
-    /// To be called after a change that the sweep depends on: it starts anew, holds and averages
+    /// To be called after a change that the sweep depends on: it starts again, holds and averages
     /// are emptied. In single sweep one more sweep is made.
     void restart();
 

@@ -96,7 +96,7 @@ double tdmaPower(const Settings& settings, const Sweeper& sweeper, double start)
 
 double sensorPower(const Settings& settings, const Scene& scene, std::uint64_t seed, double now) {
     constexpr std::array<double, 3> spread{0.15, 0.05, 0.015};  // dB, by measuring time
-    // The sensor's efficiency falls a little with the frequency that it is told.
+    // The sensor's efficiency falls a little with the frequency that it is given.
     const double efficiency = -0.3 * settings.centre / 3e9;
     return powerToDb(scene.totalPower(now)) + efficiency +
            spread[static_cast<std::size_t>(settings.sensorTime)] * timeDraw(seed, now);

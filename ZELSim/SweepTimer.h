@@ -16,7 +16,7 @@ class SweepTimer {
 
     explicit SweepTimer(TriggerSource trigger) : trigger_(std::move(trigger)) {}
 
-    /// Drops a running sweep and begins anew at `now`; `length` is the real time of a sweep in
+    /// Drops a running sweep and begins again at `now`; `length` is the real time of a sweep in
     /// seconds. With `free` set no trigger is waited for.
     void start(double now, double length, bool free);
     /// Ends sweeping; the sweeps that are finished stay.

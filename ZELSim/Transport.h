@@ -25,7 +25,7 @@ class Endpoint {
 };
 
 /// Blocks the signals that end the program but for the moments in which `serve` waits. To be
-/// called once, ahead of `serve`.
+/// called once, before `serve`.
 void catchEndSignals();
 /// Serves the wire at the endpoint until SIGINT, SIGTERM or SIGHUP. False when waiting failed.
 bool serve(Wire& wire, Endpoint& endpoint);

@@ -62,7 +62,7 @@ bool PtyEndpoint::open(const std::string& link, int baud, bool strictBaud) {
     if (slave_ < 0 || tcgetattr(slave_, &mode) != 0) {
         return fail(device_);
     }
-    // Raw ahead of the first byte: a terminal that echoes would answer itself.
+    // Raw before the first byte: a terminal that echoes would answer itself.
     cfmakeraw(&mode);
     for (const auto& [rate, speed] : kSpeeds) {
         if (rate == baud) {

@@ -37,7 +37,7 @@ class Wire {
     /// Seconds until `take` will have something (more), or the next look is worth while; nothing
     /// when only the host can set things going.
     std::optional<double> nextDue() const;
-    /// The line was cut and made anew: half a line and what was on its way are gone.
+    /// The line was cut and made again: half a line and what was on its way are gone.
     void reset();
     /// True while so much waits that the sender should pause.
     bool congested() const;

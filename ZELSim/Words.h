@@ -26,7 +26,7 @@ enum Status : int {
 struct Answer {
     int status = kAccepted;
     bool hasValue = false;
-    std::string value;  ///< text, or with `binary` the bytes behind the status line
+    std::string value;  ///< text, or with `binary` the bytes after the status line
     bool binary = false;
     bool waitsForSweep = false;  ///< the status follows when the sweep under way has ended
 };

@@ -35,7 +35,7 @@ class BareLine {
     void accepted();
 
     int line_ = -1;
-    std::size_t sampleBytes_ = 0;  // of a sweep, with the separators behind the blocks
+    std::size_t sampleBytes_ = 0;  // of a sweep, with the separators after the blocks
     std::size_t bytes_ = 0;
     std::string buffer_;
     std::size_t taken_ = 0;

@@ -35,7 +35,7 @@ std::string markdownTable(const Figures& figures) {
             continue;
         }
         table += figure.measured + " | " + figure.against + " | ";
-        // Three digits behind the point hide nothing of a ratio that is near its limit.
+        // Three digits after the point hide nothing of a ratio that is near its limit.
         table += fixed(figure.ratio, figure.ratio < 0.01 ? 5 : 3) + " | ";
         if (figure.limit == 0) {
             table += "none | |\n";

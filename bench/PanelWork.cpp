@@ -51,7 +51,7 @@ void openRows(Desk& desk) {
     QApplication::processEvents();
 }
 
-/// Runs the continuous view for so many passes behind the warm-up.
+/// Runs the continuous view for so many passes after the warm-up.
 Passes runView(Desk& desk, int passes) {
     int plots = 0;
     double start = 0;

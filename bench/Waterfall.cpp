@@ -117,9 +117,9 @@ Figure waterfallGrowth() {
     const double before = peakBytes();
     for (int i = kMany / 10; i < kMany; ++i) rows.sweeps.add(rows.forms, i);
     const double after = peakBytes();
-    return {"(m) memory behind 100,000 rows",
+    return {"(m) memory after 100,000 rows",
             numberText(after / 1e6) + " MB",
-            "behind 10,000 rows, " + numberText(before / 1e6) + " MB",
+            "after 10,000 rows, " + numberText(before / 1e6) + " MB",
             after / before,
             1.02,
             false,

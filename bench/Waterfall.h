@@ -9,7 +9,7 @@ namespace zelbench {
 Figure waterfallFrames(int width, int height, int threads, double wanted);
 /// A new row of the spectrogram at 900 pixels beside 0.3 ms.
 Figure spectrogramRow();
-/// A hundred thousand rows: memory behind the first tenth and at the end.
+/// A hundred thousand rows: memory after the first tenth and at the end.
 Figure waterfallGrowth();
 
 }  // namespace zelbench

@@ -13,13 +13,13 @@ std::string FormatValue(double value, const std::string& unit, const std::string
 std::string FormatValue(const std::string& value, const std::string& unit,
                         const std::string& format = "", bool scale = true, bool round = false,
                         int digits = 0);
-/// Rounds the number ahead of the blank.
+/// Rounds the number before the blank.
 std::string RoundValueText(const std::string& text, int digits);
 
 /// A value with an SI prefix, which is returned as k, M, G, m, µ or n (p counts, but shows none
 /// of its own); 0 for a text that is no number or that carries a unit without a prefix.
 double ParseValue(const std::string& text, std::string& prefix);
-/// A length with "mm", "cm", "µ" or a bare number; a text with "m" behind the number gives 0.
+/// A length with "mm", "cm", "µ" or a bare number; a text with "m" after the number gives 0.
 /// Throws std::invalid_argument for a text such as "5 s", which passes as numeric and is no number.
 double ParseLength(const std::string& text, std::string& unit);
 /// Comma becomes point, then the leading number.

@@ -42,9 +42,9 @@ class TextBox : public Control {
     Property<std::string> Text;
     Property<bool> Locked{this, false};
     /// The typed character as a code point; a handler that sets it to 0 swallows it. The
-    /// character goes into the text behind the handlers.
+    /// character goes into the text after the handlers.
     Event<int&> KeyPress;
-    Event<int, int> KeyDown;  ///< key code, shift; ahead of KeyPress
+    Event<int, int> KeyDown;  ///< key code, shift; before KeyPress
 };
 
 class Label : public Control {

@@ -49,7 +49,7 @@ class FileService {
     /// Opens a regular file for reading. Null, with `problem` set, for anything else: a folder, a
     /// pipe, a device, a file that may not be read.
     virtual std::unique_ptr<FileReader> open(const std::string& path, FileProblem& problem) = 0;
-    /// Puts the bytes behind the file's last one; a missing file is made. After a failure the
+    /// Adds the bytes at the end of the file; a missing file is made. After a failure the
     /// file is as it was before.
     virtual FileProblem append(const std::string& path, std::string_view bytes) = 0;
     /// Gives the file these bytes in one step, by way of a temporary file in the same folder.

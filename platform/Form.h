@@ -54,7 +54,7 @@ class Control : public PropertyOwner {
     ControlKind kind() const { return kind_; }
     Form& form() const { return form_; }
 
-    /// One event for all properties: a front end reads the control anew.
+    /// One event for all properties: a front end reads the control again.
     Event<> Changed;
     void noteChange() override { Changed(); }
 
@@ -104,7 +104,7 @@ class Form : public PropertyOwner {
     Property<bool> Modal{this, false};
     Property<int> MousePointer{this, 0};
 
-    /// Ahead of each showing of a form that is not loaded; see `load`.
+    /// Before each showing of a form that is not loaded; see `load`.
     Event<> Load;
     /// The user closes the window; a handler sets the argument to -1 to keep it.
     Event<int&> QueryUnload;

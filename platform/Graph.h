@@ -79,7 +79,7 @@ class Graph : public Control {
     Event<int, double, double> CursorMoved;
     Event<int, int> KeyDown;                 ///< key code, shift
     Event<double, double> PlotAreaTracking;  ///< the pointer over the plot area: x, y
-    Event<> ZoomFinished;                    ///< behind a zoom rectangle, the axes already set
+    Event<> ZoomFinished;                    ///< after a zoom rectangle, the axes already set
 
   private:
     GraphAxis x_;

@@ -114,7 +114,7 @@ class Graph3D : public Control {
     void addPlot();
     /// The stamp that the next curve takes.
     void stampNext(int row, std::string time);
-    /// Plots a curve into the last plot if that is empty, else into a new one behind it.
+    /// Plots a curve into the last plot if that is empty, else into a new one after it.
     void plotCurve(const std::vector<double>& depth, const std::vector<double>& x,
                    const std::vector<double>& level, const std::vector<double>& colour);
     /// A curve was plotted: the last plot holds it.

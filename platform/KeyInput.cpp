@@ -24,7 +24,7 @@ void appendUtf8(std::string& text, int code) {
     }
 }
 
-/// The key behind a character, as KeyDown counts keys: letters as capitals, digits as they are.
+/// The key after a character, as KeyDown counts keys: letters as capitals, digits as they are.
 /// Other characters have keys of their own that no handler asks for.
 int keyOf(int character) {
     if (character == kKeyEnter || character == kKeyBackspace) return character;

@@ -1,11 +1,11 @@
 #pragma once
-// A value of a control that tells its control when it changes.
+// A value of a control that informs its control when it changes.
 
 #include <utility>
 
 namespace zel {
 
-/// What owns properties: is told of each change.
+/// What owns properties: hears of each change.
 class PropertyOwner {
   public:
     virtual void noteChange() = 0;

@@ -26,7 +26,7 @@ void TimerDriver::arm(Timer& timer, std::optional<int> ms) {
     Entry& entry = entries_[&timer];
     entry.task = events_.schedule(ms.value_or(entry.interval), [this, &timer] {
         Entry& due = entries_[&timer];
-        arm(timer);  // ahead of the tick, so that a long tick keeps the pace
+        arm(timer);  // before the tick, so that a long tick keeps the pace
         if (due.inTick) {
             due.missed = true;
             return;

@@ -13,7 +13,7 @@ using IniValue = std::variant<bool, std::int16_t, std::int32_t, float, double, s
 enum class IniType { Boolean, Integer, Long, Single, Double, Text };
 
 /// The value of a key, as the type that is named or else as the default's. A missing key gives
-/// the default; a missing default counts as the number 1. A value is cut behind 750 characters.
+/// the default; a missing default counts as the number 1. A value is cut after 750 characters.
 /// "1", "WAHR" and "TRUE" in either case are true; a number is what the text starts with, for the
 /// whole types the nearest that they hold.
 IniValue ReadIni(const std::string& fileName, const std::string& section, const std::string& key,

@@ -145,7 +145,7 @@ bool IniFile::setValue(std::string_view section, std::string_view key, std::stri
         line = std::move(entry);
         return true;
     }
-    // Behind the section's last line that says something.
+    // After the section's last line that says something.
     auto place = found->lines.end();
     while (place != found->lines.begin() && withoutBlanks(std::prev(place)->text).empty()) --place;
     found->lines.insert(place, std::move(entry));

@@ -41,7 +41,7 @@ class IniFile {
     };
     struct Section {
         std::string name;
-        Line header;  ///< without text for the lines ahead of the first section
+        Line header;  ///< without text for the lines before the first section
         std::vector<Line> lines;
     };
     const Section* find(std::string_view name) const;

@@ -32,7 +32,7 @@ bool parsePlainNumber(std::string_view text, double& value) {
     }
     std::size_t count = 0;
     for (; i < plain.size() && (isDigit(plain[i]) || (plain[i] == ',' && count > 0)); ++i) {
-        if (plain[i] == ',') continue;  // groups, wherever it stands ahead of the point
+        if (plain[i] == ',') continue;  // groups, wherever it stands before the point
         digits += plain[i];
         ++count;
     }

@@ -1,5 +1,5 @@
 #pragma once
-// What the user was told: each box as one line, so that a test names icon, title and text at once.
+// What the user was shown: each box as one line, so that a test names icon, title and text at once.
 
 #include <string>
 #include <vector>

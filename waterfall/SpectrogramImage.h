@@ -24,7 +24,7 @@ class SpectrogramImage {
   public:
     explicit SpectrogramImage(const SweepHistory& history) : history_(history) {}
 
-    /// Takes in what came since the last call; a new frame draws all rows anew, at once.
+    /// Takes in what came since the last call; a new frame draws all rows again, at once.
     void update(const SpectrogramFrame& frame);
     /// The line of a row, 0 is the newest; 0 where the row has no sample.
     const Pixel* line(int back) const;

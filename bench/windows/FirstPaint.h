@@ -1,5 +1,5 @@
 #pragma once
-// Tells when a window has been painted for the first time.
+// Says when a window has been painted for the first time.
 
 #include <QEvent>
 #include <QObject>
@@ -20,7 +20,7 @@ class FirstPaint : public QObject {
     bool eventFilter(QObject* watched, QEvent* event) override {
         if (event->type() == QEvent::Paint && !told_) {
             told_ = true;
-            // The children are painted in the same go, behind the window itself.
+            // The children are painted in the same go, after the window itself.
             QTimer::singleShot(0, this, painted_);
         }
         return QObject::eventFilter(watched, event);

@@ -95,7 +95,7 @@ void Binder::follow(Control& control, QObject* widget, std::function<void()> sho
         };
     }
     entries_[&control] = {widget, std::move(show)};
-    // The windows end ahead of the forms: a change behind their end is nobody's.
+    // The windows end before the forms: a change after their end is nobody's.
     control.Changed.connect([self = QPointer<Binder>(this), key = &control] {
         if (self) self->markDirty(key);
     });

@@ -45,9 +45,9 @@ class Binder : public QObject {
     void bindShow(Control& control, QWidget* widget, std::function<void()> show);
     void bindForm(Form& form, QObject* owner, std::function<void()> show);
 
-    /// Shows the form anew with the next frame.
+    /// Shows the form again with the next frame.
     void refresh(const Form& form) { markDirty(&form); }
-    /// Shows every control and form anew: the colours have changed.
+    /// Shows every control and form again: the colours have changed.
     void refreshAll();
     /// Shows all changes now.
     void flush();
@@ -73,7 +73,7 @@ class Binder : public QObject {
     bool flushing_ = false;
 };
 
-/// A line of text that tells its text box of each key ahead of the insertion.
+/// A line of text that gives its text box each key before the insertion.
 class PanelLineEdit : public QLineEdit {
   public:
     explicit PanelLineEdit(QWidget* parent = nullptr);
@@ -94,7 +94,7 @@ class PanelLineEdit : public QLineEdit {
 
 /// The face of a control's colour for the style sheet: "plain", "red", "green", "gray".
 QString faceOf(Color color);
-/// Puts the face on the widget and has it drawn anew.
+/// Puts the face on the widget and has it drawn again.
 void setFace(QWidget* widget, const QString& face);
 
 }  // namespace zel

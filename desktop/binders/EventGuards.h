@@ -9,7 +9,7 @@
 
 namespace zel {
 
-/// Tells a button of each key that it gets, F1 among them.
+/// Gives a button each key that it gets, F1 among them.
 class KeyTeller : public QObject {
   public:
     KeyTeller(Button& control, QObject* parent) : QObject(parent), control_(control) {}

@@ -42,7 +42,7 @@ void PanelLineEdit::insertKey(QKeyEvent* event) {
     int character = characterOf(*event, code);
     if (character != 0) {
         control_->KeyPress(character);
-        // A handler may have emptied the box, or set a whole new text behind an Enter.
+        // A handler may have emptied the box, or set a whole new text after an Enter.
         const QString shown = QString::fromStdString(control_->Text);
         if (text() != shown) setText(shown);
         if (character == 0) return;

@@ -20,7 +20,7 @@ const std::vector<ShortcutRow>& shortcutTable();
 /// The keys of a control of the panel; empty for one without any.
 QString shortcutOf(const Control& control);
 
-/// A terminator key: what ends a number, behind Alt.
+/// A terminator key: what ends a number, after Alt.
 constexpr const char* kTerminatorLetters = "GMKUC";
 
 }  // namespace zel

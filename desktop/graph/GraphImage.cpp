@@ -120,7 +120,7 @@ QString save(const Graph& graph, const ViewAnnotations& view, const QString& pat
     const QByteArray bytes = kind->write(plot, size);
     if (bytes.isEmpty()) return "Cannot draw " + path;
     QSaveFile file(path);
-    // The commit does not tell of bytes that only its own flush failed to write.
+    // The commit does not report bytes that only its own flush failed to write.
     if (file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.flush() &&
         file.commit())
         return {};

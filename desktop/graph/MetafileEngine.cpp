@@ -244,7 +244,7 @@ void MetafileEngine::drawTextItem(const QPointF& origin, const QTextItem& item) 
                         static_cast<int>(std::lround(turn * 10)), static_cast<int>(font.weight()),
                         font.italic(), font.underline(), font.strikeOut(), faceOf(font)});
     writer_.setTextColor(colorOf(pen_.color()));
-    // The place of each character is told, so that the text has its width with any font. Readers
+    // The place of each character is given, so that the text has its width with any font. Readers
     // differ in what that means in a turned line.
     const QFontMetricsF metrics(font, paintDevice());
     const QString written = QString::fromStdString(fromWindows1252(bytes));

@@ -286,7 +286,7 @@ QByteArray MetafileWriter::finish() {
                                                               << 8;
     appendWord(file, checksum);
 
-    appendWord(file, 1);  // kept in memory, not behind a file
+    appendWord(file, 1);  // kept in memory, not in a file
     appendWord(file, kHeaderWords);
     appendWord(file, 0x0300);
     appendLong(file, kHeaderWords + records_.size() / 2);

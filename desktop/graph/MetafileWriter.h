@@ -56,7 +56,7 @@ class MetafileWriter {
     void selectBrush(std::optional<MetafileColor> color);
     void selectFont(const MetafileFont& font);
     void setTextColor(MetafileColor color);
-    /// What follows is seen inside of the rectangle only, from the last clip on anew; none ends it.
+    /// What follows is seen inside of the rectangle only, from the last clip on again; none ends it.
     void setClip(const std::optional<MetafileRect>& clip);
 
     /// A long line becomes several records, which share the points where they meet.
@@ -69,7 +69,7 @@ class MetafileWriter {
     /// character to the next, or is empty: the reader then places them.
     void text(MetafilePoint origin, const std::string& bytes, const std::vector<int>& advances);
 
-    /// The whole file, its headers filled in. Nothing may be written behind it.
+    /// The whole file, its headers filled in. Nothing may be written after it.
     QByteArray finish();
 
   private:
@@ -86,7 +86,7 @@ class MetafileWriter {
     struct Context {
         Selection selected{kNone, kNone, kNone};
         std::optional<MetafileColor> textColor;
-        bool textMode = false;  ///< how text is placed was told
+        bool textMode = false;  ///< how text is placed was written
     };
 
     void record(int function, const QByteArray& parameters);

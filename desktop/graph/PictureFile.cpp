@@ -78,7 +78,7 @@ QString save(const QString& path, QSize size, const Paint& paint) {
         if (!row.write(buffer, size, paint, row.kind) || bytes.isEmpty())
             return "Cannot draw " + path;
         QSaveFile file(path);
-        // The commit does not tell of bytes that only its own flush failed to write.
+        // The commit does not report bytes that only its own flush failed to write.
         if (file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.flush() &&
             file.commit())
             return {};

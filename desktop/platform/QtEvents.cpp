@@ -118,7 +118,7 @@ TaskId QtEvents::schedule(double ms, std::function<void()> task) {
     timer->setSingleShot(true);
     timer->setTimerType(Qt::PreciseTimer);
     QObject::connect(timer.get(), &QTimer::timeout, timer.get(), [this, id, task] {
-        const std::function<void()> run = task;  // the timer goes ahead of the task
+        const std::function<void()> run = task;  // the timer goes before the task
         if (const auto found = tasks_.find(id); found != tasks_.end()) {
             found->second.release()->deleteLater();
             tasks_.erase(found);

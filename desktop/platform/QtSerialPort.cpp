@@ -115,7 +115,7 @@ bool QtSerialPort::hungUp() const {
 std::string QtSerialPort::input() {
     if (!port_.isOpen()) return {};
     // What the event loop has fetched comes first; what the line has now, without the detour
-    // through the loop, behind it.
+    // through the loop, after it.
     std::string bytes;
     if (port_.bytesAvailable() > 0) bytes = port_.readAll().toStdString();
     std::array<char, 4096> room{};

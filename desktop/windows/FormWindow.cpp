@@ -59,7 +59,7 @@ void FormWindow::followForm() {
             show();
             raise();
             activateWindow();
-            // Behind the texts of this frame, which would take the selection away.
+            // After the texts of this frame, which would take the selection away.
             shown_.start(0);
         } else {
             hide();
@@ -149,7 +149,7 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
             auto* button = new QPushButton;
             button->setAutoDefault(false);
             button->setMinimumWidth(90);
-            if (buttons->count() == 1) button->setDefault(true);  // behind the stretch
+            if (buttons->count() == 1) button->setDefault(true);  // after the stretch
             buttons->addWidget(button);
             binder.bind(static_cast<Button&>(*control), button);
             for (const char* name : kCancels)

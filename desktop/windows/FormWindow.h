@@ -16,7 +16,7 @@ class FormWindow : public QDialog {
   protected:
     /// The first field that takes an entry has the focus, else the default button.
     virtual void focusFirst();
-    /// Behind the building of the window's content.
+    /// After the building of the window's content.
     void followForm();
     /// The button that Esc stands for, while it can be pressed.
     void setCancel(const Button& button) { cancels_.push_back(&button); }
@@ -32,7 +32,7 @@ class FormWindow : public QDialog {
 };
 
 /// A window that lays the form's controls out in their order: a row a text box, options below
-/// each other, buttons at the foot. A label ahead of a text box is its caption.
+/// each other, buttons at the foot. A label before a text box is its caption.
 class PlainFormWindow : public FormWindow {
   public:
     PlainFormWindow(Form& form, Binder& binder, QWidget* parent);

@@ -22,7 +22,7 @@ class MainWindow : public QMainWindow {
 
     GraphWidget& graph() { return *graph_; }
     Binder& binder() { return binder_; }
-    /// A menu of the themes; `choose` hears each choice, behind which all is drawn anew.
+    /// A menu of the themes; `choose` hears each choice, after which all is drawn again.
     void addThemeMenu(ThemeChoice now, const std::function<void(ThemeChoice)>& choose);
     /// Shows everything as the forms have it, at once.
     void showNow();

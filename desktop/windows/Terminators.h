@@ -16,7 +16,7 @@ namespace zel {
 
 struct Terminator {
     const char* caption;  ///< on the key
-    const char* typed;    ///< what stands behind the number, ahead of Enter
+    const char* typed;    ///< what stands after the number, before Enter
     char letter;          ///< of the shortcut with Alt; 0 where Enter does the same
 };
 

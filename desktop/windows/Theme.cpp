@@ -131,7 +131,7 @@ QPalette paletteOf(const ThemeColors& c) {
     return palette;
 }
 
-/// As the desktop's own settings have it, ahead of any palette of ours.
+/// As the desktop's own settings have it, before any palette of ours.
 bool systemIsDark() {
     static const bool dark = QApplication::palette().color(QPalette::Window).lightness() < 128;
     return dark;

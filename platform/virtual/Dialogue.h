@@ -30,7 +30,7 @@ class Dialogue {
     Dialogue& expect(std::string bytes);
     /// The step's answer; several follow one another.
     Dialogue& answer(std::string bytes);
-    /// Bytes that nobody asked for, behind what came before; ahead of all steps, at the opening.
+    /// Bytes that nobody asked for, after what came before; before all steps, at the opening.
     Dialogue& noise(std::string bytes) { return answer(std::move(bytes)); }
     /// The last answer comes so many milliseconds later than it would.
     Dialogue& after(int ms);
@@ -40,13 +40,13 @@ class Dialogue {
     Dialogue& silence() { return *this; }
     /// The step `times` times more.
     Dialogue& repeat(int times);
-    /// The line dies behind the last answer.
+    /// The line dies after the last answer.
     Dialogue& dies();
 
     /// Faults of the line, by the number of bytes delivered.
     LineFaults faults;
 
-    /// The line is open: what stands ahead of the first step goes out.
+    /// The line is open: what stands before the first step goes out.
     void opened();
     /// The program sent bytes.
     void sent(std::string_view bytes);
@@ -59,7 +59,7 @@ class Dialogue {
     std::function<void()> died;
 
     /// The first difference: the step's number from 1, what was expected and what was sent, in
-    /// hex; empty while all is well. Behind a failure nothing is answered any more.
+    /// hex; empty while all is well. After a failure nothing is answered any more.
     const std::string& failure() const { return failure_; }
     /// The steps that were not played; empty when all were.
     std::string leftOver() const;
@@ -97,7 +97,7 @@ class Dialogue {
     std::string written_;
     long delivered_ = 0;
     std::set<TaskId> underWay_;
-    bool held_ = false;  ///< a split is under way: what follows waits behind it
+    bool held_ = false;  ///< a split is under way: what follows waits after it
     std::vector<Piece> waiting_;
 };
 

@@ -10,9 +10,9 @@ namespace zel {
 /// Positions count the bytes delivered since the line was made, from 0. An absent position means
 /// that this fault does not happen.
 struct LineFaults {
-    std::optional<long> dropAt = std::nullopt;    ///< the line dies ahead of this byte
+    std::optional<long> dropAt = std::nullopt;    ///< the line dies before this byte
     std::optional<long> garbleAt = std::nullopt;  ///< this byte arrives with other bits
-    std::optional<long> splitAt = std::nullopt;   ///< a pause lies ahead of this byte
+    std::optional<long> splitAt = std::nullopt;   ///< a pause lies before this byte
     int splitPauseMs = 100;
 };
 
@@ -23,10 +23,10 @@ char garbled(char byte);
 struct FaultyRun {
     struct Piece {
         std::string bytes;
-        int pauseMs = 0;  ///< ahead of the piece
+        int pauseMs = 0;  ///< before the piece
     };
     std::vector<Piece> pieces;
-    bool dies = false;  ///< the line dies behind the last piece
+    bool dies = false;  ///< the line dies after the last piece
 };
 
 /// Applies the faults to bytes that begin at the position `from`.

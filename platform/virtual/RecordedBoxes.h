@@ -35,7 +35,7 @@ class RecordedBoxes : public MessageBoxes {
     std::vector<std::string> texts() const;
     void clear();
 
-    /// Runs while the box stands, ahead of its answer.
+    /// Runs while the box stands, before its answer.
     std::function<void(const Box&)> whileShown;
 
     BoxAnswer show(const Box& box) override;

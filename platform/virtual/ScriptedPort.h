@@ -20,7 +20,7 @@ class ScriptedPort : public SerialPort {
     explicit ScriptedPort(Events& events);
 
     Dialogue& expect(std::string bytes) { return script_.expect(std::move(bytes)); }
-    /// Bytes that come by themselves at the opening, or behind the steps so far.
+    /// Bytes that come by themselves at the opening, or after the steps so far.
     Dialogue& noise(std::string bytes) { return script_.noise(std::move(bytes)); }
     Dialogue& script() { return script_; }
 
@@ -28,7 +28,7 @@ class ScriptedPort : public SerialPort {
     void dropAfterByte(long count) { script_.faults.dropAt = count; }
     /// The byte of that position, counted from 0, arrives with other bits.
     void garbleByte(long position) { script_.faults.garbleAt = position; }
-    /// A pause lies ahead of the byte of that position.
+    /// A pause lies before the byte of that position.
     void splitAtByte(long position, int pauseMs = 100);
     /// The next openings fail, `times` of them; `why` is what `problem` says.
     void failOpen(std::string why, int times = 1 << 30);

@@ -11,7 +11,7 @@
 namespace zel {
 
 /// Data arrive inside a pump or a wait, with their event. A connection succeeds at the next pump
-/// unless told otherwise.
+/// unless set otherwise.
 class ScriptedSocket : public Socket {
   public:
     explicit ScriptedSocket(Events& events);

@@ -16,7 +16,7 @@ struct Look {
 
 struct Scene {
     const char* name;
-    Button ControllerForm::*key;  ///< null: as it stands behind the connection
+    Button ControllerForm::*key;  ///< null: as it stands after the connection
     std::int16_t state;
 };
 

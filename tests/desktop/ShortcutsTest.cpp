@@ -1,4 +1,4 @@
-// The keyboard's ways to the panel: a shortcut for each key, told by tool tip and document.
+// The keyboard's ways to the panel: a shortcut for each key, shown by tool tip and document.
 
 #include <QFile>
 #include <QMenuBar>

@@ -1,5 +1,5 @@
 #pragma once
-// The rules of the house as docs/architecture.md tells them, and what breaks them.
+// The rules of the house as docs/architecture.md states them, and what breaks them.
 
 #include <string>
 #include <string_view>

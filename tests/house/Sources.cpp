@@ -23,7 +23,7 @@ std::vector<std::string> linesOf(const std::string& text) {
     return lines;
 }
 
-/// Copies the code at `at` to the result, a comment as blanks; the position behind it.
+/// Copies the code at `at` to the result, a comment as blanks; the position after it.
 std::size_t skipComment(std::string_view text, std::size_t at, std::string& result) {
     const bool block = text[at + 1] == '*';
     std::size_t end = text.find(block ? "*/" : "\n", at + 2);
@@ -36,7 +36,7 @@ std::size_t skipComment(std::string_view text, std::size_t at, std::string& resu
     return end;
 }
 
-/// Copies the quotes of a literal and leaves away what they hold; the position behind it.
+/// Copies the quotes of a literal and leaves away what they hold; the position after it.
 std::size_t skipLiteral(std::string_view text, std::size_t at, std::string& result) {
     const char quote = text[at];
     result += quote;

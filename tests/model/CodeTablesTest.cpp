@@ -41,7 +41,7 @@ TEST_P(CodeTableRows, ChoiceList_HasItsCodesAsIndices) {
             ended = true;
             continue;
         }
-        EXPECT_FALSE(ended) << "code " << row.code << " stands behind one that is not offered";
+        EXPECT_FALSE(ended) << "code " << row.code << " stands after one that is not offered";
         EXPECT_EQ(row.code, index++);
     }
 }

@@ -101,7 +101,7 @@ INSTANTIATE_TEST_SUITE_P(Texts, TrimControls,
                                            TrimRow{" 12 ", "12"}, TrimRow{"12\r\n", "12"},
                                            TrimRow{"\r\n12", "12"}, TrimRow{"\0"s + "1\0"s, "1"},
                                            TrimRow{"\r\n\r\n", ""}, TrimRow{"1\r2", "1\r2"},
-                                           // Blanks go first and once: behind a CR they stay.
+                                           // Blanks go first and once: after a CR they stay.
                                            TrimRow{"12 \r", "12 "}, TrimRow{"\r 12", " 12"}));
 
 struct NumericRow {
@@ -124,7 +124,7 @@ INSTANTIATE_TEST_SUITE_P(LettersAndSigns, IsNumeric,
                                            NumericRow{"50%", true}, NumericRow{"%", false},
                                            NumericRow{"s", false}, NumericRow{"5s%", true},
                                            NumericRow{"5 ms", false}));
-// A point ahead of a number passes, whatever the number looks like.
+// A point before a number passes, whatever the number looks like.
 INSTANTIATE_TEST_SUITE_P(PointAhead, IsNumeric,
                          ::testing::Values(NumericRow{".1.5", true}, NumericRow{". 5", true},
                                            NumericRow{"-..5", true}, NumericRow{".", false},

@@ -78,7 +78,7 @@ TEST_F(Graph3dOpsTest, StampRow_LabelComesWithTheFirstRowOfTheNextTime) {
     row("12:00:01");
     EXPECT_EQ(label(11), "12:00:01     ");
     EXPECT_EQ(label(12), "");
-    // The row behind a label moves the last stamp on.
+    // The row after a label moves the last stamp on.
     EXPECT_EQ(form.LastStampText, "12:00:01");
     EXPECT_EQ(form.LastStampRow, 12);
 }

@@ -84,7 +84,7 @@ TEST_F(RendererTest, FromAbove_TheRowsLeaveNoGaps) {
 
 TEST_F(RendererTest, NearerRows_HideFartherOnes) {
     row(0, -1);   // near, and high
-    row(9, -50);  // far, and low: behind the first all the way
+    row(9, -50);  // far, and low: hidden by the first all the way
     graph.setView({80, 0, 2.8, 6, 5, 5});
     const int both = drawn(draw().rows);
     const auto over = draw().rows;

@@ -42,7 +42,7 @@ class Player {
             at += words * 2;
         }
         if (!ended) fault("no end record");
-        if (at != file_.size()) fault("bytes behind the end");
+        if (at != file_.size()) fault("bytes after the end");
         if (longAt(34) != largest) fault("largest record");
         if (!stack_.empty()) fault("a saved context is left");
         for (const Object& object : objects_)
