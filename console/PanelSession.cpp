@@ -7,6 +7,7 @@
 #include "console/Graph3DCommands.h"
 #include "console/Graph3DText.h"
 #include "console/GraphText.h"
+#include "console/LogAccess.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 
@@ -42,12 +43,18 @@ const PanelSession::CommandRow PanelSession::kCommands[] = {
     {"connect", &PanelSession::connect}, {"disconnect", &PanelSession::disconnect},
     {"answer", &PanelSession::answer},   {"pump", &PanelSession::pump},
     {"image3d", &PanelSession::image3d}, {"quit", &PanelSession::quit},
+    {"call", &PanelSession::call},
 };
 
 PanelSession::PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address)
     : program_(program), m_(means), address_(std::move(address)), live_(program.forms()) {
     m_.events.whileWaiting = [this](int ms) { return whileWaiting(ms); };
     program_.Ended.connect([this] { ended_ = true; });
+    handlers_.on(program_.logs().rootDebug.DebuggerError, [this](const std::string& text) {
+        m_.output.line("event DebuggerError " + text);
+    });
+    handlers_.on(program_.logs().DebuggerLine,
+                 [this](const std::string& text) { m_.errors.line(text); });
 }
 
 PanelSession::~PanelSession() { m_.events.whileWaiting = nullptr; }
@@ -200,6 +207,12 @@ void PanelSession::choose(std::string_view rest) {
 
 void PanelSession::set(std::string_view rest) {
     const auto [name, text] = firstWord(rest);
+    if (namesALog(name)) {
+        if (!setLogMember(program_.logs(), name, std::string(text)))
+            complain("\"" + std::string(name) + "\" cannot be set to \"" + std::string(text) +
+                     "\"");
+        return;
+    }
     if (Control* control = find(name)) tell(putText(*control, std::string(text)), name);
 }
 
@@ -215,7 +228,9 @@ void PanelSession::show(std::string_view rest) {
             m_.output.line(line);
         return;
     }
-    const std::optional<std::string> text = textOf(program_.forms(), program_.variables(), path);
+    const std::optional<std::string> text =
+        namesALog(path) ? logMember(program_.logs(), path)
+                        : textOf(program_.forms(), program_.variables(), path);
     if (text) {
         m_.output.line(*text);
     } else {
@@ -259,5 +274,14 @@ void PanelSession::pump(std::string_view rest) {
 }
 
 void PanelSession::quit(std::string_view) { ended_ = true; }
+
+void PanelSession::call(std::string_view rest) {
+    const auto [name, text] = firstWord(rest);
+    const auto arguments = splitArguments(text);
+    const auto result = arguments ? callLog(program_.logs(), name, *arguments) : std::nullopt;
+    if (!result)
+        return complain("there is no routine \"" + std::string(name) + "\" of these arguments");
+    if (!result->empty()) m_.output.line(*result);
+}
 
 }  // namespace zel

@@ -19,8 +19,6 @@
 
 namespace zel {
 
-/// Exit statuses of the tool.
-
 /// Lines are read between commands, and inside of a command while a modal form, a continuous view,
 /// a recording or a script runs.
 class PanelSession {
@@ -69,6 +67,7 @@ class PanelSession {
     void pump(std::string_view rest);
     void image3d(std::string_view rest);
     void quit(std::string_view rest);
+    void call(std::string_view rest);
 
     Control* find(std::string_view name);
     void tell(Done done, std::string_view name);
@@ -82,6 +81,7 @@ class PanelSession {
     std::int64_t pumpUntil_ = 0;
     bool ended_ = false;
     int status_ = kDone;
+    Handlers handlers_;
 };
 
 }  // namespace zel

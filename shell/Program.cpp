@@ -36,6 +36,7 @@
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
 #include "platform/TimerDriver.h"
+#include "shell/Logs.h"
 #include "shell/ProgramEnd.h"
 #include "shell/SecondTimer.h"
 #include "shell/ServerMode.h"
@@ -61,8 +62,9 @@ namespace zel {
 struct Program::Rooms {
     Rooms(const Platform& p, std::string commandLine)
         : platform(p),
+          logs(p, commandLine),
           timers(p.events),
-          link(forms, line, p.serialPort, p.tcpSocket, session, p.debug),
+          link(forms, line, p.serialPort, p.tcpSocket, session, logs.line()),
           reader(forms, line, link, mirror.SweepTime, session),
           exchange(panel, line, link, reader, session),
           bytes(forms, line, link, p.tcpSocket, session),
@@ -144,6 +146,7 @@ struct Program::Rooms {
     Session session{platform.clock, platform.events, platform.boxes, panel.DebugTextBox};
     ZEL3Variables mirror;
     ZELBas line;
+    Logs logs;
     TimerDriver timers;
     ByteLink link;
     AnswerReader reader;
@@ -210,6 +213,7 @@ ZELBas& Program::link() { return rooms_->line; }
 CommandExchange& Program::exchange() { return rooms_->exchange; }
 TraceReader& Program::traces() { return rooms_->traces; }
 SweepHistory& Program::history() { return rooms_->history; }
+Logs& Program::logs() { return rooms_->logs; }
 
 void Program::start() {
     rooms_->recent.load();

@@ -13,6 +13,7 @@
 namespace zel {
 
 class CommandExchange;
+class Logs;
 class SweepHistory;
 class TraceReader;
 
@@ -31,6 +32,7 @@ class Program {
     TraceReader& traces();
     /// The sweeps of the last while.
     SweepHistory& history();
+    Logs& logs();
 
     /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
     /// the server's window is closed; `ended` is then true.

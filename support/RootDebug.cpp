@@ -118,7 +118,7 @@ void RootDebug::Pop() {
 void RootDebug::LogMessage(std::int32_t Level, const std::string& Source,
                            const std::string& Description) {
     CallRecord record;
-    // A routine that tells its own name is the call that is already on the stack.
+    // A routine that gives its own name is the call that is already on the stack.
     if (CallStackTop >= 0 &&
         CallStack[static_cast<std::size_t>(CallStackTop)].FunctionName == Source)
         record = CallStack[static_cast<std::size_t>(CallStackTop)];

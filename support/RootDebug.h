@@ -61,7 +61,7 @@ class RootDebug {
     Event<const RuntimeFailure&, const std::vector<std::string>&> DisplayError;
 
     void Activate() { Initialized = true; }
-    /// An entry of `Level` 0 to 7; `Source` is the routine that tells it.
+    /// An entry of `Level` 0 to 7; `Source` is the routine that says it.
     void LogMessage(std::int32_t Level, const std::string& Source, const std::string& Description);
     /// An entry of level 7 with the failure and all calls; then the report.
     void LogRuntimeError(const std::string& ComponentName, const std::string& ClassName,

@@ -52,6 +52,32 @@ TEST_F(PanelSessionTest, OutputThatCannotBeWritten_EndsTheSession) {
     EXPECT_EQ(errors.str(), "");  // the third line was not read any more
 }
 
+TEST_F(PanelSessionTest, Logs_WrongNamesAndValues_AreTold) {
+    play(
+        "show RootDebug.Wings\nset RootDebug.LogPushPop maybe\nset RootDebug.CallStackTop 5\n"
+        "call RootDebug.LogMessage high \"a\" \"b\"\ncall RootDebug.Pop 1\n"
+        "call RootDebug.PushInfo \"a\ncall Fly\nshow RootDebug.CallStackTop\n");
+    EXPECT_EQ(out.str(), "-1\n");
+    EXPECT_EQ(status, kWrongUse);
+    EXPECT_EQ(errors.str(),
+              "zelctl: line 1: there is nothing to show as \"RootDebug.Wings\"\n"
+              "zelctl: line 2: \"RootDebug.LogPushPop\" cannot be set to \"maybe\"\n"
+              "zelctl: line 3: \"RootDebug.CallStackTop\" cannot be set to \"5\"\n"
+              "zelctl: line 4: there is no routine \"RootDebug.LogMessage\" of these arguments\n"
+              "zelctl: line 5: there is no routine \"RootDebug.Pop\" of these arguments\n"
+              "zelctl: line 6: there is no routine \"RootDebug.PushInfo\" of these arguments\n"
+              "zelctl: line 7: there is no routine \"Fly\" of these arguments\n");
+}
+
+TEST_F(PanelSessionTest, Logs_LinesForTheDebugger_GoToTheErrors) {
+    EXPECT_EQ(play("set RootDebug.DebuggerLogEnabled true\n"
+                   "call RootDebug.LogMessage 3 \"Listen\" \"say \"\"hello\"\"\"\n"),
+              "");
+    EXPECT_EQ(errors.str(),
+              "...    Warning\n          SOURCE      : Listen\n"
+              "          DESCRIPTION : say \"hello\"\n");
+}
+
 TEST_F(PanelSessionTest, CommentsAndBlankLines_PrintNothing) {
     EXPECT_EQ(play("# words\n\n   \n  # more\r\n"), "");
     EXPECT_EQ(status, kDone);
