@@ -11,7 +11,7 @@ class WaterfallKeys {
   public:
     WaterfallKeys(WaterfallForm& form, FileOps& files, MessageBoxes& boxes);
 
-    /// Asks for a file; a failure is told in a box.
+    /// Asks for a file; a failure is shown in a box.
     void PictureSave_Click();
 
   private:

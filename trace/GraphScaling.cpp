@@ -128,7 +128,7 @@ void GraphScaling::DisplayDataOnGraph(double xStart, double xStop, double interv
                                       : (xStop - xStart) / (pairs * intervals);
     panel_.CWGraph1.plotY(data, first, increment);
     if (autoPeak || zeroSpan) BuildXYVectors(increment);
-    // The full read cycle sizes the vectors ahead of the new range: a row stands at its own x.
+    // The full read cycle sizes the vectors before the new range: a row stands at its own x.
     std::vector<double> xs = panel_.XVector;
     const bool stale = xs.size() < data.size() || xs.empty() || xs.front() != first;
     if (stale || std::fabs(xs.back() - xs.front() -

@@ -81,7 +81,7 @@ void SweepControl::RunContinuousView() {
     panel_.StopButton.Visible = true;
     SetStopFlag(true);
     panel_.ContinuosLoopActive = true;
-    // Rows of an earlier view stay, this one goes on behind the last of them.
+    // Rows of an earlier view stay, this one goes on after the last of them.
     const GraphCurve3D* last = forms_.waterfall.Graph3D.lastRow();
     if (last != nullptr && last->depth.front() >= panel_.YVectorVal) countRow();
     bool good = firstPass();

@@ -47,7 +47,7 @@ class WaterfallCanvas : public QWidget {
     QPointF pointer_;
     QTimer pointerRead_;
     QTimer wheelEnd_;
-    QTimer rest_;         ///< behind a picture, so that sweeps have the processor as well
+    QTimer rest_;         ///< after a picture, so that sweeps have the processor as well
     bool waits_ = false;  ///< a change came meanwhile
 };
 

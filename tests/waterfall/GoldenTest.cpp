@@ -1,5 +1,5 @@
 // Small pictures compared with kept ones. With ZEL_GOLDEN=write in the environment they are written
-// anew: look at them before they are kept.
+// again: look at them before they are kept.
 
 #include <gtest/gtest.h>
 
