@@ -82,6 +82,10 @@ bool Wire::step(double target) {
             return true;
         }
         const auto next = device_.nextEvent();
+        if (breaksWait(std::min(target, next ? now() + *next : target))) {
+            waiting_ = false;  // the line itself is answered then
+            return true;
+        }
         if (!next || now() + *next > target + kSlack) {
             return false;
         }
@@ -99,6 +103,12 @@ bool Wire::step(double target) {
     }
     handle(line);
     return true;
+}
+
+// A bare line end ends a wait for a sweep: the host has given it up.
+bool Wire::breaksWait(double before) const {
+    return !lines_.empty() && !lines_.front().tooLong && lines_.front().text.empty() &&
+           lines_.front().arrival <= before + kSlack;
 }
 
 void Wire::run(double target) {
@@ -238,6 +248,9 @@ std::optional<double> Wire::nextDue() const {
     if (waiting_) {
         if (const auto event = device_.nextEvent()) {
             consider(*event);
+        }
+        if (breaksWait(receiving_)) {
+            consider(lines_.front().arrival - now());
         }
     } else if (!lines_.empty() && segments_.size() < kMostSegments) {
         consider(lines_.front().arrival - now());

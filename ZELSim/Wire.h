@@ -63,6 +63,7 @@ class Wire {
     double byteTime() const { return baud_ > 0 ? 10.0 / baud_ : 0.0; }
     void run(double target);
     bool step(double target);
+    bool breaksWait(double before) const;
     void handle(const Line& line);
     void firstLine(const std::string& text);
     void secondLine(const std::string& text);

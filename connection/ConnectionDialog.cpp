@@ -13,29 +13,25 @@ constexpr int kFallbackPorts = 10;
 
 }  // namespace
 
-ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, Handshake& handshake,
-                                   Profiles& profiles, SessionClock& sessionClock,
-                                   SoftPanel& softPanel, TraceReader& traces, SerialPortList& ports,
-                                   Events& events)
+ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, SessionStart& start,
+                                   Profiles& profiles, SerialPortList& ports,
+                                   const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       dialog_(forms.main),
       link_(link),
-      handshake_(handshake),
+      start_(start),
       profiles_(profiles),
-      sessionClock_(sessionClock),
-      softPanel_(softPanel),
-      traces_(traces),
       ports_(ports),
-      events_(events) {
-    dialog_.Load.connect([this] { Form_Load(); });
-    panel_.Direct.Clicked.connect([this] { Direct_Click(); });
-    panel_.ImmConnect.Clicked.connect([this] { ImmConnect_Click(); });
-    dialog_.ZELButton.Clicked.connect([this] { ZELButton_Click(); });
-    dialog_.LoadSettingsButton.Clicked.connect([this] { profiles_.LoadSettings_Click(); });
-    dialog_.SaveSettingsButton.Clicked.connect([this] { profiles_.SaveSettings_Click(); });
+      session_(session) {
+    handlers_.on(dialog_.Load, [this] { Form_Load(); });
+    handlers_.on(panel_.Direct.Clicked, [this] { Direct_Click(); });
+    handlers_.on(panel_.ImmConnect.Clicked, [this] { ImmConnect_Click(); });
+    handlers_.on(dialog_.ZELButton.Clicked, [this] { ZELButton_Click(); });
+    handlers_.on(dialog_.LoadSettingsButton.Clicked, [this] { profiles_.LoadSettings_Click(); });
+    handlers_.on(dialog_.SaveSettingsButton.Clicked, [this] { profiles_.SaveSettings_Click(); });
     for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1}) {
-        close->Clicked.connect([this] {
+        handlers_.on(close->Clicked, [this] {
             dialog_.Hide();
             panel_.ErrorFlag = false;
         });
@@ -92,7 +88,7 @@ void ConnectionDialog::SetConnectionKind(std::int16_t kind) {
     if (!panel_.immConnectState) showModal();
 }
 
-void ConnectionDialog::showModal() { showModalForm(dialog_, events_); }
+void ConnectionDialog::showModal() { showModalForm(dialog_, session_.events); }
 
 void ConnectionDialog::Direct_Click() {
     panel_.immConnectState = false;
@@ -116,19 +112,18 @@ void ConnectionDialog::ImmConnect_Click() {
 
 void ConnectionDialog::ZELButton_Click() {
     connectDirect(true);
-    softPanel_.SetButtonsStatus(CF::Freq);
+    start_.showFirstMenu();
 }
 
 void ConnectionDialog::connectDirect(bool readTrace) {
+    dialog_.AdviceLabel.Caption = "";
     link_.OpenPortFromDialog();
     if (panel_.ConnectionState != CF::DIRECTCON || !dialog_.IsConnectedToPort) return;
-    sessionClock_.InitTimer("start");
-    handshake_.InitConnection();
+    start_.setClock("start");
+    start_.connect();
     profiles_.SaveSettings_Click();
     panel_.State = CF::Freq;
-    if (!readTrace || !panel_.isConnected || panel_.InstrumentMode == CF::POWERSENSOR) return;
-    bool success = false;
-    traces_.ReadSingleTrace2({}, success);
+    if (readTrace) start_.readFirstSweep();
 }
 
 }  // namespace zel

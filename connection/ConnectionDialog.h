@@ -3,24 +3,20 @@
 
 #include <cstdint>
 
-#include "connection/Handshake.h"
 #include "connection/Profiles.h"
-#include "connection/SessionClock.h"
+#include "connection/SessionStart.h"
 #include "forms/Forms.h"
 #include "link/ByteLink.h"
-#include "panel/SoftPanel.h"
-#include "platform/Events.h"
 #include "platform/SerialPort.h"
-#include "trace/TraceReader.h"
+#include "platform/Session.h"
 
 namespace zel {
 
 class ConnectionDialog {
   public:
     /// Connects the menu entries of the built kinds and the dialog's buttons.
-    ConnectionDialog(Forms& forms, ByteLink& link, Handshake& handshake, Profiles& profiles,
-                     SessionClock& sessionClock, SoftPanel& softPanel, TraceReader& traces,
-                     SerialPortList& ports, Events& events);
+    ConnectionDialog(Forms& forms, ByteLink& link, SessionStart& start, Profiles& profiles,
+                     SerialPortList& ports, const Session& session);
 
     void Form_Load();
     /// The names of the platform's serial ports into `CommPorts`.
@@ -40,13 +36,11 @@ class ConnectionDialog {
     ControllerForm& panel_;
     MainForm& dialog_;
     ByteLink& link_;
-    Handshake& handshake_;
+    SessionStart& start_;
     Profiles& profiles_;
-    SessionClock& sessionClock_;
-    SoftPanel& softPanel_;
-    TraceReader& traces_;
     SerialPortList& ports_;
-    Events& events_;
+    Session session_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

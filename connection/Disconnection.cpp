@@ -1,8 +1,7 @@
 #include "connection/Disconnection.h"
 
-#include "link/DebugLine.h"
+#include "link/WaitNotice.h"
 #include "support/CommandWord.h"
-#include "support/Text.h"
 
 namespace zel {
 namespace {
@@ -16,41 +15,37 @@ constexpr std::size_t kLongestModemAnswer = 4096;
 
 }  // namespace
 
-Disconnection::Disconnection(Forms& forms, ByteLink& link, CommandExchange& exchange,
-                             Socket& TCPSocket, SessionClock& sessionClock, GraphInteraction& graph,
-                             const Clock& clock, Events& events, MessageBoxes& boxes)
+Disconnection::Disconnection(Forms& forms, const InstrumentLink& link, Socket& TCPSocket,
+                             SessionClock& sessionClock, GraphInteraction& graph,
+                             const Interlock& interlock)
     : forms_(forms),
       panel_(forms.controller),
       dialog_(forms.main),
-      link_(link),
-      exchange_(exchange),
+      link_(link.bytes),
+      exchange_(link.exchange),
       socket_(TCPSocket),
       sessionClock_(sessionClock),
       graph_(graph),
-      events_(events),
-      boxes_(boxes),
-      StopwatchA_(clock) {
-    dialog_.DisconnectButton.Clicked.connect([this] { DisconnectButton_Click(); });
-    dialog_.DisconnectButton2.Clicked.connect([this] { DisconnectButton_Click(); });
-    panel_.Disconnect.Clicked.connect([this] { DisconnectButton_Click(); });
+      interlock_(interlock),
+      session_(interlock.session()),
+      StopwatchA_(session_.clock) {
+    handlers_.on(dialog_.DisconnectButton.Clicked, [this] { DisconnectButton_Click(); });
+    handlers_.on(dialog_.DisconnectButton2.Clicked, [this] { DisconnectButton_Click(); });
+    handlers_.on(panel_.Disconnect.Clicked, [this] { DisconnectButton_Click(); });
+    handlers_.on(link.reader.AttemptAbandoned, [this] { giveAttemptBack(); });
 }
 
 void Disconnection::pointer(int shape) {
     panel_.MousePointer = shape;
-    events_.pump();
+    session_.events.pump();
 }
 
 void Disconnection::DisconnectButton_Click() {
-    if (panel_.ContinuosLoopActive) {
-        boxes_.show({BoxIcon::Warning, std::string("Please exit the Continunous View Mode first") +
-                                           kCrLf +
-                                           "Use the red stop button in the upper right corner."});
-        return;
-    }
+    if (interlock_.refuses(panel_.Disconnect)) return;
     if (!panel_.isConnected) return attemptOver();
     const BoxAnswer answer =
-        boxes_.show({BoxIcon::Question, "Are you sure you want to close the connection?",
-                     "Disconnect", BoxButtons::OkCancel});
+        session_.boxes.show({BoxIcon::Question, "Are you sure you want to close the connection?",
+                             "Disconnect", BoxButtons::OkCancel});
     if (answer != BoxAnswer::Ok) {
         pointer(11);
         exchange_.CmdInstrument("REMOTE");
@@ -62,12 +57,16 @@ void Disconnection::DisconnectButton_Click() {
 
 void Disconnection::attemptOver() {
     if (!panel_.ErrorFlag && !link_.portOpen()) {
-        boxes_.show({BoxIcon::Information, "Not Connected"});
+        session_.boxes.show({BoxIcon::Information, "Not Connected"});
         panel_.ErrorFlag = true;
     }
+    giveAttemptBack();
+}
+
+void Disconnection::giveAttemptBack() {
     pointer(0);
     if (link_.portOpen()) link_.CloseComPort();
-    DebugLine(panel_, " ");
+    session_.DebugLine(" ");
 }
 
 void Disconnection::endSession() {
@@ -75,7 +74,13 @@ void Disconnection::endSession() {
     const bool direct = panel_.ConnectionState == CF::DIRECTCON;
     if (link_.portOpen() || tcp) {
         pointer(11);
-        exchange_.CmdInstrument("LOCAL");
+        if (exchange_.busy()) {
+            // What is under way is left: no exchange begins inside another.
+            exchange_.leaveWait(0);
+            exchange_.sayLocal();
+        } else {
+            exchange_.CmdInstrument("LOCAL");
+        }
         socket_.close();
         pointer(0);
     }
@@ -88,7 +93,20 @@ void Disconnection::endSession() {
     notConnectedLook();
 }
 
+void Disconnection::endAtOnce() {
+    const bool begun = panel_.isConnected || dialog_.IsConnecting || dialog_.IsConnectedToPort;
+    const bool dialled = panel_.ConnectionState != CF::DIRECTCON && !link_.isTcp();
+    if (begun && link_.usable()) {
+        exchange_.sayLocal();
+        if (dialled && link_.portOpen()) HangUpModem();
+    }
+    link_.CloseComPort();
+    link_.CloseTCPSocket();
+    panel_.isConnected = false;
+}
+
 void Disconnection::notConnectedLook() {
+    showLinkLost(panel_, false);
     dialog_.AirBaudRateText.Text = "";
     dialog_.ModemConnected = false;
     dialog_.Hide();
@@ -123,7 +141,7 @@ void Disconnection::HangUpModem() {
     // The answers make no difference: the hang-up goes on in any case.
     link_.WriteToLink("+++");
     awaitModemAnswer();
-    events_.sleep(kModemPauseMs);
+    session_.events.sleep(kModemPauseMs);
     link_.WriteToLink("ATH0\r");
     awaitModemAnswer();
 }
@@ -134,7 +152,7 @@ void Disconnection::awaitModemAnswer() {
     while (StopwatchA_.Elapsed() < kModemAnswerMs && link_.portOpen()) {
         answer += link_.ReadFromLink(true);
         if (answer.find('\r') != std::string::npos || answer.size() > kLongestModemAnswer) return;
-        events_.wait(kPollMs);
+        session_.events.wait(kPollMs);
     }
 }
 

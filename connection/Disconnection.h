@@ -3,32 +3,33 @@
 
 #include "connection/SessionClock.h"
 #include "forms/Forms.h"
-#include "link/ByteLink.h"
-#include "link/CommandExchange.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "link/InstrumentLink.h"
+#include "platform/Session.h"
 #include "platform/Socket.h"
 #include "trace/GraphInteraction.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
 class Disconnection {
   public:
     /// Connects the disconnect buttons of the dialog and the menu entry.
-    Disconnection(Forms& forms, ByteLink& link, CommandExchange& exchange, Socket& TCPSocket,
-                  SessionClock& sessionClock, GraphInteraction& graph, const Clock& clock,
-                  Events& events, MessageBoxes& boxes);
+    Disconnection(Forms& forms, const InstrumentLink& link, Socket& TCPSocket,
+                  SessionClock& sessionClock, GraphInteraction& graph, const Interlock& interlock);
 
     void DisconnectButton_Click();
     /// The same without the question.
     void endSession();
+    /// The program ends at once: LOCAL, the hang-up of a dialled line, the close. Nothing is asked
+    /// or told.
+    void endAtOnce();
     /// Two silent answers take a little over 10.5 s.
     void HangUpModem();
     void ClosePortAndClearIdentity();
 
   private:
     void attemptOver();
+    void giveAttemptBack();
     void notConnectedLook();
     void awaitModemAnswer();
     void pointer(int shape);
@@ -41,9 +42,10 @@ class Disconnection {
     Socket& socket_;
     SessionClock& sessionClock_;
     GraphInteraction& graph_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    const Interlock& interlock_;
+    Session session_;
     Stopwatch StopwatchA_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

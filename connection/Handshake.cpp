@@ -3,9 +3,10 @@
 #include <algorithm>
 #include <cmath>
 
-#include "link/DebugLine.h"
+#include "link/WaitNotice.h"
 #include "panel/MenuTables.h"
 #include "panel/ModeOptions.h"
+#include "panel/SoftPanel.h"
 #include "support/CommandWord.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
@@ -21,29 +22,48 @@ constexpr std::size_t kIdentityShown = 13;  // characters
 
 }  // namespace
 
-Handshake::Handshake(Forms& forms, ZEL3Variables& mirror, ZELBas& state, ByteLink& link,
-                     AnswerReader& reader, CommandExchange& exchange, FrequencyLabels& labels,
-                     SoftPanel& softPanel, MenuFill& fill, Events& events, MessageBoxes& boxes)
+Handshake::Handshake(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& link,
+                     FrequencyLabels& labels, const MenuRoutines& menus, const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       dialog_(forms.main),
       mirror_(mirror),
-      state_(state),
-      link_(link),
-      reader_(reader),
-      exchange_(exchange),
+      state_(link.state),
+      link_(link.bytes),
+      reader_(link.reader),
+      exchange_(link.exchange),
       labels_(labels),
-      softPanel_(softPanel),
-      fill_(fill),
-      events_(events),
-      boxes_(boxes) {}
+      softPanel_(menus.softPanel),
+      fill_(menus.fill),
+      session_(session) {
+    for (Button* cancel :
+         {&dialog_.CancelButton, &dialog_.CancelConnButton, &dialog_.CancelConnButton1})
+        handlers_.on(cancel->Clicked, [this] { exchange_.leaveWait(0); });
+}
 
 void Handshake::mouse(int shape) {
     dialog_.MousePointer = shape;
-    events_.pump();
+    session_.events.pump();
 }
 
 void Handshake::InitConnection() {
+    const DialogueScope scope(state_);
+    const bool dialled = panel_.ConnectionState != CF::DIRECTCON && !link_.isTcp();
+    if (!dialled) state_.DialCancelled = false;
+    state_.BareCrFirst = false;
+    state_.SweepTimeTold = 0;
+    // For as long as the handshake lasts, the keys that close the dialog leave it.
+    for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1})
+        close->Caption = "Cancel";
+    connect();
+    for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1})
+        close->Caption = "Close";
+    if (!panel_.isConnected && !state_.DialCancelled)
+        (link_.isTcp() ? forms_.tcpConnection.AdviceLabel : dialog_.AdviceLabel).Caption =
+            connectionAdvice(forms_);
+}
+
+void Handshake::connect() {
     mouse(11);
     DeselectOptionBoxes(panel_);
     dialog_.IsConnecting = true;
@@ -67,15 +87,15 @@ void Handshake::InitConnection() {
 bool Handshake::wakeInstrument() {
     const std::int16_t kind = panel_.ConnectionState;
     if (kind == CF::GSMCON || kind == CF::MODEMGSMCON || kind == CF::GSMMODEMCON) {
-        DebugLine(panel_, "...");
-        events_.sleep(kRadioSettleMs);
+        session_.DebugLine("...");
+        session_.events.sleep(kRadioSettleMs);
     }
-    DebugLine(panel_, "Sending initializing <CR> ...");
-    events_.sleep(kBeforeFirstCrMs);
+    session_.DebugLine("Sending initializing <CR> ...");
+    session_.events.sleep(kBeforeFirstCrMs);
     link_.WriteToLink("\r");
-    DebugLine(panel_, "Reading the first response...");
+    session_.DebugLine("Reading the first response...");
     if (reader_.ReadAnswer().empty()) return false;
-    DebugLine(panel_, "Successful");
+    session_.DebugLine("Successful");
     mouse(11);
     return true;
 }
@@ -95,7 +115,7 @@ bool Handshake::identify() {
     std::string id;
     if (!instrumentAnswers() || !exchange_.GetInstrument("IDN?", id)) return false;
     const std::string head = id.substr(0, kIdentityShown);
-    DebugLine(panel_, head);
+    session_.DebugLine(head);
     const std::vector<std::string> fields = split(id, ',');
     if (fields.size() > 1)
         mirror_.InstrumentModel =
@@ -185,7 +205,7 @@ void Handshake::noInstrument(bool told) {
     panel_.Picture3.Visible = false;
     if (!told) {
         if (!state_.DialCancelled)
-            boxes_.show({BoxIcon::Critical, "No ZEL3 found at the specified address!"});
+            session_.boxes.show({BoxIcon::Critical, "No ZEL3 found at the specified address!"});
         panel_.ErrorFlag = false;
     }
     // What was opened for this attempt is given back, so that the next one can begin.

@@ -4,29 +4,25 @@
 #include <string>
 
 #include "forms/Forms.h"
-#include "link/AnswerReader.h"
-#include "link/ByteLink.h"
-#include "link/CommandExchange.h"
+#include "link/InstrumentLink.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
-#include "panel/SoftPanel.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "trace/FrequencyLabels.h"
 
 namespace zel {
 
 class Handshake {
   public:
-    Handshake(Forms& forms, ZEL3Variables& mirror, ZELBas& state, ByteLink& link,
-              AnswerReader& reader, CommandExchange& exchange, FrequencyLabels& labels,
-              SoftPanel& softPanel, MenuFill& fill, Events& events, MessageBoxes& boxes);
+    Handshake(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& link,
+              FrequencyLabels& labels, const MenuRoutines& menus, const Session& session);
 
     /// The link is up; `isConnected` tells the outcome. Any failure leaves the panel as far as it
-    /// got.
+    /// got, and the dialog's `AdviceLabel` says what to check. The dialog's Cancel leaves it.
     void InitConnection();
 
   private:
+    void connect();
     bool wakeInstrument();
     /// False once a silence has taken the connection down, which was told then.
     bool instrumentAnswers() const;
@@ -51,8 +47,8 @@ class Handshake {
     FrequencyLabels& labels_;
     SoftPanel& softPanel_;
     MenuFill& fill_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -14,6 +14,7 @@ void SessionClock::InitTimer(std::string_view word) {
 }
 
 void SessionClock::show() {
+    if (panel_.LinkLost) return;  // it says so, and when
     panel_.TimeLabel.Caption = timeOfDayText(clock_.date() - panel_.StartT);
 }
 

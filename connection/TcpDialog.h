@@ -1,25 +1,20 @@
 #pragma once
 // The dialog that connects to a copy of the program in server mode.
 
-#include "connection/Handshake.h"
-#include "connection/SessionClock.h"
+#include "connection/SessionStart.h"
 #include "forms/Forms.h"
-#include "link/ByteLink.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "link/InstrumentLink.h"
 #include "platform/Services.h"
+#include "platform/Session.h"
 #include "platform/Socket.h"
-#include "trace/TraceReader.h"
 
 namespace zel {
 
 class TcpDialog {
   public:
     /// Connects the menu entry and the dialog's buttons.
-    TcpDialog(Forms& forms, ByteLink& link, Handshake& handshake, SessionClock& sessionClock,
-              TraceReader& traces, Socket& TCPSocket, SettingsStore& settings, const Clock& clock,
-              Events& events, MessageBoxes& boxes);
+    TcpDialog(Forms& forms, const InstrumentLink& link, SessionStart& start, Socket& TCPSocket,
+              SettingsStore& settings, const Session& session);
 
     void Form_Load();
     void TCPConnection_Click();
@@ -29,21 +24,21 @@ class TcpDialog {
     void connect(bool readTrace);
 
   private:
-    bool awaitConnection();
+    bool awaitConnection(const std::string& where);
+    bool left() const;
+    void giveUp();
     bool probe();
 
     Forms& forms_;
     ControllerForm& panel_;
     TCPConnectionForm& dialog_;
-    ByteLink& link_;
-    Handshake& handshake_;
-    SessionClock& sessionClock_;
-    TraceReader& traces_;
+    InstrumentLink link_;
+    SessionStart& start_;
     Socket& socket_;
     SettingsStore& settings_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
     Stopwatch StopwatchA_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -36,13 +36,15 @@ class SimulatorFront : public Front {
     }
     const Clock& clock() const override { return clock_; }
     Events& events() override { return events_; }
+    QtSignals& endSignals() override { return signals_; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
-        return {clock_,     served,        boxes,     port_,   ports_,
-                tcpSocket_, serverSocket_, settings_, debug_,  clipboard_,
-                launcher_,  startup_,      folder_,   dialogs, files_};
+        return {clock_,        served,    boxes,  port_,      ports_,    tcpSocket_,
+                serverSocket_, settings_, debug_, clipboard_, launcher_, startup_,
+                folder_,       dialogs,   files_, signals_};
     }
 
   private:
+    QtSignals signals_;
     VirtualClock clock_;
     VirtualEvents events_{clock_};
     // Virtual time has to go on from one answer to the next also where no sweep is waited for.
@@ -64,10 +66,12 @@ class PortFront : public Front {
     explicit PortFront(const std::string& home) : qt_(QString::fromStdString(home)) {}
     const Clock& clock() const override { return qt_.clock; }
     Events& events() override { return qt_.events; }
+    QtSignals& endSignals() override { return qt_.endSignals; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
         return {qt_.clock,     served,           boxes,        qt_.serialPort, qt_.serialPorts,
                 qt_.tcpSocket, qt_.serverSocket, qt_.settings, qt_.debug,      clipboard_,
-                qt_.launcher,  qt_.startup,      qt_.folder,   dialogs,        qt_.files};
+                qt_.launcher,  qt_.startup,      qt_.folder,   dialogs,        qt_.files,
+                qt_.endSignals};
     }
 
   private:

@@ -23,11 +23,15 @@ class ToolkitSession {
     std::unique_ptr<Application> application_;
 };
 
+class QtSignals;
+
 class Front {
   public:
     virtual ~Front() = default;
     virtual const Clock& clock() const = 0;
     virtual Events& events() = 0;
+    /// The signals that end the program: `QtSignals` of either front.
+    virtual QtSignals& endSignals() = 0;
     /// The platform with the given event loop, which stands in front of `events`.
     virtual Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) = 0;
 };

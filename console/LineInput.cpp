@@ -3,10 +3,17 @@
 #include <poll.h>
 #include <unistd.h>
 
+#include <array>
 #include <cerrno>
 #include <utility>
 
 namespace zel {
+namespace {
+
+/// Bytes taken at once, and only when no whole line is left: as many lines at most.
+constexpr std::size_t kReadAhead = 1000;
+
+}  // namespace
 
 LineInput::Got StreamLines::next(std::string& line, bool /*block*/) {
     line.clear();
@@ -56,13 +63,16 @@ bool DescriptorLines::take(std::string& line, Got& got) {
 
 /// False when nothing has come.
 bool DescriptorLines::fill(bool block) {
-    pollfd ready{descriptor_, POLLIN, 0};
-    if (::poll(&ready, 1, block ? -1 : 0) <= 0) return block;
-    char bytes[4096];
-    const ssize_t count = ::read(descriptor_, bytes, sizeof bytes);
-    if (count > 0) {
-        waiting_.append(bytes, static_cast<std::size_t>(count));
-    } else if (count == 0 || (errno != EINTR && errno != EAGAIN)) {
+    // A descriptor below 0 is passed over.
+    std::array<pollfd, 2> ready{{{descriptor_, POLLIN, 0}, {wakeDescriptor_, POLLIN, 0}}};
+    const int count = ::poll(ready.data(), ready.size(), block ? -1 : 0);
+    if (count < 0) return errno == EINTR && block && wakeDescriptor_ < 0;
+    if (ready[0].revents == 0) return false;
+    std::array<char, kReadAhead> bytes{};
+    const ssize_t got = ::read(descriptor_, bytes.data(), bytes.size());
+    if (got > 0) {
+        waiting_.append(bytes.data(), static_cast<std::size_t>(got));
+    } else if (got == 0 || (errno != EINTR && errno != EAGAIN)) {
         ended_ = true;
     }
     return true;

@@ -33,10 +33,13 @@ class StreamLines : public LineInput {
     std::istream& stream_;
 };
 
-/// The lines of a file descriptor such as standard input.
+/// The lines of a file descriptor such as standard input. It reads ahead by no more than 1,000
+/// lines; whoever writes faster has to wait.
 class DescriptorLines : public LineInput {
   public:
-    explicit DescriptorLines(int descriptor) : descriptor_(descriptor) {}
+    /// A wait for a line ends, with nothing, when the second descriptor can be read.
+    explicit DescriptorLines(int descriptor, int wakeDescriptor = -1)
+        : descriptor_(descriptor), wakeDescriptor_(wakeDescriptor) {}
     Got next(std::string& line, bool block) override;
 
   private:
@@ -44,6 +47,7 @@ class DescriptorLines : public LineInput {
     bool take(std::string& line, Got& got);
 
     int descriptor_;
+    int wakeDescriptor_;
     std::string waiting_;
     bool passingOver_ = false;  ///< inside of a line that is too long
     bool ended_ = false;

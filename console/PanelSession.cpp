@@ -47,7 +47,7 @@ const PanelSession::CommandRow PanelSession::kCommands[] = {
 };
 
 PanelSession::PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address)
-    : program_(program), m_(means), address_(std::move(address)), live_(program.forms()) {
+    : program_(program), m_(means), address_(std::move(address)), interlock_(program.interlock()) {
     m_.events.whileWaiting = [this](int ms) { return whileWaiting(ms); };
     program_.Ended.connect([this] { ended_ = true; });
     handlers_.on(program_.logs().rootDebug.DebuggerError, [this](const std::string& text) {
@@ -60,13 +60,17 @@ PanelSession::PanelSession(Program& program, const Means& means, std::optional<L
 PanelSession::~PanelSession() { m_.events.whileWaiting = nullptr; }
 
 int PanelSession::run() {
-    live_.beginCommand();
+    interlock_.beginCommand();
     program_.start();
-    live_.endCommand();
+    interlock_.endCommand();
     m_.output.settle();
     serveLines();
     if (!program_.ended()) program_.disconnect();
     m_.output.settle();
+    if (!program_.endedBy().empty()) {
+        m_.errors.line("zelctl: ended by " + program_.endedBy());
+        if (status_ == kDone) status_ = kLinkFailed;
+    }
     return status_;
 }
 
@@ -79,7 +83,7 @@ void PanelSession::serveLines() {
     while (!ended_ && !program_.ended()) {
         if (microsLeft() > 0) {
             idle(kLongestPumpMs);
-        } else if (!readAndExecute()) {
+        } else if (interlock_.waiting() > 0 || !readAndExecute()) {
             idle(kLookMs);
         }
     }
@@ -87,16 +91,17 @@ void PanelSession::serveLines() {
 
 /// The hook of the event loop; true when the wait is over.
 bool PanelSession::whileWaiting(int ms) {
-    if (!live_.fresh()) return false;
+    if (!interlock_.userWorks()) return false;
     if (depth_ >= kDeepest) ended_ = true;
     if (ended_ || program_.ended()) {
-        live_.end();
+        interlock_.endLiveStates();
         return false;
     }
     m_.output.settle();
     if (microsLeft() > 0) {
         idle(ms);
-    } else if (!readAndExecute()) {
+    } else if (interlock_.waiting() > 0 || !readAndExecute()) {
+        // A line whose turn has not come holds those behind it.
         idle(std::min(ms, kLookMs));
     }
     return true;
@@ -139,21 +144,33 @@ void PanelSession::execute(std::string_view line) {
     }
     for (const CommandRow& row : kCommands) {
         if (row.word != word) continue;
-        live_.beginCommand();
-        ++depth_;
-        (this->*row.command)(rest);
-        --depth_;
-        live_.endCommand();
-        m_.output.settle();
+        runCommand([&] { (this->*row.command)(rest); });
         return;
     }
     complain("there is no command \"" + std::string(word) + "\"");
+}
+
+void PanelSession::runCommand(const std::function<void()>& command) {
+    interlock_.beginCommand();
+    ++depth_;
+    command();
+    --depth_;
+    interlock_.endCommand();
+    m_.output.settle();
+}
+
+/// Works a control now, or in its turn when it would begin an exchange inside another.
+void PanelSession::act(const Control& control, const std::string& name,
+                       const std::function<Done()>& work) {
+    if (interlock_.turnOf(control) != Interlock::Turn::Later) return tell(work(), name);
+    interlock_.perform(control, [this, name, work] { runCommand([&] { tell(work(), name); }); });
 }
 
 /// Lets events run, no longer than to the end of a pump.
 void PanelSession::idle(int ms) {
     const std::int64_t left = microsLeft();
     if (left > 0) ms = static_cast<int>(std::clamp<std::int64_t>(left / 1000, 1, ms));
+    if (m_.events.always) m_.events.always();
     m_.events.inner().wait(ms);
 }
 
@@ -187,7 +204,8 @@ void PanelSession::tell(Done done, std::string_view name) {
 
 void PanelSession::click(std::string_view rest) {
     const std::string name = trimmed(rest);
-    if (Control* control = find(name)) tell(clickControl(*control), name);
+    if (Control* control = find(name))
+        act(*control, name, [control] { return clickControl(*control); });
 }
 
 void PanelSession::type(std::string_view rest) {
@@ -197,12 +215,16 @@ void PanelSession::type(std::string_view rest) {
 
 void PanelSession::key(std::string_view rest) {
     const auto [name, which] = firstWord(rest);
-    if (Control* control = find(name)) tell(pressNamedKey(*control, trimmed(which)), name);
+    if (Control* control = find(name))
+        act(*control, std::string(name),
+            [control, key = trimmed(which)] { return pressNamedKey(*control, key); });
 }
 
 void PanelSession::choose(std::string_view rest) {
     const auto [name, index] = firstWord(rest);
-    if (Control* control = find(name)) tell(chooseEntry(*control, trimmed(index)), name);
+    if (Control* control = find(name))
+        act(*control, std::string(name),
+            [control, entry = trimmed(index)] { return chooseEntry(*control, entry); });
 }
 
 void PanelSession::set(std::string_view rest) {
@@ -255,9 +277,11 @@ void PanelSession::connect(std::string_view) {
     const MenuItem& item = tcp ? panel.TCPConnection : panel.Direct;
     if (const Done refused = refusal(item, false); refused != Done::Yes)
         return tell(refused, item.name());
-    if (program_.connect(*address_, true)) return;
+    if (program_.connect(*address_, true) || program_.ended()) return;
     m_.output.settle();
     m_.errors.line("zelctl: line " + std::to_string(line_) + ": no instrument was connected");
+    if (const std::string advice = program_.connectionAdvice(); !advice.empty())
+        m_.errors.line("zelctl: " + advice);
     if (status_ == kDone) status_ = kLinkFailed;
 }
 

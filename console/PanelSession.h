@@ -2,6 +2,7 @@
 // Works the panel by the names of its controls, one command a line.
 
 #include <cstdint>
+#include <functional>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -11,11 +12,11 @@
 #include "console/ControlActions.h"
 #include "console/LineInput.h"
 #include "console/LineOutput.h"
-#include "console/LiveStates.h"
 #include "console/ServingEvents.h"
 #include "platform/Clock.h"
 #include "shell/Program.h"
 #include "support/ExitStatus.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
@@ -69,13 +70,15 @@ class PanelSession {
     void quit(std::string_view rest);
     void call(std::string_view rest);
 
+    void act(const Control& control, const std::string& name, const std::function<Done()>& work);
+    void runCommand(const std::function<void()>& command);
     Control* find(std::string_view name);
     void tell(Done done, std::string_view name);
 
     Program& program_;
     Means m_;
     std::optional<LinkAddress> address_;
-    LiveStates live_;
+    Interlock& interlock_;
     long line_ = 0;  ///< number of the line at hand
     int depth_ = 0;  ///< commands on the stack
     std::int64_t pumpUntil_ = 0;

@@ -15,10 +15,17 @@ class ServingEvents : public Events {
     /// Gets the milliseconds of each wait; true when it has done the waiting.
     std::function<bool(int)> whileWaiting;
 
+    /// Runs before each wait and pump: what must be served also where time is virtual.
+    std::function<void()> always;
+
     Events& inner() { return inner_; }
 
-    void pump() override { inner_.pump(); }
+    void pump() override {
+        if (always) always();
+        inner_.pump();
+    }
     void wait(int ms) override {
+        if (always) always();
         if (!whileWaiting || !whileWaiting(ms)) inner_.wait(ms);
     }
     void sleep(int ms) override { inner_.sleep(ms); }

@@ -13,6 +13,7 @@
 #include "console/PanelSession.h"
 #include "console/ServingEvents.h"
 #include "console/Verbs.h"
+#include "desktop/platform/QtSignals.h"
 
 namespace zel {
 namespace {
@@ -25,6 +26,7 @@ struct Stage {
           events(front.events()),
           program(front.platform(events, boxes, dialogs), options.words),
           watch(program.forms().controller) {
+        events.always = [&front] { front.endSignals().deliver(); };
         program.forms().controller.DrawImage.connect(
             [this](const std::string& file, std::string& problem) {
                 problem = drawGraphImage(program, file);
@@ -64,7 +66,7 @@ int runPanel(const Options& options, Front& front, LineOutput& output, LineOutpu
     file.imbue(std::locale::classic());
     std::unique_ptr<LineInput> input;
     if (options.argument.empty()) {
-        input = std::make_unique<DescriptorLines>(STDIN_FILENO);
+        input = std::make_unique<DescriptorLines>(STDIN_FILENO, front.endSignals().descriptor());
     } else {
         file.open(options.argument, std::ios::binary);
         if (!file || file.peek() == std::ifstream::traits_type::eof()) {

@@ -20,6 +20,7 @@ struct Run {
     LineOutput& output() const { return stage.output; }
     ControllerForm& panel() const { return stage.program.forms().controller; }
     int fail(const std::string& what) const {
+        if (!program().endedBy().empty()) return kLinkFailed;  // that is told once, at the end
         stage.errors.line("zelctl: " + what);
         return kLinkFailed;
     }
@@ -109,7 +110,7 @@ int record(const Run& run) {
     dialog.SubmitTimeButton.Click();
     const auto taken = [&dialog] { return static_cast<int>(dialog.RecordedCount); };
     int shown = 0;
-    while (panel.RecordData.Checked && taken() < run.options.count &&
+    while (!run.program().ended() && panel.RecordData.Checked && taken() < run.options.count &&
            !run.program().exchange().ExchangeFailed()) {
         run.stage.events.wait(kWaitMs);
         if (!panel.RecordData.Checked || taken() == shown) continue;
@@ -147,6 +148,13 @@ constexpr VerbRow kVerbs[] = {
     {Verb::Sweep, sweep}, {Verb::Record, record}, {Verb::Show, show},
 };
 
+int tellEnd(const Run& run, int status) {
+    const std::string& signal = run.program().endedBy();
+    if (signal.empty()) return status;
+    run.stage.errors.line("zelctl: ended by " + signal);
+    return kLinkFailed;
+}
+
 }  // namespace
 
 int runVerb(const Options& options, const VerbStage& stage) {
@@ -155,14 +163,17 @@ int runVerb(const Options& options, const VerbStage& stage) {
     stage.program.start();
     if (needsInstrument && !stage.program.connect(options.address->link, false)) {
         stage.errors.settle();
-        return run.fail("no instrument was connected");
+        run.fail("no instrument was connected");
+        if (const std::string advice = stage.program.connectionAdvice(); !advice.empty())
+            stage.errors.line("zelctl: " + advice);
+        return tellEnd(run, kLinkFailed);
     }
     int status = kWrongUse;
     for (const VerbRow& row : kVerbs)
         if (row.verb == options.verb) status = row.routine(run);
-    if (needsInstrument) stage.program.disconnect();
+    if (needsInstrument && !stage.program.ended()) stage.program.disconnect();
     stage.errors.settle();
-    return status;
+    return tellEnd(run, status);
 }
 
 }  // namespace zel

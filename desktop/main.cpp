@@ -3,7 +3,6 @@
 #include <QApplication>
 #include <QTimer>
 #include <cstdio>
-#include <cstdlib>
 #include <iostream>
 
 #include "desktop/StartOptions.h"
@@ -12,6 +11,7 @@
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
 #include "shell/Program.h"
+#include "support/ExitStatus.h"
 #include "support/VersionInfo.h"
 
 namespace {
@@ -43,10 +43,10 @@ int main(int argc, char** argv) {
     zel::applyTheme(application, theme);
     zel::Program program(platform.bundle(), options.words);
     int result = 0;
-    program.Ended.connect([&result] {
-        // At once: no view, wait or window on the stack holds the end up.
-        std::fflush(nullptr);
-        std::_Exit(result);
+    // Every wait and loop on the stack comes back, since the program has ended.
+    program.Ended.connect([&] {
+        if (!program.endedBy().empty()) result = zel::kLinkFailed;
+        QApplication::exit(result);
     });
     zel::MainWindow window(program);
     window.addThemeMenu(theme, [&](zel::ThemeChoice choice) {
@@ -60,6 +60,7 @@ int main(int argc, char** argv) {
         if (program.ended()) return;
         window.show();
         if (options.address) program.connect(*options.address, true);
+        if (program.ended()) return;
         if (options.screenshot.empty()) {
             if (program.forms().controller.isConnected)
                 program.forms().controller.PlayContinuousButton.Click();

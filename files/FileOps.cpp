@@ -85,8 +85,11 @@ std::string FileOps::ReadWholeFile(const std::string& path, const ReadProgress& 
 }
 
 std::string FileOps::LastFileDateTime() const {
-    if (LastDialogFileName.empty()) return " ";
-    const FileStatus file = files_.stat(LastDialogFileName);
+    return LastDialogFileName.empty() ? " " : dateTimeOf(LastDialogFileName);
+}
+
+std::string FileOps::dateTimeOf(const std::string& path) const {
+    const FileStatus file = files_.stat(path);
     return file.exists() ? clock_.dateTimeText(file.modified) : " ";
 }
 

@@ -35,6 +35,8 @@ class FileOps {
     std::string ReadWholeFile(const std::string& path, const ReadProgress& progress = {}) const;
     /// Day and time at which the last dialog's file was written; " " without one.
     std::string LastFileDateTime() const;
+    /// The same of the file of that path; " " when it is not there.
+    std::string dateTimeOf(const std::string& path) const;
     /// Takes a name as if a dialog had given it.
     void note(const std::string& path);
     FileService& service() const { return files_; }

@@ -30,43 +30,36 @@ Whole wholeNumber(double value) {
 
 }  // namespace
 
-Recording::Recording(Forms& forms, ZEL3Variables& mirror, ByteLink& link, AnswerReader& reader,
-                     CommandExchange& exchange, TraceReader& traces, SweepControl& sweeps,
-                     FileOps& files, ViewWriter& writer, const Clock& clock, Events& events,
-                     MessageBoxes& boxes)
+Recording::Recording(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& link,
+                     SweepControl& sweeps, ViewWriter& writer, const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       dialog_(forms.time),
       mirror_(mirror),
       link_(link),
-      reader_(reader),
-      exchange_(exchange),
-      traces_(traces),
+      exchange_(link.exchange),
       sweeps_(sweeps),
-      files_(files),
       writer_(writer),
-      clock_(clock),
-      events_(events),
-      boxes_(boxes),
-      running_(clock) {
-    panel_.RecordData.Clicked.connect([this] { RecordData_Click(); });
-    dialog_.Load.connect([this] { loadForm(); });
-    dialog_.SubmitTimeButton.Clicked.connect([this] { SubmitTimeButton_Click(); });
-    dialog_.CancelTimeButton.Clicked.connect([this] { dialog_.unload(1); });
-    dialog_.X.Tick.connect([this] { X_Timer(); });
-    dialog_.TimeIntervalBox.KeyDown.connect([this](int key, int) {
+      session_(session),
+      running_(session.clock) {
+    handlers_.on(panel_.RecordData.Clicked, [this] { RecordData_Click(); });
+    handlers_.on(dialog_.Load, [this] { loadForm(); });
+    handlers_.on(dialog_.SubmitTimeButton.Clicked, [this] { SubmitTimeButton_Click(); });
+    handlers_.on(dialog_.CancelTimeButton.Clicked, [this] { dialog_.unload(1); });
+    handlers_.on(dialog_.X.Tick, [this] { X_Timer(); });
+    handlers_.on(dialog_.TimeIntervalBox.KeyDown, [this](int key, int) {
         if (key == kKeyF1) panel_.ShowHelp(kHelpTopic);
     });
-    panel_.UpNow.Tick.connect([this] { showProgress(); });
+    handlers_.on(panel_.UpNow.Tick, [this] { showProgress(); });
     // Stop need not wait for the next tick, which may be hours away.
-    panel_.StopButton.Clicked.connect([this] {
+    handlers_.on(panel_.StopButton.Clicked, [this] {
         if (dialog_.X.Enabled && !inTick_) windUp();
     });
 }
 
 void Recording::pointer(int shape) {
     panel_.MousePointer = shape;
-    events_.pump();
+    session_.events.pump();
 }
 
 void Recording::ReadTriggerSource() {
@@ -103,13 +96,13 @@ void Recording::abandon() {
 }
 
 bool Recording::chooseFile() {
-    panel_.DataFileName = files_.ShowSaveDataDialog(FileOps::kCsvFilter);
+    panel_.DataFileName = writer_.files().ShowSaveDataDialog(FileOps::kCsvFilter);
     if (panel_.DataFileName.empty()) return false;
     // Emptied once; each trace is then appended to it.
-    OutputFile file(files_.service(), panel_.DataFileName, OutputFile::Mode::Output);
+    OutputFile file(writer_.files().service(), panel_.DataFileName, OutputFile::Mode::Output);
     const std::string problem = file.close();
     if (problem.empty()) return true;
-    boxes_.show({BoxIcon::Critical, problem});
+    session_.boxes.show({BoxIcon::Critical, problem});
     return false;
 }
 
@@ -129,7 +122,7 @@ void Recording::SubmitTimeButton_Click() {
     dialog_.Hide();
     dialog_.RecordedCount = 0;
     running_.Reset();
-    lastTick_ = clock_.micros();
+    lastTick_ = session_.clock.micros();
     if (mirror_.ExternalTriggerActive) {
         RecordExtTrigger(wholeNumber<std::int16_t>(entered));
         return;
@@ -157,30 +150,34 @@ bool Recording::takeTrace() {
     }
     sweeps_.nextRow();
     bool success = false;
-    traces_.ReadSingleTrace2({}, success);
+    sweeps_.traces().ReadSingleTrace2({}, success);
     return success;
 }
 
 void Recording::X_Timer() {
     if (exchange_.busy()) {
         // The line is in the middle of a dialogue that lets events run: this tick comes behind it.
-        events_.schedule(kRetryMs, [this] {
+        session_.events.schedule(kRetryMs, [this] {
             if (dialog_.X.Enabled && !inTick_) X_Timer();
         });
         return;
     }
-    lastTick_ = clock_.micros();
+    lastTick_ = session_.clock.micros();
     dialog_.ContinuousRecording = true;
     if (!panel_.RecordData.Checked) {
         windUp();
         return;
     }
     inTick_ = true;
-    pointer(kHourglass);
     bool taken = true;
-    if (!mirror_.ExternalTriggerActive) {
-        taken = takeTrace();
-        if (taken) ++dialog_.RecordedCount;
+    {
+        // What a user does meanwhile waits for the end of the cycle.
+        const DialogueScope cycle = exchange_.hold();
+        pointer(kHourglass);
+        if (!mirror_.ExternalTriggerActive) {
+            taken = takeTrace();
+            if (taken) ++dialog_.RecordedCount;
+        }
     }
     inTick_ = false;
     panel_.MousePointer = 0;
@@ -188,25 +185,26 @@ void Recording::X_Timer() {
         windUp();
         return;
     }
-    if (taken) events_.pump();
+    if (taken) session_.events.pump();
     showProgress();
 }
 
 void Recording::resynchronise() {
-    events_.sleep(kResyncMs);
-    link_.WriteToLink("\r");
-    reader_.ReadAnswer();
-    events_.sleep(kResyncMs);
-    events_.pump();
-    link_.WriteToLink("\r");
-    reader_.ReadAnswer();
+    link_.state.BareCrFirst = false;  // it is done here
+    session_.events.sleep(kResyncMs);
+    link_.bytes.WriteToLink("\r");
+    link_.reader.ReadAnswer();
+    session_.events.sleep(kResyncMs);
+    session_.events.pump();
+    link_.bytes.WriteToLink("\r");
+    link_.reader.ReadAnswer();
 }
 
 void Recording::RecordExtTrigger(std::int32_t timeout) {
     dialog_.ContinuousRecording = true;
     bool good = true;
     panel_.STOPFlag = true;
-    events_.pump();
+    session_.events.pump();
     for (bool recording = true; recording;) {
         pointer(kHourglass);
         if (!good) {
@@ -224,7 +222,7 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
                 const bool again = dialog_.RecordedCount != 0 && panel_.State != CF::POWER;
                 bool success = true;
                 if (again) {
-                    traces_.ReadSingleTrace2({}, success);
+                    sweeps_.traces().ReadSingleTrace2({}, success);
                 } else {
                     sweeps_.PlaySingleButton_Click();
                 }
@@ -239,6 +237,7 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
                 resynchronise();
             }
         }
+        exchange_.giveTurn();
         if (!panel_.STOPFlag || panel_.isSpecMeas) {
             dialog_.ContinuousRecording = false;
             pointer(0);
@@ -253,7 +252,7 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
 
 std::string Recording::progressText() const {
     if (writer_.RecordingFileName.empty() || !panel_.RecordData.Checked) return {};
-    const std::uint64_t bytes = files_.service().stat(writer_.RecordingFileName).size;
+    const std::uint64_t bytes = writer_.files().service().stat(writer_.RecordingFileName).size;
     const double count = dialog_.RecordedCount;
     std::string text = std::filesystem::path(writer_.RecordingFileName).filename().string() + ": " +
                        generalNumber(count) + (count == 1 ? " trace, " : " traces, ") +
@@ -261,8 +260,8 @@ std::string Recording::progressText() const {
                        timeOfDayText(std::nearbyint(running_.Elapsed() / 1000.0) / kDaySeconds);
     if (mirror_.ExternalTriggerActive) return text + ", waits for the trigger";
     if (dialog_.X.Interval == 0) return text + ", the interval of 0 s takes no trace";
-    const double left =
-        dialog_.X.Interval / 1000.0 - static_cast<double>(clock_.micros() - lastTick_) / 1e6;
+    const double left = dialog_.X.Interval / 1000.0 -
+                        static_cast<double>(session_.clock.micros() - lastTick_) / 1e6;
     return text + ", next in " + generalNumber(std::max(0.0, std::nearbyint(left))) + " s";
 }
 

@@ -4,27 +4,20 @@
 #include <cstdint>
 #include <string>
 
-#include "files/FileOps.h"
 #include "files/ViewWriter.h"
 #include "forms/Forms.h"
-#include "link/AnswerReader.h"
-#include "link/ByteLink.h"
-#include "link/CommandExchange.h"
+#include "link/InstrumentLink.h"
 #include "model/ZEL3Variables.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "trace/SweepControl.h"
-#include "trace/TraceReader.h"
 
 namespace zel {
 
 class Recording {
   public:
     /// Connects the menu entry, the dialog and its timer `X`.
-    Recording(Forms& forms, ZEL3Variables& mirror, ByteLink& link, AnswerReader& reader,
-              CommandExchange& exchange, TraceReader& traces, SweepControl& sweeps, FileOps& files,
-              ViewWriter& writer, const Clock& clock, Events& events, MessageBoxes& boxes);
+    Recording(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& link, SweepControl& sweeps,
+              ViewWriter& writer, const Session& session);
 
     void RecordData_Click();
     /// TRIGSRC, unless a power sensor measures.
@@ -52,19 +45,15 @@ class Recording {
     ControllerForm& panel_;
     TimeForm& dialog_;
     ZEL3Variables& mirror_;
-    ByteLink& link_;
-    AnswerReader& reader_;
+    InstrumentLink link_;
     CommandExchange& exchange_;
-    TraceReader& traces_;
     SweepControl& sweeps_;
-    FileOps& files_;
     ViewWriter& writer_;
-    const Clock& clock_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
     Stopwatch running_;
     std::int64_t lastTick_ = 0;  ///< us, when the timer was started or last fired
     bool inTick_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

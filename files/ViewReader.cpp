@@ -61,21 +61,21 @@ class AtEnd {
 }  // namespace
 
 ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, GraphScaling& scaling,
-                       const TraceConversion& conversion, const Clock& clock, Events& events,
-                       MessageBoxes& boxes)
+                       const TraceConversion& conversion, const Interlock& interlock)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
       files_(files),
       scaling_(scaling),
-      clock_(clock),
-      events_(events),
-      boxes_(boxes),
+      interlock_(interlock),
+      clock_(interlock.session().clock),
+      events_(interlock.session().events),
+      boxes_(interlock.session().boxes),
       conversion_(conversion),
       rows_(forms.controller, mirror, conversion) {
-    panel_.LoadData.Clicked.connect([this] { LoadData_Click(); });
-    panel_.OpenFile.connect([this](const std::string& path) {
-        if (loading_) return;
+    handlers_.on(panel_.LoadData.Clicked, [this] { LoadData_Click(); });
+    handlers_.on(panel_.OpenFile, [this](const std::string& path) {
+        if (loading_ || interlock_.refuses(panel_.LoadData)) return;
         files_.note(path);
         loadFile(path);
     });
@@ -83,7 +83,7 @@ ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, Grap
 }
 
 void ViewReader::LoadData_Click() {
-    if (loading_) return;
+    if (loading_ || interlock_.refuses(panel_.LoadData)) return;
     const std::string path = files_.ShowOpenDataDialog(FileOps::kCsvFilter);
     if (!path.empty()) loadFile(path);
 }
@@ -106,7 +106,7 @@ void ViewReader::loadFile(const std::string& path) {
         if (contains(upperCase(name_), "DAT") || contains(text, "END OF LOG")) {
             LoadTheDataForOlderVersions(text);
         } else {
-            LoadTheData(text, files_.LastFileDateTime(), 0);
+            LoadTheData(text, files_.dateTimeOf(path), 0);
         }
         FileLoaded(path);
     } catch (const std::runtime_error& problem) {

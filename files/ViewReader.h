@@ -8,10 +8,8 @@
 #include "files/LoadedRows.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
 #include "trace/GraphScaling.h"
+#include "trace/Interlock.h"
 #include "trace/TraceConversion.h"
 
 namespace zel {
@@ -20,8 +18,7 @@ class ViewReader {
   public:
     /// Connects the menu entry and the front's request to open a file.
     ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, GraphScaling& scaling,
-               const TraceConversion& conversion, const Clock& clock, Events& events,
-               MessageBoxes& boxes);
+               const TraceConversion& conversion, const Interlock& interlock);
 
     void LoadData_Click();
     /// Reads and shows a file; what cannot be read is told in a box. Nothing happens while another
@@ -61,6 +58,7 @@ class ViewReader {
     ZEL3Variables& mirror_;
     FileOps& files_;
     GraphScaling& scaling_;
+    const Interlock& interlock_;
     const Clock& clock_;
     Events& events_;
     MessageBoxes& boxes_;
@@ -68,6 +66,7 @@ class ViewReader {
     LoadedRows rows_;
     std::string name_;  ///< of the file, without its folder
     bool loading_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -41,6 +41,8 @@ class ViewWriter {
     void WriteLogHeader(OutputFile& file);
     void WriteFooterAndCloseFile(OutputFile& file);
 
+    FileOps& files() { return files_; }
+
   private:
     OutputFile target() const;
     void save(const std::string& kind);

@@ -89,6 +89,7 @@ class ControllerForm : public Form {
     bool SingleSweepModeActive = false;
     std::string mLoadOption;
     bool isConnected = false;  ///< the handshake is done
+    bool LinkLost = false;     ///< the continuous view ended because the line had died
     double RecordTimeValue = 0;
     bool ErrorFlag = false;  ///< a link failure was told already
     bool ChoiceBoxActivated = false;
@@ -191,6 +192,7 @@ class ControllerForm : public Form {
     Label PaceLabel{*this, "PaceLabel"};          ///< age of the trace, sweeps a second
     Frame PlaybackFrame{*this, "PlaybackFrame"};  ///< shown while a series of traces is played
     Label FileLabel{*this, "FileLabel"};  ///< progress of a recording or of a file that loads
+    Label WaitLabel{*this, "WaitLabel"};  ///< what is waited for, and how long at most
     TextBox DebugTextBox{*this, "DebugTextBox"};
 
     // Soft positions.

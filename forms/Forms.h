@@ -31,6 +31,7 @@ class TCPConnectionForm : public Form {
     TextBox IPAdressTextBox{*this, "IPAdressTextBox"};
     TextBox RemotePortTextBox{*this, "RemotePortTextBox"};
     TextBox IDTextBox{*this, "IDTextBox"};
+    Label AdviceLabel{*this, "AdviceLabel"};  ///< how long a wait lasts; what to check behind it
     Button ConnectTCPButton{*this, "ConnectTCPButton", "Connect"};
     Button QuitTCPButton{*this, "QuitTCPButton", "Close"};
 };

@@ -11,6 +11,7 @@
 #include "model/ZEL3Variables.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "trace/GraphScaling.h"
+#include "trace/Interlock.h"
 #include "trace/TraceConversion.h"
 
 namespace zel {
@@ -23,8 +24,12 @@ struct SavedFiles {
                   platform.clock};
     GraphScaling scaling{forms.controller, forms.waterfall, mirror, platform.clock};
     TraceConversion conversion{forms.controller, mirror, forms.waterfall.Graph3D};
-    ViewReader reader{forms,      mirror,         files,           scaling,
-                      conversion, platform.clock, platform.events, platform.boxes};
+    ZELBas line;
+    Interlock interlock{
+        forms,
+        line,
+        {platform.clock, platform.events, platform.boxes, forms.controller.DebugTextBox}};
+    ViewReader reader{forms, mirror, files, scaling, conversion, interlock};
 };
 
 inline std::string textOf(const std::uint8_t* data, std::size_t size) {

@@ -27,22 +27,20 @@ bool IsPrintableAnswer(const std::string& text) {
     });
 }
 
-AnswerReader::AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const double& SweepTime,
-                           const Session& session)
+AnswerReader::AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const Session& session)
     : panel_(forms.controller),
       dialog_(forms.main),
       state_(state),
       link_(link),
-      SweepTime_(SweepTime),
-      events_(session.events),
-      boxes_(session.boxes),
+      session_(session),
+      notice_(forms, session),
       StopwatchA_(session.clock),
       sinceGrowth_(session.clock) {}
 
 std::string AnswerReader::ReadAnswer() {
     double timeout =
         panel_.ConnectionState == ControllerForm::DIRECTCON ? kDirectTimeoutS : kOtherTimeoutS;
-    if (state_.WaitCommandActive) timeout = std::nearbyint(timeout + 2 * SweepTime_);
+    if (state_.WaitCommandActive) timeout = std::nearbyint(timeout + 2 * state_.SweepTimeTold);
     timeout = std::clamp(timeout, 0.0, kLongestTimeoutS);
     return read(static_cast<std::int64_t>(timeout * 1000), "No response received!", true);
 }
@@ -54,15 +52,22 @@ std::string AnswerReader::ReadAnswerTriggered(std::int32_t timeoutSeconds) {
 std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
                                bool quietWhenFailed) {
     answered_ = absenceTold_ = noiseTold_ = false;
+    const WaitNotice::Shown shown(notice_);
     if (link_.isTcp()) state_.InputBuffer.clear();
     StopwatchA_.Reset();
     sinceGrowth_.Reset();
     for (;;) {
+        if (state_.mustLeave(session_.clock.micros())) {
+            leave();
+            return "";
+        }
         if (!link_.usable()) {
-            if (!state_.DialCancelled) {
+            // A view that has lost its line says so once.
+            const bool told = panel_.ContinuosLoopActive && state_.ExchangeFailed;
+            if (!state_.DialCancelled && !told) {
                 std::string text = "Port not open!";
                 if (!link_.problem().empty()) text += kCrLf + link_.problem();
-                boxes_.show({BoxIcon::Critical, text});
+                session_.boxes.show({BoxIcon::Critical, text});
             }
             state_.ExchangeFailed = true;
             return "";
@@ -75,25 +80,47 @@ std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
         judgeNoise();
         const auto end = state_.InputBuffer.find('\r');
         if (end != std::string::npos) {
-            events_.pump();
+            session_.events.pump();
             std::string answer = state_.InputBuffer.substr(0, end);
             state_.InputBuffer.erase(0, end + 1);
             state_.ExchangeFailed = false;
             answered_ = true;
+            showLinkLost(panel_, false);
             return answer;
         }
         if (state_.InputBuffer.size() > kLongestAnswer) state_.InputBuffer.clear();
         if (StopwatchA_.Elapsed() > timeoutMs) break;
-        events_.wait(kPollMs);
+        notice_.tell(StopwatchA_.Elapsed(), timeoutMs);
+        session_.events.wait(kPollMs);
     }
     if (panel_.isConnected) {
         const bool told = quietWhenFailed && state_.ExchangeFailed;
         state_.ExchangeFailed = true;
-        if (!told) boxes_.show({BoxIcon::Warning, silenceText});
+        if (!told) session_.boxes.show({BoxIcon::Warning, silenceText});
     } else {
         giveUpConnecting();
     }
     return "";
+}
+
+void AnswerReader::leave() {
+    state_.ExchangeFailed = true;
+    if (state_.Ending) return;
+    state_.WaitLeft = true;
+    state_.BareCrFirst = true;
+    if (panel_.isConnected) return;
+    state_.DialCancelled = true;  // the user knows why there is no session
+    giveUpConnecting();
+}
+
+void AnswerReader::awaitQuietly(int timeoutMs) {
+    const Stopwatch waited(session_.clock);
+    std::string bytes;
+    while (waited.Elapsed() <= timeoutMs && link_.usable()) {
+        bytes += link_.takeBytes();
+        if (bytes.find('\r') != std::string::npos || bytes.size() > kLongestAnswer) return;
+        session_.events.wait(kPollMs);
+    }
 }
 
 void AnswerReader::judgeNoise() {
@@ -102,10 +129,10 @@ void AnswerReader::judgeNoise() {
     const bool settled =
         state_.InputBuffer.find('\r') != std::string::npos || sinceGrowth_.Elapsed() >= kSettledMs;
     if (!settled || IsPrintableAnswer(state_.InputBuffer)) return;
-    boxes_.show({BoxIcon::Information,
-                 "Incorrect baud rate for the connection!" + std::string(kCrLf) +
-                     "Received: " + fromWindows1252(state_.InputBuffer),
-                 "Incorrect baud rate"});
+    session_.boxes.show({BoxIcon::Information,
+                         "Incorrect baud rate for the connection!" + std::string(kCrLf) +
+                             "Received: " + fromWindows1252(state_.InputBuffer),
+                         "Incorrect baud rate"});
     panel_.ErrorFlag = true;
     noiseTold_ = true;
 }
@@ -113,20 +140,16 @@ void AnswerReader::judgeNoise() {
 void AnswerReader::giveUpConnecting() {
     if (!panel_.ErrorFlag || noiseTold_) {
         if (!state_.DialCancelled) {
-            boxes_.show({BoxIcon::Critical, "No ZEL3 found at the specified address!"});
+            session_.boxes.show({BoxIcon::Critical, "No ZEL3 found at the specified address!"});
             absenceTold_ = true;
         }
         panel_.ErrorFlag = false;
     }
     if (panel_.ConnectionState == ControllerForm::DIRECTCON) link_.CloseComPort();
-    // One message is enough: the disconnection behind it stays silent.
-    const bool flag = panel_.ErrorFlag;
-    panel_.ErrorFlag = true;
-    dialog_.DisconnectButton.Click();
-    panel_.ErrorFlag = flag;
+    AttemptAbandoned();
     dialog_.OnPic.Visible = false;
     dialog_.MousePointer = 0;
-    events_.pump();
+    session_.events.pump();
 }
 
 }  // namespace zel

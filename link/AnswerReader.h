@@ -6,6 +6,7 @@
 
 #include "forms/Forms.h"
 #include "link/ByteLink.h"
+#include "link/WaitNotice.h"
 #include "link/ZELBas.h"
 #include "platform/Session.h"
 
@@ -17,15 +18,19 @@ bool IsPrintableAnswer(const std::string& text);
 
 class AnswerReader {
   public:
-    /// `SweepTime` is the mirror's sweep time, in seconds.
-    AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const double& SweepTime,
-                 const Session& session);
+    AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const Session& session);
 
     /// One line without its CR, or the empty text. A silence in session sets `ExchangeFailed`
     /// and tells "No response received!" once; while connecting it takes the connection down.
     std::string ReadAnswer();
     /// The same with the caller's time-out in seconds, for an exchange that a trigger ends.
     std::string ReadAnswerTriggered(std::int32_t timeoutSeconds);
+    /// Takes a line that the instrument owes, or waits that long; nothing is told.
+    void awaitQuietly(int timeoutMs);
+
+    /// A silence has ended the attempt to connect, which was told as far as it had to be. Who owns
+    /// the connection takes it down.
+    Event<> AttemptAbandoned;
 
     /// The last read found a line, be it an empty one.
     bool answered() const { return answered_; }
@@ -36,14 +41,14 @@ class AnswerReader {
     std::string read(std::int64_t timeoutMs, const char* silenceText, bool quietWhenFailed);
     void judgeNoise();
     void giveUpConnecting();
+    void leave();
 
     ControllerForm& panel_;
     MainForm& dialog_;
     ZELBas& state_;
     ByteLink& link_;
-    const double& SweepTime_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
+    WaitNotice notice_;
     Stopwatch StopwatchA_;
     Stopwatch sinceGrowth_;
     bool answered_ = false;

@@ -43,6 +43,7 @@ bool BinaryTrace::mayAskAgain(const Round& round) const {
     const bool stopped = (round.looping && !panel_.ContinuosLoopActive) ||
                          (round.recording && !panel_.RecordDataFlag);
     const bool disconnected = round.connected && !panel_.isConnected;
+    if (state_.mustLeave(session_.clock.micros())) return false;
     return !stopped && !disconnected && link_.usable();
 }
 

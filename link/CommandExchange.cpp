@@ -1,5 +1,7 @@
 #include "link/CommandExchange.h"
 
+#include <string_view>
+
 #include "link/InstrumentErrors.h"
 #include "link/WireText.h"
 #include "support/NumberText.h"
@@ -15,6 +17,10 @@ constexpr int kFirstAnswerMs = 5000;
 constexpr int kRetryPauseMs = 50;
 constexpr int kValueWaitMs = 250;
 constexpr int kValuePollMs = 20;
+constexpr int kOwedAnswerMs = 2000;
+constexpr int kAfterOwedMs = 50;
+constexpr std::string_view kSweepTimeSetting = "SWPTIME,";
+constexpr int kFarewellMs = 500;  // for each of its answers
 
 }  // namespace
 
@@ -35,7 +41,35 @@ CommandExchange::CommandExchange(ControllerForm& panel, ZELBas& state, ByteLink&
 void CommandExchange::beginLine(const char* kind, const std::string& text, float& t0) {
     session_.DebugLine(std::string(kind) + " <" + text + "> starting");
     t0 = static_cast<float>(session_.clock.secondsOfDay());
+    settleOwedAnswer();
     state_.InputBuffer.clear();
+}
+
+void CommandExchange::settleOwedAnswer() {
+    if (!state_.BareCrFirst || !link_.usable()) return;
+    state_.BareCrFirst = false;
+    link_.takeBytes();
+    link_.WriteToLink("\r");
+    reader_.awaitQuietly(kOwedAnswerMs);
+    // The answer that was owed may come with the one to the CR.
+    session_.events.sleep(kAfterOwedMs);
+    link_.takeBytes();
+}
+
+void CommandExchange::leaveWait(int graceMs) {
+    state_.leaveWait(session_.clock.micros() + std::int64_t{graceMs} * 1000);
+}
+
+void CommandExchange::sayLocal() {
+    const bool inTheMiddle = busy() || state_.BareCrFirst;
+    const DialogueScope scope(state_);
+    for (const char* line : {"\r", "cmd\r", "LOCAL\r"}) {
+        if (!link_.usable()) return;
+        if (line[0] == '\r' && !inTheMiddle) continue;
+        link_.takeBytes();
+        link_.WriteToLink(line);
+        reader_.awaitQuietly(kFarewellMs);
+    }
 }
 
 void CommandExchange::finishLine(const char* kind, const std::string& text, float t0) {
@@ -145,6 +179,8 @@ bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
     if (!reader_.answered()) return false;
     session_.DebugLine("<" + keywordAndValue + "> response: " + numberText(status));
     if (status != 0) report(status, keywordAndValue);
+    if (status == 0 && startsWith(keywordAndValue, kSweepTimeSetting))
+        state_.SweepTimeTold = leadingNumber(keywordAndValue.substr(kSweepTimeSetting.size()));
     finishLine("SET", keywordAndValue, t0);
     return status == 0;
 }
@@ -181,6 +217,7 @@ bool CommandExchange::GetInstrument(const std::string& keyword, std::string& val
     std::string answer;
     if (!readValue(answer)) return false;
     value = fromWindows1252(answer);
+    if (keyword == "SWPTIME") state_.SweepTimeTold = leadingNumber(value);
     session_.DebugLine("<" + keyword + "> response: " + value);
     finishLine("GET", keyword, t0);
     return true;

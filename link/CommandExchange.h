@@ -32,6 +32,16 @@ class CommandExchange {
     bool GetInstrument(const std::string& keyword, std::string& value);
     /// A dialogue is under way further up the stack, and only lets events run: the line is taken.
     bool busy() const { return state_.DialoguesUnderWay > 0; }
+    /// The user does not wait any longer for what is under way; an answer that comes within
+    /// `graceMs` milliseconds still counts. The next exchange sends a bare CR first.
+    void leaveWait(int graceMs);
+    /// LOCAL as the last word of a program that ends at once: at most about 1.5 s, and nothing is
+    /// told.
+    void sayLocal();
+    /// For a loop of exchanges, before its next round: what waits for its turn has it now.
+    void giveTurn() { state_.TurnGiven(); }
+    /// The line is taken for as long as the result lives: a cycle of several exchanges.
+    DialogueScope hold() { return DialogueScope(state_); }
     /// The last read of a line failed, or the link is gone: loops end.
     bool ExchangeFailed() const { return state_.ExchangeFailed; }
 
@@ -39,6 +49,7 @@ class CommandExchange {
     void beginLine(const char* kind, const std::string& text, float& t0);
     void finishLine(const char* kind, const std::string& text, float t0);
     void delay(DelayPlace place);
+    void settleOwedAnswer();
     void report(int status, const std::string& keyword);
     bool triggeredDialogue(const std::string& keyword, std::int32_t timeoutSeconds);
     bool refuseCommand(const std::string& keyword, int status, float t0);

@@ -1,6 +1,5 @@
 #include "panel/HardKeys.h"
 
-#include "panel/Interlock.h"
 #include "panel/MenuTables.h"
 #include "support/NumberText.h"
 
@@ -23,24 +22,24 @@ const HardKey kHardKeys[] = {
 }  // namespace
 
 HardKeys::HardKeys(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
-                   SoftPanel& softPanel, MenuFill& fill, MessageBoxes& boxes)
+                   const MenuRoutines& menus, const Interlock& interlock)
     : panel_(panel),
       mirror_(mirror),
       exchange_(exchange),
-      softPanel_(softPanel),
-      fill_(fill),
-      boxes_(boxes) {
+      softPanel_(menus.softPanel),
+      fill_(menus.fill),
+      interlock_(interlock) {
     for (const HardKey& row : kHardKeys)
-        (panel_.*row.key).Clicked.connect([this, menu = row.menu] { press(menu); });
+        handlers_.on((panel_.*row.key).Clicked, [this, menu = row.menu] { press(menu); });
     // The tracking generator has a key in both rows.
-    panel_.TrackButton1.Clicked.connect([this] { panel_.TrackButton.Click(); });
+    handlers_.on(panel_.TrackButton1.Clicked, [this] { panel_.TrackButton.Click(); });
 }
 
 void HardKeys::press(std::int16_t menu) {
     const bool leaving = menu == CF::Freq && mirror_.PowerSensorExitRequested;
-    if (!leaving && refusedByPowerSensor(panel_, boxes_)) return;
+    if (!leaving && interlock_.refuses(Interlock::Rule::NoPowerSensor)) return;
     if (menu == CF::Freq) mirror_.PowerSensorExitRequested = false;
-    if (menu == CF::Marker && refusedByContinuousView(panel_, boxes_)) return;
+    if (menu == CF::Marker && interlock_.refuses(Interlock::Rule::NoContinuousView)) return;
     softPanel_.InitForm(menu);
     const HardKeyMenu* captions = hardKeyMenu(menu);
     softPanel_.setKeyCaptions(captions->captions);

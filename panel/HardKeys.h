@@ -6,7 +6,7 @@
 #include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
 #include "panel/SoftPanel.h"
-#include "platform/MessageBox.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
@@ -14,7 +14,7 @@ class HardKeys {
   public:
     /// Connects the keys.
     HardKeys(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
-             SoftPanel& softPanel, MenuFill& fill, MessageBoxes& boxes);
+             const MenuRoutines& menus, const Interlock& interlock);
 
     /// In power sensor mode only the frequency key opens its menu, when the analyzer key asked.
     void press(std::int16_t menu);
@@ -27,7 +27,8 @@ class HardKeys {
     CommandExchange& exchange_;
     SoftPanel& softPanel_;
     MenuFill& fill_;
-    MessageBoxes& boxes_;
+    const Interlock& interlock_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -4,7 +4,7 @@
 #include <string_view>
 
 #include "link/WireText.h"
-#include "panel/Interlock.h"
+#include "panel/Hourglass.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
 
@@ -46,14 +46,20 @@ bool IsStatusCommand(std::string& line) {
                                 [&](std::string_view head) { return line.rfind(head, 0) == 0; });
 }
 
-ManualCommand::ManualCommand(ControllerForm& panel, ZELBas& state, ByteLink& link,
-                             AnswerReader& reader, Events& events, MessageBoxes& boxes)
-    : panel_(panel), state_(state), link_(link), reader_(reader), events_(events), boxes_(boxes) {
-    panel_.SendButton.Clicked.connect([this] { SendButton_Click(); });
-    panel_.ManualCommandText.KeyPress.connect(
-        [this](int& key) { ManualCommandText_KeyPress(key); });
-    panel_.ManualCommandText.KeyDown.connect(
-        [this](int key, int) { ManualCommandText_KeyDown(key); });
+ManualCommand::ManualCommand(ControllerForm& panel, const InstrumentLink& link,
+                             const Interlock& interlock)
+    : panel_(panel),
+      state_(link.state),
+      link_(link.bytes),
+      reader_(link.reader),
+      interlock_(interlock),
+      events_(interlock.session().events),
+      boxes_(interlock.session().boxes) {
+    handlers_.on(panel_.SendButton.Clicked, [this] { SendButton_Click(); });
+    handlers_.on(panel_.ManualCommandText.KeyPress,
+                 [this](int& key) { ManualCommandText_KeyPress(key); });
+    handlers_.on(panel_.ManualCommandText.KeyDown,
+                 [this](int key, int) { ManualCommandText_KeyDown(key); });
 }
 
 void ManualCommand::ManualCommandText_KeyDown(int key) {
@@ -70,18 +76,15 @@ void ManualCommand::ManualCommandText_KeyPress(int key) {
     if (panel_.isConnected) {
         if (key == kKeyEnter) SendButton_Click();
     } else if (!panel_.ErrorFlag) {
-        refusedUnconnected(panel_, boxes_);
+        interlock_.refuses(Interlock::Rule::Connected);
         panel_.ErrorFlag = true;
     }
 }
 
 void ManualCommand::SendButton_Click() {
-    if (!panel_.isConnected) {
-        boxes_.show({BoxIcon::Information, "Please connect to the instrument first."});
-        return;
-    }
-    if (refusedByContinuousView(panel_, boxes_)) return;
+    if (interlock_.refuses(panel_.SendButton)) return;
     if (!sendable(panel_.ManualCommandText.Text.get(), boxes_)) return;
+    const DialogueScope scope(state_);
     const Hourglass busy(panel_, events_);
     std::string line = panel_.ManualCommandText.Text;
     if (line == "SET" || line == "set") SetLinePending_ = true;

@@ -4,11 +4,8 @@
 #include <string>
 
 #include "forms/ControllerForm.h"
-#include "link/AnswerReader.h"
-#include "link/ByteLink.h"
-#include "link/ZELBas.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "link/InstrumentLink.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
@@ -18,8 +15,7 @@ bool IsStatusCommand(std::string& line);
 class ManualCommand {
   public:
     /// Connects the box and the button.
-    ManualCommand(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
-                  Events& events, MessageBoxes& boxes);
+    ManualCommand(ControllerForm& panel, const InstrumentLink& link, const Interlock& interlock);
 
     void SendButton_Click();
     void ManualCommandText_KeyPress(int key);
@@ -33,9 +29,11 @@ class ManualCommand {
     ZELBas& state_;
     ByteLink& link_;
     AnswerReader& reader_;
+    const Interlock& interlock_;
     Events& events_;
     MessageBoxes& boxes_;
     bool SetLinePending_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

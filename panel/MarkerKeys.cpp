@@ -1,7 +1,7 @@
 #include "panel/MarkerKeys.h"
 
 #include "model/Numeric.h"
-#include "panel/Interlock.h"
+#include "panel/Hourglass.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "trace/FrequencyLabels.h"
@@ -36,26 +36,22 @@ const MarkerKeyRow& rowOf(const char* command) {
 }  // namespace
 
 MarkerKeys::MarkerKeys(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
-                       MarkerReadout& readout, TraceReader& traces, Events& events,
-                       MessageBoxes& boxes)
+                       MarkerReadout& readout, TraceReader& traces, const Interlock& interlock)
     : panel_(panel),
       mirror_(mirror),
       exchange_(exchange),
       readout_(readout),
       traces_(traces),
-      events_(events),
-      boxes_(boxes) {
-    panel_.MarkPkButton.Clicked.connect([this] { peak("MARKPK"); });
-    panel_.NextPeakButton.Clicked.connect([this] { peak("MARKNXTPK"); });
-    panel_.MinPeakButton.Clicked.connect([this] { peak("MARKMIN"); });
-    panel_.MarkToCentButton.Clicked.connect([this] { MarkToCentButton_Click(); });
-    panel_.MarkToRefButton.Clicked.connect([this] { MarkToRefButton_Click(); });
-    panel_.MarkerCheckBox.Clicked.connect([this] { MarkerCheckBox_Click(); });
-    panel_.DeltaCheckBox.Clicked.connect([this] { DeltaCheckBox_Click(); });
-}
-
-bool MarkerKeys::refused() {
-    return refusedUnconnected(panel_, boxes_) || refusedByContinuousView(panel_, boxes_);
+      interlock_(interlock),
+      events_(interlock.session().events),
+      boxes_(interlock.session().boxes) {
+    handlers_.on(panel_.MarkPkButton.Clicked, [this] { peak("MARKPK"); });
+    handlers_.on(panel_.NextPeakButton.Clicked, [this] { peak("MARKNXTPK"); });
+    handlers_.on(panel_.MinPeakButton.Clicked, [this] { peak("MARKMIN"); });
+    handlers_.on(panel_.MarkToCentButton.Clicked, [this] { MarkToCentButton_Click(); });
+    handlers_.on(panel_.MarkToRefButton.Clicked, [this] { MarkToRefButton_Click(); });
+    handlers_.on(panel_.MarkerCheckBox.Clicked, [this] { MarkerCheckBox_Click(); });
+    handlers_.on(panel_.DeltaCheckBox.Clicked, [this] { DeltaCheckBox_Click(); });
 }
 
 void MarkerKeys::paint(const char* command) {
@@ -84,13 +80,13 @@ bool MarkerKeys::command(const char* word) {
 }
 
 void MarkerKeys::peak(const char* word) {
-    if (refused()) return;
+    if (interlock_.refuses(panel_.*rowOf(word).key)) return;
     const Hourglass busy(panel_, events_);
     if (command(word)) readout_.MakeMarkerReadout();
 }
 
 void MarkerKeys::MarkToCentButton_Click() {
-    if (refused()) return;
+    if (interlock_.refuses(panel_.MarkToCentButton)) return;
     const Hourglass busy(panel_, events_);
     if (!command("MARKTOCENT")) return;
     events_.sleep(kMoveMs);
@@ -105,7 +101,7 @@ void MarkerKeys::MarkToCentButton_Click() {
 }
 
 void MarkerKeys::MarkToRefButton_Click() {
-    if (refused()) return;
+    if (interlock_.refuses(panel_.MarkToRefButton)) return;
     const Hourglass busy(panel_, events_);
     if (!command("MARKTOLVL")) return;
     events_.sleep(kMoveMs);
@@ -125,14 +121,14 @@ void MarkerKeys::MarkToRefButton_Click() {
 }
 
 bool MarkerKeys::checkRefused(CheckBox& box) {
-    if (refusedByPowerSensor(panel_, boxes_)) return true;
+    if (interlock_.refuses(Interlock::Rule::NoPowerSensor)) return true;
     if (!panel_.isConnected) {
         if (!box.Value()) return true;
-        boxes_.show({BoxIcon::Information, "Please connect to the instrument first."});
+        interlock_.refuses(Interlock::Rule::ConnectedBySend);
         box.setValue(false);
         return true;
     }
-    return refusedByContinuousView(panel_, boxes_);
+    return interlock_.refuses(Interlock::Rule::NoContinuousView);
 }
 
 void MarkerKeys::deltaOff() {

@@ -5,8 +5,7 @@
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MarkerReadout.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "trace/Interlock.h"
 #include "trace/TraceReader.h"
 
 namespace zel {
@@ -15,7 +14,7 @@ class MarkerKeys {
   public:
     /// Connects keys and check boxes.
     MarkerKeys(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
-               MarkerReadout& readout, TraceReader& traces, Events& events, MessageBoxes& boxes);
+               MarkerReadout& readout, TraceReader& traces, const Interlock& interlock);
 
     /// A peak key by its command: MARKPK, MARKNXTPK, MARKMIN.
     void peak(const char* word);
@@ -25,7 +24,6 @@ class MarkerKeys {
     void DeltaCheckBox_Click();
 
   private:
-    bool refused();
     void paint(const char* command);
     bool command(const char* word);
     bool checkRefused(CheckBox& box);
@@ -37,8 +35,10 @@ class MarkerKeys {
     CommandExchange& exchange_;
     MarkerReadout& readout_;
     TraceReader& traces_;
+    const Interlock& interlock_;
     Events& events_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

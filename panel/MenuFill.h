@@ -12,6 +12,15 @@
 
 namespace zel {
 
+class MenuFill;
+class SoftPanel;
+
+/// The routines that show a menu: its layout and its values.
+struct MenuRoutines {
+    SoftPanel& softPanel;
+    MenuFill& fill;
+};
+
 class MenuFill {
   public:
     MenuFill(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange)

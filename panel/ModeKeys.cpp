@@ -1,7 +1,7 @@
 #include "panel/ModeKeys.h"
 
 #include "model/Numeric.h"
-#include "panel/Interlock.h"
+#include "panel/Hourglass.h"
 #include "panel/MenuTables.h"
 #include "panel/ModeOptions.h"
 #include "trace/FrequencyLabels.h"
@@ -76,24 +76,25 @@ const ModeRow kModes[] = {
 }  // namespace
 
 ModeKeys::ModeKeys(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
-                   SoftPanel& softPanel, MenuFill& fill, GraphScaling& scaling, Events& events,
-                   MessageBoxes& boxes)
+                   const MenuRoutines& menus, GraphScaling& scaling, const Interlock& interlock)
     : panel_(forms.controller),
       dialog_(forms.main),
       mirror_(mirror),
       exchange_(exchange),
-      softPanel_(softPanel),
-      fill_(fill),
+      softPanel_(menus.softPanel),
+      fill_(menus.fill),
       scaling_(scaling),
-      events_(events),
-      boxes_(boxes) {
-    panel_.AnalyzerButton.Clicked.connect([this] { AnalyzerButton_Click(); });
-    panel_.ResetButton.Clicked.connect([this] { ResetButton_Click(); });
+      interlock_(interlock),
+      events_(interlock.session().events),
+      boxes_(interlock.session().boxes) {
+    handlers_.on(panel_.AnalyzerButton.Clicked, [this] { AnalyzerButton_Click(); });
+    handlers_.on(panel_.ResetButton.Clicked, [this] { ResetButton_Click(); });
     for (const ModeRow& row : kModes)
-        modeButton(panel_, row.mode).Clicked.connect([this, mode = row.mode] { enterMode(mode); });
+        handlers_.on(modeButton(panel_, row.mode).Clicked,
+                     [this, mode = row.mode] { enterMode(mode); });
     for (std::int16_t mode = CF::ANALYZER; mode <= CF::DISTTOFAULTMEASURE; ++mode) {
         OptionButton& option = modeOption(panel_, mode);
-        option.Clicked.connect([this, &option, mode] {
+        handlers_.on(option.Clicked, [this, &option, mode] {
             if (option.Value()) modeButton(panel_, mode).Click();
         });
     }
@@ -103,14 +104,14 @@ void ModeKeys::enterMode(std::int16_t mode) {
     const ModeRow* row = nullptr;
     for (const ModeRow& candidate : kModes)
         if (candidate.mode == mode) row = &candidate;
-    if (row == nullptr || refusedByContinuousView(panel_, boxes_)) return;
+    if (row == nullptr || interlock_.refuses(Interlock::Rule::NoContinuousView)) return;
     softPanel_.InitForm(row->menu);
     softPanel_.setKeyCaptions(row->captions);
     softPanel_.SetTextFieldsAndFrames(row->menu);
     const bool on = panel_.InstrumentMode == mode;
     if (!on || row->alwaysTakesOver) {
         const bool connecting = row->whileConnecting && dialog_.IsConnecting;
-        if (!connecting && refusedUnconnected(panel_, boxes_)) return;
+        if (!connecting && interlock_.refuses(Interlock::Rule::Connected)) return;
         const Hourglass busy(panel_, events_);
         if (!on) {
             if (!exchange_.SetInstrument("MEAS," + std::to_string(mode))) {
@@ -128,10 +129,12 @@ void ModeKeys::enterMode(std::int16_t mode) {
 }
 
 void ModeKeys::AnalyzerButton_Click() {
-    if (panel_.InstrumentMode == CF::ANALYZER || refusedByContinuousView(panel_, boxes_)) return;
+    if (panel_.InstrumentMode == CF::ANALYZER ||
+        interlock_.refuses(Interlock::Rule::NoContinuousView))
+        return;
     mirror_.PowerSensorExitRequested = true;
     panel_.FrequencyButton.Click();
-    if (refusedUnconnected(panel_, boxes_)) {
+    if (interlock_.refuses(Interlock::Rule::Connected)) {
         panel_.State = 0;
         return;
     }
@@ -165,7 +168,7 @@ void ModeKeys::presetMirror() {
 }
 
 void ModeKeys::ResetButton_Click() {
-    if (refusedByContinuousView(panel_, boxes_)) return;
+    if (interlock_.refuses(Interlock::Rule::NoContinuousView)) return;
     const Hourglass busy(panel_, events_);
     exchange_.CmdInstrument("PRESET");
     presetMirror();

@@ -6,17 +6,16 @@
 #include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
 #include "panel/SoftPanel.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
 #include "trace/GraphScaling.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
 class ModeKeys {
   public:
     /// Connects the mode keys, their options and the preset key.
-    ModeKeys(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange, SoftPanel& softPanel,
-             MenuFill& fill, GraphScaling& scaling, Events& events, MessageBoxes& boxes);
+    ModeKeys(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
+             const MenuRoutines& menus, GraphScaling& scaling, const Interlock& interlock);
 
     /// Enters the mode of that MEAS number, 2 to 7, and shows its menu.
     void enterMode(std::int16_t mode);
@@ -34,8 +33,10 @@ class ModeKeys {
     SoftPanel& softPanel_;
     MenuFill& fill_;
     GraphScaling& scaling_;
+    const Interlock& interlock_;
     Events& events_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

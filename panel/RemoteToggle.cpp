@@ -1,30 +1,26 @@
 #include "panel/RemoteToggle.h"
 
-#include "panel/Interlock.h"
+#include "panel/Hourglass.h"
 
 namespace zel {
 
-RemoteToggle::RemoteToggle(ControllerForm& panel, CommandExchange& exchange, Events& events,
-                           MessageBoxes& boxes)
-    : panel_(panel), exchange_(exchange), events_(events), boxes_(boxes) {
-    panel_.OnOffButton.Clicked.connect([this] { OnOffButton_Click(); });
-    panel_.LocalButton.Clicked.connect([this] { LocalButton_Click(); });
-}
-
-bool RemoteToggle::mayAct() {
-    return !refusedUnconnected(panel_, boxes_) && !refusedByContinuousView(panel_, boxes_);
+RemoteToggle::RemoteToggle(ControllerForm& panel, CommandExchange& exchange,
+                           const Interlock& interlock)
+    : panel_(panel), exchange_(exchange), interlock_(interlock) {
+    handlers_.on(panel_.OnOffButton.Clicked, [this] { OnOffButton_Click(); });
+    handlers_.on(panel_.LocalButton.Clicked, [this] { LocalButton_Click(); });
 }
 
 void RemoteToggle::OnOffButton_Click() {
-    if (!mayAct()) return;
-    const Hourglass busy(panel_, events_);
+    if (interlock_.refuses(panel_.OnOffButton)) return;
+    const Hourglass busy(panel_, interlock_.session().events);
     const bool toRemote = panel_.OnOffButton.Caption.get() == "R";
     exchange_.CmdInstrument(toRemote ? "REMOTE" : "LOCAL");
     panel_.OnOffButton.Caption = toRemote ? "L" : "R";
 }
 
 void RemoteToggle::LocalButton_Click() {
-    if (mayAct()) exchange_.CmdInstrument("LOCAL");
+    if (!interlock_.refuses(panel_.LocalButton)) exchange_.CmdInstrument("LOCAL");
 }
 
 }  // namespace zel

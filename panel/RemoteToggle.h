@@ -3,27 +3,23 @@
 
 #include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
 class RemoteToggle {
   public:
-    RemoteToggle(ControllerForm& panel, CommandExchange& exchange, Events& events,
-                 MessageBoxes& boxes);
+    RemoteToggle(ControllerForm& panel, CommandExchange& exchange, const Interlock& interlock);
 
     /// The caption holds the state to go to: "R" sends REMOTE, any other LOCAL.
     void OnOffButton_Click();
     void LocalButton_Click();
 
   private:
-    bool mayAct();
-
     ControllerForm& panel_;
     CommandExchange& exchange_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    const Interlock& interlock_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

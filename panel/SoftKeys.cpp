@@ -1,29 +1,29 @@
 #include "panel/SoftKeys.h"
 
-#include "panel/Interlock.h"
+#include "panel/Hourglass.h"
 
 namespace zel {
 
 SoftKeys::SoftKeys(ControllerForm& panel, SoftPanel& softPanel, Z9GetCommands& queries,
-                   Z9SetCommands& settings, Events& events, MessageBoxes& boxes)
+                   Z9SetCommands& settings, const Interlock& interlock)
     : panel_(panel),
       softPanel_(softPanel),
       queries_(queries),
       settings_(settings),
-      events_(events),
-      boxes_(boxes) {
+      interlock_(interlock) {
     for (int i = 0; i < panel_.SoftKey.count(); ++i) {
-        panel_.SoftKey(i).Clicked.connect([this, i] { SoftKey_Click(i); });
-        panel_.SoftTextBox(i).KeyPress.connect(
-            [this, i](int& key) { SoftTextBox_KeyPress(i, key); });
-        panel_.SoftTextBox(i).KeyDown.connect([this](int key, int) { SoftTextBox_KeyDown(key); });
-        panel_.ChoiceBox(i).Clicked.connect([this, i] { ChoiceBox_Click(i); });
+        handlers_.on(panel_.SoftKey(i).Clicked, [this, i] { SoftKey_Click(i); });
+        handlers_.on(panel_.SoftTextBox(i).KeyPress,
+                     [this, i](int& key) { SoftTextBox_KeyPress(i, key); });
+        handlers_.on(panel_.SoftTextBox(i).KeyDown,
+                     [this](int key, int) { SoftTextBox_KeyDown(key); });
+        handlers_.on(panel_.ChoiceBox(i).Clicked, [this, i] { ChoiceBox_Click(i); });
     }
 }
 
 void SoftKeys::SoftKey_Click(int index) {
-    if (refusedUnconnected(panel_, boxes_) || refusedByContinuousView(panel_, boxes_)) return;
-    const Hourglass busy(panel_, events_);
+    if (interlock_.refuses(panel_.SoftKey(index))) return;
+    const Hourglass busy(panel_, interlock_.session().events);
     softPanel_.SetSoftButtonsColor(index);
     queries_.press(index);
 }
@@ -34,9 +34,9 @@ void SoftKeys::SoftTextBox_KeyPress(int index, int key) {
         box.Text = "";
         panel_.SoftBoxFirstKey = 2;
     }
-    if (refusedUnconnected(panel_, boxes_)) return;
+    if (interlock_.refuses(Interlock::Rule::Connected)) return;
     const bool enters = key == kKeyEnter && (!box.Text.get().empty() || panel_.ChoiceBoxActivated);
-    if (enters && !refusedByContinuousView(panel_, boxes_)) {
+    if (enters && !interlock_.refuses(Interlock::Rule::NoContinuousView)) {
         panel_.SetOption.setValue(true);
         settings_.enter(index);
         panel_.SoftBoxFirstKey = 1;

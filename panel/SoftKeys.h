@@ -5,8 +5,7 @@
 #include "panel/SoftPanel.h"
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
@@ -14,7 +13,7 @@ class SoftKeys {
   public:
     /// Connects keys, boxes and lists.
     SoftKeys(ControllerForm& panel, SoftPanel& softPanel, Z9GetCommands& queries,
-             Z9SetCommands& settings, Events& events, MessageBoxes& boxes);
+             Z9SetCommands& settings, const Interlock& interlock);
 
     void SoftKey_Click(int index);
     /// Enter sets the value of the position; other characters go into the box.
@@ -29,8 +28,8 @@ class SoftKeys {
     SoftPanel& softPanel_;
     Z9GetCommands& queries_;
     Z9SetCommands& settings_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    const Interlock& interlock_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -16,7 +16,8 @@ class Events {
     /// Lets events run, and where none came waits for the next one, at most `ms` milliseconds.
     /// Wakes at once when a byte arrives on a port or socket, a timer is due or a user acts.
     virtual void wait(int ms) = 0;
-    /// A fixed delay of the protocol: no user event is served meanwhile.
+    /// A fixed delay of the protocol: no event is served meanwhile, timers included. The end of the
+    /// program cuts it short.
     virtual void sleep(int ms) = 0;
     /// Runs the task once, `ms` milliseconds from now, inside a later pump or wait.
     virtual TaskId schedule(double ms, std::function<void()> task) = 0;

@@ -7,6 +7,7 @@
 #include "platform/MessageBox.h"
 #include "platform/SerialPort.h"
 #include "platform/Services.h"
+#include "platform/Signals.h"
 #include "platform/Socket.h"
 
 namespace zel {
@@ -28,6 +29,7 @@ struct Platform {
     ApplicationFolder& folder;
     FileDialogs& fileDialogs;
     FileService& files;
+    Signals& endSignals;
 };
 
 }  // namespace zel

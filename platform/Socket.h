@@ -33,6 +33,8 @@ class Socket {
     virtual std::string peekData() = 0;
     virtual std::string getData() = 0;
     virtual std::string localIP() const = 0;
+    /// Why the socket is in the state Error, for a user; empty when nothing is known.
+    virtual std::string problem() const { return {}; }
 
     Event<> DataArrival;
     Event<int> ConnectionRequest;

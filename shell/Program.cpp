@@ -7,6 +7,7 @@
 #include "connection/Handshake.h"
 #include "connection/Profiles.h"
 #include "connection/SessionClock.h"
+#include "connection/SessionStart.h"
 #include "connection/TcpDialog.h"
 #include "files/FileMenu.h"
 #include "files/FileOps.h"
@@ -36,6 +37,7 @@
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
 #include "platform/TimerDriver.h"
+#include "shell/EndingBoxes.h"
 #include "shell/Logs.h"
 #include "shell/ProgramEnd.h"
 #include "shell/SecondTimer.h"
@@ -45,6 +47,7 @@
 #include "trace/FrequencyLabels.h"
 #include "trace/GraphInteraction.h"
 #include "trace/GraphScaling.h"
+#include "trace/Interlock.h"
 #include "trace/ManualScale.h"
 #include "trace/PaceMonitor.h"
 #include "trace/PowerReadout.h"
@@ -65,7 +68,7 @@ struct Program::Rooms {
           logs(p, commandLine),
           timers(p.events),
           link(forms, line, p.serialPort, p.tcpSocket, session, logs.line()),
-          reader(forms, line, link, mirror.SweepTime, session),
+          reader(forms, line, link, session),
           exchange(panel, line, link, reader, session),
           bytes(forms, line, link, p.tcpSocket, session),
           binary(panel, line, link, reader, bytes, session),
@@ -78,50 +81,45 @@ struct Program::Rooms {
           waterfall(forms, rows, p.folder),
           pictureOptions(forms.waterfall),
           history(forms),
-          manualScale(panel, forms.manualScale, p.boxes),
+          manualScale(panel, forms.manualScale, boxes),
           pace(panel, p.clock),
-          traces(forms, mirror, line, exchange, binary, conversion, scaling, pace, p.events,
-                 p.boxes),
+          traces(forms, mirror, line, exchange, binary, conversion, scaling, pace, p.events, boxes),
           power(forms, exchange, p.events),
-          sweeps(forms, exchange, traces, power, p.events, p.boxes),
+          interlock(forms, line, session),
+          sweeps(forms, exchange, traces, power, session),
           files(panel, p.fileDialogs, p.folder, p.files, p.clock),
-          views(forms, mirror, exchange, files, p.clock, p.boxes),
-          viewReader(forms, mirror, files, scaling, conversion, p.clock, p.events, p.boxes),
-          recording(forms, mirror, link, reader, exchange, traces, sweeps, files, views, p.clock,
-                    p.events, p.boxes),
+          views(forms, mirror, exchange, files, p.clock, boxes),
+          viewReader(forms, mirror, files, scaling, conversion, interlock),
+          recording(forms, mirror, instrument, sweeps, views, session),
           recent(panel, p.settings),
-          fileMenu(panel, files, p.folder, p.boxes),
-          spectrogram(panel, history, files, p.boxes),
-          waterfallKeys(forms.waterfall, files, p.boxes),
+          fileMenu(panel, files, p.folder, boxes),
+          spectrogram(panel, history, files, boxes),
+          waterfallKeys(forms.waterfall, files, boxes),
           softPanel(panel),
           fill(panel, mirror, exchange),
           markerReadout(panel, mirror, exchange),
-          queries(panel, mirror, exchange, softPanel, fill, markerReadout, traces, scaling,
-                  p.boxes),
+          queries(panel, mirror, exchange, softPanel, fill, markerReadout, traces, scaling, boxes),
           settings(forms, mirror, exchange, softPanel, queries, markerReadout, labels, traces,
                    scaling, p.events),
-          hardKeys(panel, mirror, exchange, softPanel, fill, p.boxes),
-          softKeys(panel, softPanel, queries, settings, p.events, p.boxes),
-          modeKeys(forms, mirror, exchange, softPanel, fill, scaling, p.events, p.boxes),
-          markerKeys(panel, mirror, exchange, markerReadout, traces, p.events, p.boxes),
-          manualCommand(panel, line, link, reader, p.events, p.boxes),
+          hardKeys(panel, mirror, exchange, MenuRoutines{softPanel, fill}, interlock),
+          softKeys(panel, softPanel, queries, settings, interlock),
+          modeKeys(forms, mirror, exchange, MenuRoutines{softPanel, fill}, scaling, interlock),
+          markerKeys(panel, mirror, exchange, markerReadout, traces, interlock),
+          manualCommand(panel, instrument, interlock),
           helpKeys(panel),
-          help(p.folder, p.files, p.launcher, p.boxes),
+          help(p.folder, p.files, p.launcher, boxes),
           sessionClock(panel, p.clock),
           profiles(panel, forms.main, p.settings),
-          handshake(forms, mirror, line, link, reader, exchange, labels, softPanel, fill, p.events,
-                    p.boxes),
-          dialog(forms, link, handshake, profiles, sessionClock, softPanel, traces, p.serialPorts,
-                 p.events),
-          tcpDialog(forms, link, handshake, sessionClock, traces, p.tcpSocket, p.settings, p.clock,
-                    p.events, p.boxes),
-          disconnection(forms, link, exchange, p.tcpSocket, sessionClock, graph, p.clock, p.events,
-                        p.boxes),
-          remote(panel, exchange, p.events, p.boxes),
+          handshake(forms, mirror, instrument, labels, MenuRoutines{softPanel, fill}, session),
+          sessionStart(panel, handshake, sessionClock, traces, softPanel),
+          dialog(forms, link, sessionStart, profiles, p.serialPorts, session),
+          tcpDialog(forms, instrument, sessionStart, p.tcpSocket, p.settings, session),
+          disconnection(forms, instrument, p.tcpSocket, sessionClock, graph, interlock),
+          remote(panel, exchange, interlock),
           serverMode(forms, p.startup, p.events),
           startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
           second(forms, p.serverSocket, sessionClock),
-          end(forms, p.boxes) {
+          end(forms, boxes) {
         panel.CommandLine = std::move(commandLine);
         history.describe = [this] {
             OutputFile header(files.service(), "", OutputFile::Mode::Output);
@@ -129,6 +127,14 @@ struct Program::Rooms {
             ViewHeader{panel, mirror, platform.clock, [](const char*, double&) {}}.write(header);
             return header.text();
         };
+        handlers.on(p.endSignals.EndRequested,
+                    [this](const std::string& name) { endAtOnce(name); });
+        // No wait, loop or modal form holds the end up.
+        handlers.on(end.Ended, [this] {
+            line.Ending = true;
+            for (Form* form : forms.all())
+                if (form->Modal) form->Hide();
+        });
         timers.attach(panel.UpNow);
         panel.ShowHelp.connect([this](int context) { help.showTopic(context); });
         timers.attach(panel.PaceTimer);
@@ -140,12 +146,23 @@ struct Program::Rooms {
         });
     }
 
+    /// LOCAL and the close, whatever is under way; then every wait and loop comes to its end.
+    void endAtOnce(const std::string& signal) {
+        if (end.ended()) return;
+        endedBy = signal;
+        line.Ending = true;
+        disconnection.endAtOnce();
+        end.end();
+    }
+
     Platform platform;
+    std::string endedBy;  ///< the signal that ended the program
     Forms forms;
     ControllerForm& panel = forms.controller;
-    Session session{platform.clock, platform.events, platform.boxes, panel.DebugTextBox};
-    ZEL3Variables mirror;
     ZELBas line;
+    EndingBoxes boxes{platform.boxes, line};
+    Session session{platform.clock, platform.events, boxes, panel.DebugTextBox};
+    ZEL3Variables mirror;
     Logs logs;
     TimerDriver timers;
     ByteLink link;
@@ -166,6 +183,7 @@ struct Program::Rooms {
     PaceMonitor pace;
     TraceReader traces;
     PowerReadout power;
+    Interlock interlock;
     SweepControl sweeps;
     FileOps files;
     ViewWriter views;
@@ -190,6 +208,7 @@ struct Program::Rooms {
     SessionClock sessionClock;
     Profiles profiles;
     Handshake handshake;
+    SessionStart sessionStart;
     ConnectionDialog dialog;
     TcpDialog tcpDialog;
     Disconnection disconnection;
@@ -198,6 +217,7 @@ struct Program::Rooms {
     StartUp startUp;
     SecondTimer second;
     ProgramEnd end;
+    Handlers handlers;
 };
 
 Program::Program(const Platform& platform, std::string commandLine)
@@ -214,6 +234,7 @@ CommandExchange& Program::exchange() { return rooms_->exchange; }
 TraceReader& Program::traces() { return rooms_->traces; }
 SweepHistory& Program::history() { return rooms_->history; }
 Logs& Program::logs() { return rooms_->logs; }
+Interlock& Program::interlock() { return rooms_->interlock; }
 
 void Program::start() {
     rooms_->recent.load();
@@ -245,6 +266,12 @@ bool Program::connect(const LinkAddress& address, bool readTrace) {
     return panel.isConnected;
 }
 
+std::string Program::connectionAdvice() const {
+    const bool tcp = rooms_->panel.ConnectionState == ControllerForm::TCPCON;
+    return tcp ? rooms_->forms.tcpConnection.AdviceLabel.Caption
+               : rooms_->forms.main.AdviceLabel.Caption;
+}
+
 void Program::disconnect() {
     if (rooms_->panel.isConnected) rooms_->disconnection.endSession();
 }
@@ -256,5 +283,6 @@ bool Program::requestClose() {
 }
 
 bool Program::ended() const { return rooms_->end.ended(); }
+const std::string& Program::endedBy() const { return rooms_->endedBy; }
 
 }  // namespace zel

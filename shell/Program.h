@@ -13,6 +13,7 @@
 namespace zel {
 
 class CommandExchange;
+class Interlock;
 class Logs;
 class SweepHistory;
 class TraceReader;
@@ -33,6 +34,7 @@ class Program {
     /// The sweeps of the last while.
     SweepHistory& history();
     Logs& logs();
+    Interlock& interlock();
 
     /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
     /// the server's window is closed; `ended` is then true.
@@ -41,6 +43,8 @@ class Program {
     /// showing the dialog. With `readTrace` one sweep is read and drawn as the dialog does. True
     /// when an instrument is connected.
     bool connect(const LinkAddress& address, bool readTrace);
+    /// What to check after an attempt that found no instrument; empty when nothing is to be said.
+    std::string connectionAdvice() const;
     /// LOCAL and the close, without the question; nothing when not connected.
     void disconnect();
 
@@ -48,6 +52,8 @@ class Program {
     bool requestClose();
     /// The program has come to its end; the front leaves its event loop.
     bool ended() const;
+    /// The signal that ended it ("SIGTERM"); empty when none did.
+    const std::string& endedBy() const;
     Event<> Ended;
 
   private:

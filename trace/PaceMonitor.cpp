@@ -60,7 +60,8 @@ void PaceMonitor::show() {
         text += "   " + formatPattern(sweepsPerSecond(), "0.0") + " sweeps/s   ";
         text += sweepSetsThePace() ? "the sweep sets the pace" : "the line sets the pace";
     }
-    panel_.CWGraph1.Old = running && age > 2 * std::max(cycleMicros_, kShortestCycle);
+    panel_.CWGraph1.Old =
+        panel_.LinkLost || (running && age > 2 * std::max(cycleMicros_, kShortestCycle));
     panel_.PaceLabel.Caption = text;
 }
 

@@ -1,5 +1,6 @@
 #include "trace/SweepControl.h"
 
+#include "link/WaitNotice.h"
 #include "platform/ModalForm.h"
 
 namespace zel {
@@ -8,6 +9,8 @@ namespace {
 using CF = ControllerForm;
 
 constexpr int kPowerBox = 0;
+constexpr const char* kLost = "connection lost";
+constexpr int kStopGraceMs = 1000;  // for the answer of a sweep that is about to end
 constexpr std::int32_t kLastRow = 2147483647;
 
 /// Says that an acquisition is under way for as long as it lives.
@@ -27,18 +30,18 @@ class Running {
 
 }  // namespace
 
-SweepControl::SweepControl(Forms& forms, const CommandExchange& exchange, TraceReader& traces,
-                           PowerReadout& power, Events& events, MessageBoxes& boxes)
+SweepControl::SweepControl(Forms& forms, CommandExchange& exchange, TraceReader& traces,
+                           PowerReadout& power, const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       exchange_(exchange),
       traces_(traces),
       power_(power),
-      events_(events),
-      boxes_(boxes) {
-    panel_.PlaySingleButton.Clicked.connect([this] { PlaySingleButton_Click(); });
-    panel_.PlayContinuousButton.Clicked.connect([this] { PlayContinuousButton_Click(); });
-    panel_.StopButton.Clicked.connect([this] { StopButton_Click(); });
+      events_(session.events),
+      boxes_(session.boxes) {
+    handlers_.on(panel_.PlaySingleButton.Clicked, [this] { PlaySingleButton_Click(); });
+    handlers_.on(panel_.PlayContinuousButton.Clicked, [this] { PlayContinuousButton_Click(); });
+    handlers_.on(panel_.StopButton.Clicked, [this] { StopButton_Click(); });
 }
 
 SweepControl::Pass SweepControl::passKind() const {
@@ -84,15 +87,18 @@ void SweepControl::RunContinuousView() {
     // Rows of an earlier view stay, this one goes on after the last of them.
     const GraphCurve3D* last = forms_.waterfall.Graph3D.lastRow();
     if (last != nullptr && last->depth.front() >= panel_.YVectorVal) countRow();
+    showLinkLost(panel_, false);
     bool good = firstPass();
     while (good && panel_.STOPFlag) {
         forms_.waterfall.styleLastRow();
-        if (exchange_.ExchangeFailed()) return;  // no clean-up: Stop is the way back
+        if (exchange_.ExchangeFailed()) return showLoss();  // no clean-up: Stop is the way back
         panel_.ContinuosLoopActive = true;
         good = laterPass();
         if (good) panel_.ContinuosLoopActive = false;
+        exchange_.giveTurn();
     }
-    if (good) {
+    if (!good && exchange_.ExchangeFailed()) showLoss();
+    if (good || !panel_.STOPFlag) {  // a wait that Stop has left is a stop as well
         panel_.Connection.Enabled = true;
         panel_.Utility.Enabled = true;
         forms_.waterfall.styleLastRow();
@@ -137,8 +143,18 @@ void SweepControl::countRow() {
     if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
 }
 
+void SweepControl::showLoss() {
+    showLinkLost(panel_, true);
+    panel_.CWGraph1.Old = true;
+    panel_.TimeLabel.Caption = std::string(kLost) + " " + panel_.TimeLabel.Caption.get();
+}
+
 void SweepControl::StopButton_Click() {
+    exchange_.leaveWait(kStopGraceMs);
     SetStopFlag(false);
+    // Behind a dead line no loop is left to enable them.
+    panel_.Connection.Enabled = true;
+    panel_.Utility.Enabled = true;
     panel_.ContinuosLoopActive = false;
     if (panel_.State == CF::POWER) forms_.powerAndRefl.unload(1);
     panel_.StopButton.Visible = false;

@@ -4,8 +4,7 @@
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "trace/PowerReadout.h"
 #include "trace/TraceReader.h"
 
@@ -14,8 +13,8 @@ namespace zel {
 class SweepControl {
   public:
     /// Connects the keys.
-    SweepControl(Forms& forms, const CommandExchange& exchange, TraceReader& traces,
-                 PowerReadout& power, Events& events, MessageBoxes& boxes);
+    SweepControl(Forms& forms, CommandExchange& exchange, TraceReader& traces, PowerReadout& power,
+                 const Session& session);
 
     void PlaySingleButton_Click();
     void PlayContinuousButton_Click();
@@ -26,6 +25,7 @@ class SweepControl {
     /// The newest plot of the waterfall is done, and the next trace has a row of its own.
     void nextRow();
     void countRow();
+    TraceReader& traces() { return traces_; }
     void SetStopFlag(bool value) { panel_.STOPFlag = value; }
 
   private:
@@ -34,14 +34,16 @@ class SweepControl {
     bool powerPass(Pass kind);
     bool firstPass();
     bool laterPass();
+    void showLoss();
 
     Forms& forms_;
     ControllerForm& panel_;
-    const CommandExchange& exchange_;
+    CommandExchange& exchange_;
     TraceReader& traces_;
     PowerReadout& power_;
     Events& events_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -108,6 +108,7 @@ TraceReader::Step TraceReader::wait() {
 
 void TraceReader::begin() {
     pace_.cycleBegins();
+    silenceToldHere_ = panel_.ContinuosLoopActive && !state_.ExchangeFailed;
     panel_.RecordData.Visible = false;
     pointer(11);
     panel_.PlaySingleButton.Enabled = false;
@@ -181,13 +182,17 @@ void TraceReader::waterfallRow() {
 
 void TraceReader::abortView(bool& success) {
     panel_.PlaySingleButton.Enabled = true;
-    if (!state_.DialCancelled) boxes_.show({BoxIcon::Information, "Unsuccessful View"});
+    // In the continuous view the silence itself was told, and one box is enough.
+    const bool known = state_.WaitLeft || state_.Ending || silenceToldHere_;
+    if (!state_.DialCancelled && !known) boxes_.show({BoxIcon::Information, "Unsuccessful View"});
     pointer(0);
     success = false;
 }
 
 void TraceReader::ReadSingleTrace(bool& success) {
     success = false;
+    const DialogueScope scope(state_);
+    silenceToldHere_ = false;
     if (!panel_.isConnected) {
         boxes_.show({BoxIcon::Information, "Please connect to the intrument first."});
         return;
@@ -223,6 +228,8 @@ void TraceReader::ReadSingleTrace(bool& success) {
 
 void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     success = false;
+    const DialogueScope scope(state_);
+    silenceToldHere_ = false;
     if (state_.ExchangeFailed) return abortView(success);
     const auto close = [this] {
         pointer(0);

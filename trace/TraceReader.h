@@ -64,6 +64,7 @@ class TraceReader {
     PaceMonitor& pace_;
     Events& events_;
     MessageBoxes& boxes_;
+    bool silenceToldHere_ = false;  ///< a failure of this cycle's line has a box of its own
 };
 
 }  // namespace zel

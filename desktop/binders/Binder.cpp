@@ -57,6 +57,18 @@ Binder::Binder(QObject* parent) : QObject(parent) {
 
 bool Binder::refused(const Control& control) const { return refuses && refuses(control); }
 
+void Binder::act(const Control& control, std::function<void()> work) const {
+    // By the time of its turn a control may be gone from the window.
+    const auto checked = [&control, work = std::move(work)] {
+        if (control.Visible && control.Enabled) work();
+    };
+    if (perform) {
+        perform(control, checked);
+    } else if (!refused(control)) {
+        checked();
+    }
+}
+
 QObject* Binder::widgetOf(const Control& control) const {
     const auto found = entries_.find(&control);
     return found == entries_.end() ? nullptr : found->second.widget;
@@ -115,9 +127,8 @@ void Binder::describe(const Control& control, QWidget* widget) {
 
 void Binder::bind(Button& control, QPushButton* widget) {
     widget->installEventFilter(new KeyTeller(control, widget));
-    connect(widget, &QPushButton::clicked, this, [this, &control] {
-        if (!refused(control)) control.Click();
-    });
+    connect(widget, &QPushButton::clicked, this,
+            [this, &control] { act(control, [&control] { control.Click(); }); });
     follow(control, widget, [&control, widget] {
         widget->setText(caption(control.Caption));
         widget->setEnabled(control.Enabled && hasHandler(control));
@@ -132,7 +143,13 @@ void Binder::bind(Button& control, QPushButton* widget) {
 }
 
 void Binder::bind(TextBox& control, PanelLineEdit* widget) {
-    widget->setControl(&control, [this, &control] { return refused(control); });
+    widget->setControl(
+        &control, [this, &control] { return refused(control); },
+        [this, &control](std::function<void()> enter) {
+            if (!defers || !defers(control)) return false;
+            act(control, std::move(enter));
+            return true;
+        });
     connect(widget, &QLineEdit::textEdited, this, [this, &control, widget](const QString& typed) {
         if (refused(control)) return markDirty(&control);
         control.Text = typed.toStdString();
@@ -167,12 +184,9 @@ void Binder::bind(Label& control, QLabel* widget) {
 
 void Binder::bind(CheckBox& control, QCheckBox* widget) {
     connect(widget, &QCheckBox::clicked, this, [this, &control, widget] {
-        if (refused(control)) {
-            widget->setChecked(control.Value());
-        } else {
-            control.Click();
-            markDirty(&control);
-        }
+        act(control, [&control] { control.Click(); });
+        widget->setChecked(control.Value());
+        markDirty(&control);
     });
     follow(control, widget, [&control, widget] {
         widget->setText(caption(control.Caption));
@@ -186,7 +200,7 @@ void Binder::bind(OptionButton& control, QRadioButton* widget) {
     // The group is the form's: Qt's own exclusion would not know what code selects.
     widget->setAutoExclusive(false);
     connect(widget, &QRadioButton::clicked, this, [this, &control, widget] {
-        if (!refused(control)) control.Click();
+        act(control, [&control] { control.Click(); });
         widget->setChecked(control.Value());
         markDirty(&control);
     });
@@ -203,7 +217,9 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
     widget->installEventFilter(new ListGuard(control, widget));
     widget->setInsertPolicy(QComboBox::NoInsert);
     connect(widget, &QComboBox::activated, this, [this, &control](int index) {
-        if (!refused(control) && !control.Locked) control.pick(index);
+        act(control, [&control, index] {
+            if (!control.Locked) control.pick(index);
+        });
         markDirty(&control);
     });
     if (control.editable()) {
@@ -258,7 +274,7 @@ void Binder::bind(Frame& control, QWidget* widget, QLabel* captionLabel) {
 
 void Binder::bind(MenuItem& control, QAction* action) {
     connect(action, &QAction::triggered, this, [this, &control] {
-        if (!refused(control)) control.Click();
+        act(control, [&control] { control.Click(); });
         markDirty(&control);
     });
     const QString keys = shortcutOf(control);

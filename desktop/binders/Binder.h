@@ -54,6 +54,10 @@ class Binder : public QObject {
     /// While this answers true for a control, what a user does to it is dropped: work is under
     /// way that it must not disturb.
     std::function<bool(const Control&)> refuses;
+    /// Whether what a user does to a control waits for the end of what is under way.
+    std::function<bool(const Control&)> defers;
+    /// Runs what a user does to a control, now or in its turn; at once where it is empty.
+    std::function<void(const Control&, std::function<void()>)> perform;
     /// Whether the control was bound, for the tests.
     QObject* widgetOf(const Control& control) const;
 
@@ -62,6 +66,7 @@ class Binder : public QObject {
     void markDirty(const void* key);
     void describe(const Control& control, QWidget* widget);
     bool refused(const Control& control) const;
+    void act(const Control& control, std::function<void()> work) const;
 
     struct Entry {
         QObject* widget = nullptr;
@@ -77,7 +82,9 @@ class Binder : public QObject {
 class PanelLineEdit : public QLineEdit {
   public:
     explicit PanelLineEdit(QWidget* parent = nullptr);
-    void setControl(TextBox* control, std::function<bool()> refused);
+    /// `enter` may take an Enter over that has to wait for its turn.
+    void setControl(TextBox* control, std::function<bool()> refused,
+                    std::function<bool(std::function<void()>)> enter);
     /// A key is on its way into the text, and its control knows of it.
     bool typing() const { return typing_; }
 
@@ -90,6 +97,7 @@ class PanelLineEdit : public QLineEdit {
     TextBox* control_ = nullptr;
     bool typing_ = false;
     std::function<bool()> refused_;
+    std::function<bool(std::function<void()>)> enter_;
 };
 
 /// The face of a control's colour for the style sheet: "plain", "red", "green", "gray".

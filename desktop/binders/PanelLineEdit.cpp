@@ -20,9 +20,11 @@ PanelLineEdit::PanelLineEdit(QWidget* parent) : QLineEdit(parent) {
     setAcceptDrops(false);
 }
 
-void PanelLineEdit::setControl(TextBox* control, std::function<bool()> refused) {
+void PanelLineEdit::setControl(TextBox* control, std::function<bool()> refused,
+                               std::function<bool(std::function<void()>)> enter) {
     control_ = control;
     refused_ = std::move(refused);
+    enter_ = std::move(enter);
 }
 
 void PanelLineEdit::keyPressEvent(QKeyEvent* event) {
@@ -31,6 +33,13 @@ void PanelLineEdit::keyPressEvent(QKeyEvent* event) {
     if (event->matches(QKeySequence::Paste) || event->matches(QKeySequence::Cut) ||
         event->matches(QKeySequence::Undo) || event->matches(QKeySequence::Redo))
         return QLineEdit::keyPressEvent(event);
+    const bool enters = keyCodeOf(*event) == kKeyEnter;
+    if (enters && enter_ && enter_([control = control_] {
+            int key = kKeyEnter;
+            control->KeyDown(key, 0);
+            control->KeyPress(key);
+        }))
+        return;
     typing_ = true;
     insertKey(event);
     typing_ = false;

@@ -14,7 +14,6 @@ namespace {
 // An answer of a fast line comes within this time; events need not run meanwhile.
 constexpr int kShortWayMs = 2;
 constexpr std::int64_t kPumpEveryMicros = 2000;
-constexpr std::int64_t kPaintEveryMicros = 10000;
 constexpr std::size_t kMostSources = 8;
 
 }  // namespace
@@ -96,19 +95,16 @@ void QtEvents::processAndWait(int ms) {
 }
 
 void QtEvents::sleep(int ms) {
+    // Nothing is served, timers included: a tick that began an exchange now would stand between
+    // the two halves of another. Only the end of the program does not wait.
     const std::int64_t end = clock_.micros() + std::int64_t{ms} * 1000;
+    pollfd wake{wakeDescriptor_, POLLIN, 0};
     for (;;) {
-        // The windows go on being painted; what a user does waits. An input that waits in the
-        // queue would end a wait for events at once, so the pauses between are plain ones.
-        if (clock_.micros() - lastProcessed_ >= kPumpEveryMicros) {
-            if (QAbstractEventDispatcher* dispatcher = QAbstractEventDispatcher::instance())
-                dispatcher->processEvents(QEventLoop::ExcludeUserInputEvents);
-            lastProcessed_ = clock_.micros();
-        }
         const std::int64_t left = end - clock_.micros();
         if (left <= 0) return;
-        const std::int64_t pause = std::min(left, kPaintEveryMicros);
-        ::poll(nullptr, 0, static_cast<int>((pause + 999) / 1000));
+        const int woken =
+            ::poll(&wake, wakeDescriptor_ < 0 ? 0 : 1, static_cast<int>((left + 999) / 1000));
+        if (woken > 0) return;
     }
 }
 

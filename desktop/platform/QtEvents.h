@@ -30,6 +30,8 @@ class QtEvents : public Events {
     };
     int addSource(Source source);
     void removeSource(int id);
+    /// A descriptor that ends a delay as soon as it can be read; -1 for none.
+    void setWakeDescriptor(int descriptor) { wakeDescriptor_ = descriptor; }
 
   private:
     bool bytesWait() const;
@@ -43,6 +45,7 @@ class QtEvents : public Events {
     std::map<TaskId, std::unique_ptr<QTimer>> tasks_;
     TaskId lastTask_ = 0;
     std::unique_ptr<QTimer> waitTimer_;
+    int wakeDescriptor_ = -1;
     std::int64_t lastProcessed_ = 0;  // microseconds
 };
 

@@ -8,6 +8,7 @@
 #include "desktop/platform/QtEvents.h"
 #include "desktop/platform/QtSerialPort.h"
 #include "desktop/platform/QtServices.h"
+#include "desktop/platform/QtSignals.h"
 #include "desktop/platform/QtSocket.h"
 #include "desktop/platform/SystemFiles.h"
 #include "platform/Platform.h"
@@ -16,8 +17,11 @@ namespace zel {
 
 /// Needs a QCoreApplication; the windows of boxes and dialogs need a QApplication.
 struct QtPlatform {
-    explicit QtPlatform(const QString& home = {}) : folder(home) {}
+    explicit QtPlatform(const QString& home = {}) : folder(home) {
+        events.setWakeDescriptor(endSignals.descriptor());
+    }
 
+    QtSignals endSignals;
     QtClock clock;
     QtEvents events{clock};
     QtMessageBoxes boxes;
@@ -37,9 +41,9 @@ struct QtPlatform {
     Platform bundle() { return bundle(boxes, fileDialogs); }
     /// With boxes and file dialogs of another front.
     Platform bundle(MessageBoxes& otherBoxes, FileDialogs& otherDialogs) {
-        return {clock,     events,       otherBoxes, serialPort,   serialPorts,
-                tcpSocket, serverSocket, settings,   debug,        clipboard,
-                launcher,  startup,      folder,     otherDialogs, files};
+        return {clock,        events,       otherBoxes, serialPort, serialPorts, tcpSocket,
+                serverSocket, settings,     debug,      clipboard,  launcher,    startup,
+                folder,       otherDialogs, files,      endSignals};
     }
 };
 

@@ -56,6 +56,7 @@ void QtSocket::adopt(QTcpSocket* socket) {
                              peerClosed_ = true;
                          } else {
                              failed_ = true;
+                             problem_ = socket_->errorString().toStdString();
                          }
                      });
 }
@@ -89,6 +90,7 @@ void QtSocket::close() {
     }
     server_.close();
     failed_ = peerClosed_ = false;
+    problem_.clear();
 }
 
 SocketState QtSocket::state() const {

@@ -25,6 +25,7 @@ class QtSocket : public Socket {
     std::string peekData() override;
     std::string getData() override;
     std::string localIP() const override;
+    std::string problem() const override { return problem_; }
 
   private:
     void adopt(QTcpSocket* socket);
@@ -36,6 +37,7 @@ class QtSocket : public Socket {
     std::map<int, QTcpSocket*> requests_;
     int lastRequest_ = 0;
     bool failed_ = false;
+    std::string problem_;  ///< of the failure
     bool peerClosed_ = false;
     int source_ = 0;
 };

@@ -34,7 +34,20 @@ constexpr const char* kCancels[] = {"cmdCancel", "CancelTimeButton", "QuitTCPBut
                                     "ClosePwrForm"};
 
 constexpr int kFieldWidth = 260;
+constexpr int kAdviceWidth = 380;
 constexpr int kHourglass = 11;
+
+/// A line of more than one row, which needs its room from the start.
+QLabel* adviceLine(Label& control, Binder& binder) {
+    auto* label = new QLabel;
+    label->setWordWrap(true);
+    label->setTextFormat(Qt::PlainText);
+    label->setMinimumWidth(kAdviceWidth);
+    label->setMinimumHeight(3 * label->fontMetrics().lineSpacing());
+    label->setAlignment(Qt::AlignLeft | Qt::AlignTop);
+    binder.bind(control, label);
+    return label;
+}
 
 }  // namespace
 
@@ -123,7 +136,9 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
     layout->addLayout(fields);
     QLabel* caption = nullptr;
     for (Control* control : form.controls()) {
-        if (control->kind() == ControlKind::Label) {
+        if (control->name() == "AdviceLabel") {
+            layout->addWidget(adviceLine(static_cast<Label&>(*control), binder));
+        } else if (control->kind() == ControlKind::Label) {
             caption = new QLabel;
             binder.bind(static_cast<Label&>(*control), caption);
         } else if (control->kind() == ControlKind::TextBox) {
@@ -220,6 +235,7 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     for (const Button* control :
          {&form.CancelButton, &form.CancelConnButton, &form.CancelConnButton1})
         setCancel(*control);
+    layout->addWidget(adviceLine(form.AdviceLabel, binder));
     layout->addStretch(1);
     busy_ = new QProgressBar;
     busy_->setRange(0, 0);

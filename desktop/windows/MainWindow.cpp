@@ -8,7 +8,6 @@
 #include <QMenuBar>
 #include <QStatusBar>
 #include <QVBoxLayout>
-#include <algorithm>
 #include <map>
 #include <set>
 
@@ -19,6 +18,7 @@
 #include "desktop/windows/PlaybackBar.h"
 #include "desktop/windows/Shortcuts.h"
 #include "desktop/windows/WaterfallWindow.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 namespace {
@@ -30,6 +30,7 @@ constexpr int kSideWidth = 440;
 constexpr int kWidestSide = 620;
 constexpr int kPaceWidth = 190;
 constexpr int kHourglass = 11;
+constexpr const char* kLostDot = "<span style='color:#c0392b'>●</span>";
 constexpr QSize kSmallestImage(800, 500);
 
 /// The last part of a text whose parts stand apart goes to a line of its own: the readouts beside
@@ -54,7 +55,16 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     setObjectName("ControllerForm");
     setMinimumSize(1000, 570);
     resize(1280, 760);
-    binder_.refuses = [this](const Control& control) { return mustNotDisturb(control); };
+    Interlock& interlock = program_.interlock();
+    binder_.refuses = [&interlock](const Control& control) {
+        return interlock.turnOf(control) == Interlock::Turn::Never;
+    };
+    binder_.defers = [&interlock](const Control& control) {
+        return interlock.turnOf(control) == Interlock::Turn::Later;
+    };
+    binder_.perform = [&interlock](const Control& control, std::function<void()> act) {
+        interlock.perform(control, std::move(act));
+    };
     auto* centre = new QWidget;
     auto* layout = new QHBoxLayout(centre);
     layout->setSpacing(kSpacing);
@@ -71,7 +81,8 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     buildShortcuts(*this, panel_, binder_);
     terminators_->buildShortcuts(*this);
     installEventFilter(new FileDrop(
-        *this, [this] { return mustNotDisturb(panel_.LoadData); },
+        *this,
+        [this, &interlock] { return interlock.turnOf(panel_.LoadData) != Interlock::Turn::Now; },
         [this](const QString& path) { panel_.OpenFile(path.toStdString()); }));
 
     Forms& forms = program_.forms();
@@ -107,21 +118,6 @@ void MainWindow::drawImage(const std::string& path, std::string& problem) {
     saveGraphImage(panel_.CWGraph1, annotateView(panel_, program_.variables()),
                    QString::fromStdString(path), &error, graph_->size().expandedTo(kSmallestImage));
     problem = error.toStdString();
-}
-
-bool MainWindow::mustNotDisturb(const Control& control) const {
-    // The continuous view refuses by itself, in words.
-    if (panel_.ContinuosLoopActive) return false;
-    const bool busy = panel_.MousePointer == kHourglass || panel_.AcquisitionRunning ||
-                      program_.forms().main.MousePointer == kHourglass;
-    const Forms& forms = program_.forms();
-    // What only looks at sweeps that have come disturbs nothing.
-    if (&control.form() == &forms.waterfall) return false;
-    const Control* const always[] = {
-        &panel_.StopButton,          &panel_.ExitObject, &forms.main.CancelButton,
-        &forms.specialMeas.sldSpeed, &panel_.cmd3D,      &panel_.SpectrogramShow,
-        &panel_.SpectrogramPause};
-    return busy && std::find(std::begin(always), std::end(always), &control) == std::end(always);
 }
 
 QWidget* MainWindow::graphSide() {
@@ -239,12 +235,15 @@ void MainWindow::buildStatusLine() {
     statusBar()->addWidget(activity_);
     statusBar()->addWidget(state_, 1);
     auto* progress = new QLabel;
+    auto* wait = new QLabel;
+    statusBar()->addPermanentWidget(wait);
     statusBar()->addPermanentWidget(progress);
     statusBar()->addPermanentWidget(busy_);
     statusBar()->addPermanentWidget(clock);
     statusBar()->setSizeGripEnabled(false);
     binder_.bind(panel_.TimeLabel, clock);
     binder_.bind(panel_.FileLabel, progress);
+    binder_.bind(panel_.WaitLabel, wait);
     for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
         binder_.bindShow(*picture, state_, [this] { showState(); });
     activityOff_.setSingleShot(true);
@@ -252,7 +251,7 @@ void MainWindow::buildStatusLine() {
             [this] { activity_->setText("<span style='color:#77818b'>●</span>"); });
     activityOff_.start(0);
     panel_.DebugTextBox.Changed.connect([self = QPointer<MainWindow>(this)] {
-        if (!self || self->activityOff_.isActive()) return;
+        if (!self || self->activityOff_.isActive() || self->panel_.LinkLost) return;
         self->activity_->setText("<span style='color:#27ae60'>●</span>");
         self->activityOff_.start(kActivityMs);
     });
@@ -270,11 +269,17 @@ void MainWindow::showState() {
                                          forms.tcpConnection.RemotePortTextBox.Text.get())
                 : QString::fromStdString(forms.main.COMList.Text() + ", " +
                                          forms.main.BaudList.Text() + " baud");
-        text = "Connected: " + id + "  (" + where + ")";
+        text = (panel_.LinkLost ? "Connection lost: " : "Connected: ") + id + "  (" + where + ")";
     } else if (forms.main.IsConnecting && forms.main.MousePointer == kHourglass) {
         text = "Connecting...";
     }
     state_->setText(text);
+    if (panel_.LinkLost) {
+        activityOff_.stop();
+        activity_->setText(kLostDot);
+    } else if (activity_->text() == kLostDot) {
+        activityOff_.start(0);
+    }
     const bool busy = panel_.MousePointer == kHourglass || forms.main.MousePointer == kHourglass;
     busy_->setVisible(busy && !panel_.ContinuosLoopActive);
     setCursor(busy && !panel_.ContinuosLoopActive ? Qt::BusyCursor : Qt::ArrowCursor);

@@ -38,7 +38,6 @@ class MainWindow : public QMainWindow {
     void buildStatusLine();
     void showState();
     void drawImage(const std::string& path, std::string& problem);
-    bool mustNotDisturb(const Control& control) const;
 
     Program& program_;
     ControllerForm& panel_;

@@ -30,6 +30,8 @@ class ScriptedSocket : public Socket {
     void arrive(const std::string& bytes);
     /// The far end closes.
     void peerCloses();
+    /// What the platform says about a connection that ends in Error.
+    void setProblem(std::string problem) { problem_ = std::move(problem); }
     void setState(SocketState state) { state_ = state; }
     void setLocalIP(std::string address) { localIP_ = std::move(address); }
 
@@ -48,6 +50,7 @@ class ScriptedSocket : public Socket {
     std::string peekData() override { return waiting_; }
     std::string getData() override { return std::exchange(waiting_, {}); }
     std::string localIP() const override { return localIP_; }
+    std::string problem() const override { return problem_; }
 
   private:
     void begin();
@@ -61,6 +64,7 @@ class ScriptedSocket : public Socket {
     std::string waiting_;
     std::string host_;
     int port_ = 0;
+    std::string problem_;
     std::string localIP_ = "127.0.0.1";
 };
 

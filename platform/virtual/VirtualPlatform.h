@@ -27,6 +27,7 @@ struct VirtualPlatform {
     FixedApplicationFolder folder;
     QueuedFileDialogs fileDialogs;
     VirtualFiles files{clock};
+    Signals endSignals;
 
     /// The bundle with the scripted port.
     Platform bundle() { return bundle(port); }
@@ -35,7 +36,7 @@ struct VirtualPlatform {
     /// The same on another disk.
     Platform bundle(SerialPort& other, FileService& disk) {
         return {clock, events,    boxes,    other,   ports,  tcpSocket,   serverSocket, settings,
-                debug, clipboard, launcher, startup, folder, fileDialogs, disk};
+                debug, clipboard, launcher, startup, folder, fileDialogs, disk,         endSignals};
     }
 };
 

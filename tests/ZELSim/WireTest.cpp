@@ -228,6 +228,18 @@ TEST(Wire, Wait_TakesTheSweepTimeDividedByTheSpeed) {
     EXPECT_EQ(host.wire.take(), "");
 }
 
+TEST(Wire, BareCrInAWait_EndsItAndIsAnswered) {
+    Host host;
+    EXPECT_EQ(host.cmd("REMOTE"), "0\r");
+    EXPECT_EQ(host.set("SWPTIME,100"), "0\r");
+    EXPECT_EQ(host.cmd("WAIT"), "");
+    host.wire.advance(2);
+    EXPECT_EQ(host.say(""), "0\r");
+    EXPECT_EQ(host.value("SWPTIME"), "100");
+    host.wire.advance(300);
+    EXPECT_EQ(host.wire.take(), "");  // the wait is not answered any more
+}
+
 TEST(Wire, LinesBehindWait_AreServedAfterIt) {
     Host host;
     host.setUp({"SWPTIME,0.1"});

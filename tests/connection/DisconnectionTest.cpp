@@ -231,8 +231,9 @@ struct Dialled : LineRig, ::testing::Test {
     ZEL3Variables mirror;
     GraphInteraction graph{panel, mirror};
     SessionClock sessionClock{panel, platform.clock};
-    Disconnection disconnection{forms, link,           exchange, socket, sessionClock,
-                                graph, platform.clock, events,   boxes};
+    InstrumentLink line{state, link, reader, exchange, binary};
+    Interlock interlock{forms, state, session};
+    Disconnection disconnection{forms, line, socket, sessionClock, graph, interlock};
 };
 
 TEST_F(Dialled, HangUp_SilentModem_TakesALittleOver10AndAHalfSeconds) {

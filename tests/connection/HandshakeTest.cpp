@@ -287,8 +287,8 @@ struct BareHandshake : LineRig {
     FrequencyLabels labels{panel, dialog, mirror, exchange, events};
     SoftPanel softPanel{panel};
     MenuFill fill{panel, mirror, exchange};
-    Handshake handshake{forms,  mirror,    state, link,   reader, exchange,
-                        labels, softPanel, fill,  events, boxes};
+    InstrumentLink line{state, link, reader, exchange, binary};
+    Handshake handshake{forms, mirror, line, labels, {softPanel, fill}, session};
 };
 
 TEST(DialledHandshake, MobilePhones_SettleForThreeSecondsMore) {

@@ -1,4 +1,6 @@
 #include <gtest/gtest.h>
+#include <sys/ioctl.h>
+#include <unistd.h>
 
 #include <sstream>
 #include <string>
@@ -32,11 +34,11 @@ struct PanelSessionTest : ::testing::Test {
         ConsoleBoxes boxes(output, answers);
         ConsoleFileDialogs dialogs(answers);
         ServingEvents events(platform.events);
-        Program program(
-            {platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
-             platform.serverSocket, platform.settings, platform.debug, platform.clipboard,
-             platform.launcher, platform.startup, platform.folder, dialogs, platform.files},
-            words);
+        Program program({platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
+                         platform.serverSocket, platform.settings, platform.debug,
+                         platform.clipboard, platform.launcher, platform.startup, platform.folder,
+                         dialogs, platform.files, platform.endSignals},
+                        words);
         PanelSession session(program,
                              {platform.clock, events, input, output, errorOutput, answers, true},
                              LinkAddress{LinkAddress::Kind::Serial, kSimulatorPort, 57600});
@@ -199,6 +201,56 @@ TEST_F(PanelSessionTest, LineThatIsTooLong_IsToldAndPassedOver) {
 TEST_F(PanelSessionTest, BytesThatAreNoUtf8_AreTakenAsWestern) {
     EXPECT_EQ(play("set MainForm.TelNumberBox \xE9\nshow MainForm.TelNumberBox.Text\n"),
               "\xC3\xA9\n");
+}
+
+TEST_F(PanelSessionTest, LineInATickOfTheRecording_WaitsForItsEnd) {
+    // 4 s a sweep: the lines come in the middle of the first tick.
+    platform.files.putFolder("/views");
+    const std::string printed = play(
+        "connect\n"
+        "click SweepButton\n"
+        "key SoftTextBox(0) right\n"
+        "set SoftTextBox(0) 4\n"
+        "key SoftTextBox(0) enter\n"
+        "click RecordData\n"
+        "set TimeForm.TimeIntervalBox 5\n"
+        "answer /views/trace.csv\n"
+        "click TimeForm.SubmitTimeButton\n"
+        "pump 5500\n"
+        "show PlaySingleButton.Enabled\n"
+        "click MarkerCheckBox\n"
+        "show TimeForm.RecordedCount\n"
+        "show MarkerOn\n"
+        "click StopButton\n");
+    // The tick was under way, the click came after it, and the line behind waited as well.
+    EXPECT_EQ(printed, "false\n1\ntrue\n");
+}
+
+TEST(LineInputTest, StandardInput_IsReadAheadByAThousandLinesAtMost) {
+    int ends[2];
+    ASSERT_EQ(::pipe(ends), 0);
+    const std::string lines(5000, '\n');
+    ASSERT_EQ(::write(ends[1], lines.data(), lines.size()), static_cast<ssize_t>(lines.size()));
+    DescriptorLines input(ends[0]);
+    std::string line;
+    ASSERT_EQ(input.next(line, false), LineInput::Got::Line);
+    int left = 0;
+    ASSERT_EQ(::ioctl(ends[0], FIONREAD, &left), 0);
+    EXPECT_GE(left, 4000);
+    ::close(ends[0]);
+    ::close(ends[1]);
+}
+
+TEST(LineInputTest, WaitForALine_EndsWithTheOtherDescriptor) {
+    int lines[2];
+    int wake[2];
+    ASSERT_EQ(::pipe(lines), 0);
+    ASSERT_EQ(::pipe(wake), 0);
+    ASSERT_EQ(::write(wake[1], "!", 1), 1);
+    DescriptorLines input(lines[0], wake[0]);
+    std::string line;
+    EXPECT_EQ(input.next(line, true), LineInput::Got::Nothing);
+    for (const int end : {lines[0], lines[1], wake[0], wake[1]}) ::close(end);
 }
 
 }  // namespace

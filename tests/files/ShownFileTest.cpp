@@ -43,6 +43,30 @@ struct ShownFileTest : FileSession, ::testing::Test {
     std::string faults;
 };
 
+TEST_F(ShownFileTest, WhileAViewRuns_NothingIsLoaded) {
+    panel.ContinuosLoopActive = true;
+    const unsigned long plots = panel.CWGraph1.plotSerial();
+    show(text);
+    panel.ContinuosLoopActive = false;
+    panel.AcquisitionRunning = panel.STOPFlag = true;  // between two passes
+    show(text);
+    EXPECT_EQ(boxes.texts(), (Texts{"Please exit the continuous View Mode first",
+                                    "Please exit the continuous View Mode first"}));
+    EXPECT_EQ(panel.CWGraph1.plotSerial(), plots);
+    EXPECT_FALSE(panel.Shown.fromFile);
+}
+
+TEST_F(ShownFileTest, WhileARecordingRuns_NothingIsLoaded) {
+    panel.RecordDataFlag = true;
+    platform.fileDialogs.answer(folder.write("shown.csv", text));
+    panel.LoadData.Click();
+    show(text);
+    EXPECT_EQ(boxes.texts(),
+              (Texts{"Please stop the recording first", "Please stop the recording first"}));
+    EXPECT_TRUE(platform.fileDialogs.opens.empty());
+    EXPECT_FALSE(panel.Shown.fromFile);
+}
+
 TEST_F(ShownFileTest, Annotations_AreThoseOfTheFile) {
     mirror.ResolutionBandwidth = 1;
     mirror.SweepTime = 9;

@@ -115,26 +115,26 @@ TEST_F(Answers, Silence_Tcp_EndsAfterSixteenSeconds) {
 
 TEST_F(Answers, Silence_AfterWait_LastsTwoSweepsLonger) {
     state.WaitCommandActive = true;
-    SweepTime = 3;
+    state.SweepTimeTold = 3;
     expectSilenceOf(15);
 }
 
 TEST_F(Answers, Silence_AfterWait_IsRoundedToWholeSeconds) {
     state.WaitCommandActive = true;
-    SweepTime = 0.2;
+    state.SweepTimeTold = 0.2;
     expectSilenceOf(9);
-    SweepTime = 0.3;
+    state.SweepTimeTold = 0.3;
     expectSilenceOf(10);
 }
 
 TEST_F(Answers, Silence_SweepTimeWithoutWait_ChangesNothing) {
-    SweepTime = 100;
+    state.SweepTimeTold = 100;
     expectSilenceOf(9);
 }
 
 TEST_F(Answers, Silence_SweepTimeBeyondSense_EndsAllTheSame) {
     state.WaitCommandActive = true;
-    SweepTime = 1e300;
+    state.SweepTimeTold = 1e300;
     const std::int64_t ms = read();
     EXPECT_LE(ms, 86'401'000);
     EXPECT_EQ(shown(), Texts{kSilence});
@@ -243,7 +243,7 @@ struct Connecting : Answers {
     int disconnects = 0;
     Connecting() {
         whileConnecting();
-        dialog.DisconnectButton.Clicked.connect([this] { ++disconnects; });
+        reader.AttemptAbandoned.connect([this] { ++disconnects; });
     }
 };
 
@@ -293,7 +293,7 @@ TEST_F(Connecting, NoiseThenSilence_IsTheBaudBoxAndThenTheAbsence) {
 
 TEST_F(Answers, Triggered_TimeOut_IsTheCallersAlone) {
     state.WaitCommandActive = true;
-    SweepTime = 100;
+    state.SweepTimeTold = 100;
     const std::int64_t ms = readTriggered(3);
     EXPECT_GE(ms, 3000);
     EXPECT_LE(ms, 3050);

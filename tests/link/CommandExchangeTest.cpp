@@ -140,7 +140,7 @@ TEST_F(Line, Cmd_ClosedPort_RepeatsTheBoxForFiveSeconds) {
 }
 
 TEST_F(Line, Cmd_Wait_LengthensEveryLaterReadUntilTheNextCommand) {
-    SweepTime = 2;
+    state.SweepTimeTold = 2;
     exchangeOf("cmd", "WAIT", "0\r");
     port.expect("set\r").silence();
     port.expect("cmd\r").answer("0\r");
@@ -152,7 +152,7 @@ TEST_F(Line, Cmd_Wait_LengthensEveryLaterReadUntilTheNextCommand) {
 }
 
 TEST_F(Line, Cmd_WaitItself_MayLastTwoSweepsLonger) {
-    SweepTime = 2;
+    state.SweepTimeTold = 2;
     port.expect("cmd\r").answer("0\r");
     port.expect("WAIT\r").answer("0\r").after(12900);
     EXPECT_TRUE(exchange.CmdInstrument("WAIT"));

@@ -72,10 +72,9 @@ struct LineRig {
     ControllerForm& panel = forms.controller;
     MainForm& dialog = forms.main;
     ZELBas state;
-    double SweepTime = 0;
     Session session{platform.clock, events, boxes, panel.DebugTextBox};
     ByteLink link{forms, state, port, socket, session, debug};
-    AnswerReader reader{forms, state, link, SweepTime, session};
+    AnswerReader reader{forms, state, link, session};
     CommandExchange exchange{panel, state, link, reader, session};
     BinaryReader byteReader{forms, state, link, socket, session};
     BinaryTrace binary{panel, state, link, reader, byteReader, session};

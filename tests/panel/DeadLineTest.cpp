@@ -281,13 +281,18 @@ TEST_P(DeadLineInTheView, Stop_IsTheWayBack) {
         rig.panel.PlayContinuousButton.Click();  // comes back by itself
         ASSERT_TRUE(rig.line.failed());
         EXPECT_FALSE(rig.boxes.texts().empty());
+        if (GetParam() == End::Silent) {
+            EXPECT_EQ(rig.boxes.texts().size(), 1U);
+        }
         EXPECT_FALSE(rig.panel.ContinuosLoopActive);
+        EXPECT_TRUE(rig.panel.LinkLost);
         EXPECT_TRUE(rig.panel.StopButton.Visible);
         EXPECT_EQ(rig.panel.MousePointer.get(), 0);
         rig.panel.StopButton.Click();
         EXPECT_FALSE(rig.panel.StopButton.Visible);
         EXPECT_TRUE(rig.panel.PlayContinuousButton.Visible);
-        EXPECT_FALSE(rig.panel.Connection.Enabled);  // until the next view that ends by Stop
+        EXPECT_TRUE(rig.panel.Connection.Enabled);
+        EXPECT_TRUE(rig.panel.Utility.Enabled);
         rig.line.mend();
         if (GetParam() == End::Dead) {
             rig.program.disconnect();

@@ -5,6 +5,7 @@
 
 #include "panel/ManualCommand.h"
 #include "platform/KeyInput.h"
+#include "tests/Told.h"
 #include "tests/panel/Panel.h"
 
 namespace zel {

@@ -187,10 +187,66 @@ TEST_F(SweepControlTest, FailedLink_InALaterPass_EndsTheLoopWithOneView) {
     fullCycle();
     port.expect("cmd\r").silence();
     panel.PlayContinuousButton.Click();
-    EXPECT_EQ(boxes.texts(), (Texts{"No response received!", "Unsuccessful View"}));
+    EXPECT_EQ(boxes.texts(), Texts{"No response received!"});
     EXPECT_FALSE(panel.ContinuosLoopActive);
     EXPECT_FALSE(panel.Connection.Enabled);
     EXPECT_TRUE(panel.RecordData.Visible);
+    panel.StopButton.Click();
+    EXPECT_TRUE(panel.Connection.Enabled);
+    EXPECT_TRUE(panel.Utility.Enabled);
+}
+
+TEST_F(SweepControlTest, FailedLink_StatusClockAndGraphSayThatTheConnectionIsLost) {
+    fullCycle();
+    port.expect("cmd\r").silence();
+    panel.PlayContinuousButton.Click();
+    EXPECT_TRUE(panel.LinkLost);
+    EXPECT_EQ(panel.ConnectedPic.Image.get(), "lost");
+    EXPECT_TRUE(panel.CWGraph1.Old);
+    const std::string clock = panel.TimeLabel.Caption;
+    EXPECT_EQ(clock.rfind("connection lost ", 0), 0U) << clock;
+    platform.events.runFor(3000);
+    EXPECT_EQ(panel.TimeLabel.Caption.get(), clock);
+    EXPECT_TRUE(panel.CWGraph1.Old);
+    // The next good answer takes it back.
+    panel.StopButton.Click();
+    cmd("INIT");
+    EXPECT_TRUE(program.exchange().CmdInstrument("INIT"));
+    EXPECT_FALSE(panel.LinkLost);
+    EXPECT_EQ(panel.ConnectedPic.Image.get(), "connected");
+}
+
+TEST_F(SweepControlTest, StopInALongSweep_LeavesTheWaitAfterASecond) {
+    askSettings();
+    port.expect("cmd\r").answer("0\r");
+    port.expect("WAIT\r").silence();
+    platform.events.schedule(3000, [this] { panel.StopButton.Click(); });
+    panel.PlayContinuousButton.Click();
+    EXPECT_NEAR(static_cast<double>(platform.clock.micros()) / 1e6, 4, 0.2);
+    EXPECT_EQ(boxes.texts(), Texts{});
+    EXPECT_TRUE(panel.PlayContinuousButton.Visible);
+    EXPECT_TRUE(panel.Connection.Enabled);
+    EXPECT_FALSE(panel.LinkLost);
+    port.expect("\r").answer("0\r");
+    cmd("INIT");
+    EXPECT_TRUE(program.exchange().CmdInstrument("INIT"));
+    expectPlayed();
+}
+
+TEST_F(SweepControlTest, StopInASingleSweep_LeavesTheWait) {
+    askSettings();
+    port.expect("cmd\r").answer("0\r");
+    port.expect("WAIT\r").silence();
+    platform.events.schedule(2000, [this] {
+        EXPECT_TRUE(panel.StopButton.Visible);
+        panel.StopButton.Click();
+    });
+    panel.PlaySingleButton.Click();
+    EXPECT_LT(platform.clock.micros(), 4000000);
+    EXPECT_EQ(boxes.texts(), Texts{});
+    EXPECT_FALSE(panel.StopButton.Visible);
+    EXPECT_TRUE(panel.PlaySingleButton.Enabled);
+    EXPECT_EQ(panel.MousePointer.get(), 0);
 }
 
 TEST_F(SweepControlTest, FailedLink_SeenBetweenPasses_LeavesWithoutCleanUp) {

@@ -9,6 +9,7 @@
 #include <QFile>
 #include <QTemporaryDir>
 #include <array>
+#include <csignal>
 
 #include "desktop/platform/QtPlatform.h"
 #include "tests/desktop/Desk.h"
@@ -92,7 +93,8 @@ TEST_F(OnQt, BytesThatTheLoopFetched_ComeAheadOfThoseOnTheLine) {
     const Terminal line;
     ASSERT_TRUE(openPort(line.path));
     line.send("first ");
-    platform.events.sleep(10);  // the loop fetches what has come
+    platform.events.sleep(10);
+    platform.events.pump();  // the loop fetches what has come
     line.send("second");
     std::string got = platform.serialPort.input();
     for (int i = 0; i < 50 && got.size() < 12; ++i) {
@@ -166,7 +168,7 @@ TEST_F(OnQt, Burst_ArrivesWhole) {
     std::string got;
     for (std::size_t at = 0; at < sent.size(); at += 3000) {
         line.send(sent.substr(at, 3000));
-        platform.events.sleep(1);
+        platform.events.wait(1);
         if (at % 9000 == 0) got += platform.serialPort.input();
     }
     for (int i = 0; i < 100 && got.size() < sent.size(); ++i) {
@@ -176,13 +178,26 @@ TEST_F(OnQt, Burst_ArrivesWhole) {
     EXPECT_EQ(got, sent);
 }
 
-TEST_F(OnQt, Sleep_LastsItsTimeAndRunsTasks) {
+TEST_F(OnQt, Sleep_LastsItsTimeAndServesNoEvent) {
     bool ran = false;
     platform.events.schedule(3, [&ran] { ran = true; });
     const std::int64_t start = platform.clock.micros();
     platform.events.sleep(25);
     EXPECT_GE(platform.clock.micros() - start, 25000);
+    EXPECT_FALSE(ran);
+    for (int i = 0; i < 20 && !ran; ++i) platform.events.wait(5);
     EXPECT_TRUE(ran);
+}
+
+TEST_F(OnQt, Signal_IsAnEventAndCutsADelayShort) {
+    std::string got;
+    platform.endSignals.EndRequested.connect([&got](const std::string& name) { got = name; });
+    std::raise(SIGTERM);
+    const std::int64_t start = platform.clock.micros();
+    platform.events.sleep(5000);
+    EXPECT_LT(platform.clock.micros() - start, 2000000);
+    for (int i = 0; i < 20 && got.empty(); ++i) platform.events.wait(5);
+    EXPECT_EQ(got, "SIGTERM");
 }
 
 TEST_F(OnQt, PortHeldByAnother_IsNamed) {

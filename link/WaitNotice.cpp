@@ -1,0 +1,66 @@
+#include "link/WaitNotice.h"
+
+namespace zel {
+namespace {
+
+constexpr std::int64_t kSilentMs = 1000;
+constexpr std::int64_t kMinuteS = 60;
+
+std::string lengthText(std::int64_t seconds) {
+    if (seconds < 2 * kMinuteS) return std::to_string(seconds) + " s";
+    return std::to_string((seconds + kMinuteS - 1) / kMinuteS) + " min";
+}
+
+}  // namespace
+
+WaitNotice::WaitNotice(Forms& forms, const Session& session)
+    : forms_(forms), panel_(forms.controller), session_(session) {}
+
+Label& WaitNotice::dialogLabel() const {
+    const bool tcp = panel_.ConnectionState == ControllerForm::TCPCON;
+    return tcp ? forms_.tcpConnection.AdviceLabel : forms_.main.AdviceLabel;
+}
+
+void WaitNotice::tell(std::int64_t elapsedMs, std::int64_t timeoutMs) {
+    if (elapsedMs < kSilentMs) return;
+    const std::int64_t left = (timeoutMs - elapsedMs + 999) / 1000;
+    if (left == shownSeconds_) return;
+    if (shownSeconds_ < 0 && !panel_.StopButton.Visible) {
+        panel_.StopButton.Visible = true;
+        lentStop_ = true;
+    }
+    shownSeconds_ = left;
+    const std::string text = "Waiting for the instrument, at most " + lengthText(left) + " more";
+    panel_.WaitLabel.Caption = text;
+    if (!panel_.isConnected) dialogLabel().Caption = text;
+}
+
+void WaitNotice::clear() {
+    if (shownSeconds_ < 0) return;
+    shownSeconds_ = -1;
+    panel_.WaitLabel.Caption = "";
+    if (!panel_.isConnected) dialogLabel().Caption = "";
+    if (lentStop_) panel_.StopButton.Visible = false;
+    lentStop_ = false;
+}
+
+void showLinkLost(ControllerForm& panel, bool lost) {
+    panel.LinkLost = lost;
+    panel.ConnectedPic.Image = lost ? "lost" : "connected";
+}
+
+std::string connectionAdvice(const Forms& forms) {
+    if (forms.controller.ConnectionState == ControllerForm::TCPCON) {
+        return forms.tcpConnection.IPAdressTextBox.Text.get() + ":" +
+               forms.tcpConnection.RemotePortTextBox.Text.get() +
+               ": check that the server runs there, that its instrument is on and connected, and "
+               "that no firewall is between";
+    }
+    const std::string baud = forms.main.BaudList.Text();
+    return forms.main.COMList.Text() + " at " + baud +
+           " baud: check that the instrument is on, that its cable is at this port, and that it "
+           "is set to " +
+           baud + " baud";
+}
+
+}  // namespace zel

@@ -1,0 +1,50 @@
+#pragma once
+// Shows that an answer is waited for and how long that may still take, with a key to leave it.
+
+#include <cstdint>
+
+#include "forms/Forms.h"
+#include "platform/Session.h"
+
+namespace zel {
+
+/// The panel's wait line, the same line in the dialog that connects, and the Stop key, which is
+/// on show for the length of the wait. A wait that ends within a second shows nothing.
+class WaitNotice {
+  public:
+    WaitNotice(Forms& forms, const Session& session);
+
+    /// `elapsedMs` of at most `timeoutMs` milliseconds have passed.
+    void tell(std::int64_t elapsedMs, std::int64_t timeoutMs);
+    void clear();
+
+    /// Takes the notice away at the end of a scope.
+    class Shown {
+      public:
+        explicit Shown(WaitNotice& notice) : notice_(notice) {}
+        ~Shown() { notice_.clear(); }
+        Shown(const Shown&) = delete;
+        Shown& operator=(const Shown&) = delete;
+
+      private:
+        WaitNotice& notice_;
+    };
+
+  private:
+    Label& dialogLabel() const;
+
+    Forms& forms_;
+    ControllerForm& panel_;
+    Session session_;
+    std::int64_t shownSeconds_ = -1;  ///< that the text names; -1 while nothing is shown
+    bool lentStop_ = false;           ///< the Stop key is on show for this wait alone
+};
+
+/// Whether the line of the session has died: the picture of the connection says so.
+void showLinkLost(ControllerForm& panel, bool lost);
+
+/// "COM3 at 57600 baud: check that the instrument is on, ...": what to look at when no instrument
+/// was found; "host:2277: ..." for a connection over TCP.
+std::string connectionAdvice(const Forms& forms);
+
+}  // namespace zel

@@ -1,0 +1,229 @@
+#include "trace/Interlock.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace zel {
+namespace {
+
+constexpr int kHourglass = 11;
+constexpr std::size_t kMostWaiting = 64;
+
+struct Words {
+    Interlock::Rule rule;
+    BoxIcon icon;
+    const char* text;
+};
+using Rule = Interlock::Rule;
+constexpr Words kWords[] = {
+    {Rule::Connected, BoxIcon::Information, "Please connect to the intrument first."},
+    {Rule::ConnectedBySend, BoxIcon::Information, "Please connect to the instrument first."},
+    {Rule::NoContinuousView, BoxIcon::Exclamation,
+     "Please exit the continuous View Mode first\r\n"
+     "Use the red stop button in the upper right corner."},
+    {Rule::NoViewToEndFor, BoxIcon::Warning,
+     "Please exit the Continunous View Mode first\r\n"
+     "Use the red stop button in the upper right corner."},
+    {Rule::NoViewForFile, BoxIcon::Information, "Please exit the continuous View Mode first"},
+    {Rule::NoRecordingForFile, BoxIcon::Information, "Please stop the recording first"},
+    {Rule::NoPowerSensor, BoxIcon::Information, "Please exit the Power Sensor Mode first."},
+};
+
+}  // namespace
+
+Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
+    : forms_(forms), panel_(forms.controller), state_(state), session_(session) {
+    ControllerForm& p = panel_;
+    rule({&p.MarkPkButton, &p.NextPeakButton, &p.MinPeakButton, &p.MarkToCentButton,
+          &p.MarkToRefButton, &p.OnOffButton, &p.LocalButton},
+         {Rule::Connected, Rule::NoContinuousView});
+    for (int i = 0; i < p.SoftKey.count(); ++i)
+        rule({&p.SoftKey(i)}, {Rule::Connected, Rule::NoContinuousView});
+    rule({&p.SendButton}, {Rule::ConnectedBySend, Rule::NoContinuousView});
+    rule({&p.SpanButton, &p.AmplitudeButton, &p.BWButton, &p.SweepButton, &p.TraceButton,
+          &p.MeasButton},
+         {Rule::NoPowerSensor});
+    rule({&p.MarkerButton}, {Rule::NoPowerSensor, Rule::NoContinuousView});
+    rule({&p.AnalyzerButton, &p.TrackButton, &p.TrackButton1, &p.PwrButton, &p.ChnPwrButton,
+          &p.OccBWButton, &p.TDMAButton, &p.DistFaultButton, &p.ResetButton},
+         {Rule::NoContinuousView});
+    rule({&p.LoadData}, {Rule::NoViewForFile, Rule::NoRecordingForFile});
+    for (int i = 0; i < p.RecentFile.count(); ++i)
+        rule({&p.RecentFile(i)}, {Rule::NoViewForFile, Rule::NoRecordingForFile});
+    rule({&p.Disconnect, &forms.main.DisconnectButton, &forms.main.DisconnectButton2},
+         {Rule::NoViewToEndFor});
+
+    always_ = {&p.StopButton,
+               &p.ExitObject,
+               &forms.main.CancelButton,
+               &forms.main.CancelConnButton,
+               &forms.main.CancelConnButton1,
+               &forms.tcpConnection.QuitTCPButton,
+               &forms.specialMeas.sldSpeed,
+               &p.cmd3D,
+               &p.SpectrogramShow,
+               &p.SpectrogramPause,
+               &forms.specialMeas.cmdStop};
+    silent_ = {&p.GetOption,
+               &p.SetOption,
+               &p.HelpHelp,
+               &p.HelpAbout,
+               &p.UtilityGraphSettings,
+               &p.UtilityStartup,
+               &p.UtilityTrouble,
+               &p.DelLogFile,
+               &p.MenuFileSaveImage,
+               &p.cmdZoom,
+               &p.cmd3D,
+               &forms.time.CancelTimeButton};
+    handlers_.on(state_.LineFree, [this] { scheduleWaiting(); });
+    handlers_.on(state_.TurnGiven, [this] { runWaiting(); });
+    handlers_.on(p.StopButton.Clicked, [this] { waiting_.clear(); });
+    // A form that is closed and shown again begins anew.
+    for (Form* form : forms_.all()) {
+        handlers_.on(form->Changed, [this, form] {
+            if (form->Modal && form->Visible) return;
+            for (States& states : known_) states.erase(form);
+        });
+    }
+}
+
+Interlock::~Interlock() {
+    if (scheduled_) session_.events.cancel(task_);
+}
+
+void Interlock::rule(std::initializer_list<const Control*> controls,
+                     std::initializer_list<Rule> rules) {
+    for (const Control* control : controls) rules_[control] = rules;
+}
+
+bool Interlock::met(Rule rule) const {
+    switch (rule) {
+        case Rule::Connected:
+        case Rule::ConnectedBySend:
+            return panel_.isConnected;
+        case Rule::NoContinuousView:
+        case Rule::NoViewToEndFor:
+            return !panel_.ContinuosLoopActive;
+        case Rule::NoViewForFile:
+            // Between two passes the view runs as well.
+            return !panel_.ContinuosLoopActive &&
+                   !(panel_.AcquisitionRunning && panel_.STOPFlag && !panel_.RecordDataFlag);
+        case Rule::NoRecordingForFile:
+            return !panel_.RecordDataFlag && !forms_.time.ContinuousRecording;
+        case Rule::NoPowerSensor:
+            return panel_.InstrumentMode != ControllerForm::POWERSENSOR;
+    }
+    return true;
+}
+
+bool Interlock::refuses(Rule rule) const {
+    if (met(rule)) return false;
+    for (const Words& words : kWords)
+        if (words.rule == rule) session_.boxes.show({words.icon, words.text});
+    return true;
+}
+
+bool Interlock::refuses(const Control& control) const {
+    const auto found = rules_.find(&control);
+    return found != rules_.end() && std::any_of(found->second.begin(), found->second.end(),
+                                                [this](Rule rule) { return refuses(rule); });
+}
+
+bool Interlock::anyUnmet(const Control& control) const {
+    const auto found = rules_.find(&control);
+    return found != rules_.end() && std::any_of(found->second.begin(), found->second.end(),
+                                                [this](Rule rule) { return !met(rule); });
+}
+
+bool Interlock::talks(const Control& control) const {
+    if (silent_.count(&control) > 0) return false;
+    const Form& form = control.form();
+    return &form == &panel_ || &form == &forms_.main || &form == &forms_.tcpConnection ||
+           &form == &forms_.time || &form == &forms_.specialMeas || &form == &forms_.devicesChoice;
+}
+
+Interlock::Turn Interlock::turnOf(const Control& control) const {
+    // What only looks at sweeps that have come disturbs nothing.
+    if (always_.count(&control) > 0 || &control.form() == &forms_.waterfall) return Turn::Now;
+    if (state_.Ending) return Turn::Never;
+    if (anyUnmet(control)) return Turn::Now;  // it refuses by itself, in words
+    if (std::find(running_.begin(), running_.end(), &control) != running_.end()) return Turn::Never;
+    if (state_.DialoguesUnderWay > 0) return talks(control) ? Turn::Later : Turn::Now;
+    if (panel_.ContinuosLoopActive) return Turn::Now;
+    const bool busy = panel_.MousePointer == kHourglass || panel_.AcquisitionRunning ||
+                      forms_.main.MousePointer == kHourglass;
+    return busy ? Turn::Never : Turn::Now;
+}
+
+bool Interlock::perform(const Control& control, std::function<void()> act) {
+    switch (turnOf(control)) {
+        case Turn::Now:
+            run({&control, std::move(act)});
+            return true;
+        case Turn::Later:
+            if (waiting_.size() >= kMostWaiting) return false;
+            waiting_.push_back({&control, std::move(act)});
+            return true;
+        case Turn::Never:
+            break;
+    }
+    return false;
+}
+
+void Interlock::run(const Act& act) {
+    struct Running {
+        explicit Running(std::vector<const Control*>& all, const Control* one) : running(all) {
+            running.push_back(one);
+        }
+        ~Running() { running.pop_back(); }
+        std::vector<const Control*>& running;
+    };
+    const Running running(running_, act.control);
+    act.run();
+}
+
+void Interlock::scheduleWaiting() {
+    if (waiting_.empty() || scheduled_) return;
+    scheduled_ = true;
+    task_ = session_.events.schedule(0, [this] {
+        scheduled_ = false;
+        runWaiting();
+    });
+}
+
+void Interlock::runWaiting() {
+    while (!waiting_.empty() && state_.DialoguesUnderWay == 0) {
+        const Act act = std::move(waiting_.front());
+        waiting_.pop_front();
+        if (state_.Ending || !act.control->Visible || !act.control->Enabled) continue;
+        run(act);
+    }
+}
+
+bool Interlock::userWorks() const {
+    const States states = liveStates();
+    if (known_.empty()) return !states.empty();
+    const States& before = known_.back();
+    return std::any_of(states.begin(), states.end(),
+                       [&](const void* state) { return before.count(state) == 0; });
+}
+
+void Interlock::endLiveStates() {
+    for (Form* form : forms_.all())
+        if (form->Modal && form->Visible) form->Hide();
+    if (panel_.STOPFlag || panel_.ContinuosLoopActive || forms_.time.ContinuousRecording)
+        panel_.StopButton.Click();
+}
+
+Interlock::States Interlock::liveStates() const {
+    States states;
+    for (const Form* form : forms_.all())
+        if (form->Modal && form->Visible) states.insert(form);
+    if (panel_.STOPFlag || panel_.ContinuosLoopActive) states.insert(&panel_.STOPFlag);
+    if (panel_.isSpecMeas) states.insert(&panel_.isSpecMeas);
+    if (forms_.time.ContinuousRecording) states.insert(&forms_.time.ContinuousRecording);
+    return states;
+}
+
+}  // namespace zel
