@@ -79,6 +79,7 @@ void Handshake::connect() {
     if (panel_.InstrumentMode != CF::POWERSENSOR && !readState()) return;
     dialog_.IsConnecting = false;
     panel_.isConnected = true;
+    mirror_.Unsure.clear();
     connectedLook();
     fill_.FillTextFields("FREQ");
     mouse(0);

@@ -7,6 +7,7 @@
 #include <string_view>
 #include <vector>
 
+#include "model/UnsureSettings.h"
 #include "platform/Form.h"
 
 namespace zel {
@@ -54,6 +55,8 @@ struct ZEL3Variables {
     bool MarkerOn = false;
     bool DeltaOn = false;
     std::array<std::int16_t, 14> MenuVisitCount{};
+    /// Where this record may differ from the instrument; no field of its own.
+    UnsureSettings Unsure;
 
     /// Counts a visit of the menu with that word ("FREQ" to "DTF"). True from the second visit
     /// on: the mirror holds the menu's values. False for any other word.

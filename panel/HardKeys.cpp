@@ -46,19 +46,26 @@ void HardKeys::press(std::int16_t menu) {
     softPanel_.SetTextFieldsAndFrames(panel_.State);
     softPanel_.SetButtonsStatus(panel_.State);
     if (panel_.ContinuosLoopActive || !panel_.isConnected) return;
-    if (menu == CF::Marker) readMarkers();
-    std::string answer;
-    if (menu == CF::SWEEP && exchange_.GetInstrument("SWPTIME", answer))
-        mirror_.SweepTime = leadingNumber(answer);
-    fill_.FillTextFields(captions->word);
+    bool answers = true;
+    if (menu == CF::Marker) answers = readMarkers();
+    if (menu == CF::SWEEP) answers = readSweepTime();
+    fill_.FillTextFields(captions->word, answers);
 }
 
-void HardKeys::readMarkers() {
+bool HardKeys::readMarkers() {
     std::string answer;
-    if (exchange_.GetInstrument("MARK1ON", answer))
-        panel_.MarkerCheckBox.setValue(leadingNumber(answer) != 0);
-    if (exchange_.GetInstrument("DELTA1ON", answer))
-        panel_.DeltaCheckBox.setValue(leadingNumber(answer) != 0);
+    if (!exchange_.GetInstrument("MARK1ON", answer)) return false;
+    panel_.MarkerCheckBox.setValue(leadingNumber(answer) != 0);
+    if (!exchange_.GetInstrument("DELTA1ON", answer)) return false;
+    panel_.DeltaCheckBox.setValue(leadingNumber(answer) != 0);
+    return true;
+}
+
+bool HardKeys::readSweepTime() {
+    std::string answer;
+    if (!exchange_.GetInstrument("SWPTIME", answer)) return false;
+    mirror_.SweepTime = leadingNumber(answer);
+    return true;
 }
 
 }  // namespace zel

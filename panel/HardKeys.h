@@ -20,7 +20,9 @@ class HardKeys {
     void press(std::int16_t menu);
 
   private:
-    void readMarkers();
+    /// False at the first question without an answer.
+    bool readMarkers();
+    bool readSweepTime();
 
     ControllerForm& panel_;
     ZEL3Variables& mirror_;

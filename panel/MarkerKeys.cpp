@@ -94,6 +94,7 @@ void MarkerKeys::MarkToCentButton_Click() {
     if (exchange_.GetInstrument("MARK1", answer)) {
         panel_.CFLabel.Caption = centerLabelText(split(answer, ',').front());
         mirror_.CenterFrequency = leadingNumber(answer);
+        mirror_.Unsure.known("FREQ");
     }
     readout_.MakeMarkerReadout();
     bool success = false;

@@ -8,7 +8,7 @@
 
 namespace zel {
 
-void MenuFill::FillTextFields(std::string_view menuWord) {
+void MenuFill::FillTextFields(std::string_view menuWord, bool mayAsk) {
     struct Row {
         std::string_view word;
         void (MenuFill::*fill)();
@@ -27,19 +27,26 @@ void MenuFill::FillTextFields(std::string_view menuWord) {
         {"TDMAPOWER", &MenuFill::fillTDMAPower},
         {"DTF", &MenuFill::fillDistanceToFault},
     };
-    known_ = mirror_.GetLazyQuery(menuWord);
+    // The visit counts in any case.
+    const bool known = mirror_.GetLazyQuery(menuWord);
+    asks_ = mayAsk && !known;
     for (const Row& row : kRows)
         if (row.word == menuWord) (this->*row.fill)();
 }
 
+bool MenuFill::answered(const char* word, std::string& answer) {
+    asks_ = asks_ && exchange_.GetInstrument(word, answer);
+    return asks_;
+}
+
 void MenuFill::ask(const char* word, std::string& field) {
     std::string answer;
-    if (!known_ && exchange_.GetInstrument(word, answer)) field = answer;
+    if (answered(word, answer)) field = answer;
 }
 
 void MenuFill::ask(const char* word, double& field) {
     std::string answer;
-    if (!known_ && exchange_.GetInstrument(word, answer)) field = leadingNumber(answer);
+    if (answered(word, answer)) field = leadingNumber(answer);
 }
 
 void MenuFill::ask(const char* word, std::int16_t& field) {
@@ -135,7 +142,7 @@ void MenuFill::fillChannelPower() {
 void MenuFill::fillOccupiedBandwidth() {
     ask("OBWSTD", mirror_.OccBWStandard);
     ask("OBW", mirror_.OccBWValue);
-    if (!known_) mirror_.OccBWValueCopy = mirror_.OccBWValue;
+    if (asks_) mirror_.OccBWValueCopy = mirror_.OccBWValue;
     ask("OBWCHBW", mirror_.OccBWChannelBandwidth);
     show(0, mirror_.OccBWValue, "Hz");
     choose(1, mirror_.OccBWStandard);

@@ -26,8 +26,10 @@ class MenuFill {
     MenuFill(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange)
         : panel_(panel), mirror_(mirror), exchange_(exchange) {}
 
-    /// Takes a menu word. A word without boxes to fill only counts its visit.
-    void FillTextFields(std::string_view menuWord);
+    /// Takes a menu word. A word without boxes to fill only counts its visit. The first question
+    /// without an answer is the last: the boxes show what the mirror holds. Without `mayAsk` none
+    /// is asked.
+    void FillTextFields(std::string_view menuWord, bool mayAsk = true);
 
     /// Unit of the channel power readout.
     std::string ChannelPowerUnitName = "dBm";
@@ -48,7 +50,9 @@ class MenuFill {
     void fillTDMAPower();
     void fillDistanceToFault();
 
-    /// Asks the instrument unless the menu's values are known; a failure leaves the field.
+    /// The answer, unless the menu's values are known or an earlier question failed.
+    bool answered(const char* word, std::string& answer);
+    /// Asks the instrument; a failure leaves the field.
     void ask(const char* word, double& field);
     void ask(const char* word, std::int16_t& field);
     void ask(const char* word, std::string& field);
@@ -58,7 +62,7 @@ class MenuFill {
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
     CommandExchange& exchange_;
-    bool known_ = false;
+    bool asks_ = true;
 };
 
 }  // namespace zel

@@ -170,8 +170,9 @@ void ModeKeys::presetMirror() {
 void ModeKeys::ResetButton_Click() {
     if (interlock_.refuses(Interlock::Rule::NoContinuousView)) return;
     const Hourglass busy(panel_, events_);
-    exchange_.CmdInstrument("PRESET");
+    const bool preset = exchange_.CmdInstrument("PRESET");
     presetMirror();
+    if (preset) mirror_.Unsure.clear();
     panel_.MarkerCheckBox.setValue(false);
     panel_.DeltaCheckBox.setValue(false);
     panel_.PowerSensorCheck.setValue(false);

@@ -178,7 +178,10 @@ void Z9GetCommands::runQuery(const Query& query, int index) {
         } else {
             std::string prefix;
             const bool whole = query.leadingNumber || query.captions;
-            store(query.field, whole ? answer : ParseValue(box.Text, prefix));
+            const double taken = whole ? answer : ParseValue(box.Text, prefix);
+            store(query.field, taken);
+            // A number with a unit and no prefix reads as 0: the mirror is not the instrument's.
+            if (query.field.index() != 0 && taken == answer) mirror_.Unsure.known(query.word);
         }
         if (query.captions) decode(*query.captions, answer, index);
     } else if (query.captions) {
@@ -208,9 +211,11 @@ void Z9GetCommands::stopFrequency(int index) { edgeFrequency(index, 1); }
 
 void Z9GetCommands::fullSpan(int index) {
     softPanel_.SetSoftButtonsColor(index);
-    exchange_.SetInstrument("SPAN," + WireNumber(kFullSpan));
+    const bool accepted = exchange_.SetInstrument("SPAN," + WireNumber(kFullSpan));
     mirror_.CenterFrequency = kFullCentre;
     mirror_.Span = kFullSpan;
+    mirror_.Unsure.sent("FREQ", accepted);
+    mirror_.Unsure.sent("SPAN", accepted);
     panel_.CFLabel.Caption = centerLabelText(kFullCentre);
     panel_.SpanLabel.Caption = spanLabelText(kFullSpan);
     readTrace();
@@ -218,16 +223,18 @@ void Z9GetCommands::fullSpan(int index) {
 
 void Z9GetCommands::zeroSpan(int index) {
     softPanel_.SetSoftButtonsColor(index);
-    exchange_.SetInstrument("SPAN,0");
+    const bool accepted = exchange_.SetInstrument("SPAN,0");
     mirror_.Span = 0;
+    mirror_.Unsure.sent("SPAN", accepted);
     panel_.SpanLabel.Caption = spanLabelText(0);
     readTrace();
 }
 
 void Z9GetCommands::lastSpan(int index) {
     softPanel_.SetSoftButtonsColor(index);
-    exchange_.SetInstrument("SPAN," + WireNumber(panel_.LastSpan));
+    const bool accepted = exchange_.SetInstrument("SPAN," + WireNumber(panel_.LastSpan));
     mirror_.Span = panel_.LastSpan;
+    mirror_.Unsure.sent("SPAN", accepted);
     panel_.SpanLabel.Caption = spanLabelText(mirror_.Span);
     readTrace();
 }
@@ -314,7 +321,8 @@ void Z9GetCommands::channelPowerUnit(int index) {
 }
 
 void Z9GetCommands::levelAdjust(int /*index*/) {
-    if (getSelected()) exchange_.CmdInstrument("LVLADJUST");
+    // The channel power's key alone looks at the option.
+    if (getSelected() || panel_.State != CF::CHNPOWER) exchange_.CmdInstrument("LVLADJUST");
 }
 
 void Z9GetCommands::marker(int index) {

@@ -26,7 +26,7 @@ constexpr int kReceiverChoice = 8;
 Z9SetCommands::Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
                              SoftPanel& softPanel, Z9GetCommands& queries, MarkerReadout& markers,
                              FrequencyLabels& labels, TraceReader& traces, GraphScaling& scaling,
-                             Events& events)
+                             const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
@@ -37,7 +37,7 @@ Z9SetCommands::Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchang
       labels_(labels),
       traces_(traces),
       scaling_(scaling),
-      events_(events) {}
+      session_(session) {}
 
 // A row a soft position, in the order in which the operations run.
 const std::vector<Z9SetCommands::Clause>& Z9SetCommands::clauses() {
@@ -108,7 +108,7 @@ void Z9SetCommands::enter(int index) {
 
 void Z9SetCommands::pointer(int shape) {
     panel_.MousePointer = shape;
-    events_.pump();
+    session_.events.pump();
 }
 
 double Z9SetCommands::boxValue(int index) const {
@@ -116,7 +116,8 @@ double Z9SetCommands::boxValue(int index) const {
     return ParseValue(panel_.SoftTextBox(index).Text, prefix);
 }
 
-bool Z9SetCommands::valueText(Source source, int index, std::string& text, double& number) const {
+bool Z9SetCommands::valueText(Source source, int index, std::string& text) const {
+    double number = 0;
     switch (source) {
         case Source::Value:
             number = boxValue(index);
@@ -125,7 +126,8 @@ bool Z9SetCommands::valueText(Source source, int index, std::string& text, doubl
             text = generalNumber(boxValue(index));
             return true;
         case Source::Whole:
-            number = std::trunc(std::clamp(boxValue(index), -2147483648.0, 2147483647.0));
+            number = std::trunc(boxValue(index));
+            if (number < -2147483648.0 || number > 2147483647.0) return false;
             break;
         case Source::Word:
             number = std::nearbyint(boxValue(index));
@@ -157,12 +159,19 @@ void Z9SetCommands::store(const Field& field, double number, const std::string& 
 void Z9SetCommands::send(const Setting& setting, int index) {
     softPanel_.SetSoftButtonsColor(index);
     std::string text;
-    double number = 0;
-    if (!valueText(setting.source, index, text, number)) return;
+    if (!valueText(setting.source, index, text)) {
+        session_.boxes.show({BoxIcon::Plain, "Out of Range!"});
+        return;
+    }
     pointer(11);
-    exchange_.SetInstrument(setting.word + text);
+    const bool accepted = exchange_.SetInstrument(setting.word + text);
     // The mirror takes the number as it was written in the command.
     store(setting.field, leadingNumber(text), text);
+    if (setting.field.index() != 0) {
+        std::string_view word = setting.word;
+        word.remove_suffix(1);
+        mirror_.Unsure.sent(word, accepted);
+    }
     if (setting.after != nullptr) (this->*setting.after)(index);
     pointer(0);
 }
@@ -182,7 +191,10 @@ void Z9SetCommands::readTrace() {
 
 void Z9SetCommands::afterCentre(int /*index*/) {
     std::string answer;
-    if (exchange_.GetInstrument("SPAN", answer)) mirror_.Span = leadingNumber(answer);
+    if (exchange_.GetInstrument("SPAN", answer)) {
+        mirror_.Span = leadingNumber(answer);
+        mirror_.Unsure.known("SPAN");
+    }
     panel_.SoftTextBox(1).Text = FormatValue(mirror_.Span, "Hz");
     panel_.CFLabel.Caption = centerLabelText(mirror_.CenterFrequency);
     showEdges();
@@ -194,8 +206,9 @@ void Z9SetCommands::manualSpan(int index) {
     const std::string text = WireNumber(boxValue(index));
     pointer(11);
     panel_.LastSpan = mirror_.Span;
-    exchange_.SetInstrument("SPAN," + text);
+    const bool accepted = exchange_.SetInstrument("SPAN," + text);
     mirror_.Span = leadingNumber(text);
+    mirror_.Unsure.sent("SPAN", accepted);
     showSpan();
     showEdges();
     readTrace();
@@ -207,8 +220,8 @@ void Z9SetCommands::edgeFrequency(double span, double centre) {
     if (span < 0) return;  // quietly; the pointer stays as it was set
     mirror_.Span = span;
     mirror_.CenterFrequency = centre;
-    exchange_.SetInstrument("SPAN," + generalNumber(span));
-    exchange_.SetInstrument("FREQ," + generalNumber(centre));
+    mirror_.Unsure.sent("SPAN", exchange_.SetInstrument("SPAN," + generalNumber(span)));
+    mirror_.Unsure.sent("FREQ", exchange_.SetInstrument("FREQ," + generalNumber(centre)));
     panel_.CFLabel.Caption = centerLabelText(centre);
     showSpan();
     readTrace();
@@ -237,11 +250,13 @@ void Z9SetCommands::afterOffset(int /*index*/) {
 void Z9SetCommands::zeroSpan(int index) {
     softPanel_.SetSoftButtonsColor(index);
     pointer(11);
-    exchange_.SetInstrument("SPAN,0");
+    const bool accepted = exchange_.SetInstrument("SPAN,0");
     panel_.SpanLabel.Caption = spanLabelText(0);
     mirror_.Span = 0;
+    mirror_.Unsure.sent("SPAN", accepted);
     // The centre is rewritten though nothing was sent about it: the key's way leaves it alone.
     mirror_.CenterFrequency = kZeroSpanCentre;
+    if (!accepted) mirror_.Unsure.sent("FREQ", false);
     panel_.CFLabel.Caption = centerLabelText(mirror_.CenterFrequency);
     readTrace();
     pointer(0);

@@ -11,7 +11,7 @@
 #include "panel/MarkerReadout.h"
 #include "panel/SoftPanel.h"
 #include "panel/Z9GetCommands.h"
-#include "platform/Events.h"
+#include "platform/Session.h"
 #include "trace/FrequencyLabels.h"
 #include "trace/GraphScaling.h"
 #include "trace/TraceReader.h"
@@ -19,13 +19,14 @@
 namespace zel {
 
 /// The mirror takes what was asked for, whatever the instrument makes of it; a refusal is told by
-/// the exchange. A text that is no number goes out as 0.
+/// the exchange. A text that is no number goes out as 0; a number that its word cannot hold is
+/// refused in a box and nothing is sent.
 class Z9SetCommands {
   public:
     Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
                   SoftPanel& softPanel, Z9GetCommands& queries, MarkerReadout& markers,
                   FrequencyLabels& labels, TraceReader& traces, GraphScaling& scaling,
-                  Events& events);
+                  const Session& session);
 
     /// Runs the operations of all menus in their order for the position of that index; each
     /// clause looks at the state as the clauses ahead of it left it.
@@ -38,8 +39,8 @@ class Z9SetCommands {
     enum class Source {
         Value,        ///< the box, a number with prefix
         LocaleValue,  ///< the same, written with its zero ahead of the point
-        Whole,        ///< the same, cut to a whole number of 32 bits
-        Word,         ///< the same, as a 16-bit number: too large an entry ends the operation
+        Whole,        ///< the same, cut to a whole number of 32 bits; one that has more is refused
+        Word,         ///< the same, as a 16-bit number; one that has more is refused
         Choice,       ///< index of the list
         Text,         ///< the box, trimmed
     };
@@ -58,7 +59,8 @@ class Z9SetCommands {
     static const std::vector<Clause>& clauses();
 
     void send(const Setting& setting, int index);
-    bool valueText(Source source, int index, std::string& text, double& number) const;
+    /// False for a number that its source cannot hold.
+    bool valueText(Source source, int index, std::string& text) const;
     void store(const Field& field, double number, const std::string& text);
 
     void afterCentre(int index);
@@ -93,7 +95,7 @@ class Z9SetCommands {
     FrequencyLabels& labels_;
     TraceReader& traces_;
     GraphScaling& scaling_;
-    Events& events_;
+    Session session_;
 };
 
 }  // namespace zel

@@ -52,6 +52,7 @@ class Label : public Control {
     Label(Form& form, std::string name, std::string caption = "")
         : Control(form, std::move(name), ControlKind::Label), Caption{this, std::move(caption)} {}
     Property<std::string> Caption;
+    Property<bool> Struck{this, false};  ///< the value is unsure: a line goes through it
 };
 
 class Frame : public Control {

@@ -58,6 +58,7 @@
 #include "waterfall/PictureOptions.h"
 #include "waterfall/SweepHistory.h"
 #include "waterfall/WaterfallView.h"
+#include "trace/UnsureMarks.h"
 
 namespace zel {
 
@@ -74,6 +75,7 @@ struct Program::Rooms {
           binary(panel, line, link, reader, bytes, session),
           instrument{line, link, reader, exchange, binary},
           labels(panel, forms.main, mirror, exchange, p.events),
+          marks(panel, mirror),
           conversion(panel, mirror, forms.waterfall.Graph3D),
           scaling(panel, forms.waterfall, mirror, p.clock),
           graph(panel, mirror),
@@ -100,7 +102,7 @@ struct Program::Rooms {
           markerReadout(panel, mirror, exchange),
           queries(panel, mirror, exchange, softPanel, fill, markerReadout, traces, scaling, boxes),
           settings(forms, mirror, exchange, softPanel, queries, markerReadout, labels, traces,
-                   scaling, p.events),
+                   scaling, session),
           hardKeys(panel, mirror, exchange, MenuRoutines{softPanel, fill}, interlock),
           softKeys(panel, softPanel, queries, settings, interlock),
           modeKeys(forms, mirror, exchange, MenuRoutines{softPanel, fill}, scaling, interlock),
@@ -172,6 +174,7 @@ struct Program::Rooms {
     BinaryTrace binary;
     InstrumentLink instrument;
     FrequencyLabels labels;
+    UnsureMarks marks;
     TraceConversion conversion;
     GraphScaling scaling;
     GraphInteraction graph;

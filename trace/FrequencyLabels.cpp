@@ -32,6 +32,7 @@ void FrequencyLabels::query(const char* word, double& field, Label& label,
     if (ok) {
         label.Caption = text(answer);
         field = leadingNumber(answer);
+        mirror_.Unsure.known(word);
     }
     dialog_.MousePointer = 0;
     events_.pump();

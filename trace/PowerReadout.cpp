@@ -29,31 +29,34 @@ PowerReadout::PowerReadout(Forms& forms, CommandExchange& exchange, Events& even
     dialog.ClosePwrForm.Clicked.connect([&dialog] { dialog.unload(1); });
 }
 
-void PowerReadout::ReadPowerValue(const std::string& query, int boxIndex, const std::string& unit) {
+bool PowerReadout::ReadPowerValue(const std::string& query, int boxIndex, const std::string& unit) {
     events_.pump();
     std::string answer;
-    if (!exchange_.GetInstrument(query, answer)) return;
+    if (!exchange_.GetInstrument(query, answer)) return false;
     if (query == "PWR") panel_.LastPowerText = answer;
     if (query == "REFL") panel_.LastReflectionText = answer;
     events_.pump();
     panel_.LastReadingText = answer;
     panel_.SoftTextBox(boxIndex).Text = FormatValue(answer, unit);
+    return true;
 }
 
-void PowerReadout::readPowerSensor(int boxIndex) {
-    ReadPowerValue("PWR", boxIndex, kUnit);
-    if (forms_.powerAndRefl.ReadPowerAndRefl) ReadPowerValue("REFL", kReflectionBox, kUnit);
+bool PowerReadout::readPowerSensor(int boxIndex) {
+    if (!ReadPowerValue("PWR", boxIndex, kUnit)) return false;
+    return !forms_.powerAndRefl.ReadPowerAndRefl || ReadPowerValue("REFL", kReflectionBox, kUnit);
 }
 
-void PowerReadout::ReadPowerReadings(std::string_view modeName, int boxIndex) {
+bool PowerReadout::ReadPowerReadings(std::string_view modeName, int boxIndex) {
     panel_.MousePointer = 11;
     events_.pump();
     panel_.PlaySingleButton.Enabled = false;
-    if (modeName == "PowerSensor") readPowerSensor(boxIndex);
-    if (modeName == "TDMAPower") ReadPowerValue("TDMAPWR", boxIndex, kUnit);
+    bool good = true;
+    if (modeName == "PowerSensor") good = readPowerSensor(boxIndex);
+    if (modeName == "TDMAPower") good = ReadPowerValue("TDMAPWR", boxIndex, kUnit);
     panel_.PlaySingleButton.Enabled = true;
     panel_.MousePointer = 0;
     events_.pump();
+    return good;
 }
 
 }  // namespace zel

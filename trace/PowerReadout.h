@@ -16,11 +16,13 @@ class PowerReadout {
     PowerReadout(Forms& forms, CommandExchange& exchange, Events& events);
 
     /// Asks one reading ("PWR", "REFL", "TDMAPWR") and shows it in the soft box of that index.
-    void ReadPowerValue(const std::string& query, int boxIndex, const std::string& unit);
+    /// False when the instrument gave none; the box keeps its text.
+    bool ReadPowerValue(const std::string& query, int boxIndex, const std::string& unit);
     /// One round of the continuous view, for "PowerSensor" or "TDMAPower".
-    void ReadPowerReadings(std::string_view modeName, int boxIndex);
-    /// The power, and the reflection where the dialog says so.
-    void readPowerSensor(int boxIndex);
+    bool ReadPowerReadings(std::string_view modeName, int boxIndex);
+    /// The power, and the reflection where the dialog says so. False at the first without an
+    /// answer.
+    bool readPowerSensor(int boxIndex);
 
   private:
     Forms& forms_;

@@ -60,8 +60,8 @@ void SweepControl::PlaySingleButton_Click() {
         traces_.ReadSingleTrace(success);
         return;
     }
-    power_.readPowerSensor(kPowerBox);
-    if (panel_.RecordDataFlag) panel_.SaveView("power");
+    const bool good = power_.readPowerSensor(kPowerBox);
+    if (good && panel_.RecordDataFlag) panel_.SaveView("power");
 }
 
 void SweepControl::PlayContinuousButton_Click() {
@@ -108,8 +108,8 @@ void SweepControl::RunContinuousView() {
 }
 
 bool SweepControl::powerPass(Pass kind) {
-    power_.ReadPowerReadings(kind == Pass::PowerSensor ? "PowerSensor" : "TDMAPower", kPowerBox);
-    return true;
+    return power_.ReadPowerReadings(kind == Pass::PowerSensor ? "PowerSensor" : "TDMAPower",
+                                    kPowerBox);
 }
 
 bool SweepControl::firstPass() {

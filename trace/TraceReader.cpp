@@ -45,7 +45,9 @@ TraceReader::Step TraceReader::query(const char* word, double& field) {
     if (!exchange_.GetInstrument(word, panel_.InstrumentAnswer))
         return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Refused;
     field = leadingNumber(panel_.InstrumentAnswer);
-    return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Ok;
+    if (exchange_.ExchangeFailed()) return Step::LinkFailed;
+    mirror_.Unsure.known(word);
+    return Step::Ok;
 }
 
 TraceReader::Step TraceReader::queryCode(const char* word, std::uint8_t& field) {
@@ -84,12 +86,19 @@ TraceReader::Step TraceReader::askSettings() {
 }
 
 TraceReader::Step TraceReader::askAgain(const ReadAgain& again) {
+    // What is unsure is asked whether the caller wants it or not.
+    const auto wanted = [this](bool asked, AxisSetting setting) {
+        return asked || mirror_.Unsure.has(setting);
+    };
     Step step = Step::Ok;
-    if (again.freq) step = queryFrequency();
-    if (step == Step::Ok && again.span) step = querySpan();
-    if (step == Step::Ok && again.refLvl) step = query("REFLVL", mirror_.ReferenceLevel);
-    if (step == Step::Ok && again.range) step = query("RANGE", mirror_.ReferenceRange);
-    if (step == Step::Ok && again.detector) step = queryCode("TRACEDET", mirror_.TraceDetector);
+    if (wanted(again.freq, AxisSetting::Frequency)) step = queryFrequency();
+    if (step == Step::Ok && wanted(again.span, AxisSetting::Span)) step = querySpan();
+    if (step == Step::Ok && wanted(again.refLvl, AxisSetting::ReferenceLevel))
+        step = query("REFLVL", mirror_.ReferenceLevel);
+    if (step == Step::Ok && wanted(again.range, AxisSetting::Range))
+        step = query("RANGE", mirror_.ReferenceRange);
+    if (step == Step::Ok && wanted(again.detector, AxisSetting::Detector))
+        step = queryCode("TRACEDET", mirror_.TraceDetector);
     return step;
 }
 

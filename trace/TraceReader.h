@@ -32,7 +32,7 @@ class TraceReader {
 
     /// The full cycle. True in `success` when a trace was read and drawn.
     void ReadSingleTrace(bool& success);
-    /// The selective cycle: only the settings that are asked for.
+    /// The selective cycle: only the settings that are asked for, and those that are unsure.
     void ReadSingleTrace2(const ReadAgain& again, bool& success);
 
   private:

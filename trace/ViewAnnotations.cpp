@@ -38,6 +38,17 @@ void annotateFile(const ShownView& shown, ViewAnnotations& view) {
     view.mode = shown.mode;
 }
 
+void markUnsure(const UnsureSettings& unsure, ViewAnnotations& view) {
+    view.refLevelUnsure = unsure.has(AxisSetting::ReferenceLevel);
+    view.rangeUnsure = unsure.has(AxisSetting::Range);
+    view.detectorUnsure = unsure.has(AxisSetting::Detector);
+    view.yUnsure = view.refLevelUnsure || view.rangeUnsure;
+    // Lengths rest on the cable alone, times on a span of zero as well.
+    const bool hertz = view.xUnit == "Hz";
+    view.xUnsure = (hertz && unsure.has(AxisSetting::Frequency)) ||
+                   (view.xUnit != "m" && unsure.has(AxisSetting::Span));
+}
+
 }  // namespace
 
 double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror) {
@@ -68,7 +79,11 @@ ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& m
         findCode(CodeTable::MeasurementMode,
                  shown.instrumentMode != 0 ? shown.instrumentMode : panel.InstrumentMode);
     if (mode != nullptr) view.mode = std::string(mode->text);
-    if (shown.fromFile) annotateFile(shown, view);
+    if (shown.fromFile) {
+        annotateFile(shown, view);
+    } else {
+        markUnsure(mirror.Unsure, view);
+    }
     const double left = graph.xAxis().Minimum;
     const double right = graph.xAxis().Maximum;
     view.left = "Start " + FormatValue(left, view.xUnit);

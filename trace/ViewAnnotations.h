@@ -22,6 +22,12 @@ struct ViewAnnotations {
     std::string left;       ///< x at the left edge: "Start 0 Hz"
     std::string center;
     std::string right;
+    // The instrument may have another value than the one that is shown.
+    bool refLevelUnsure = false;
+    bool rangeUnsure = false;
+    bool detectorUnsure = false;
+    bool xUnsure = false;  ///< the labels of the x axis and left, center, right
+    bool yUnsure = false;  ///< the labels of the y axis
 };
 
 /// The range code of the view on the graph, also where a file gave dB a division.

@@ -177,8 +177,10 @@ void Binder::bind(Label& control, QLabel* widget) {
         widget->setText(text(control.Caption));
         widget->setVisible(control.Visible);
         const Color ink = control.ForeColor;
-        widget->setStyleSheet(ink == kWindowText ? QString()
-                                                 : QString("color: %1").arg(inkOf(ink).name()));
+        QString style;
+        if (ink != kWindowText) style = QString("color: %1;").arg(inkOf(ink).name());
+        if (control.Struck) style += "text-decoration: line-through;";
+        widget->setStyleSheet(style);
     });
 }
 

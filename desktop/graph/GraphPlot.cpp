@@ -105,9 +105,9 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     old_->setVisible(false);
 }
 
-QCPTextElement* GraphPlot::addText(QCPLayoutGrid& grid, int row, int column,
+AnnotationText* GraphPlot::addText(QCPLayoutGrid& grid, int row, int column,
                                    Qt::Alignment alignment) {
-    auto* element = new QCPTextElement(&plot_, " ", plotFont());
+    auto* element = new AnnotationText(&plot_, plotFont());
     element->setTextColor(colors_.text);
     element->setTextFlags(static_cast<int>((alignment | Qt::AlignVCenter).toInt()));
     grid.addElement(row, column, element);
@@ -194,6 +194,26 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     bottom_[0]->setText(text(view.left));
     bottom_[1]->setText(text(view.center));
     bottom_[2]->setText(text(view.right));
+    strike(view);
+}
+
+void GraphPlot::strike(const ViewAnnotations& view) {
+    const auto ifUnsure = [](bool unsure, const std::string& part) {
+        return unsure ? QStringList{text(part)} : QStringList{};
+    };
+    top_[0]->setStruck(ifUnsure(view.refLevelUnsure, view.refLevel) +
+                       ifUnsure(view.rangeUnsure, view.range));
+    top_[2]->setStruck(ifUnsure(view.detectorUnsure, view.detector));
+    bottom_[0]->setStruck(ifUnsure(view.xUnsure, view.left));
+    bottom_[1]->setStruck(ifUnsure(view.xUnsure, view.center));
+    bottom_[2]->setStruck(ifUnsure(view.xUnsure, view.right));
+    const auto strikeLabels = [](QCPAxis* axis, bool unsure) {
+        QFont font = plotFont();
+        font.setStrikeOut(unsure);
+        axis->setTickLabelFont(font);
+    };
+    strikeLabels(plot_.xAxis, view.xUnsure);
+    strikeLabels(plot_.yAxis, view.yUnsure);
 }
 
 void GraphPlot::clipToView() {

@@ -5,6 +5,7 @@
 
 #include <array>
 
+#include "desktop/graph/AnnotationText.h"
 #include "platform/Graph.h"
 #include "trace/ViewAnnotations.h"
 
@@ -48,16 +49,17 @@ class GraphPlot {
         bool visible = false;
         double x = 0;
     };
-    QCPTextElement* addText(QCPLayoutGrid& grid, int row, int column, Qt::Alignment alignment);
+    AnnotationText* addText(QCPLayoutGrid& grid, int row, int column, Qt::Alignment alignment);
     void styleAxes();
     void setRanges(const Graph& graph);
+    void strike(const ViewAnnotations& view);
 
     QCustomPlot& plot_;
     GraphColors colors_;
     QCPAxisRect* axisRect_ = nullptr;
     QCPGraph* trace_ = nullptr;
-    std::array<QCPTextElement*, 4> top_{};
-    std::array<QCPTextElement*, 3> bottom_{};
+    std::array<AnnotationText*, 4> top_{};
+    std::array<AnnotationText*, 3> bottom_{};
     std::array<CursorItems, 2> cursors_{};
     QCPItemStraightLine* trigger_ = nullptr;
     QCPItemText* triggerText_ = nullptr;

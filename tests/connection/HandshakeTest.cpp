@@ -255,6 +255,17 @@ TEST_F(Connection, Handshake_SingleSweep_SendsNoInit) {
     EXPECT_EQ(port.written().find("INIT"), std::string::npos);
 }
 
+TEST_F(Connection, Handshake_Done_LeavesNoSettingUnsure) {
+    for (const char* word : {"FREQ", "SPAN", "REFLVL", "RANGE", "TRACEDET"})
+        mirror.Unsure.sent(word, false);
+    page({{"MEAS", "3"}}).wake().cmd("REMOTE").identity().detectorModeAndFrequency();
+    page().get("FREQOFFS", "0");
+    EXPECT_TRUE(connect());
+    expectPlayed();
+    EXPECT_FALSE(mirror.Unsure.any());
+    EXPECT_FALSE(panel.SpanLabel.Struck);
+}
+
 TEST_F(Connection, Handshake_SecondOfTheProcess_AsksNoFrequencyOffset) {
     page().whole().cmd("LOCAL");
     page().wake().cmd("REMOTE").identity().detectorModeAndFrequency().state();

@@ -92,6 +92,46 @@ TEST_F(MenuFillTest, NewMenu_PaintsItsFirstKeyAndEmptiesTheBoxes) {
     }
 }
 
+TEST_F(MenuFillTest, QuestionWithoutAnAnswer_IsTheLastOfItsMenu) {
+    mirror.ReferenceOffset = 2;
+    mirror.RFInputImpedance = 1;
+    getSilent();
+    panel.AmplitudeButton.Click();
+    expectPlayed();
+    EXPECT_EQ(boxes.texts(), Texts{"No response received!"});
+    EXPECT_EQ(panel.SoftTextBox(3).Text.get(), "2 dB");
+    EXPECT_EQ(panel.ChoiceBox(4).Text(), "75 Ohm");
+}
+
+TEST_F(MenuFillTest, RefusedQuestion_IsTheLastOfItsMenuToo) {
+    getRefused("RBW", "6");
+    panel.BWButton.Click();
+    expectPlayed();
+}
+
+TEST_F(MenuFillTest, MarkerMenu_OnASilentLine_AsksOnce) {
+    getSilent();
+    Stopwatch waited(platform.clock);
+    panel.MarkerButton.Click();
+    expectPlayed();
+    EXPECT_EQ(boxes.texts(), Texts{"No response received!"});
+    EXPECT_LT(waited.Elapsed(), 20000);
+}
+
+TEST_F(MenuFillTest, SweepMenu_OnASilentLine_AsksOnce) {
+    getSilent();
+    panel.SweepButton.Click();
+    expectPlayed();
+    EXPECT_EQ(boxes.texts(), Texts{"No response received!"});
+}
+
+TEST_F(MenuFillTest, MarkerMenu_SecondMarkerRefused_AsksNoMore) {
+    get("MARK1ON", "0");
+    getRefused("DELTA1ON", "6");
+    panel.MarkerButton.Click();
+    expectPlayed();
+}
+
 TEST_F(MenuFillTest, TransducerMenu_BeginsWithAnEmptyName) {
     open(kMeas);
     get("MEAS", "1");

@@ -301,14 +301,43 @@ TEST_F(SettingTest, TriggerLevel_GoesOutUnderItsWordAndMovesTheLine) {
     EXPECT_EQ(panel.CWGraph1.trigger().Height, -40);
 }
 
-TEST_F(SettingTest, ChannelBandwidthAbove32767_EndsQuietly) {
+TEST_F(SettingTest, NumberThatItsWordCannotHold_IsRefusedInABoxAndNotSent) {
+    const struct {
+        Menu menu;
+        int box;
+        const char* text;
+    } rows[] = {{kChnPower, 3, "32768"},    {kChnPower, 3, "-32769"}, {kOccBW, 2, "2147483648"},
+                {kOccBW, 2, "-2147483649"}, {kTdma, 2, "2147483648"}, {kTracking, 4, "3G"}};
+    for (const auto& row : rows) {
+        boxes.clear();
+        open(row.menu);
+        mirror.OccBWChannelBandwidth = 5;
+        type(row.box, row.text);
+        enter(row.box);
+        EXPECT_EQ(port.written(), "");
+        ASSERT_EQ(boxes.boxes().size(), 1U) << row.text;
+        EXPECT_EQ(boxes.boxes()[0].text, "Out of Range!");
+        EXPECT_EQ(boxes.boxes()[0].icon, BoxIcon::Plain);
+        EXPECT_EQ(mirror.OccBWChannelBandwidth, 5);
+        EXPECT_TRUE(panel.GetOption.Value());
+        EXPECT_EQ(panel.MousePointer.get(), 0);
+    }
+}
+
+TEST_F(SettingTest, LargestNumbersOfTheirWords_AreSent) {
     open(kChnPower);
-    type(3, "40k");
+    type(3, "32767");
+    set("CHPWRUNIT,32767");
     enter(3);
-    EXPECT_EQ(port.written(), "");
+    expectPlayed();
+    visited();
+    panel.InstrumentMode = CF::OCCBANDWIDTH;
+    panel.OccBWButton.Click();
+    type(2, "2147483647.9");  // its fraction is cut first
+    set("OBWCHBW,2147483647");
+    enter(2);
+    expectPlayed();
     EXPECT_EQ(boxes.texts(), Texts{});
-    EXPECT_TRUE(panel.GetOption.Value());
-    EXPECT_EQ(panel.MousePointer.get(), 0);
 }
 
 TEST_F(SettingTest, NamesOfTransducersAndLimits_GoOutAsTyped) {

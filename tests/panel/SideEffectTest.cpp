@@ -51,6 +51,7 @@ TEST_F(SideEffectTest, NewStart_IsInTheMirrorAheadOfTheExchange) {
     boxes.whileShown = [&](const Box&) { seen = mirror.Span; };
     set("SPAN,150000000", "5");
     set("FREQ,1025000000");
+    get("SPAN", "200000000");  // the refused value
     sweep();
     type(2, "950M");
     enter(2);

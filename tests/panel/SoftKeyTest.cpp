@@ -358,11 +358,20 @@ TEST_F(SoftKeyTest, LevelAdjust_IsACommandOfThreeMenus) {
     expectPlayed();
 }
 
-TEST_F(SoftKeyTest, LevelAdjust_WithSetSelected_SendsNothing) {
+TEST_F(SoftKeyTest, LevelAdjust_WithSetSelected_IsSentButForTheChannelPower) {
     open(kChnPower);
     panel.SetOption.setValue(true);
     panel.SoftKey(4).Click();
     EXPECT_EQ(port.written(), "");
+    for (const Menu& menu : {kOccBW, kTdma}) {
+        visited();
+        panel.InstrumentMode = menu.mode;
+        (panel.*menu.key).Click();
+        panel.SetOption.setValue(true);
+        cmd("LVLADJUST");
+        panel.SoftKey(3).Click();
+    }
+    expectPlayed();
 }
 
 TEST_F(SoftKeyTest, ChannelPower_IsShownInItsUnit) {

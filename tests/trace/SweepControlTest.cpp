@@ -447,5 +447,51 @@ TEST_F(PowerReadoutTest, Continuous_InTheTdmaMenu_ReadsItsPowerWithoutADialog) {
     EXPECT_EQ(panel.LastPowerText, "");
 }
 
+TEST_F(PowerReadoutTest, Continuous_SilentReading_IsToldOnceAndEndsTheLoop) {
+    choose(true);
+    get("PWR", "1");
+    get("REFL", "2");
+    getSilent();
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_EQ(boxes.texts(), Texts{"No response received!"});
+    EXPECT_FALSE(panel.ContinuosLoopActive);
+    EXPECT_TRUE(panel.StopButton.Visible);  // the way back
+    panel.StopButton.Click();
+    EXPECT_FALSE(panel.StopButton.Visible);
+    EXPECT_TRUE(panel.PlayContinuousButton.Visible);
+}
+
+TEST_F(PowerReadoutTest, Continuous_RefusedReading_EndsTheLoop) {
+    panel.State = ControllerForm::TDMA;
+    panel.InstrumentMode = ControllerForm::TDMAPOWERMODE;
+    get("TDMAPWR", "-40");
+    getRefused("TDMAPWR", "5");
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_EQ(boxes.texts().size(), 1U);
+    EXPECT_FALSE(panel.ContinuosLoopActive);
+}
+
+TEST_F(PowerReadoutTest, Continuous_StopInsideTheBoxOfAReading_IsANormalStop) {
+    choose(false);
+    getRefused("PWR", "5");
+    boxes.whileShown = [this](const Box&) { panel.StopButton.Click(); };
+    panel.PlayContinuousButton.Click();
+    expectPlayed();
+    EXPECT_EQ(boxes.texts().size(), 1U);
+    expectIdle();
+}
+
+TEST_F(PowerReadoutTest, Single_RefusedReadingOfARecording_SavesNothing) {
+    panel.RecordDataFlag = true;
+    Texts saved;
+    panel.SaveView.connect([&](const std::string& kind) { saved.push_back(kind); });
+    getRefused("PWR", "6");
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+    EXPECT_EQ(saved, Texts{});
+}
+
 }  // namespace
 }  // namespace zel

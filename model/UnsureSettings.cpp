@@ -1,0 +1,32 @@
+#include "model/UnsureSettings.h"
+
+#include <algorithm>
+
+namespace zel {
+namespace {
+
+// In the order of AxisSetting.
+constexpr std::array<std::string_view, 5> kWords = {"FREQ", "SPAN", "REFLVL", "RANGE", "TRACEDET"};
+
+}  // namespace
+
+bool UnsureSettings::any() const {
+    return std::find(unsure_.begin(), unsure_.end(), true) != unsure_.end();
+}
+
+void UnsureSettings::set(std::string_view word, bool unsure) {
+    const auto found = std::find(kWords.begin(), kWords.end(), word);
+    if (found == kWords.end()) return;
+    bool& mark = unsure_.at(static_cast<std::size_t>(found - kWords.begin()));
+    if (mark == unsure) return;
+    mark = unsure;
+    Changed();
+}
+
+void UnsureSettings::clear() {
+    if (!any()) return;
+    unsure_.fill(false);
+    Changed();
+}
+
+}  // namespace zel
