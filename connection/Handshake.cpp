@@ -4,7 +4,6 @@
 #include <cmath>
 
 #include "link/WaitNotice.h"
-#include "panel/MenuTables.h"
 #include "panel/ModeOptions.h"
 #include "panel/SoftPanel.h"
 #include "support/CommandWord.h"
@@ -183,7 +182,7 @@ bool Handshake::readState() {
 void Handshake::connectedLook() {
     panel_.SetDevice.Enabled = false;
     panel_.ConnectedPic.Visible = true;
-    softPanel_.setKeyCaptions(hardKeyMenu(CF::Freq)->captions);
+    softPanel_.setKeyCaptions(CF::Freq);
     softPanel_.SetTextFieldsAndFrames(CF::Freq);
     panel_.State = CF::Freq;
     panel_.Picture3.Visible = true;

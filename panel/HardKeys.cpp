@@ -1,6 +1,6 @@
 #include "panel/HardKeys.h"
 
-#include "panel/MenuTables.h"
+#include "panel/SoftPositions.h"
 #include "support/NumberText.h"
 
 namespace zel {
@@ -41,15 +41,14 @@ void HardKeys::press(std::int16_t menu) {
     if (menu == CF::Freq) mirror_.PowerSensorExitRequested = false;
     if (menu == CF::Marker && interlock_.refuses(Interlock::Rule::NoContinuousView)) return;
     softPanel_.InitForm(menu);
-    const HardKeyMenu* captions = hardKeyMenu(menu);
-    softPanel_.setKeyCaptions(captions->captions);
+    softPanel_.setKeyCaptions(menu);
     softPanel_.SetTextFieldsAndFrames(panel_.State);
     softPanel_.SetButtonsStatus(panel_.State);
     if (panel_.ContinuosLoopActive || !panel_.isConnected) return;
     bool answers = true;
     if (menu == CF::Marker) answers = readMarkers();
     if (menu == CF::SWEEP) answers = readSweepTime();
-    fill_.FillTextFields(captions->word, answers);
+    fill_.FillTextFields(menuWord(menu), answers);
 }
 
 bool HardKeys::readMarkers() {

@@ -7,8 +7,8 @@
 
 #include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
-#include "model/CodeTables.h"
 #include "model/ZEL3Variables.h"
+#include "panel/SoftPositions.h"
 
 namespace zel {
 
@@ -37,27 +37,13 @@ class MenuFill {
     std::string LastPowerAnswer;
 
   private:
-    void fillFrequency();
-    void fillSpan();
-    void fillAmplitude();
-    void fillBandwidth();
-    void fillSweep();
-    void fillTrace();
-    void fillMarker();
-    void fillMeasurement();
-    void fillChannelPower();
-    void fillOccupiedBandwidth();
-    void fillTDMAPower();
-    void fillDistanceToFault();
-
     /// The answer, unless the menu's values are known or an earlier question failed.
     bool answered(const char* word, std::string& answer);
-    /// Asks the instrument; a failure leaves the field.
-    void ask(const char* word, double& field);
-    void ask(const char* word, std::int16_t& field);
-    void ask(const char* word, std::string& field);
-    void show(int index, double value, const std::string& unit);
+    void ask(const SoftPosition& position);
+    void show(const SoftPosition& position);
     void choose(int index, double code);
+    void showTriggerSource();
+    void fillMarker();
 
     ControllerForm& panel_;
     ZEL3Variables& mirror_;

@@ -2,8 +2,8 @@
 
 #include "model/Numeric.h"
 #include "panel/Hourglass.h"
-#include "panel/MenuTables.h"
 #include "panel/ModeOptions.h"
+#include "panel/SoftPositions.h"
 #include "trace/FrequencyLabels.h"
 
 namespace zel {
@@ -14,63 +14,18 @@ using CF = ControllerForm;
 struct ModeRow {
     std::int16_t mode = 0;
     std::int16_t menu = 0;
-    KeyCaptions captions;  // an empty one hides its key
-    int waitMs = 0;        // the instrument needs it to change its mode
+    int waitMs = 0;  // the instrument needs it to change its mode
     const char* failure = nullptr;
-    const char* word = nullptr;    // for FillTextFields; null where the menu is not filled
     bool whileConnecting = false;  // works while the handshake runs
     bool alwaysTakesOver = false;  // scale and option also when the mode is on already
 };
 const ModeRow kModes[] = {
-    {CF::TRACKINGGENERATOR,
-     CF::TRACKINGGEN,
-     {"TRANS\r\nCAL", "REFLECT\r\nCAL", "TRANSM\r\nVECT CAL", "REFLECT\r\nVECT CAL",
-      "TRACGEN\r\nLEVEL"},
-     0,
-     "Tracking Generator Mode unsuccessful",
-     nullptr,
-     false,
-     false},
-    {CF::POWERSENSOR,
-     CF::POWER,
-     {"POWER", "FREQ", "POWER-\r\nREF", "MEAS\r\nTIME", "REFL\r\nLEVEL"},
-     2500,
-     "Power Sensor Mode unsuccessful",
-     nullptr,
-     false,
-     false},
-    {CF::CHANNELPOWER,
-     CF::CHNPOWER,
-     {"CHN\r\nPOWER", "CHN\r\nPWRSTD", "CHN\r\nPWRUNIT", "CHN\r\nPWRBW", "LEVEL\r\nADJ"},
-     0,
-     "Channer Power Mode unsuccessful",
-     "CHANNELPOWER",
-     true,
-     true},
-    {CF::OCCBANDWIDTH,
-     CF::OCCBW,
-     {"OCCUP\r\nBW", "OCCBW\r\nSTD", "OCCBW\r\nCHNBW", "LVL\r\nADJ", hiddenKey("LEVEL\r\nADJ")},
-     2000,
-     "Occupied Bandwidth Mode unsuccessful",
-     "OCCBANDWIDTH",
-     true,
-     true},
-    {CF::TDMAPOWERMODE,
-     CF::TDMA,
-     {"TDMA\r\nPOWER", "TDMA\r\nPWRSTD", "MEAS\r\nTIME", "LVL\r\nADJ", hiddenKey("LEVEL\r\nADJ")},
-     0,
-     "TDMA Power unsuccessful",
-     "TDMAPOWER",
-     true,
-     true},
-    {CF::DISTTOFAULTMEASURE,
-     CF::DISTFAULT,
-     {"CABLE\r\nMODEL", "CABLE\r\nLEN", "DTF\r\nMODE", "LEN\r\nUNIT", hiddenKey("LEVEL\r\nADJ")},
-     0,
-     "Distance to Fault Mode unsuccessful",
-     "DTF",
-     true,
-     true},
+    {CF::TRACKINGGENERATOR, CF::TRACKINGGEN, 0, "Tracking Generator Mode unsuccessful"},
+    {CF::POWERSENSOR, CF::POWER, 2500, "Power Sensor Mode unsuccessful"},
+    {CF::CHANNELPOWER, CF::CHNPOWER, 0, "Channer Power Mode unsuccessful", true, true},
+    {CF::OCCBANDWIDTH, CF::OCCBW, 2000, "Occupied Bandwidth Mode unsuccessful", true, true},
+    {CF::TDMAPOWERMODE, CF::TDMA, 0, "TDMA Power unsuccessful", true, true},
+    {CF::DISTTOFAULTMEASURE, CF::DISTFAULT, 0, "Distance to Fault Mode unsuccessful", true, true},
 };
 
 }  // namespace
@@ -106,7 +61,7 @@ void ModeKeys::enterMode(std::int16_t mode) {
         if (candidate.mode == mode) row = &candidate;
     if (row == nullptr || interlock_.refuses(Interlock::Rule::NoContinuousView)) return;
     softPanel_.InitForm(row->menu);
-    softPanel_.setKeyCaptions(row->captions);
+    softPanel_.setKeyCaptions(row->menu);
     softPanel_.SetTextFieldsAndFrames(row->menu);
     const bool on = panel_.InstrumentMode == mode;
     if (!on || row->alwaysTakesOver) {
@@ -124,7 +79,8 @@ void ModeKeys::enterMode(std::int16_t mode) {
         mirror_.ReferenceRange = 0;
         mirror_.ReferenceUnit = 0;
         modeOption(panel_, mode).setValue(true);
-        if (row->word != nullptr && panel_.isConnected) fill_.FillTextFields(row->word);
+        const std::string_view word = menuWord(row->menu);
+        if (!word.empty() && panel_.isConnected) fill_.FillTextFields(word);
     }
 }
 

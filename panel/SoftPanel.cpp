@@ -93,17 +93,14 @@ void SoftPanel::SetTextFieldsAndFrames(std::int16_t state) {
     UnlockTextFields();
     SetSoftBoxesToEditable();
     SetButtonsActive();
-    const MenuLayout* layout = menuLayout(state);
-    if (layout == nullptr) return;
-    for (int i = 0; i < panel_.SoftKey.count(); ++i)
-        layPosition(i, layout->positions.at(static_cast<std::size_t>(i)));
+    for (const SoftPosition& position : softPositions(state)) layPosition(position);
 }
 
-void SoftPanel::layPosition(int index, const MenuPosition& position) {
-    Frame& frame = panel_.SoftFrame(index);
-    TextBox& box = panel_.SoftTextBox(index);
-    DropDownList& list = panel_.ChoiceBox(index);
-    Button& key = panel_.SoftKey(index);
+void SoftPanel::layPosition(const SoftPosition& position) {
+    Frame& frame = panel_.SoftFrame(position.key);
+    TextBox& box = panel_.SoftTextBox(position.key);
+    DropDownList& list = panel_.ChoiceBox(position.key);
+    Button& key = panel_.SoftKey(position.key);
     if (!position.frame.empty()) frame.Caption = std::string(position.frame);
     const bool isChoice =
         position.kind == PositionKind::Choice || position.kind == PositionKind::LockedChoice;
@@ -111,10 +108,11 @@ void SoftPanel::layPosition(int index, const MenuPosition& position) {
         frame.Visible = position.kind != PositionKind::None;
     box.Visible = position.kind == PositionKind::Box || position.kind == PositionKind::LockedBox;
     box.Locked = position.kind == PositionKind::LockedBox;
-    if (position.choices) list.setItems(choicesOf(*position.choices));
-    list.Visible = isChoice || position.listAboveBox;
+    const std::optional<CodeTable> choices = isChoice ? position.codes : position.listAboveBox;
+    if (choices) list.setItems(choicesOf(*choices));
+    list.Visible = choices.has_value();
     list.Locked = position.kind == PositionKind::LockedChoice;
-    switch (position.key) {
+    switch (position.action) {
         case KeyAction::Leave:
             break;
         case KeyAction::Enable:
@@ -127,44 +125,36 @@ void SoftPanel::layPosition(int index, const MenuPosition& position) {
             key.Visible = false;
             break;
         case KeyAction::PaintGreen:
-            SetButtonColor(index, "green");
+            SetButtonColor(position.key, "green");
             break;
     }
 }
 
-void SoftPanel::laySubMenu(std::int16_t state, const KeyCaptions& captions,
-                           const std::array<std::string_view, 3>& frames) {
+void SoftPanel::laySubMenu(std::int16_t state) {
     SetButtonsActive();
-    setKeyCaptions(captions);
-    for (int i = 0; i < panel_.SoftFrame.count(); ++i) {
-        const bool used =
-            i < static_cast<int>(frames.size()) && !frames.at(static_cast<std::size_t>(i)).empty();
+    setKeyCaptions(state);
+    for (const SoftPosition& position : softPositions(state)) {
+        const int i = position.key;
+        const bool used = position.kind != PositionKind::None;
         panel_.SoftFrame(i).Visible = used;
-        if (used) panel_.SoftFrame(i).Caption = std::string(frames.at(static_cast<std::size_t>(i)));
+        if (used) panel_.SoftFrame(i).Caption = std::string(position.frame);
         // The names of transducers and limit lines are typed.
-        const bool typed = used && i < 2;
+        const bool typed = position.kind == PositionKind::Box;
         panel_.SoftTextBox(i).Visible = typed;
         panel_.SoftTextBox(i).Locked = false;
         if (typed) panel_.SoftTextBox(i).Text = "";
-        panel_.ChoiceBox(i).Visible = false;
+        DropDownList& list = panel_.ChoiceBox(i);
+        list.Visible = used && !typed;
+        if (!list.Visible) continue;
+        list.setItems(choicesOf(*position.codes));
+        list.Locked = true;
     }
     SetStates(panel_.State, state);
 }
 
-void SoftPanel::layTransducerMenu() {
-    laySubMenu(ControllerForm::MEAS_TRD,
-               {"TRANSD", "TRANSD\r\ndB", "TRANSD1\r\nOff", "TRANSD2\r\nOff", "EXIT"},
-               {"Transducer", "Transducer Db", ""});
-}
+void SoftPanel::layTransducerMenu() { laySubMenu(ControllerForm::MEAS_TRD); }
 
-void SoftPanel::layLimitMenu() {
-    laySubMenu(ControllerForm::MEAS_LLINES,
-               {"LOWER\r\nLIMIT", "UPPER\r\nLIMIT", "LIMITS\r\nPASSED", "EXIT", ""},
-               {"Lower Limit", "Upper Limit", "Limits Passed"});
-    panel_.ChoiceBox(2).setItems(choicesOf(CodeTable::LimitPass));
-    panel_.ChoiceBox(2).Visible = true;
-    panel_.ChoiceBox(2).Locked = true;
-}
+void SoftPanel::layLimitMenu() { laySubMenu(ControllerForm::MEAS_LLINES); }
 
 void SoftPanel::SetButtonsStatus(std::int16_t state) {
     const HardKeyPicture* current = &kHardKeyPictures[8];  // the marker key stands for the rest
@@ -175,11 +165,10 @@ void SoftPanel::SetButtonsStatus(std::int16_t state) {
     (panel_.*current->key).Picture = std::string(current->picture) + "_b";
 }
 
-void SoftPanel::setKeyCaptions(const KeyCaptions& captions) {
-    for (int i = 0; i < panel_.SoftKey.count(); ++i) {
-        const KeyCaption& caption = captions.at(static_cast<std::size_t>(i));
-        panel_.SoftKey(i).Caption = std::string(caption.text);
-        panel_.SoftKey(i).Visible = caption.visible;
+void SoftPanel::setKeyCaptions(std::int16_t state) {
+    for (const SoftPosition& position : softPositions(state)) {
+        panel_.SoftKey(position.key).Caption = std::string(position.caption.text);
+        panel_.SoftKey(position.key).Visible = position.caption.visible;
     }
 }
 

@@ -5,7 +5,7 @@
 #include <string_view>
 
 #include "forms/ControllerForm.h"
-#include "panel/MenuTables.h"
+#include "panel/SoftPositions.h"
 
 namespace zel {
 
@@ -32,13 +32,12 @@ class SoftPanel {
     /// The sub-menus of the measurement menu.
     void layTransducerMenu();
     void layLimitMenu();
-    /// Writes the captions and hides the keys without one.
-    void setKeyCaptions(const KeyCaptions& captions);
+    /// Writes the captions of a menu and hides the keys without one.
+    void setKeyCaptions(std::int16_t state);
 
   private:
-    void laySubMenu(std::int16_t state, const KeyCaptions& captions,
-                    const std::array<std::string_view, 3>& frames);
-    void layPosition(int index, const MenuPosition& position);
+    void laySubMenu(std::int16_t state);
+    void layPosition(const SoftPosition& position);
 
     ControllerForm& panel_;
 };

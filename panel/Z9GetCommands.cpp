@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
 
 #include "model/Numeric.h"
 #include "support/NumberText.h"
@@ -19,19 +20,12 @@ constexpr double kFullCentre = 1.5e9;  // fixed numbers of the instrument family
 constexpr double kFullSpan = 3e9;
 constexpr const char* kTriggerLevel = "TRIGGER\r\nLEVEL";
 
-struct BandwidthKey {
+struct BandwidthPrompt {
     const char* word;
-    const char* promptWord;
-    const char* prompt;
-    CodeTable table;
-    double ZEL3Variables::*field;
+    const char* text;
 };
-constexpr BandwidthKey kBandwidths[] = {
-    {"RBW", "rbw,", "Set the Resolution Bandwidth (0-9):", T::ResolutionBandwidth,
-     &ZV::ResolutionBandwidth},
-    {"VBW", "vbw,", "Set the Video Bandwidth (0-12):", T::VideoBandwidth, &ZV::VideoBandwidth},
-};
-const BandwidthKey& bandwidthKey(int index) { return kBandwidths[index / 2]; }
+constexpr BandwidthPrompt kResolutionPrompt = {"rbw,", "Set the Resolution Bandwidth (0-9):"};
+constexpr BandwidthPrompt kVideoPrompt = {"vbw,", "Set the Video Bandwidth (0-12):"};
 
 double wholeNumber(double value, double lowest, double highest) {
     return std::clamp(std::nearbyint(value), lowest, highest);
@@ -53,89 +47,46 @@ Z9GetCommands::Z9GetCommands(ControllerForm& panel, ZEL3Variables& mirror,
       scaling_(scaling),
       boxes_(boxes) {}
 
-// A row a soft key, in the order in which the operations run.
-const std::vector<Z9GetCommands::Clause>& Z9GetCommands::clauses() {
+Z9GetCommands::Quirk Z9GetCommands::quirk(KeyQuirk which) {
     using Z = Z9GetCommands;
-    static const std::vector<Clause> table = {
-        {CF::Freq, 0, Query{"FREQ", "Hz", &ZV::CenterFrequency}},
-        {CF::Freq, 1, Query{"SPAN", "Hz", &ZV::Span}},
-        {CF::Freq, 2, &Z::startFrequency},
-        {CF::Freq, 3, &Z::stopFrequency},
-        {CF::Freq, 4, Query{"FREQOFFS", "Hz", &ZV::FrequencyOffset}},
-        {CF::SPAN, 0, Query{"SPAN", "Hz", &ZV::Span}},
-        {CF::SPAN, 1, &Z::fullSpan},
-        {CF::SPAN, 2, &Z::zeroSpan},
-        {CF::SPAN, 3, &Z::lastSpan},
-        {CF::AMPT, 0, &Z::referenceLevel},
-        {CF::AMPT, 1, Query{"RANGE", "", &ZV::ReferenceRange, T::Range}},
-        {CF::AMPT, 2, Query{"UNIT", "", &ZV::ReferenceUnit, T::ReferenceUnit}},
-        {CF::AMPT, 3, Query{"REFLVLOFFS", "dB", &ZV::ReferenceOffset}},
-        {CF::AMPT, 4, Query{"RFINPUT", "", &ZV::RFInputImpedance, T::RFInput}},
-        {CF::BW, 0, &Z::bandwidth},
-        {CF::BW, 1, &Z::autoBandwidth},
-        {CF::BW, 2, &Z::bandwidth},
-        {CF::BW, 3, &Z::autoBandwidth},
-        {CF::SWEEP, 0, Query{"SWPTIME", "s", &ZV::SweepTime}},
-        {CF::SWEEP, 1, &Z::autoSweepTime},
-        {CF::SWEEP, 2, Query{"SWPCONT", "", &ZV::SweepContinuous, T::SweepContinuous}},
-        {CF::SWEEP, 3, &Z::triggerSource},
-        {CF::SWEEP, 4, &Z::triggerValue},
-        {CF::TRACE, 0, Query{"TRACEMODE", "", &ZV::TraceMode, T::TraceMode}},
-        {CF::TRACE, 1, Query{"TRACEDET", "", &ZV::TraceDetector, T::Detector}},
-        {CF::TRACE, 2, &Z::singleTrace},
-        {CF::Marker, 0, &Z::marker},
-        {CF::Marker, 1, &Z::marker},
-        {CF::Marker, 2, &Z::marker},
-        {CF::MEAS, 0, Query{"MEAS", "", {}, T::MeasurementMode}},
-        {CF::MEAS, 1, &Z::transducerMenu},
-        {CF::MEAS, 2, &Z::limitMenu},
-        {CF::MEAS_TRD, 0, Query{"TRD1"}},
-        {CF::MEAS_TRD, 1, Query{"TRD2"}},
-        {CF::MEAS_TRD, 2, &Z::transducerOff},
-        {CF::MEAS_TRD, 3, &Z::transducerOff},
-        {CF::MEAS_TRD, 4, &Z::leaveSubMenu},
-        {CF::MEAS_LLINES, 0, Query{"LIMLOW"}},
-        {CF::MEAS_LLINES, 1, Query{"LIMUPP"}},
-        {CF::MEAS_LLINES, 2, Query{"LIMPASS", "", {}, T::LimitPass}},
-        {CF::MEAS_LLINES, 3, &Z::leaveSubMenu},
-        {CF::TRACKINGGEN, 0, Query{"TRANSCAL", "", {}, T::Calibration}},
-        {CF::TRACKINGGEN, 1, Query{"REFLCAL", "", {}, T::Calibration}},
-        {CF::TRACKINGGEN, 2, Query{"TRANSVECTCAL", "", {}, T::Calibration}},
-        {CF::TRACKINGGEN, 3, Query{"REFLVECTCAL", "", {}, T::Calibration}},
-        {CF::TRACKINGGEN, 4, Query{"TGLVL"}},
-        {CF::POWER, 0, Query{"PWR", "dBm"}},
-        {CF::POWER, 1, Query{"FREQ", "Hz"}},
-        {CF::POWER, 3, Query{"MEASTIME", "s", {}, T::PowerMeasTime}},
-        {CF::POWER, 4, Query{"REFL"}},
-        {CF::CHNPOWER, 0, &Z::channelPower},
-        {CF::CHNPOWER, 1, Query{"CHPWRSTD", "", &ZV::ChannelPowerStandard, T::Standard}},
-        {CF::CHNPOWER, 2, &Z::channelPowerUnit},
-        {CF::CHNPOWER, 3, Query{"CHPWRBW", "Hz", &ZV::ChannelPowerBandwidth}},
-        {CF::CHNPOWER, 4, &Z::levelAdjust},
-        {CF::OCCBW, 0, Query{"OBW", "Hz", &ZV::OccBWValue, std::nullopt, true}},
-        {CF::OCCBW, 1, Query{"OBWSTD", "", &ZV::OccBWStandard, T::Standard}},
-        // The answer lands in the channel power's field, on purpose.
-        {CF::OCCBW, 2, Query{"OBWCHBW", "Hz", &ZV::ChannelPowerBandwidth}},
-        {CF::OCCBW, 3, &Z::levelAdjust},
-        {CF::TDMA, 0, Query{"TDMAPWR", "dBm", &ZV::TDMAPowerValue}},
-        {CF::TDMA, 1, Query{"TDMASTD", "", &ZV::TDMAStandard, T::TDMAStandard}},
-        {CF::TDMA, 2, Query{"MEASTIME", "s", &ZV::TDMAMeasTime}},
-        {CF::TDMA, 3, &Z::levelAdjust},
-        {CF::DISTFAULT, 0, Query{"CABLEMOD"}},
-        {CF::DISTFAULT, 1, Query{"CABLELEN", "", &ZV::CableLength}},
-        {CF::DISTFAULT, 2, Query{"DTFMODE", "", &ZV::DTFMode, T::DTFMode}},
-        {CF::DISTFAULT, 3, Query{"LENUNIT", "", &ZV::LengthUnit}},
+    struct Row {
+        KeyQuirk which;
+        Quirk does;
     };
-    return table;
+    static constexpr Row kQuirks[] = {
+        {KeyQuirk::StartFrequency, &Z::startFrequency},
+        {KeyQuirk::StopFrequency, &Z::stopFrequency},
+        {KeyQuirk::FullSpan, &Z::fullSpan},
+        {KeyQuirk::ZeroSpan, &Z::zeroSpan},
+        {KeyQuirk::LastSpan, &Z::lastSpan},
+        {KeyQuirk::ReferenceLevel, &Z::referenceLevel},
+        {KeyQuirk::Bandwidth, &Z::bandwidth},
+        {KeyQuirk::AutoBandwidth, &Z::autoBandwidth},
+        {KeyQuirk::AutoSweepTime, &Z::autoSweepTime},
+        {KeyQuirk::TriggerSource, &Z::triggerSource},
+        {KeyQuirk::TriggerValue, &Z::triggerValue},
+        {KeyQuirk::SingleTrace, &Z::singleTrace},
+        {KeyQuirk::Marker, &Z::marker},
+        {KeyQuirk::TransducerMenu, &Z::transducerMenu},
+        {KeyQuirk::LimitMenu, &Z::limitMenu},
+        {KeyQuirk::TransducerOff, &Z::transducerOff},
+        {KeyQuirk::LeaveSubMenu, &Z::leaveSubMenu},
+        {KeyQuirk::ChannelPower, &Z::channelPower},
+        {KeyQuirk::ChannelPowerUnit, &Z::channelPowerUnit},
+        {KeyQuirk::LevelAdjust, &Z::levelAdjust},
+    };
+    for (const Row& row : kQuirks)
+        if (row.which == which) return row.does;
+    return nullptr;
 }
 
 void Z9GetCommands::press(int index) {
-    for (const Clause& clause : clauses()) {
-        if (clause.state != panel_.State || clause.key != index) continue;
-        if (const Query* query = std::get_if<Query>(&clause.does)) {
-            runQuery(*query, index);
-        } else {
-            (this->*std::get<1>(clause.does))(index);
+    for (const SoftPosition& position : softPositions()) {
+        if (position.state != panel_.State || position.key != index) continue;
+        if (const Quirk does = quirk(position.onKey)) {
+            (this->*does)(index);
+        } else if (position.onKey == KeyQuirk::Asks) {
+            runQuery(position);
         }
     }
 }
@@ -150,16 +101,6 @@ bool Z9GetCommands::QueryToSoftBox(const std::string& word, int index, const std
     return true;
 }
 
-void Z9GetCommands::store(const Field& field, double number) {
-    if (const auto* real = std::get_if<double ZV::*>(&field)) {
-        mirror_.*(*real) = number;
-    } else if (const auto* word = std::get_if<std::int16_t ZV::*>(&field)) {
-        mirror_.*(*word) = static_cast<std::int16_t>(wholeNumber(number, -32768, 32767));
-    } else if (const auto* byte = std::get_if<std::uint8_t ZV::*>(&field)) {
-        mirror_.*(*byte) = static_cast<std::uint8_t>(wholeNumber(number, 0, 255));
-    }
-}
-
 void Z9GetCommands::decode(CodeTable table, double code, int index) {
     const CodeRow* row = findCode(table, code);
     if (row == nullptr || row->caption.empty()) return;
@@ -168,26 +109,21 @@ void Z9GetCommands::decode(CodeTable table, double code, int index) {
     list.setText(list.List(row->code));
 }
 
-void Z9GetCommands::runQuery(const Query& query, int index) {
-    TextBox& box = panel_.SoftTextBox(index);
+void Z9GetCommands::runQuery(const SoftPosition& query) {
+    TextBox& box = panel_.SoftTextBox(query.key);
+    std::string prefix;
     if (getSelected()) {
-        if (!QueryToSoftBox(query.word, index, query.unit)) return;
+        if (!QueryToSoftBox(query.word, query.key, query.unit)) return;
         const double answer = leadingNumber(LastQueryAnswer);
-        if (const auto* text = std::get_if<std::string ZV::*>(&query.field)) {
-            mirror_.*(*text) = LastQueryAnswer;
-        } else {
-            std::string prefix;
-            const bool whole = query.leadingNumber || query.captions;
-            const double taken = whole ? answer : ParseValue(box.Text, prefix);
-            store(query.field, taken);
-            // A number with a unit and no prefix reads as 0: the mirror is not the instrument's.
-            if (query.field.index() != 0 && taken == answer) mirror_.Unsure.known(query.word);
-        }
-        if (query.captions) decode(*query.captions, answer, index);
-    } else if (query.captions) {
+        const bool whole = query.leadingNumber || query.codes;
+        const double taken = whole ? answer : ParseValue(box.Text, prefix);
+        storeField(mirror_, query.field, taken, LastQueryAnswer);
+        // A number with a unit and no prefix reads as 0: the mirror is not the instrument's.
+        if (query.field.index() != 0 && taken == answer) mirror_.Unsure.known(query.word);
+        if (query.codes) decode(*query.codes, answer, query.key);
+    } else if (query.codes) {
         // A caption reads as 0, so that the box shows the caption of code 0.
-        std::string prefix;
-        decode(*query.captions, ParseValue(box.Text, prefix), index);
+        decode(*query.codes, ParseValue(box.Text, prefix), query.key);
     }
 }
 
@@ -241,31 +177,34 @@ void Z9GetCommands::lastSpan(int index) {
 
 void Z9GetCommands::referenceLevel(int index) {
     const std::string unit = levelUnitText(mirror_.ReferenceUnit);
-    runQuery(Query{"REFLVL", unit.c_str(), &ZV::ReferenceLevel}, index);
+    SoftPosition query = *row(index);
+    query.unit = unit.c_str();
+    runQuery(query);
 }
 
 void Z9GetCommands::bandwidth(int index) {
-    const BandwidthKey& key = bandwidthKey(index);
-    if (getSelected()) return runQuery(Query{key.word, "Hz", key.field, key.table}, index);
+    const SoftPosition& position = *row(index);
+    if (getSelected()) return runQuery(position);
     softPanel_.SetSoftButtonsColor(index);
     if (index == 0) softPanel_.SetButtonColor(3, "green");
-    const std::optional<std::string> reply = boxes_.prompt(key.prompt, "Enter Value", "");
+    const BandwidthPrompt& prompt = index == 0 ? kResolutionPrompt : kVideoPrompt;
+    const std::optional<std::string> reply = boxes_.prompt(prompt.text, "Enter Value", "");
     if (!reply || !IsNumericText(*reply)) return;  // nothing to convert: nothing is sent
     const double code = leadingNumber(*reply);
-    exchange_.SetInstrument(key.promptWord + WireNumber(code));
-    mirror_.*key.field = code;
+    exchange_.SetInstrument(prompt.word + WireNumber(code));
+    storeField(mirror_, position.field, code, *reply);
 }
 
 void Z9GetCommands::autoBandwidth(int index) {
-    const BandwidthKey& key = bandwidthKey(index);
     const int shown = index - 1;
-    const bool done = exchange_.SetInstrument(std::string(key.word) + ",0");
+    const SoftPosition& position = *row(shown);
+    const bool done = exchange_.SetInstrument(std::string(position.word) + ",0");
     // The words speak of the resolution bandwidth in this case as well.
-    if (!done && key.table == T::VideoBandwidth)
+    if (!done && position.codes == T::VideoBandwidth)
         boxes_.show({BoxIcon::Exclamation, "Could not set Resolution Bandwidth to Auto"});
     panel_.SoftTextBox(shown).Text = "Auto Set";
     panel_.ChoiceBox(shown).setText("Auto");
-    if (getSelected()) runQuery(Query{key.word, "Hz", key.field, key.table}, shown);
+    if (getSelected()) runQuery(position);
 }
 
 void Z9GetCommands::autoSweepTime(int index) {
@@ -274,18 +213,18 @@ void Z9GetCommands::autoSweepTime(int index) {
     exchange_.SetInstrument("SWPTIME,0");
     std::string answer;
     if (exchange_.GetInstrument("SWPTIME", answer)) mirror_.SweepTime = leadingNumber(answer);
-    const CodeRow* row = findCode(T::AutoSweepTime, mirror_.SweepTime);
-    if (row != nullptr) {
-        panel_.SoftTextBox(index).Text = std::string(row->choice);
-        panel_.ChoiceBox(index).setText(std::string(row->choice));
+    const CodeRow* code = findCode(T::AutoSweepTime, mirror_.SweepTime);
+    if (code != nullptr) {
+        panel_.SoftTextBox(index).Text = std::string(code->choice);
+        panel_.ChoiceBox(index).setText(std::string(code->choice));
     }
     QueryToSoftBox("SWPTIME", 0, "s");
 }
 
 void Z9GetCommands::triggerSource(int index) {
-    runQuery(Query{"TRIGSRC", "", &ZV::TriggerSource, T::TriggerSource}, index);
-    const CodeRow* row = findCode(T::TriggerSource, mirror_.TriggerSource);
-    if (row != nullptr) panel_.SoftKey(4).Caption = std::string(row->text);
+    runQuery(*row(index));
+    const CodeRow* code = findCode(T::TriggerSource, mirror_.TriggerSource);
+    if (code != nullptr) panel_.SoftKey(4).Caption = std::string(code->text);
 }
 
 void Z9GetCommands::triggerValue(int index) {
@@ -294,7 +233,11 @@ void Z9GetCommands::triggerValue(int index) {
         if (!QueryToSoftBox("TRIGLVL", index, "%")) return;
         scaling_.SetAnnotation(wholeNumber(leadingNumber(LastQueryAnswer), -32768, 32767));
     } else {
-        runQuery(Query{"TRIGDEL", "s", &ZV::TriggerDelay}, index);
+        SoftPosition query = *row(index);
+        query.word = "TRIGDEL";
+        query.unit = "s";
+        query.field = &ZV::TriggerDelay;
+        runQuery(query);
     }
 }
 
@@ -312,17 +255,19 @@ void Z9GetCommands::leaveSubMenu(int /*index*/) { panel_.MeasButton.Click(); }
 
 void Z9GetCommands::channelPower(int index) {
     fill_.ChannelPowerUnitName = ChannelPowerUnitText(mirror_.ChannelPowerUnit, "CHNPWR");
-    runQuery(Query{"CHPWR", fill_.ChannelPowerUnitName.c_str(), &ZV::ChannelPowerValue}, index);
+    SoftPosition query = *row(index);
+    query.unit = fill_.ChannelPowerUnitName.c_str();
+    runQuery(query);
 }
 
 void Z9GetCommands::channelPowerUnit(int index) {
-    runQuery(Query{"CHPWRUNIT", "", &ZV::ChannelPowerUnit, T::ChannelPowerUnit}, index);
+    runQuery(*row(index));
     fill_.ChannelPowerUnitName = ChannelPowerUnitText(mirror_.ChannelPowerUnit, "CHNPWR");
 }
 
-void Z9GetCommands::levelAdjust(int /*index*/) {
+void Z9GetCommands::levelAdjust(int index) {
     // The channel power's key alone looks at the option.
-    if (getSelected() || panel_.State != CF::CHNPOWER) exchange_.CmdInstrument("LVLADJUST");
+    if (getSelected() || panel_.State != CF::CHNPOWER) exchange_.CmdInstrument(row(index)->word);
 }
 
 void Z9GetCommands::marker(int index) {
@@ -330,9 +275,10 @@ void Z9GetCommands::marker(int index) {
         boxes_.show({BoxIcon::Information, "Please activate a marker first."});
         return;
     }
-    if (index == 2) return runQuery(Query{"MARKMODE", "", {}, T::MarkerMode}, index);
+    const SoftPosition& position = *row(index);
+    if (index == 2) return runQuery(position);
     if (!getSelected()) return;
-    if (!QueryToSoftBox(index == 0 ? "MARK1" : "DELTA1", index, "Hz")) return;
+    if (!QueryToSoftBox(position.word, index, position.unit)) return;
     markers_.showAnswer(index == 0 ? MarkerKind::Marker : MarkerKind::Delta, LastQueryAnswer);
 }
 

@@ -2,18 +2,15 @@
 // The press of a soft key: asks the instrument for one value, or carries out an action.
 
 #include <functional>
-#include <optional>
 #include <string>
-#include <variant>
-#include <vector>
 
 #include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
-#include "model/CodeTables.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MarkerReadout.h"
 #include "panel/MenuFill.h"
 #include "panel/SoftPanel.h"
+#include "panel/SoftPositions.h"
 #include "platform/MessageBox.h"
 #include "trace/GraphScaling.h"
 #include "trace/TraceReader.h"
@@ -37,25 +34,12 @@ class Z9GetCommands {
     std::string LastQueryAnswer;
 
   private:
-    using Field =
-        std::variant<std::monostate, double ZEL3Variables::*, std::int16_t ZEL3Variables::*,
-                     std::uint8_t ZEL3Variables::*, std::string ZEL3Variables::*>;
-    struct Query {
-        const char* word;
-        const char* unit = "";
-        Field field{};
-        std::optional<CodeTable> captions = std::nullopt;
-        bool leadingNumber = false;  ///< the field takes the answer, not the shown text
-    };
-    struct Clause {
-        std::int16_t state;
-        int key;
-        std::variant<Query, void (Z9GetCommands::*)(int)> does;
-    };
-    static const std::vector<Clause>& clauses();
+    using Quirk = void (Z9GetCommands::*)(int);
+    static Quirk quirk(KeyQuirk which);
 
-    void runQuery(const Query& query, int index);
-    void store(const Field& field, double number);
+    /// The row of the key as it stands now, or null.
+    const SoftPosition* row(int index) const { return softPosition(panel_.State, index); }
+    void runQuery(const SoftPosition& query);
     void decode(CodeTable table, double code, int index);
 
     void startFrequency(int index);

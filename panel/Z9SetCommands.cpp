@@ -39,69 +39,42 @@ Z9SetCommands::Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchang
       scaling_(scaling),
       session_(session) {}
 
-// A row a soft position, in the order in which the operations run.
-const std::vector<Z9SetCommands::Clause>& Z9SetCommands::clauses() {
+Z9SetCommands::Quirk Z9SetCommands::quirk(EntryQuirk which) {
     using Z = Z9SetCommands;
-    using S = Source;
-    static const std::vector<Clause> table = {
-        {CF::Freq, 0, Setting{"FREQ,", S::Value, &ZV::CenterFrequency, &Z::afterCentre}},
-        {CF::Freq, 1, &Z::manualSpan},
-        {CF::Freq, 2, &Z::startFrequency},
-        {CF::Freq, 3, &Z::stopFrequency},
-        {CF::Freq, 4, Setting{"FREQOFFS,", S::Value, &ZV::FrequencyOffset, &Z::afterOffset}},
-        {CF::SPAN, 0, &Z::manualSpan},
-        {CF::SPAN, 2, &Z::zeroSpan},
-        {CF::AMPT, 0, Setting{"REFLVL,", S::Value, &ZV::ReferenceLevel}},
-        {CF::AMPT, 1, Setting{"RANGE,", S::Choice, &ZV::ReferenceRange}},
-        {CF::AMPT, 2, Setting{"UNIT,", S::Choice, &ZV::ReferenceUnit}},
-        {CF::AMPT, 3, Setting{"REFLVLOFFS,", S::Value, &ZV::ReferenceOffset}},
-        {CF::AMPT, 4, Setting{"RFINPUT,", S::Choice, &ZV::RFInputImpedance}},
-        {CF::BW, 0, Setting{"RBW,", S::Choice, &ZV::ResolutionBandwidth, &Z::afterBandwidth}},
-        {CF::BW, 2, Setting{"VBW,", S::Choice, &ZV::VideoBandwidth, &Z::afterBandwidth}},
-        {CF::SWEEP, 0, Setting{"SWPTIME,", S::Value, &ZV::SweepTime, &Z::afterSweepTime}},
-        {CF::SWEEP, 1, &Z::autoSweepTime},
-        {CF::SWEEP, 2, &Z::sweepMode},
-        {CF::SWEEP, 3, &Z::triggerSource},
-        {CF::SWEEP, 4, &Z::triggerValue},
-        {CF::TRACE, 0, Setting{"TRACEMODE,", S::Choice, &ZV::TraceMode}},
-        {CF::TRACE, 1, Setting{"TRACEDET,", S::Choice, &ZV::TraceDetector}},
-        {CF::Marker, 0, &Z::marker},
-        {CF::Marker, 1, &Z::marker},
-        {CF::Marker, 2, Setting{"MARKMODE,", S::Choice}},
-        {CF::MEAS, 0, &Z::measurementMode},
-        {CF::MEAS_TRD, 0, Setting{"TRD1,", S::Text}},
-        {CF::MEAS_TRD, 1, Setting{"TRD2,", S::Text}},
-        {CF::MEAS_LLINES, 0, Setting{"LIMLOW,", S::Text}},
-        {CF::MEAS_LLINES, 1, Setting{"LIMUPP,", S::Text}},
-        {CF::TRACKINGGEN, 4, Setting{"TGLVL,", S::Whole}},
-        {CF::POWER, 1, Setting{"FREQ,", S::Value}},
-        {CF::POWER, 3, Setting{"MEASTIME,", S::Choice}},
-        {CF::CHNPOWER, 1, Setting{"CHPWRSTD,", S::Choice, &ZV::ChannelPowerStandard}},
-        {CF::CHNPOWER, 2, Setting{"CHPWRUNIT,", S::Choice, &ZV::ChannelPowerUnit}},
-        {CF::CHNPOWER, 0, Setting{"CHPWRSTD,", S::Word}},
-        // The channel bandwidth has no word of its own: its entry goes out under the unit's.
-        {CF::CHNPOWER, 3, Setting{"CHPWRUNIT,", S::Word}},
-        {CF::OCCBW, 1, Setting{"OBWSTD,", S::Choice, &ZV::OccBWStandard}},
-        {CF::OCCBW, 2, Setting{"OBWCHBW,", S::Whole, &ZV::OccBWChannelBandwidth}},
-        {CF::TDMA, 1, Setting{"TDMASTD,", S::Choice, &ZV::TDMAStandard}},
-        {CF::TDMA, 2, Setting{"MEASTIME,", S::Whole, &ZV::TDMAMeasTime}},
-        {CF::DISTFAULT, 0, Setting{"CABLEMOD,", S::Text}},
-        {CF::DISTFAULT, 1, Setting{"CABLELEN,", S::LocaleValue, &ZV::CableLength}},
-        {CF::DISTFAULT, 2, Setting{"DTFMODE,", S::Choice, &ZV::DTFMode}},
-        {CF::DISTFAULT, 3, Setting{"LENUNIT,", S::Text, &ZV::LengthUnit}},
+    struct Row {
+        EntryQuirk which;
+        Quirk does;
     };
-    return table;
+    static constexpr Row kQuirks[] = {
+        {EntryQuirk::AfterCentre, &Z::afterCentre},
+        {EntryQuirk::AfterOffset, &Z::afterOffset},
+        {EntryQuirk::AfterBandwidth, &Z::afterBandwidth},
+        {EntryQuirk::AfterSweepTime, &Z::afterSweepTime},
+        {EntryQuirk::ManualSpan, &Z::manualSpan},
+        {EntryQuirk::StartFrequency, &Z::startFrequency},
+        {EntryQuirk::StopFrequency, &Z::stopFrequency},
+        {EntryQuirk::ZeroSpan, &Z::zeroSpan},
+        {EntryQuirk::AutoSweepTime, &Z::autoSweepTime},
+        {EntryQuirk::SweepMode, &Z::sweepMode},
+        {EntryQuirk::TriggerSource, &Z::triggerSource},
+        {EntryQuirk::TriggerValue, &Z::triggerValue},
+        {EntryQuirk::Marker, &Z::marker},
+        {EntryQuirk::MeasurementMode, &Z::measurementMode},
+    };
+    for (const Row& row : kQuirks)
+        if (row.which == which) return row.does;
+    return nullptr;
 }
 
 void Z9SetCommands::enter(int index) {
     // With the other option selected an Enter asks, as the key does.
     if (!panel_.SetOption.Value()) return queries_.press(index);
-    for (const Clause& clause : clauses()) {
-        if (clause.state != panel_.State || clause.key != index) continue;
-        if (const Setting* setting = std::get_if<Setting>(&clause.does)) {
-            send(*setting, index);
-        } else {
-            (this->*std::get<Action>(clause.does))(index);
+    for (const SoftPosition& position : softPositions()) {
+        if (position.state != panel_.State || position.key != index) continue;
+        if (position.source != EntrySource::None) {
+            send(position);
+        } else if (const Quirk does = quirk(position.onEntry)) {
+            (this->*does)(index);
         }
     }
 }
@@ -116,27 +89,30 @@ double Z9SetCommands::boxValue(int index) const {
     return ParseValue(panel_.SoftTextBox(index).Text, prefix);
 }
 
-bool Z9SetCommands::valueText(Source source, int index, std::string& text) const {
+bool Z9SetCommands::valueText(const SoftPosition& position, std::string& text) const {
+    const int index = position.key;
     double number = 0;
-    switch (source) {
-        case Source::Value:
+    switch (position.source) {
+        case EntrySource::None:
+            return false;
+        case EntrySource::Value:
             number = boxValue(index);
             break;
-        case Source::LocaleValue:
+        case EntrySource::LocaleValue:
             text = generalNumber(boxValue(index));
             return true;
-        case Source::Whole:
+        case EntrySource::Whole:
             number = std::trunc(boxValue(index));
             if (number < -2147483648.0 || number > 2147483647.0) return false;
             break;
-        case Source::Word:
+        case EntrySource::Word:
             number = std::nearbyint(boxValue(index));
             if (number < -32768 || number > 32767) return false;
             break;
-        case Source::Choice:
+        case EntrySource::Choice:
             number = panel_.ChoiceBox(index).ListIndex();
             break;
-        case Source::Text:
+        case EntrySource::Text:
             text = trimmed(panel_.SoftTextBox(index).Text.get());
             return true;
     }
@@ -144,35 +120,20 @@ bool Z9SetCommands::valueText(Source source, int index, std::string& text) const
     return true;
 }
 
-void Z9SetCommands::store(const Field& field, double number, const std::string& text) {
-    if (const auto* real = std::get_if<double ZV::*>(&field)) {
-        mirror_.*(*real) = number;
-    } else if (const auto* word = std::get_if<std::int16_t ZV::*>(&field)) {
-        mirror_.*(*word) = static_cast<std::int16_t>(number);
-    } else if (const auto* byte = std::get_if<std::uint8_t ZV::*>(&field)) {
-        mirror_.*(*byte) = static_cast<std::uint8_t>(std::max(number, 0.0));
-    } else if (const auto* string = std::get_if<std::string ZV::*>(&field)) {
-        mirror_.*(*string) = text;
-    }
-}
-
-void Z9SetCommands::send(const Setting& setting, int index) {
-    softPanel_.SetSoftButtonsColor(index);
+void Z9SetCommands::send(const SoftPosition& position) {
+    softPanel_.SetSoftButtonsColor(position.key);
     std::string text;
-    if (!valueText(setting.source, index, text)) {
+    if (!valueText(position, text)) {
         session_.boxes.show({BoxIcon::Plain, "Out of Range!"});
         return;
     }
     pointer(11);
-    const bool accepted = exchange_.SetInstrument(setting.word + text);
+    const std::string word = position.wordToSet();
+    const bool accepted = exchange_.SetInstrument(word + "," + text);
     // The mirror takes the number as it was written in the command.
-    store(setting.field, leadingNumber(text), text);
-    if (setting.field.index() != 0) {
-        std::string_view word = setting.word;
-        word.remove_suffix(1);
-        mirror_.Unsure.sent(word, accepted);
-    }
-    if (setting.after != nullptr) (this->*setting.after)(index);
+    storeField(mirror_, position.fieldToSet(), leadingNumber(text), text);
+    if (position.fieldToSet().index() != 0) mirror_.Unsure.sent(word, accepted);
+    if (const Quirk after = quirk(position.onEntry)) (this->*after)(position.key);
     pointer(0);
 }
 

@@ -2,14 +2,13 @@
 // The Enter key in a soft box and a pick in its list: sends the value to the instrument.
 
 #include <string>
-#include <variant>
-#include <vector>
 
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MarkerReadout.h"
 #include "panel/SoftPanel.h"
+#include "panel/SoftPositions.h"
 #include "panel/Z9GetCommands.h"
 #include "platform/Session.h"
 #include "trace/FrequencyLabels.h"
@@ -33,35 +32,12 @@ class Z9SetCommands {
     void enter(int index);
 
   private:
-    using Field =
-        std::variant<std::monostate, double ZEL3Variables::*, std::int16_t ZEL3Variables::*,
-                     std::uint8_t ZEL3Variables::*, std::string ZEL3Variables::*>;
-    enum class Source {
-        Value,        ///< the box, a number with prefix
-        LocaleValue,  ///< the same, written with its zero ahead of the point
-        Whole,        ///< the same, cut to a whole number of 32 bits; one that has more is refused
-        Word,         ///< the same, as a 16-bit number; one that has more is refused
-        Choice,       ///< index of the list
-        Text,         ///< the box, trimmed
-    };
-    using Action = void (Z9SetCommands::*)(int);
-    struct Setting {
-        const char* word;  ///< with its comma
-        Source source = Source::Value;
-        Field field{};
-        Action after = nullptr;
-    };
-    struct Clause {
-        std::int16_t state;
-        int key;
-        std::variant<Setting, Action> does;
-    };
-    static const std::vector<Clause>& clauses();
+    using Quirk = void (Z9SetCommands::*)(int);
+    static Quirk quirk(EntryQuirk which);
 
-    void send(const Setting& setting, int index);
+    void send(const SoftPosition& position);
     /// False for a number that its source cannot hold.
-    bool valueText(Source source, int index, std::string& text) const;
-    void store(const Field& field, double number, const std::string& text);
+    bool valueText(const SoftPosition& position, std::string& text) const;
 
     void afterCentre(int index);
     void manualSpan(int index);

@@ -1,7 +1,6 @@
 #include "shell/StartUp.h"
 
 #include "connection/Profiles.h"
-#include "panel/MenuTables.h"
 #include "support/CommandWord.h"
 #include "support/TimeText.h"
 
@@ -35,7 +34,7 @@ bool StartUp::Form_Load(const VersionInfo& version) {
     if (panel_.mLoadOption.empty()) panel_.mLoadOption = "R";
     panel_.ConnectedPic.Visible = false;
     graph_.setUpCursors();
-    softPanel_.setKeyCaptions(hardKeyMenu(ControllerForm::Freq)->captions);
+    softPanel_.setKeyCaptions(ControllerForm::Freq);
     softPanel_.SetTextFieldsAndFrames(ControllerForm::Freq);
     softPanel_.SetSoftButtonsColor(0);
     softPanel_.SetButtonsStatus(ControllerForm::Freq);

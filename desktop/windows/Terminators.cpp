@@ -7,6 +7,7 @@
 #include <QShortcut>
 
 #include "desktop/binders/ShortcutTable.h"
+#include "panel/SoftPositions.h"
 
 namespace zel {
 namespace {
@@ -23,33 +24,34 @@ const std::vector<Terminator> kMetres = {{"m", "", 0}};
 const std::vector<Terminator> kLengths = {{"m", "", 0}, {"cm", "cm", 'C'}, {"mm", "mm", 'M'}};
 const std::vector<Terminator> kEnter = {{"Enter", "", 0}};
 
-struct UnitRow {
-    std::int16_t state;
-    int position;  ///< -1: every one
-    const std::vector<Terminator>& terminators;
-};
-const UnitRow kUnits[] = {
-    {CF::Freq, -1, kHertz},   {CF::SPAN, -1, kHertz},       {CF::AMPT, 0, kLevel},
-    {CF::AMPT, 3, kDecibels}, {CF::SWEEP, 0, kSeconds},     {CF::POWER, 1, kHertz},
-    {CF::OCCBW, 2, kHertz},   {CF::TDMA, 2, kWholeSeconds}, {CF::DISTFAULT, 1, kMetres},
-};
-
-constexpr int kSweepTrigger = 4;
 constexpr const char* kLevelCaption = "TRIGGER\r\nLEVEL";
 
 }  // namespace
 
 const std::vector<Terminator>& terminatorsOf(const ControllerForm& panel,
                                              const ZEL3Variables& mirror, int position) {
-    if (panel.State == CF::Marker && position < 2) {
-        if (panel.InstrumentMode == CF::DISTTOFAULTMEASURE) return kLengths;
-        return mirror.Span != 0 ? kHertz : kSeconds;
+    const SoftPosition* row = softPosition(panel.State, position);
+    switch (row == nullptr ? EntryUnit::Enter : row->entryUnit) {
+        case EntryUnit::Enter:
+            break;
+        case EntryUnit::Hertz:
+            return kHertz;
+        case EntryUnit::Seconds:
+            return kSeconds;
+        case EntryUnit::WholeSeconds:
+            return kWholeSeconds;
+        case EntryUnit::Level:
+            return kLevel;
+        case EntryUnit::Decibels:
+            return kDecibels;
+        case EntryUnit::Metres:
+            return kMetres;
+        case EntryUnit::MarkerX:
+            if (panel.InstrumentMode == CF::DISTTOFAULTMEASURE) return kLengths;
+            return mirror.Span != 0 ? kHertz : kSeconds;
+        case EntryUnit::TriggerValue:
+            return panel.SoftKey(position).Caption.get() == kLevelCaption ? kLevel : kSeconds;
     }
-    if (panel.State == CF::SWEEP && position == kSweepTrigger)
-        return panel.SoftKey(position).Caption.get() == kLevelCaption ? kLevel : kSeconds;
-    for (const UnitRow& row : kUnits)
-        if (row.state == panel.State && (row.position < 0 || row.position == position))
-            return row.terminators;
     return kEnter;
 }
 
