@@ -77,7 +77,7 @@ const SoftPosition kRows[] = {
     {.state = CF::AMPT, .key = 2, .caption = "UNIT", .frame = "Unit", .kind = K::Choice,
      .codes = T::ReferenceUnit, .word = "UNIT", .field = &ZV::ReferenceUnit, .source = S::Choice,
      .fill = Fill::Shows},
-    // The list of the impedances above the box is the instrument's panel's own.
+    // The list of the impedances above the box is meant.
     {.state = CF::AMPT, .key = 3, .caption = "REF\r\nOFFSET", .frame = "Ref Level Offset",
      .kind = K::Box, .listAboveBox = T::RFInput, .word = "REFLVLOFFS", .unit = "dB",
      .field = &ZV::ReferenceOffset, .source = S::Value, .entryUnit = U::Decibels,

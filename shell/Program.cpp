@@ -54,11 +54,11 @@
 #include "trace/SweepControl.h"
 #include "trace/TraceConversion.h"
 #include "trace/TraceReader.h"
+#include "trace/UnsureMarks.h"
 #include "waterfall/Graph3dOps.h"
 #include "waterfall/PictureOptions.h"
 #include "waterfall/SweepHistory.h"
 #include "waterfall/WaterfallView.h"
-#include "trace/UnsureMarks.h"
 
 namespace zel {
 

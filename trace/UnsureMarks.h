@@ -11,13 +11,19 @@ class UnsureMarks {
   public:
     UnsureMarks(ControllerForm& panel, ZEL3Variables& mirror) {
         changes_.on(mirror.Unsure.Changed, [&panel, &mirror] {
-            panel.CFLabel.Struck = mirror.Unsure.has(AxisSetting::Frequency);
-            panel.SpanLabel.Struck = mirror.Unsure.has(AxisSetting::Span);
+            strike(panel.CFLabel, mirror.Unsure.has(AxisSetting::Frequency));
+            strike(panel.SpanLabel, mirror.Unsure.has(AxisSetting::Span));
             panel.CWGraph1.Refresh();
         });
     }
 
   private:
+    static void strike(Label& label, bool unsure) {
+        label.Struck = unsure;
+        label.ToolTip =
+            unsure ? "The instrument did not take this value. The next sweep asks it." : "";
+    }
+
     Handlers changes_;
 };
 

@@ -1,6 +1,12 @@
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <regex>
 #include <set>
+#include <string>
 
 #include "ZELSim/Words.h"
+#include "panel/SoftPositions.h"
 #include "tests/ZELSim/WireFixture.h"
 
 namespace zelsim {
@@ -26,23 +32,28 @@ TEST(Words, EachName_StandsOnceAndIsFound) {
 }
 
 TEST(Words, EachWordThatTheProgramSends_IsInTheTable) {
-    for (const char* name :
-         {"CABLELEN",     "CABLEMOD",     "CAL_DTF",   "CAL_TGSCLRFL", "CAL_TGSCLTRN",
-          "CAL_TGVECRFL", "CAL_TGVECTRN", "CHPWR",     "CHPWRBW",      "CHPWRSTD",
-          "CHPWRUNIT",    "CTRACEBIN",    "DELTA1",    "DELTA1ON",     "DTFMODE",
-          "DYNRANGE",     "FREQ",         "FREQOFFS",  "IDN",          "INIT",
-          "LENUNIT",      "LEVEL",        "LIMDEL",    "LIMLOW",       "LIMPASS",
-          "LIMUPP",       "LOCAL",        "LVLADJUST", "MARK1",        "MARK1ON",
-          "MARKMIN",      "MARKMODE",     "MARKNXTPK", "MARKPK",       "MARKTOCENT",
-          "MARKTOLVL",    "MEAS",         "MEASTIME",  "OBW",          "OBWCHBW",
-          "OBWSTD",       "PRESET",       "PWR",       "PWRTOREF",     "RANGE",
-          "RBW",          "RECALL",       "REFL",      "REFLCAL",      "REFLVECTCAL",
-          "REFLVL",       "REFLVLOFFS",   "REMOTE",    "RESTART",      "RFINPUT",
-          "SAVE",         "SPAN",         "SWPCONT",   "SWPTIME",      "TDMAPWR",
-          "TDMASTD",      "TGLVL",        "THROFF",    "TRACEBIN",     "TRACEDET",
-          "TRACEMODE",    "TRACETOMEM",   "TRANSCAL",  "TRANSVECTCAL", "TRD1",
-          "TRD2",         "TRIGDEL",      "TRIGLVL",   "TRIGSRC",      "UNIT",
-          "VBW",          "WAIT",         "ZERO",      "BAUD"}) {
+    // As the sources name them where they speak to the instrument, and the soft positions' table.
+    const std::regex call(
+        "\\b(CmdInstrument|CmdInstrumentTriggered|SetInstrument|GetInstrument|QueryToSoftBox|"
+        "ReadPowerValue|queryCode|query|command|answered)\\(\\s*\"([A-Z][A-Z0-9_]+)");
+    std::set<std::string> names;
+    for (const char* room : {"link", "trace", "files", "panel", "connection", "script", "shell"}) {
+        const std::filesystem::path folder = std::filesystem::path(ZEL_SOURCE_DIR) / room;
+        if (!std::filesystem::exists(folder)) continue;
+        for (const auto& entry : std::filesystem::directory_iterator(folder)) {
+            if (entry.path().extension() != ".cpp") continue;
+            std::ifstream stream(entry.path());
+            const std::string text{std::istreambuf_iterator<char>(stream), {}};
+            for (std::sregex_iterator at(text.begin(), text.end(), call), end; at != end; ++at)
+                names.insert((*at)[2]);
+        }
+    }
+    for (const zel::SoftPosition& position : zel::softPositions()) {
+        for (const char* word : {position.word, position.wordToSet()})
+            if (*word != 0) names.insert(word);
+    }
+    EXPECT_GT(names.size(), 60U);
+    for (const std::string& name : names) {
         EXPECT_NE(findWord(name), nullptr) << name;
     }
 }

@@ -9,7 +9,11 @@ QApplication& testApplication() {
     static char name[] = "test_desktop";
     static char* arguments[] = {name, nullptr};
     // Left standing: the toolkit's own statics end first.
-    static auto* application = new QApplication(count, arguments);
+    static auto* application = [] {
+        // The same fonts on every desk.
+        qputenv("FONTCONFIG_FILE", ZEL_SOURCE_DIR "/tests/fonts.conf");
+        return new QApplication(count, arguments);
+    }();
     return *application;
 }
 

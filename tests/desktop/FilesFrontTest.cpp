@@ -80,8 +80,6 @@ TEST_F(FilesDesk, EntryBoxes_LeaveDropsToTheWindow) {
 }
 
 TEST_F(FilesDesk, RecentMenu_WithoutFiles_IsDisabled) {
-    panel().RecentMenu.Enabled = false;
-    for (MenuItem& entry : panel().RecentFile) entry.Visible = false;
     const QAction* menu = actionOf(panel().RecentMenu);
     ASSERT_NE(menu->menu(), nullptr);
     EXPECT_FALSE(menu->isEnabled());

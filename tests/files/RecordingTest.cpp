@@ -18,7 +18,8 @@ std::size_t count(const std::string& text, const std::string& what) {
 
 /// A session with the simulated instrument in virtual time.
 struct RecordingTest : ::testing::Test {
-    RecordingTest() {
+    explicit RecordingTest(const std::string& commandLine = "")
+        : program(platform.bundle(port), commandLine) {
         platform.ports.ports = {"COM1"};
         program.start();
         EXPECT_TRUE(program.connect({LinkAddress::Kind::Serial, "COM1", 57600}, false));
@@ -35,12 +36,25 @@ struct RecordingTest : ::testing::Test {
     VirtualPlatform platform;
     Folder folder{platform.files};
     zelsim::InProcessPort port{platform.clock, platform.events, {}, {.answering = 0.0001}};
-    Program program{platform.bundle(port), ""};
+    Program program;
     Forms& forms = program.forms();
     CF& panel = forms.controller;
     ZEL3Variables& mirror = program.variables();
     RecordedBoxes& boxes = platform.boxes;
 };
+
+struct RecordingWithoutHeader : RecordingTest {
+    RecordingWithoutHeader() : RecordingTest(" noheader ") {}
+};
+
+TEST_F(RecordingWithoutHeader, Traces_AreRowsAlone) {
+    begin("1");
+    platform.events.sleep(2500);
+    panel.StopButton.Click();
+    const std::string text = folder.read("trace.csv");
+    EXPECT_EQ(text.find("Reference Unit"), std::string::npos);
+    EXPECT_GT(count(text, "\r\n"), 301U);
+}
 
 TEST_F(RecordingTest, Dialog_AsksForTheInterval) {
     panel.RecordData.Click();

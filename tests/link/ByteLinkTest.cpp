@@ -231,6 +231,13 @@ TEST_F(Line, ReadFromLink_TcpSilence_ReturnsEmptyAfterATenthOfASecond) {
     EXPECT_LE(ms, 120);
 }
 
+TEST_F(Line, ReadFromLink_TcpDataAsTheWaitEnds_IsTaken) {
+    overTcp();
+    events.schedule(105, [&] { socket.arrive("0\r"); });
+    EXPECT_EQ(link.ReadFromLink(true), "0\r");
+    EXPECT_EQ(socket.peekData(), "");
+}
+
 TEST_F(Line, ReadFromLink_TcpData_WakeTheWait) {
     overTcp();
     events.schedule(37, [&] { socket.arrive("0\r"); });

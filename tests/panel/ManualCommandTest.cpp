@@ -141,6 +141,16 @@ TEST_F(ManualCommandTest, LineBehindSet_IsReadAsAStatus) {
     expectPlayed();
 }
 
+TEST_F(ManualCommandTest, SetInMixedCase_IsAStatusLineAndLeavesTheNextOneAlone) {
+    port.expect("Set\r").answer("0\r");
+    port.expect("FREQ\r").answer("0\r77\r");
+    send("Set");
+    EXPECT_EQ(shown(), "<Ack>: 0");
+    send("FREQ");
+    EXPECT_EQ(shown(), "77");
+    expectPlayed();
+}
+
 TEST_F(ManualCommandTest, SetBehindSet_StaysPending) {
     port.expect("set\r").answer("0\r").repeat(1);
     port.expect("FREQ,1\r").answer("0\r");

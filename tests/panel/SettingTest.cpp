@@ -125,6 +125,27 @@ TEST_F(SettingTest, Centre_AsksTheSpanAndReadsATrace) {
     EXPECT_EQ(panel.SoftTextBox(3).Text.get(), "1.55 GHz");
 }
 
+TEST_F(SettingTest, ManualSpan_InItsOwnMenu_FillsTheHiddenEdgesToo) {
+    open(kSpan);
+    panel.SoftTextBox(2).Text = "old";
+    panel.SoftTextBox(3).Text = "old";
+    type(0, "50M");
+    set("SPAN,50000000");
+    sweep();
+    enter(0);
+    expectPlayed();
+    EXPECT_FALSE(panel.SoftTextBox(2).Visible);
+    EXPECT_FALSE(panel.SoftTextBox(3).Visible);
+    EXPECT_EQ(panel.SoftTextBox(2).Text.get(), "975 MHz");
+    EXPECT_EQ(panel.SoftTextBox(3).Text.get(), "1.025 GHz");
+    // The frequency menu shows them as its own filling has them.
+    visited();
+    panel.FrequencyButton.Click();
+    EXPECT_TRUE(panel.SoftTextBox(2).Visible);
+    EXPECT_EQ(panel.SoftTextBox(2).Text.get(), "975 MHz");
+    EXPECT_EQ(panel.SoftTextBox(3).Text.get(), "1.025 GHz");
+}
+
 TEST_F(SettingTest, ManualSpan_RemembersTheLastOne) {
     for (const Menu& menu : {kFreq, kSpan}) {
         visited();

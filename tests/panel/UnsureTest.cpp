@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "tests/panel/Panel.h"
+#include "trace/TraceReader.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {

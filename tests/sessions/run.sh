@@ -11,6 +11,10 @@ zelctl=$1
 session=$2
 base=${session%.txt}
 
+# The same fonts on every desk.
+FONTCONFIG_FILE=$(cd "$(dirname "$0")/.." && pwd)/fonts.conf
+export FONTCONFIG_FILE
+
 scratch=$(mktemp -d)
 trap 'rm -rf "$scratch"' EXIT
 

@@ -231,6 +231,19 @@ TEST_F(FullCycleTest, DistanceToFault_RunsFromZeroToTheCableLength) {
     EXPECT_EQ(panel.ViewStop, 12.5);
 }
 
+TEST_F(FullCycleTest, DistanceToFault_AtZeroSpan_RunsOverTheCableAllTheSame) {
+    panel.InstrumentMode = ControllerForm::DISTTOFAULTMEASURE;
+    mirror.CableLength = 12.5;
+    askSettings(8, {{"SPAN", "0"}});
+    cmd("WAIT");
+    trace(levelBlock(-35250));
+    EXPECT_TRUE(readFull());
+    expectPlayed();
+    EXPECT_EQ(panel.ViewStart, 0);
+    EXPECT_EQ(panel.ViewStop, 12.5);
+    EXPECT_EQ(panel.Shown.xUnit, "m");
+}
+
 TEST_F(FullCycleTest, DistanceToFault_UnknownLength_IsAskedOnceAheadOfWait) {
     panel.InstrumentMode = ControllerForm::DISTTOFAULTMEASURE;
     for (int cycle = 0; cycle < 2; ++cycle) {

@@ -161,6 +161,36 @@ TEST_F(GraphDesk, LongTextsAroundTheGraph_AreNotCutInTheSmallestWindow) {
     }
 }
 
+TEST_F(GraphDesk, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
+    ZEL3Variables& mirror = program->variables();
+    mirror.ReferenceLevel = -20;
+    show();
+    const auto struck = [this] {
+        QList<QCPTextElement*> texts;
+        collectTexts(*window->graph().plotLayout(), texts);
+        QStringList parts;
+        for (QCPTextElement* element : texts)
+            parts += dynamic_cast<AnnotationText&>(*element).struck();
+        return parts.join("|").toStdString();
+    };
+    EXPECT_EQ(struck(), "");
+    mirror.Unsure.sent("REFLVL", false);
+    QApplication::processEvents();
+    EXPECT_EQ(struck(), "Ref -20 dBm");
+    EXPECT_TRUE(window->graph().yAxis->tickLabelFont().strikeOut());
+    EXPECT_FALSE(window->graph().xAxis->tickLabelFont().strikeOut());
+    mirror.Unsure.sent("SPAN", false);
+    QApplication::processEvents();
+    EXPECT_TRUE(window->graph().xAxis->tickLabelFont().strikeOut());
+    EXPECT_TRUE(widgetOf<QLabel>(panel().SpanLabel)->styleSheet().contains("line-through"));
+    EXPECT_TRUE(savePicture(*window, "unsure"));
+    mirror.Unsure.clear();
+    QApplication::processEvents();
+    EXPECT_EQ(struck(), "");
+    EXPECT_FALSE(window->graph().yAxis->tickLabelFont().strikeOut());
+    EXPECT_EQ(widgetOf<QLabel>(panel().SpanLabel)->styleSheet(), "");
+}
+
 TEST_F(GraphDesk, HiddenCursor_IsNotDragged) {
     const double before = panel().CWGraph1.cursor(1).X;
     drag(at(before, -60), at(6e8, -60));

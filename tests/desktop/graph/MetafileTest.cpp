@@ -344,6 +344,7 @@ TEST(MetafileEngine, NoPenAndNoBrush_DrawNothing) {
 }
 
 TEST(MetafileEngine, Text_HasItsFontColorAndWidth) {
+    testApplication();  // a font that is made before it has another family
     QFont font;
     font.setPointSize(9);
     font.setBold(true);
