@@ -6,6 +6,7 @@
 #include "platform/Controls.h"
 #include "platform/Graph.h"
 #include "support/NumberText.h"
+#include "support/RTFGen.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -55,6 +56,10 @@ std::string listBoxCount(const Control& control) {
     return std::to_string(static_cast<const ListBox&>(control).Items.get().size());
 }
 
+std::string richTextCode(const Control& control) {
+    return toText(rtfDocument(static_cast<const RichText&>(control).runs()));
+}
+
 constexpr Row kRows[] = {
     {ControlKind::Button, "Caption", read<Button, &Button::Caption>},
     {ControlKind::Button, "Picture", read<Button, &Button::Picture>},
@@ -74,7 +79,8 @@ constexpr Row kRows[] = {
     {ControlKind::OptionButton, "Caption", read<OptionButton, &OptionButton::Caption>},
     {ControlKind::OptionButton, "Value", read<OptionButton, &OptionButton::Value>},
     {ControlKind::Picture, "Image", read<Picture, &Picture::Image>},
-    {ControlKind::RichText, "TextRTF", read<RichText, &RichText::TextRTF>},
+    {ControlKind::RichText, "Text", read<RichText, &RichText::Text>},
+    {ControlKind::RichText, "Rtf", richTextCode},
     {ControlKind::Slider, "Min", read<Slider, &Slider::Min>},
     {ControlKind::Slider, "Max", read<Slider, &Slider::Max>},
     {ControlKind::Slider, "Value", read<Slider, &Slider::Value>},

@@ -7,6 +7,7 @@
 
 #include "forms/ControllerForm.h"
 #include "forms/MainForm.h"
+#include "forms/ScriptForms.h"
 #include "forms/WaterfallForm.h"
 #include "platform/Controls.h"
 
@@ -56,29 +57,6 @@ class TimeForm : public Form {
     Button SubmitTimeButton{*this, "SubmitTimeButton", "OK"};
     Button CancelTimeButton{*this, "CancelTimeButton", "Cancel"};
     Timer X{*this, "X", 0};
-};
-
-class SpecialMeasForm : public Form {
-  public:
-    SpecialMeasForm() : Form("SpecialMeasForm") {
-        Caption = "Special Measurements";
-        addVariables({{"DataFileNameSpec", &DataFileNameSpec}});
-        sldSpeed.Value = sldSpeed.Max.get();
-    }
-    std::string DataFileNameSpec;        ///< the result file of a script; empty without one
-    Slider sldSpeed{*this, "sldSpeed"};  ///< pace of a loaded series; the top is without a pause
-    CheckBox chkWaterfall{*this, "chkWaterfall", "Waterfall"};
-    Button cmdStop{*this, "cmdStop", "Stop"};
-};
-
-class ScriptEditor : public Form {
-  public:
-    ScriptEditor() : Form("ScriptEditor") { Caption = "Script Editor"; }
-};
-
-class STDForm : public Form {
-  public:
-    STDForm() : Form("STDForm") { Caption = "Level and Phase"; }
 };
 
 class AboutForm : public Form {

@@ -54,6 +54,10 @@ struct ZEL3Variables {
     std::string MeasModeText;
     bool MarkerOn = false;
     bool DeltaOn = false;
+    bool ScriptInProgress = false;
+    bool ScanInProgress = false;          ///< a script scans frequencies
+    std::int16_t CTraceAverageCount = 0;  ///< complex traces a measurement
+    std::vector<double> CTraceData;       ///< 301 levels, 301 phases
     std::array<std::int16_t, 14> MenuVisitCount{};
     /// Where this record may differ from the instrument; no field of its own.
     UnsureSettings Unsure;

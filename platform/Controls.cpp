@@ -75,4 +75,22 @@ void DropDownList::pick(int index) {
     Clicked();
 }
 
+void RichText::append(TextRun run) {
+    if (run.text.empty()) return;
+    const bool joins = !runs_.empty() && runs_.back().bold == run.bold &&
+                       runs_.back().italic == run.italic && runs_.back().color == run.color;
+    if (joins) {
+        runs_.back().text += run.text;
+    } else {
+        runs_.push_back(std::move(run));
+    }
+    noteChange();
+}
+
+void RichText::setRuns(std::vector<TextRun> runs) {
+    if (runs == runs_) return;
+    runs_ = std::move(runs);
+    noteChange();
+}
+
 }  // namespace zel

@@ -161,13 +161,36 @@ class Slider : public Control {
     Event<> Scrolled;
 };
 
-/// A text with runs of format, as the rich text code "{\rtf1 ...}".
+/// A stretch of text of one look.
+struct TextRun {
+    std::string text;
+    bool bold = false;
+    bool italic = false;
+    Color color = 0;
+    bool operator==(const TextRun&) const = default;
+};
+
+/// A text in runs of one look each.
 class RichText : public Control {
   public:
     RichText(Form& form, std::string name) : Control(form, std::move(name), ControlKind::RichText) {
         BackColor = kWindowBackground;
     }
-    Property<std::string> TextRTF{this, ""};
+    const std::vector<TextRun>& runs() const { return runs_; }
+    /// The runs without their looks.
+    std::string Text() const {
+        std::string text;
+        for (const TextRun& run : runs_) text += run.text;
+        return text;
+    }
+    bool empty() const { return runs_.empty(); }
+    /// At the end; a run of the same look as the last one is joined to it.
+    void append(TextRun run);
+    void setRuns(std::vector<TextRun> runs);
+    void Clear() { setRuns({}); }
+
+  private:
+    std::vector<TextRun> runs_;
 };
 
 /// A menu (with no click of its own) or an entry of one. `parent` is null for the menus of the

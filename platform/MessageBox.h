@@ -8,7 +8,7 @@ namespace zel {
 
 /// `Warning` and `Exclamation` look alike; they differ only where boxes are shown as text.
 enum class BoxIcon { Plain, Critical, Question, Warning, Exclamation, Information };
-enum class BoxButtons { Ok, OkCancel, YesNo };
+enum class BoxButtons { Ok, OkCancel, YesNo, YesNoCancel };
 enum class BoxAnswer { Ok = 1, Cancel = 2, Yes = 6, No = 7 };
 
 /// The title of a box that is given none.

@@ -36,6 +36,8 @@ const ButtonSet kButtonSets[] = {
     {BoxButtons::Ok, QMessageBox::Ok, QMessageBox::Ok},
     {BoxButtons::OkCancel, QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Cancel},
     {BoxButtons::YesNo, QMessageBox::Yes | QMessageBox::No, QMessageBox::No},
+    {BoxButtons::YesNoCancel, QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel,
+     QMessageBox::Cancel},
 };
 
 QString linesOf(const std::string& text) {
@@ -116,7 +118,9 @@ BoxAnswer QtMessageBoxes::show(const Box& box) {
         window.setStandardButtons(row.buttons);
         window.setEscapeButton(row.escape);
     }
-    window.setDefaultButton(box.buttons == BoxButtons::YesNo ? QMessageBox::Yes : QMessageBox::Ok);
+    const bool question =
+        box.buttons == BoxButtons::YesNo || box.buttons == BoxButtons::YesNoCancel;
+    window.setDefaultButton(question ? QMessageBox::Yes : QMessageBox::Ok);
     return answerOf(window.exec());
 }
 

@@ -3,7 +3,8 @@
 namespace zel {
 
 BoxAnswer affirmativeOf(BoxButtons buttons) {
-    return buttons == BoxButtons::YesNo ? BoxAnswer::Yes : BoxAnswer::Ok;
+    const bool question = buttons == BoxButtons::YesNo || buttons == BoxButtons::YesNoCancel;
+    return question ? BoxAnswer::Yes : BoxAnswer::Ok;
 }
 
 std::vector<std::string> RecordedBoxes::texts() const {
