@@ -46,6 +46,7 @@ ViewWriter::ViewWriter(Forms& forms, ZEL3Variables& mirror, CommandExchange& exc
 void ViewWriter::SaveCurrentView_Click() {
     panel_.DataFileName = panel_.isSpecMeas ? forms_.specialMeas.DataFileNameSpec
                                             : files_.ShowSaveDataDialog(FileOps::kCsvFilter);
+    if (panel_.isSpecMeas) forms_.specialMeas.ResolveName(panel_.DataFileName);
     if (panel_.DataFileName.empty()) return;
     fromMenu_ = true;
     SaveView(panel_.InstrumentMode == CF::POWERSENSOR ? "power" : "trace");
@@ -118,7 +119,7 @@ void ViewWriter::WriteViewData(OutputFile& file) {
 void ViewWriter::finish(OutputFile& file) {
     const std::string problem = file.close();
     if (problem.empty()) return;
-    const bool recording = panel_.RecordDataFlag;
+    const bool recording = panel_.RecordDataFlag && !panel_.isSpecMeas;
     // Ahead of the box, so that no further trace is begun behind it.
     if (recording) panel_.StopButton.Click();
     boxes_.show(

@@ -38,6 +38,7 @@
 #include "panel/Z9SetCommands.h"
 #include "platform/TimerDriver.h"
 #include "shell/EndingBoxes.h"
+#include "script/Scripts.h"
 #include "shell/Logs.h"
 #include "shell/ProgramEnd.h"
 #include "shell/SecondTimer.h"
@@ -109,6 +110,8 @@ struct Program::Rooms {
           markerKeys(panel, mirror, exchange, markerReadout, traces, interlock),
           manualCommand(panel, instrument, interlock),
           helpKeys(panel),
+          scripts(forms, {mirror, line, link, reader, exchange, binary},
+                  {traces, recording, viewReader, files}, p.folder, session, interlock),
           help(p.folder, p.files, p.launcher, boxes),
           sessionClock(panel, p.clock),
           profiles(panel, forms.main, p.settings),
@@ -207,6 +210,7 @@ struct Program::Rooms {
     MarkerKeys markerKeys;
     ManualCommand manualCommand;
     HelpKeys helpKeys;
+    Scripts scripts;
     RoboHelp_CSH help;
     SessionClock sessionClock;
     Profiles profiles;
@@ -238,6 +242,7 @@ TraceReader& Program::traces() { return rooms_->traces; }
 SweepHistory& Program::history() { return rooms_->history; }
 Logs& Program::logs() { return rooms_->logs; }
 Interlock& Program::interlock() { return rooms_->interlock; }
+Scripts& Program::scripts() { return rooms_->scripts; }
 
 void Program::start() {
     rooms_->recent.load();

@@ -17,6 +17,7 @@ class Interlock;
 class Logs;
 class SweepHistory;
 class TraceReader;
+struct Scripts;
 
 class Program {
   public:
@@ -35,6 +36,7 @@ class Program {
     SweepHistory& history();
     Logs& logs();
     Interlock& interlock();
+    Scripts& scripts();
 
     /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
     /// the server's window is closed; `ended` is then true.

@@ -61,7 +61,7 @@ void SweepControl::PlaySingleButton_Click() {
         return;
     }
     const bool good = power_.readPowerSensor(kPowerBox);
-    if (good && panel_.RecordDataFlag) panel_.SaveView("power");
+    if (good && panel_.RecordDataFlag && !panel_.isSpecMeas) panel_.SaveView("power");
 }
 
 void SweepControl::PlayContinuousButton_Click() {

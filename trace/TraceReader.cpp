@@ -172,7 +172,7 @@ void TraceReader::scaleAndConvert() {
     scaling_.setGraphAxes(panel_.ViewStart, panel_.ViewStop, mirror_.ReferenceLevel,
                           byteOf(std::nearbyint(mirror_.ReferenceRange)), true);
     conversion_.ConvertTrace();
-    if (panel_.RecordDataFlag) panel_.SaveView("trace");
+    if (recordsTraces()) panel_.SaveView("trace");
 }
 
 void TraceReader::waterfallRow() {
@@ -253,7 +253,7 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
         return close();
     }
     begin();
-    if (panel_.RecordDataFlag && !exchange_.CmdInstrument("INIT")) return close();
+    if (recordsTraces() && !exchange_.CmdInstrument("INIT")) return close();
     // A loaded file has set fields of the mirror: they are the instrument's again behind this.
     Step step = panel_.Shown.fromFile ? askSettings() : askAgain(again);
     if (step == Step::Ok) step = wait();

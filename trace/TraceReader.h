@@ -52,6 +52,8 @@ class TraceReader {
     void waterfallRow();
     void abortView(bool& success);
     void pointer(int shape);
+    /// A script's window has the flag for itself.
+    bool recordsTraces() const { return panel_.RecordDataFlag && !panel_.isSpecMeas; }
 
     Forms& forms_;
     ControllerForm& panel_;

@@ -1,0 +1,97 @@
+#include "script/PhaseDisplay.h"
+
+#include "model/Numeric.h"
+#include "script/Statistics.h"
+#include "support/RTFBoxManager.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr const char* kCoarse = "#.0#";
+constexpr const char* kFine = "#.00#";
+constexpr double kHalfTurn = 180;
+
+std::string shown(double value, const char* unit, const char* format) {
+    return FormatValue(value, unit, format, false);
+}
+
+/// The name and two tabs, then the value on the same line.
+void addValue(RichText& box, const std::string& name, const std::string& value) {
+    appendRichText(box, name + "\t\t", false, false, 0, false);
+    appendRichText(box, value, false, false, 0, true);
+}
+
+}  // namespace
+
+PhaseDisplay::PhaseDisplay(STDForm& form, SpecialMeasForm& script, Events& events)
+    : form_(form), script_(script), events_(events) {
+    form_.cmdExecute.Clicked.connect([this] { cmdExecute_Click(); });
+    form_.cmdStop.Clicked.connect([this] { cmdStop_Click(); });
+    form_.cmdClear.Clicked.connect([this] { cmdClear_Click(); });
+    form_.optDegrees.Clicked.connect([this] { optDegrees_Click(); });
+    form_.optRadians.Clicked.connect([this] { optRadians_Click(); });
+    form_.Unload.connect([this](int) { cmdClear_Click(); });
+}
+
+void PhaseDisplay::cmdExecute_Click() {
+    form_.cmdExecute.Enabled = false;
+    events_.pump();
+    script_.cmdExecute.Click();
+    form_.cmdExecute.Enabled = true;
+}
+
+void PhaseDisplay::cmdStop_Click() {
+    script_.cmdStop.Click();
+    form_.cmdStop.Enabled = false;
+}
+
+void PhaseDisplay::cmdClear_Click() {
+    form_.rtfReceive.Clear();
+    form_.refMeasBox.Clear();
+}
+
+void PhaseDisplay::displayPhaseMeasurement(double level, double stdLevel, double phase,
+                                           double stdPhase) {
+    const int number = script_.ctraceMeasurementNo;
+    const bool first = number == 1;
+    const bool radians = form_.optRadians.Value();
+    RichText& box = first ? form_.refMeasBox : form_.rtfReceive;
+    if (number > 1) {
+        const std::string row = std::to_string(number - 1) + "] ";
+        // One blank fewer for two digits: the columns line up.
+        appendRichText(box, (number >= 11 ? "[" : "[ ") + row, false, false, 0, false);
+    }
+    form_.lblMeanLevel.Caption = shown(level, "dBm", kCoarse);
+    addValue(
+        box, "Level: ",
+        first ? shown(level, "dBm", kCoarse) : shown(level - form_.refMeasLevel, "dB", kCoarse));
+    form_.lblStdLevel.Caption = shown(stdLevel, "dB", kCoarse);
+    addValue(box, "Std Dev Lvl: ", form_.lblStdLevel.Caption);
+    const double angle = radians ? phase : phase * kDegreesPerRadian;
+    form_.lblMeanPhase.Caption = shown(angle, "", kCoarse);
+    addValue(box, "Phase: ", shown(first ? angle : angle - form_.refPhase, "", kCoarse));
+    form_.lblStdPhase.Caption = shown(stdPhase, "", radians ? kFine : kCoarse);
+    if (first) {
+        addValue(box, "Phase Std Dev(rad): ", shown(stdPhase, "", kFine));
+    } else {
+        addValue(box, "Phase Std Dev: ", shown(stdPhase, "", kCoarse));
+    }
+}
+
+void PhaseDisplay::convert(double factor, double divisor, const char* format) {
+    Label& mean = form_.lblMeanPhase;
+    Label& deviation = form_.lblStdPhase;
+    for (Label* label : {&mean, &deviation}) {
+        const std::string& text = label->Caption;
+        if (text.empty()) continue;
+        label->Caption = shown(ParseNumberInvariant(text) * factor / divisor, "", format);
+    }
+    form_.refPhase = form_.refPhase * factor / divisor;
+}
+
+void PhaseDisplay::optDegrees_Click() { convert(kHalfTurn, form_.pi, kCoarse); }
+
+void PhaseDisplay::optRadians_Click() { convert(form_.pi, kHalfTurn, kFine); }
+
+}  // namespace zel
