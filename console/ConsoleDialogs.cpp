@@ -1,6 +1,7 @@
 #include "console/ConsoleDialogs.h"
 
 #include <array>
+#include <string_view>
 #include <utility>
 
 #include "support/Text.h"
@@ -53,14 +54,25 @@ std::string boxLine(BoxIcon icon, const std::string& title, const std::string& t
 BoxAnswer ConsoleBoxes::show(const Box& box) {
     output_.repeatable(boxLine(box.icon, box.title, box.text));
     if (box.icon == BoxIcon::Critical) ++failures_;
-    if (box.buttons == BoxButtons::Ok) return BoxAnswer::Ok;
-    const bool yesNo = box.buttons == BoxButtons::YesNo;
-    const BoxAnswer agreed = yesNo ? BoxAnswer::Yes : BoxAnswer::Ok;
-    const BoxAnswer refused = yesNo ? BoxAnswer::No : BoxAnswer::Cancel;
-    const std::optional<std::string> answer = answers_.next();
-    if (!answer) return agreed;
-    for (const Word& word : kWords)
-        if (lowerCase(trimmed(*answer)) == word.text) return word.affirmative ? agreed : refused;
+    if (reader) output_.settle();  // what is answered must have been seen
+    const bool asks = box.buttons != BoxButtons::Ok;
+    std::optional<std::string> answer;
+    if (reader) {
+        answer = reader();
+    } else if (asks) {
+        answer = answers_.next();
+    }
+    if (!asks) return BoxAnswer::Ok;
+    const bool yes = box.buttons != BoxButtons::OkCancel;
+    const bool cancels = box.buttons != BoxButtons::YesNo;
+    const BoxAnswer agreed = yes ? BoxAnswer::Yes : BoxAnswer::Ok;
+    if (!answer || (reader && trimmed(*answer).empty())) return agreed;
+    for (const Word& word : kWords) {
+        if (lowerCase(trimmed(*answer)) != word.text) continue;
+        if (word.affirmative) return agreed;
+        const bool cancel = cancels && (!yes || isCancel(*answer));
+        return cancel ? BoxAnswer::Cancel : BoxAnswer::No;
+    }
     if (misfit) misfit(*answer);
     return agreed;
 }
@@ -74,13 +86,27 @@ std::optional<std::string> ConsoleBoxes::prompt(const std::string& text, const s
     return answer;
 }
 
-std::optional<std::string> ConsoleFileDialogs::save(const FileDialogRequest&) { return next(); }
+std::optional<std::string> ConsoleFileDialogs::save(const FileDialogRequest& request) {
+    return next("save", request);
+}
 
-std::optional<std::string> ConsoleFileDialogs::open(const FileDialogRequest&) { return next(); }
+std::optional<std::string> ConsoleFileDialogs::open(const FileDialogRequest& request) {
+    return next("open", request);
+}
 
-std::optional<std::string> ConsoleFileDialogs::next() {
-    std::optional<std::string> answer = answers_.next();
-    if (answer && isCancel(*answer)) answer.reset();
+std::optional<std::string> ConsoleFileDialogs::next(const char* kind,
+                                                    const FileDialogRequest& request) {
+    if (!reader) {
+        std::optional<std::string> answer = answers_.next();
+        if (answer && isCancel(*answer)) answer.reset();
+        return answer;
+    }
+    const bool saves = std::string_view(kind) == "save";
+    const std::string title =
+        !request.title.empty() ? request.title : std::string(saves ? "Save As" : "Open");
+    output_.line(std::string("file[") + kind + "] " + oneLine(title));
+    std::optional<std::string> answer = reader();
+    if (answer && trimmed(*answer).empty()) answer.reset();
     return answer;
 }
 

@@ -33,6 +33,10 @@ class ConsoleBoxes : public MessageBoxes {
     /// Gets an answer that does not fit its question; the affirmative button is taken then.
     std::function<void(const std::string&)> misfit;
 
+    /// Reads the answer of each box as it stands, of those with an OK alone too; nothing agrees.
+    /// While it is there, no queued answer is taken.
+    std::function<std::optional<std::string>()> reader;
+
     /// Boxes so far that told of a failure.
     int failures() const { return failures_; }
 
@@ -49,12 +53,19 @@ class ConsoleBoxes : public MessageBoxes {
 /// Cancelled unless an answer waits; "cancel" cancels as well.
 class ConsoleFileDialogs : public FileDialogs {
   public:
-    explicit ConsoleFileDialogs(AnswerQueue& answers) : answers_(answers) {}
+    ConsoleFileDialogs(LineOutput& output, AnswerQueue& answers)
+        : output_(output), answers_(answers) {}
+
+    /// Reads a path for each dialog, which is then told as "file[open] TITLE"; an empty one and
+    /// nothing cancel it. While it is there, no queued answer is taken.
+    std::function<std::optional<std::string>()> reader;
+
     std::optional<std::string> save(const FileDialogRequest& request) override;
     std::optional<std::string> open(const FileDialogRequest& request) override;
 
   private:
-    std::optional<std::string> next();
+    std::optional<std::string> next(const char* kind, const FileDialogRequest& request);
+    LineOutput& output_;
     AnswerQueue& answers_;
 };
 

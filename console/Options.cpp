@@ -99,6 +99,11 @@ struct Parser {
         show->add_option("FILE", options.argument, "Saved view, recording or log")->required();
         imageOption(show, options);
         rowsOptions(show, options);
+        CLI::App* run = verb(Verb::Run, "run", "Runs a measurement script");
+        run->add_option("SCRIPT", options.argument, "The script, a text file")->required();
+        outputOption(run, options, "File of the results");
+        run->add_flag("--rehearse", options.rehearse,
+                      "Only tells how the run would go; no file is written, no port opened");
         CLI::App* panel =
             verb(Verb::Panel, "panel", "Works the panel by the names of its controls");
         panel->add_option("FILE", options.argument, "Lines of commands; standard input without it");
@@ -135,6 +140,7 @@ struct Parser {
 
 std::string missing(const Options& options) {
     if (options.verb == Verb::Panel || options.verb == Verb::Show) return {};
+    if (options.verb == Verb::Run && !options.address) return {};
     if (!options.address) return "this verb needs an instrument: --connect URL";
     if (upperCase(options.words).find("SERVER") != std::string::npos)
         return "the word SERVER goes with the verb panel only";

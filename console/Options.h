@@ -9,7 +9,7 @@
 
 namespace zel {
 
-enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Panel };
+enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Run, Panel };
 
 struct Options {
     std::optional<ConnectAddress> address;
@@ -17,10 +17,11 @@ struct Options {
     std::string words;  ///< the program's command line
     bool verbose = false;
     Verb verb = Verb::Info;
-    std::string argument;     ///< keyword of get, set, cmd; file of show and panel
+    std::string argument;     ///< keyword of get, set, cmd; file of show, run and panel
     int count = 1;            ///< sweeps, traces
     double interval = 0;      ///< of a recording, s
     std::string output;       ///< file of the saved view or the recording; empty for none
+    bool rehearse = false;    ///< a script is checked and not run
     std::string image;        ///< file of the graph's picture; empty for none
     std::string waterfall;    ///< file of the rows in depth; empty for none
     std::string spectrogram;  ///< file of the rows from above; empty for none

@@ -2,6 +2,7 @@
 
 #include <unistd.h>
 
+#include <algorithm>
 #include <fstream>
 #include <locale>
 #include <memory>
@@ -11,9 +12,11 @@
 #include "console/LineInput.h"
 #include "console/LineOutput.h"
 #include "console/PanelSession.h"
+#include "console/RunScript.h"
 #include "console/ServingEvents.h"
 #include "console/Verbs.h"
 #include "desktop/platform/QtSignals.h"
+#include "rehearsal/Rehearsal.h"
 
 namespace zel {
 namespace {
@@ -22,8 +25,9 @@ namespace {
 struct Stage {
     Stage(const Options& options, Front& front, LineOutput& boxOutput, LineOutput& errorOutput)
         : boxes(boxOutput, answers),
-          dialogs(answers),
+          dialogs(boxOutput, answers),
           events(front.events()),
+          files(front.platform(events, boxes, dialogs).files),
           program(front.platform(events, boxes, dialogs), options.words),
           watch(program.forms().controller) {
         events.always = [&front] { front.endSignals().deliver(); };
@@ -35,6 +39,7 @@ struct Stage {
             [this](const std::string& file, std::string& problem) {
                 problem = drawWaterfallImage(program, file);
             });
+        offerRehearsal(program, boxes, files);
         watch.onExchange = [&boxOutput] { boxOutput.settle(); };
         if (!options.verbose) return;
         const Clock& clock = front.clock();
@@ -48,6 +53,7 @@ struct Stage {
     ConsoleBoxes boxes;
     ConsoleFileDialogs dialogs;
     ServingEvents events;
+    FileService& files;
     Program program;
     DebugWatch watch;
 };
@@ -59,6 +65,17 @@ void drawBar(std::ostream& stream, int done, int wanted) {
     stream << "\r[" << std::string(static_cast<std::size_t>(filled), '#')
            << std::string(static_cast<std::size_t>(kWidth - filled), '-') << "] " << done << " of "
            << wanted << (done == wanted ? "\n" : "") << std::flush;
+}
+
+/// A line over the one before; an empty one ends it.
+void drawLine(std::ostream& stream, const std::string& text) {
+    constexpr std::size_t kWidth = 60;
+    if (text.empty()) {
+        stream << std::endl;
+        return;
+    }
+    stream << '\r' << text << std::string(kWidth - std::min(text.size(), kWidth), ' ')
+           << std::flush;
 }
 
 int runPanel(const Options& options, Front& front, LineOutput& output, LineOutput& errors) {
@@ -93,11 +110,22 @@ int runPanel(const Options& options, Front& front, LineOutput& output, LineOutpu
 int runOneVerb(const Options& options, Front& front, const Streams& streams, LineOutput& output,
                LineOutput& errors) {
     Stage stage(options, front, errors, errors);
+    if (options.verb == Verb::Run && options.rehearse)
+        return rehearseScript(options, stage.files, output, errors);
     ProgressBar progress;
     if (streams.errorsAreTerminal)
         progress = [&streams](int done, int wanted) { drawBar(streams.errors, done, wanted); };
+    DescriptorLines input(STDIN_FILENO);
+    std::function<void(const std::string&)> progressLine;
+    if (streams.errorsAreTerminal)
+        progressLine = [&streams](const std::string& text) { drawLine(streams.errors, text); };
+    const bool virtualTime = options.address && options.address->simulated;
+    const auto script = [&](const Options& given) {
+        return runScript(given, {stage.program, stage.files, stage.events, input, virtualTime,
+                                 stage.boxes, stage.dialogs, stage.answers, errors, progressLine});
+    };
     return runVerb(options, {stage.program, stage.events, stage.answers, stage.boxes, output,
-                             errors, writeGraphImage, writeRowsImage, progress});
+                             errors, writeGraphImage, writeRowsImage, progress, script});
 }
 
 }  // namespace

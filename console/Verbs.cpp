@@ -138,6 +138,8 @@ int show(const Run& run) {
     return run.drawImage();
 }
 
+int runList(const Run& run) { return run.stage.script(run.options); }
+
 using Routine = int (*)(const Run&);
 struct VerbRow {
     Verb verb;
@@ -145,7 +147,7 @@ struct VerbRow {
 };
 constexpr VerbRow kVerbs[] = {
     {Verb::Info, info},   {Verb::Get, get},       {Verb::Set, set},   {Verb::Cmd, cmd},
-    {Verb::Sweep, sweep}, {Verb::Record, record}, {Verb::Show, show},
+    {Verb::Sweep, sweep}, {Verb::Record, record}, {Verb::Show, show}, {Verb::Run, runList},
 };
 
 int tellEnd(const Run& run, int status) {
@@ -159,7 +161,8 @@ int tellEnd(const Run& run, int status) {
 
 int runVerb(const Options& options, const VerbStage& stage) {
     const Run run{options, stage};
-    const bool needsInstrument = options.verb != Verb::Show;
+    const bool needsInstrument =
+        options.verb == Verb::Run ? options.address.has_value() : options.verb != Verb::Show;
     stage.program.start();
     if (needsInstrument && !stage.program.connect(options.address->link, false)) {
         stage.errors.settle();

@@ -30,7 +30,8 @@ struct VerbStage {
     LineOutput& errors;
     ImageWriter image;
     RowsWriter rows;
-    ProgressBar progress;  ///< may be empty
+    ProgressBar progress;                       ///< may be empty
+    std::function<int(const Options&)> script;  ///< runs a script; gives the exit status
 };
 
 /// Starts the program, connects, does the verb of the options, disconnects; `show` needs no

@@ -169,7 +169,7 @@ struct DialogsTest : ::testing::Test {
     LineOutput output{stream};
     AnswerQueue answers;
     ConsoleBoxes boxes{output, answers};
-    ConsoleFileDialogs dialogs{answers};
+    ConsoleFileDialogs dialogs{output, answers};
     const Box yesNo{BoxIcon::Question, "?", "T", BoxButtons::YesNo};
     const Box okCancel{BoxIcon::Question, "?", "T", BoxButtons::OkCancel};
 };

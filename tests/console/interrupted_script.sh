@@ -1,0 +1,49 @@
+#!/usr/bin/env bash
+# Interrupts a script that pauses, and kills one that writes: the first ends at once with status 1,
+# the second leaves whole lines.
+#
+#   interrupted_script.sh ZELCTL
+set -euo pipefail
+
+zelctl=$1
+scratch=$(mktemp -d)
+trap 'rm -rf "$scratch"' EXIT
+cd "$scratch"
+
+wait_for() {
+    for _ in $(seq 200); do
+        [ ! -s "$1" ] || return 0
+        sleep 0.05
+    done
+    echo "$1 was not written"
+    exit 1
+}
+
+# A shell's background commands ignore the interrupt key; python's do not.
+printf 'SAVERESULTS OUT.TXT\nCOMMENT A\nPAUSE 600\nCOMMENT B\n' > pause.txt
+status=0
+python3 - "$zelctl" <<'EOF' || status=$?
+import os, signal, subprocess, sys, time
+run = subprocess.Popen([sys.argv[1], "--home", "home", "run", "pause.txt"], stdin=subprocess.DEVNULL,
+                       preexec_fn=lambda: signal.signal(signal.SIGINT, signal.SIG_DFL))
+for _ in range(400):
+    if os.path.exists("OUT.TXT") and os.path.getsize("OUT.TXT") > 0:
+        break
+    time.sleep(0.05)
+run.send_signal(signal.SIGINT)
+sys.exit(run.wait(timeout=20))
+EOF
+[ "$status" = 1 ] || { echo "status $status behind the interrupt key"; exit 1; }
+[ "$(wc -l < OUT.TXT)" = 1 ] || { echo "the run went on"; cat OUT.TXT; exit 1; }
+
+printf 'SAVERESULTS LOG.TXT\nDO\nCOMMENT PASS I OF MANY\nLOOP -1\n' > endless.txt
+"$zelctl" --home home run endless.txt < /dev/null &
+process=$!
+wait_for LOG.TXT
+sleep 0.3
+kill -9 "$process"
+wait "$process" 2>/dev/null || true
+whole=$(grep -ac 'PASSOF MANY'$'\r''$' LOG.TXT || true)
+[ "$whole" -gt 10 ] || { echo "only $whole lines"; exit 1; }
+[ "$(tail -c 2 LOG.TXT | od -An -tx1 | tr -d ' \n')" = 0d0a ] || { echo "the last line is cut"; exit 1; }
+[ "$(wc -l < LOG.TXT)" = "$whole" ] || { echo "lines that are not whole"; exit 1; }
