@@ -10,6 +10,7 @@
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
+#include "rehearsal/Rehearsal.h"
 #include "shell/Program.h"
 #include "support/ExitStatus.h"
 #include "support/VersionInfo.h"
@@ -42,6 +43,7 @@ int main(int argc, char** argv) {
         QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Theme", ""))));
     zel::applyTheme(application, theme);
     zel::Program program(platform.bundle(), options.words);
+    zel::offerRehearsal(program, platform.boxes, platform.files);
     int result = 0;
     // Every wait and loop on the stack comes back, since the program has ended.
     program.Ended.connect([&] {

@@ -31,6 +31,21 @@ QString autostartEntry(const std::string& linkName) {
     return folder + "/" + name + ".desktop";
 }
 
+/// The example scripts, on the first start; what is there already is the user's.
+void copyExamples(const QString& folder) {
+    constexpr const char* kScripts = "/specialMeas";
+    if (QDir(folder + kScripts).exists() || QCoreApplication::instance() == nullptr) return;
+    const QString program = QCoreApplication::applicationDirPath();
+    for (const QString& place : {program, program + "/../share/zelremote"}) {
+        const QDir source(place + kScripts);
+        if (!source.exists()) continue;
+        QDir().mkpath(folder + kScripts);
+        for (const QString& name : source.entryList({"*.txt"}, QDir::Files))
+            QFile::copy(source.filePath(name), folder + kScripts + "/" + name);
+        return;
+    }
+}
+
 }  // namespace
 
 QtApplicationFolder::QtApplicationFolder(const QString& home) {
@@ -41,6 +56,7 @@ QtApplicationFolder::QtApplicationFolder(const QString& home) {
             QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) + "/ZELRemote";
     QDir().mkpath(folder);
     path_ = QDir(folder).absolutePath().toStdString();
+    copyExamples(folder);
 }
 
 std::string QtApplicationFolder::programPath() {

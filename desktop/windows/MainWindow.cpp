@@ -16,6 +16,8 @@
 #include "desktop/windows/FileDrop.h"
 #include "desktop/windows/PanelSide.h"
 #include "desktop/windows/PlaybackBar.h"
+#include "desktop/windows/ScriptEditorWindow.h"
+#include "desktop/windows/ScriptFormWindow.h"
 #include "desktop/windows/Shortcuts.h"
 #include "desktop/windows/WaterfallWindow.h"
 #include "trace/Interlock.h"
@@ -88,6 +90,9 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     Forms& forms = program_.forms();
     windows_.push_back(std::make_unique<ConnectionWindow>(forms.main, binder_, this));
     windows_.push_back(std::make_unique<WaterfallWindow>(forms, binder_, this));
+    windows_.push_back(std::make_unique<ScriptFormWindow>(forms.specialMeas, binder_, this));
+    windows_.push_back(std::make_unique<StatisticsWindow>(forms.std, binder_, this));
+    windows_.push_back(std::make_unique<ScriptEditorWindow>(forms.scriptEditor, binder_, this));
     for (Form* form : {static_cast<Form*>(&forms.manualScale),
                        static_cast<Form*>(&forms.powerAndRefl), static_cast<Form*>(&forms.time),
                        static_cast<Form*>(&forms.tcpConnection), static_cast<Form*>(&forms.server)})
