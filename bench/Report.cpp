@@ -13,6 +13,7 @@
 #include "bench/Files.h"
 #include "bench/PanelWork.h"
 #include "bench/Redraw.h"
+#include "bench/ScriptWork.h"
 #include "bench/SweepRate.h"
 #include "bench/Waterfall.h"
 #include "bench/Windows.h"
@@ -79,6 +80,10 @@ int main(int argc, char** argv) {
         {'m', "growth", [] { return zelbench::waterfallGrowth(); }},
         {'n', "view with rows", [&] { return zelbench::rowsPaced(simulator); }},
         {'n', "view with rows", [&] { return zelbench::rowsUnpaced(simulator); }},
+        {'s', "statements", [] { return zelbench::statementRate(); }},
+        {'t', "scan", [&] { return zelbench::scanCost(simulator); }},
+        {'u', "statistics", [] { return zelbench::traceStatistics(); }},
+        {'v', "slow road", [] { return zelbench::slowRoad(); }},
     };
     zelbench::Figures figures;
     bool allMet = true;
