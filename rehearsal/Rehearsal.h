@@ -1,5 +1,5 @@
 #pragma once
-// A script run ahead of time: in virtual time, on a simulated instrument, without writing a file.
+// A script run before its time: in virtual time, on a simulated instrument, without writing a file.
 
 #include <cstddef>
 #include <string>

@@ -21,7 +21,7 @@ class ComplexMeasurement {
           display_(display) {}
 
     /// One measurement of `CTraceAverageCount` traces. It ends early when the run is stopped or
-    /// the line fails. Throws `ScriptFailure` for a count of 0, behind the one trace that it
+    /// the line fails. Throws `ScriptFailure` for a count of 0, after the one trace that it
     /// takes.
     void measure();
     /// Reduces the samples, which it scales in place, and writes what comes out: dBm, rad, dB, and

@@ -27,7 +27,7 @@ class Executor : private StatementRoutines {
     /// Ends every wait of the step mode; the runs walk to their ends without acting.
     void release();
 
-    /// Ahead of each statement that is carried out; its index in the list.
+    /// Before each statement that is carried out; its index in the list.
     Event<int> StatementBegins;
     /// The instrument refused an exchange of the statement under way.
     Event<const std::string&> Refused;

@@ -23,7 +23,7 @@ constexpr auto kStatements = std::to_array<Statement>({
     {"NOSAVE", T::Exact, A::None, false, &R::noSave, "NOSAVE",
      "Results of this run are not saved, and nobody is asked for a file."},
     {"SAVERESULTS", T::Prefix, A::File, false, &R::saveResults, "SAVERESULTS file",
-     "Sets the file of the results; repeat it behind a loop, as a \"*\" in the name stands for the "
+     "Sets the file of the results; repeat it after a loop, as a \"*\" in the name stands for the "
      "running index only up to the loop's end."},
     {"STEPMODE", T::Exact, A::None, false, &R::stepMode, "STEPMODE",
      "From here on each statement waits for the Next button."},
@@ -70,7 +70,7 @@ constexpr auto kStatements = std::to_array<Statement>({
     {"SCANSTART", T::Prefix, A::Number, true, &R::scanStart, "SCANSTART hertz",
      "Goes to the first frequency of a scan."},
     {"SCANSTEP", T::Prefix, A::Number, true, &R::scanStep, "SCANSTEP hertz",
-     "The step of a scan; it returns to the statement behind this one."},
+     "The step of a scan; it returns to the statement after this one."},
     {"SCANSTOP", T::Prefix, A::Number, true, &R::scanStop, "SCANSTOP hertz",
      "Reads the level, tests the limits, and steps on up to this frequency."},
     {"LOADTRACE", T::Prefix, A::File, false, &R::loadTrace, "LOADTRACE file",

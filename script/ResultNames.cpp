@@ -42,7 +42,7 @@ std::optional<std::string> resolveName(FileService& files, const std::string& na
     if (typed) return (given.is_absolute() ? given : fs::path(folder) / given).string();
     fs::path path = given.is_absolute() ? given.root_path() : fs::path(folder);
     for (const fs::path& part : given.relative_path()) {
-        if (part.empty()) continue;  // behind a last separator
+        if (part.empty()) continue;  // after a last separator
         path /= entryOf(files, path, part.string());
     }
     return path.string();

@@ -18,7 +18,7 @@ constexpr int kTextFilter = 2;
 constexpr std::size_t kNameLength = 15;
 constexpr double kDegrees = 57.2957795;
 
-/// The number that a part begins with, in general form with one blank behind it.
+/// The number that a part begins with, in general form with one blank after it.
 std::string partNumber(std::string_view part) {
     return generalNumber(GetNumeric(std::string(part))) + " ";
 }

@@ -17,7 +17,7 @@ class ResultOutput {
 
     /// Appends one line: date, time, name, value. `name` comes back in capitals. A value is
     /// written as the number that it begins with, two parts at a semicolon as two; the values of
-    /// "comment" and "loopcount" stay texts. Nothing tells of a file that cannot be written.
+    /// "comment" and "loopcount" stay texts. Nothing reports a file that cannot be written.
     void saveValue(std::string& name, const std::string& value);
     void saveValue(const char* name, const std::string& value);
     /// The four results of a complex measurement: dBm, dB, radians, and the deviation in the unit

@@ -20,9 +20,9 @@ struct ScriptRun {
     double scanStep = 0;         ///< Hz
     int scanReturnIndex = 0;     ///< of the SCANSTEP statement
     std::string timeOutText;     ///< stays from one statement to the next
-    bool stopped = false;        ///< this invocation was told to stop; it only walks on
+    bool stopped = false;        ///< stop was requested; the run only walks on
     bool released = false;       ///< does not wait for presses any more
-    bool ended = false;          ///< the procedure ends behind this statement
+    bool ended = false;          ///< the procedure ends after this statement
     ScriptRun* outer = nullptr;  ///< a run that waits further up the stack
 };
 

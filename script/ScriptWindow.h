@@ -22,7 +22,7 @@ class ScriptWindow {
     /// Fills the list from a file; it is empty when the file cannot be read.
     void open(const std::string& path);
     void cmboSpecialMeasList_Click();
-    /// Fills the list anew from the open script, the slow way.
+    /// Fills the list again from the open script, the slow way.
     void reloadCommands();
     /// The editor on the open script; nothing when it cannot be read.
     void cmdEdit_Click();

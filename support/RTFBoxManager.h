@@ -10,7 +10,7 @@ namespace zel {
 /// The mark of a carriage return in a text that is shown; see `markCarriageReturns`.
 inline constexpr const char* kCarriageReturnMark = "-CR-";
 
-/// Appends a run, and with `newLine` CR LF behind it. A text that holds the mark "-CR-" has the
+/// Appends a run, and with `newLine` CR LF after it. A text that holds the mark "-CR-" has the
 /// marks shown instead and gets no new line.
 void appendRichText(RichText& box, const std::string& text, bool bold, bool italic, Color color,
                     bool newLine);

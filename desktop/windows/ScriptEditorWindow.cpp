@@ -33,7 +33,7 @@ const Statement* statementOf(std::string_view word) {
     return nullptr;
 }
 
-/// What a statement is good for, behind its shape.
+/// What a statement is good for, after its shape.
 QString helpOf(const Statement& statement) {
     return QString::fromUtf8(statement.shape.data(), static_cast<int>(statement.shape.size())) +
            " - " +
