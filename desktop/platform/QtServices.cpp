@@ -32,18 +32,13 @@ QString autostartEntry(const std::string& linkName) {
 }
 
 /// The example scripts, on the first start; what is there already is the user's.
-void copyExamples(const QString& folder) {
+void copyExamples(const QString& from, const QString& folder) {
     constexpr const char* kScripts = "/specialMeas";
-    if (QDir(folder + kScripts).exists() || QCoreApplication::instance() == nullptr) return;
-    const QString program = QCoreApplication::applicationDirPath();
-    for (const QString& place : {program, program + "/../share/zelremote"}) {
-        const QDir source(place + kScripts);
-        if (!source.exists()) continue;
-        QDir().mkpath(folder + kScripts);
-        for (const QString& name : source.entryList({"*.txt"}, QDir::Files))
-            QFile::copy(source.filePath(name), folder + kScripts + "/" + name);
-        return;
-    }
+    const QDir source(from + "/defaults" + kScripts);
+    if (QDir(folder + kScripts).exists() || !source.exists()) return;
+    QDir().mkpath(folder + kScripts);
+    for (const QString& name : source.entryList({"*.txt"}, QDir::Files))
+        QFile::copy(source.filePath(name), folder + kScripts + "/" + name);
 }
 
 }  // namespace
@@ -56,7 +51,8 @@ QtApplicationFolder::QtApplicationFolder(const QString& home) {
             QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) + "/ZELRemote";
     QDir().mkpath(folder);
     path_ = QDir(folder).absolutePath().toStdString();
-    copyExamples(folder);
+    if (QCoreApplication::instance() != nullptr)
+        copyExamples(QString::fromStdString(programPath()), folder);
 }
 
 std::string QtApplicationFolder::programPath() {

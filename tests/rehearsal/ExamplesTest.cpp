@@ -17,7 +17,7 @@ namespace {
 /// The names of the examples with their texts.
 std::map<std::string, std::string> examples() {
     std::map<std::string, std::string> texts;
-    const std::string folder = std::string(ZEL_SOURCE_DIR) + "/specialMeas";
+    const std::string folder = std::string(ZEL_SOURCE_DIR) + "/defaults/specialMeas";
     for (const auto& entry : std::filesystem::directory_iterator(folder)) {
         std::ifstream in(entry.path(), std::ios::binary);
         std::ostringstream text;
