@@ -19,9 +19,10 @@ namespace {
 
 constexpr const char* kImageKind = "wmf";
 
-/// A row more of the waterfall; a session of weeks has more than a word counts.
-void countUp(std::int16_t& count) {
-    if (count < std::numeric_limits<std::int16_t>::max()) ++count;
+/// A row more of the waterfall; a session of weeks must not wrap.
+template <class Count>
+void countUp(Count& count) {
+    if (count < std::numeric_limits<Count>::max()) ++count;
 }
 
 }  // namespace
