@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <exception>
 
-#include "panel/Interlock.h"
 #include "support/Text.h"
 #include "support/TimeText.h"
 
@@ -24,7 +23,7 @@ bool isComment(const std::string& text) { return startsWith(trimmed(text), "#");
 }  // namespace
 
 Executor::Executor(Forms& forms, const InstrumentLine& line, const PanelRoutines& panel,
-                   ResultOutput& results, ComplexMeasurement& complex, const Session& session)
+                   ResultOutput& results, ComplexMeasurement& complex, const Interlock& interlock)
     : forms_(forms),
       form_(forms.specialMeas),
       panel_(forms.controller),
@@ -32,8 +31,9 @@ Executor::Executor(Forms& forms, const InstrumentLine& line, const PanelRoutines
       routines_(panel),
       results_(results),
       complex_(complex),
-      session_(session),
-      elapsed_(session.clock) {
+      interlock_(interlock),
+      session_(interlock.session()),
+      elapsed_(session_.clock) {
     form_.cmdExecute.Clicked.connect([this] { cmdExecute_Click(); });
     form_.cmdNext.Clicked.connect([this] { cmdNext_Click(); });
     form_.cmdStop.Clicked.connect([this] { cmdStop_Click(); });
@@ -48,7 +48,7 @@ Executor::Executor(Forms& forms, const InstrumentLine& line, const PanelRoutines
 
 void Executor::cmdExecute_Click() {
     if (run_ != nullptr && !run_->stopped) return;
-    if (refusedByContinuousView(panel_, session_.boxes)) return;
+    if (interlock_.refuses(Interlock::Rule::NoContinuousView)) return;
     if (line_.exchange.busy()) {
         // A run that was stopped inside of an exchange has to come to its end first.
         if (startPending_) return;

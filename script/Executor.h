@@ -10,6 +10,7 @@
 #include "script/ResultOutput.h"
 #include "script/ScriptParts.h"
 #include "script/ScriptRun.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 
@@ -18,7 +19,7 @@ namespace zel {
 class Executor : private StatementRoutines {
   public:
     Executor(Forms& forms, const InstrumentLine& line, const PanelRoutines& panel,
-             ResultOutput& results, ComplexMeasurement& complex, const Session& session);
+             ResultOutput& results, ComplexMeasurement& complex, const Interlock& interlock);
 
     void cmdExecute_Click();
     void cmdNext_Click();
@@ -103,6 +104,7 @@ class Executor : private StatementRoutines {
     PanelRoutines routines_;
     ResultOutput& results_;
     ComplexMeasurement& complex_;
+    const Interlock& interlock_;
     Session session_;
     ScriptRun* run_ = nullptr;  ///< the innermost
     Stopwatch elapsed_;

@@ -15,13 +15,13 @@ namespace zel {
 
 struct Scripts {
     Scripts(Forms& forms, const InstrumentLine& line, const PanelRoutines& panel,
-            ApplicationFolder& folder, const Session& session)
-        : results(forms, panel.files, session),
-          display(forms.std, forms.specialMeas, session.events),
+            ApplicationFolder& folder, const Interlock& interlock)
+        : results(forms, panel.files, interlock.session()),
+          display(forms.std, forms.specialMeas, interlock.session().events),
           complex(forms, line, results, display),
-          executor(forms, line, panel, results, complex, session),
-          window(forms, panel.files, folder, session),
-          editing(forms.scriptEditor, panel.files, session.boxes) {}
+          executor(forms, line, panel, results, complex, interlock),
+          window(forms, panel.files, folder, interlock.session()),
+          editing(forms.scriptEditor, panel.files, interlock.session().boxes) {}
 
     ResultOutput results;
     PhaseDisplay display;

@@ -37,8 +37,8 @@
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
 #include "platform/TimerDriver.h"
-#include "shell/EndingBoxes.h"
 #include "script/Scripts.h"
+#include "shell/EndingBoxes.h"
 #include "shell/Logs.h"
 #include "shell/ProgramEnd.h"
 #include "shell/SecondTimer.h"
@@ -111,7 +111,7 @@ struct Program::Rooms {
           manualCommand(panel, instrument, interlock),
           helpKeys(panel),
           scripts(forms, {mirror, line, link, reader, exchange, binary},
-                  {traces, recording, viewReader, files}, p.folder, session, interlock),
+                  {traces, recording, viewReader, files}, p.folder, interlock),
           help(p.folder, p.files, p.launcher, boxes),
           sessionClock(panel, p.clock),
           profiles(panel, forms.main, p.settings),

@@ -53,17 +53,15 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
     rule({&p.Disconnect, &forms.main.DisconnectButton, &forms.main.DisconnectButton2},
          {Rule::NoViewToEndFor});
 
-    always_ = {&p.StopButton,
-               &p.ExitObject,
-               &forms.main.CancelButton,
-               &forms.main.CancelConnButton,
-               &forms.main.CancelConnButton1,
-               &forms.tcpConnection.QuitTCPButton,
-               &forms.specialMeas.sldSpeed,
-               &p.cmd3D,
-               &p.SpectrogramShow,
-               &p.SpectrogramPause,
-               &forms.specialMeas.cmdStop};
+    always_ = {&p.StopButton, &p.ExitObject, &forms.main.CancelButton, &forms.main.CancelConnButton,
+               &forms.main.CancelConnButton1, &forms.tcpConnection.QuitTCPButton,
+               &forms.specialMeas.sldSpeed, &p.cmd3D, &p.SpectrogramShow, &p.SpectrogramPause,
+               // A script runs for hours, and its window knows what it may do meanwhile.
+               &forms.specialMeas.cmdStop, &forms.specialMeas.cmdNext,
+               &forms.specialMeas.cmdExecute, &forms.specialMeas.cmdCancel,
+               &forms.specialMeas.chkStep, &forms.specialMeas.chkSave,
+               &forms.specialMeas.chkWaterfall, &forms.specialMeas.chkGetSweep,
+               &forms.specialMeas.cmdSave, &forms.std.cmdStop};
     silent_ = {&p.GetOption,
                &p.SetOption,
                &p.HelpHelp,
@@ -210,6 +208,10 @@ bool Interlock::userWorks() const {
 }
 
 void Interlock::endLiveStates() {
+    if (forms_.specialMeas.RunsActive > 0) {
+        forms_.specialMeas.cmdStop.Click();
+        forms_.specialMeas.ReleaseWait();
+    }
     for (Form* form : forms_.all())
         if (form->Modal && form->Visible) form->Hide();
     if (panel_.STOPFlag || panel_.ContinuosLoopActive || forms_.time.ContinuousRecording)
@@ -221,7 +223,7 @@ Interlock::States Interlock::liveStates() const {
     for (const Form* form : forms_.all())
         if (form->Modal && form->Visible) states.insert(form);
     if (panel_.STOPFlag || panel_.ContinuosLoopActive) states.insert(&panel_.STOPFlag);
-    if (panel_.isSpecMeas) states.insert(&panel_.isSpecMeas);
+    if (forms_.specialMeas.RunsActive > 0) states.insert(&forms_.specialMeas.RunsActive);
     if (forms_.time.ContinuousRecording) states.insert(&forms_.time.ContinuousRecording);
     return states;
 }
