@@ -35,13 +35,13 @@ constexpr Scale kScales[] = {
 
 double secondsOf(const Scale& scale) {
     zel::Forms forms;
-    zel::ZEL3Variables mirror;
-    mirror.TraceDetector = zel::DETAUTOPEAK;
-    mirror.ReferenceUnit = scale.unit;
-    mirror.ReferenceRange = scale.range;
-    mirror.ReferenceLevel = scale.reference;
-    zel::TraceConversion conversion(forms.controller, mirror, forms.waterfall.Graph3D);
-    conversion.SelectRawScale();
+    zel::Sweep sweep;
+    sweep.settings.TraceDetector = zel::DETAUTOPEAK;
+    sweep.settings.ReferenceUnit = scale.unit;
+    sweep.settings.ReferenceRange = scale.range;
+    sweep.settings.ReferenceLevel = scale.reference;
+    zel::TraceConversion conversion(forms.controller, forms.waterfall.Graph3D);
+    zel::TraceConversion::SelectRawScale(sweep);
 
     std::mt19937 random(1);
     std::uniform_real_distribution<double> level(scale.lowest, scale.highest);
@@ -53,8 +53,8 @@ double secondsOf(const Scale& scale) {
     for (int round = 0; round < kRounds; ++round) {
         rounds.push_back(timeOf([&] {
                              for (int i = 0; i < kTimes; ++i) {
-                                 forms.controller.PeakTraceData = raw;
-                                 conversion.ConvertTrace();
+                                 sweep.raw = raw;
+                                 conversion.ConvertTrace(sweep);
                              }
                          }) /
                          kTimes);

@@ -15,6 +15,7 @@
 #include "model/ZEL3Variables.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
+#include "trace/Sweep.h"
 
 namespace zelbench {
 namespace {
@@ -37,15 +38,18 @@ struct Bench {
         mirror.CenterFrequency = 1.5e9;
         mirror.Span = 1e6;
         mirror.ReferenceLevel = -20;
-        panel.TraceIntervals = 300;
-        panel.ViewSpan = mirror.Span;
-        panel.ViewStart = 1.4995e9;
-        panel.ViewStop = 1.5005e9;
+        zel::Sweep& sweep = program.sweep();
+        sweep.settings = mirror;
+        sweep.instrumentMode = panel.InstrumentMode;
+        sweep.axis.start = 1.4995e9;
+        sweep.axis.stop = 1.5005e9;
+        sweep.wanted = sweep.came = kPoints;
     }
     std::string file(const char* name) const { return folder.filePath(name).toStdString(); }
     void newSweep() {
-        panel.RawTraceData.resize(kPoints);
-        for (double& value : panel.RawTraceData) value = std::round(level(random)) / 1000;
+        std::vector<double>& values = program.sweep().physical;
+        values.resize(kPoints);
+        for (double& value : values) value = std::round(level(random)) / 1000;
     }
     /// The path of a recording of `kTraces` traces.
     std::string recording() {

@@ -1,6 +1,7 @@
 #include "console/GraphText.h"
 
 #include <algorithm>
+#include <cmath>
 #include <functional>
 
 #include "support/NumberText.h"
@@ -42,6 +43,8 @@ std::vector<std::string> graphLines(const Graph& graph) {
                         generalNumber(cursor.Y) + ", colour " + std::to_string(cursor.color) +
                         ", " + shownText(cursor.Visible));
     }
+    if (!graph.Incomplete.get().empty())
+        lines.push_back("annotation Incomplete: \"" + graph.Incomplete.get() + "\"");
     const GraphAnnotation& trigger = graph.trigger();
     lines.push_back("annotation Trigger: \"" + replaceAll(trigger.Caption, kCrLf, "\\r\\n") +
                     "\" at " + generalNumber(trigger.Height) + ", " + shownText(trigger.Visible));
@@ -61,6 +64,9 @@ std::vector<std::string> rowsOf(const std::vector<double>& values, bool autoPeak
     rows.reserve(count);
     for (std::size_t row = 0; row < count; ++row) {
         const std::size_t i = row * width;
+        const auto missing = [](double value) { return std::isnan(value); };
+        const auto first = values.begin() + static_cast<std::ptrdiff_t>(i);
+        if (std::any_of(first, first + static_cast<std::ptrdiff_t>(width), missing)) continue;
         std::string text = shortestNumber(xOfValue(i));
         for (std::size_t k = 0; k < width; ++k) text += "," + shortestNumber(values[i + k]);
         rows.push_back(std::move(text));
@@ -70,10 +76,9 @@ std::vector<std::string> rowsOf(const std::vector<double>& values, bool autoPeak
 
 }  // namespace
 
-std::vector<std::string> sweepRows(const ControllerForm& panel, bool autoPeak) {
-    const Graph& graph = panel.CWGraph1;
-    return rowsOf(panel.RawTraceData, autoPeak, [&graph](std::size_t i) {
-        return graph.firstX() + static_cast<double>(i) * graph.increment();
+std::vector<std::string> sweepRows(const Sweep& sweep) {
+    return rowsOf(sweep.physical, sweep.autoPeak(), [&sweep](std::size_t i) {
+        return sweep.axis.first + static_cast<double>(i) * sweep.axis.increment;
     });
 }
 

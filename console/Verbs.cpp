@@ -1,5 +1,6 @@
 #include "console/Verbs.h"
 
+#include <memory>
 #include <utility>
 #include <vector>
 
@@ -76,9 +77,21 @@ int cmd(const Run& run) {
     return run.fail("the instrument did not carry out " + run.options.argument);
 }
 
+/// Tells each incomplete trace on the error output from now on; the result counts them.
+std::shared_ptr<int> tellIncompleteTraces(const Run& run) {
+    auto count = std::make_shared<int>(0);
+    LineOutput& errors = run.stage.errors;
+    run.program().traces().CutShort.connect([count, &errors](const Sweep& sweep) {
+        ++*count;
+        errors.line(incompleteText(sweep));
+    });
+    return count;
+}
+
 int sweep(const Run& run) {
     ControllerForm& panel = run.panel();
     WaterfallForm& waterfall = run.program().forms().waterfall;
+    const auto incomplete = tellIncompleteTraces(run);
     for (int i = 0; i < run.options.count && run.output().problem().empty(); ++i) {
         bool success = false;
         // As passes of one view the sweeps stand behind each other in the waterfall.
@@ -87,40 +100,55 @@ int sweep(const Run& run) {
         run.program().traces().ReadSingleTrace(success);
         panel.ContinuosLoopActive = false;
         if (run.wantsRows()) waterfall.styleLastRow();
+        const Sweep& sweep = run.program().traces().lastSweep();
+        if (sweep.wanted > 0) {
+            run.output().line(i == 0 ? sweepHeader(sweep.autoPeak()) : std::string());
+            run.output().lines(sweepRows(sweep));
+        }
         if (!success) return run.fail("sweep " + std::to_string(i + 1) + " could not be read");
-        const bool autoPeak = run.program().variables().TraceDetector == 0;
-        run.output().line(i == 0 ? sweepHeader(autoPeak) : std::string());
-        run.output().lines(sweepRows(panel, autoPeak));
     }
     if (!run.options.output.empty()) {
         run.stage.answers.add(run.options.output);
         run.panel().SaveCurrentView.Click();
         if (run.stage.boxes.failures() > 0) return kLinkFailed;
     }
-    return run.drawImage();
+    const int drawn = run.drawImage();
+    return *incomplete > 0 ? kLinkFailed : drawn;
 }
+
+/// How far a recording is; its tick handler outlives the verb.
+struct RecordingWatch {
+    int ticks = 0;
+    bool broken = false;  ///< it ended by itself: the file cannot be written
+};
 
 int record(const Run& run) {
     constexpr int kWaitMs = 100;
     ControllerForm& panel = run.panel();
     TimeForm& dialog = run.program().forms().time;
+    const auto incomplete = tellIncompleteTraces(run);
+    const auto watch = std::make_shared<RecordingWatch>();
+    const int wanted = run.options.count;
+    dialog.Ticked.connect([watch, wanted, &panel, progress = run.stage.progress] {
+        watch->broken = watch->broken || !panel.RecordData.Checked;
+        if (watch->broken || watch->ticks >= wanted) return;
+        ++watch->ticks;
+        if (progress) progress(watch->ticks, wanted);
+        if (watch->ticks == wanted) panel.StopButton.Click();
+    });
     panel.RecordData.Click();
     dialog.TimeIntervalBox.Text = generalNumber(run.options.interval);
     run.stage.answers.add(run.options.output);
     dialog.SubmitTimeButton.Click();
-    const auto taken = [&dialog] { return static_cast<int>(dialog.RecordedCount); };
-    int shown = 0;
-    while (!run.program().ended() && panel.RecordData.Checked && taken() < run.options.count &&
-           !run.program().exchange().ExchangeFailed()) {
+    while (!run.program().ended() && panel.RecordData.Checked && watch->ticks < wanted)
         run.stage.events.wait(kWaitMs);
-        if (!panel.RecordData.Checked || taken() == shown) continue;
-        shown = taken();
-        if (run.stage.progress) run.stage.progress(shown, run.options.count);
-    }
-    const bool whole = panel.RecordData.Checked && taken() >= run.options.count;
     if (panel.RecordData.Checked) panel.StopButton.Click();
-    if (whole) return kDone;
-    return run.fail("the recording ended behind " + std::to_string(shown) + " traces");
+    if (watch->ticks < wanted)
+        return run.fail("the recording ended behind " + std::to_string(watch->ticks) + " traces");
+    if (dialog.FailedCount > 0)
+        return run.fail(generalNumber(dialog.FailedCount) + " of " + std::to_string(wanted) +
+                        " traces could not be read");
+    return *incomplete > 0 ? kLinkFailed : kDone;
 }
 
 int show(const Run& run) {

@@ -45,11 +45,13 @@ LoadedRows::Scale LoadedRows::scale() const {
 }
 
 double LoadedRows::converted(double value, Scale scale) const {
-    conversion_.ClipToReferenceLevel(value);
+    const VerticalScale axis{mirror_.ReferenceUnit, mirror_.ReferenceLevel,
+                             LevelRange::ofDecibels(mirror_.ReferenceRange)};
+    axis.ClipToReferenceLevel(value);
     if (scale == Scale::Volts) value = VoltsToDbm(value);
     if (scale == Scale::Watts) value = WattsToDbm(value);
     if (scale == Scale::Percent) value = DbmToPercent(value, mirror_.ReferenceLevel);
-    return conversion_.ClipToBottom(value, false);
+    return axis.ClipToBottom(value);
 }
 
 double LoadedRows::ConvertLoadedValue(double value) const { return converted(value, scale()); }

@@ -7,15 +7,14 @@
 #include "files/FieldList.h"
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
-#include "trace/TraceConversion.h"
+#include "trace/VerticalScale.h"
 
 namespace zel {
 
 class LoadedRows {
   public:
-    LoadedRows(ControllerForm& panel, const ZEL3Variables& mirror,
-               const TraceConversion& conversion)
-        : panel_(panel), mirror_(mirror), conversion_(conversion) {}
+    LoadedRows(ControllerForm& panel, const ZEL3Variables& mirror)
+        : panel_(panel), mirror_(mirror) {}
 
     /// Fills `DataXAxisArrayToLoad` and `DataValArrayToLoad` with at most 301 rows from the entry
     /// `startIndex` on. `nextIndex` is the entry behind the rows, or -1 when the text is used up.
@@ -34,7 +33,6 @@ class LoadedRows {
 
     ControllerForm& panel_;
     const ZEL3Variables& mirror_;
-    const TraceConversion& conversion_;
 };
 
 /// The number of an entry, with point or comma; 0 for what is none.

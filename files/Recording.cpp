@@ -120,7 +120,7 @@ void Recording::SubmitTimeButton_Click() {
     panel_.PlayContinuousButton.Visible = false;
     panel_.StopButton.Visible = true;
     dialog_.Hide();
-    dialog_.RecordedCount = 0;
+    clearCounts();
     running_.Reset();
     lastTick_ = session_.clock.micros();
     if (mirror_.ExternalTriggerActive) {
@@ -143,15 +143,36 @@ void Recording::windUp() {
     panel_.FileLabel.Caption = "";
 }
 
+void Recording::clearCounts() {
+    dialog_.RecordedCount = dialog_.TickCount = 0;
+    dialog_.IncompleteCount = dialog_.FailedCount = 0;
+}
+
+bool Recording::countTrace() {
+    const Sweep& sweep = sweeps_.traces().lastSweep();
+    ++dialog_.TickCount;
+    if (sweep.whole())
+        ++dialog_.RecordedCount;
+    else if (sweep.incomplete())
+        ++dialog_.IncompleteCount;
+    else
+        ++dialog_.FailedCount;
+    return sweep.whole();
+}
+
 bool Recording::takeTrace() {
-    if (dialog_.RecordedCount == 0 || panel_.State == CF::POWER) {
+    const bool power = panel_.State == CF::POWER || panel_.InstrumentMode == CF::POWERSENSOR;
+    if (dialog_.RecordedCount == 0 || power) {
         sweeps_.PlaySingleButton_Click();
-        return true;
+    } else {
+        sweeps_.nextRow();
+        bool success = false;
+        sweeps_.traces().ReadSingleTrace2({}, success);
     }
-    sweeps_.nextRow();
-    bool success = false;
-    sweeps_.traces().ReadSingleTrace2({}, success);
-    return success;
+    if (!power) return countTrace();
+    ++dialog_.TickCount;
+    ++dialog_.RecordedCount;
+    return true;
 }
 
 void Recording::X_Timer() {
@@ -174,13 +195,11 @@ void Recording::X_Timer() {
         // What a user does meanwhile waits for the end of the cycle.
         const DialogueScope cycle = exchange_.hold();
         pointer(kHourglass);
-        if (!mirror_.ExternalTriggerActive) {
-            taken = takeTrace();
-            if (taken) ++dialog_.RecordedCount;
-        }
+        if (!mirror_.ExternalTriggerActive) taken = takeTrace();
     }
     inTick_ = false;
     panel_.MousePointer = 0;
+    dialog_.Ticked();
     if (!panel_.RecordData.Checked) {
         windUp();
         return;
@@ -226,11 +245,12 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
                 } else {
                     sweeps_.PlaySingleButton_Click();
                 }
+                countTrace();
+                dialog_.Ticked();
                 if (!success) {
                     panel_.MousePointer = 0;
                     break;
                 }
-                ++dialog_.RecordedCount;
                 showProgress();
             } else if (panel_.isSpecMeas) {
                 forms_.specialMeas.cmdStop.Click();
@@ -250,13 +270,22 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
     windUp();
 }
 
+/// "2 incomplete, 1 failed, "; empty while every attempt brought a whole trace.
+std::string Recording::missedText() const {
+    std::string text;
+    if (dialog_.IncompleteCount > 0)
+        text += generalNumber(dialog_.IncompleteCount) + " incomplete, ";
+    if (dialog_.FailedCount > 0) text += generalNumber(dialog_.FailedCount) + " failed, ";
+    return text;
+}
+
 std::string Recording::progressText() const {
     if (writer_.RecordingFileName.empty() || !panel_.RecordData.Checked) return {};
     const std::uint64_t bytes = writer_.files().service().stat(writer_.RecordingFileName).size;
     const double count = dialog_.RecordedCount;
     std::string text = std::filesystem::path(writer_.RecordingFileName).filename().string() + ": " +
                        generalNumber(count) + (count == 1 ? " trace, " : " traces, ") +
-                       sizeText(bytes) + ", " +
+                       missedText() + sizeText(bytes) + ", " +
                        timeOfDayText(std::nearbyint(running_.Elapsed() / 1000.0) / kDaySeconds);
     if (mirror_.ExternalTriggerActive) return text + ", waits for the trigger";
     if (dialog_.X.Interval == 0) return text + ", the interval of 0 s takes no trace";

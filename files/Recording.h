@@ -32,11 +32,14 @@ class Recording {
     std::string progressText() const;
 
   private:
+    std::string missedText() const;
     void loadForm();
     bool chooseFile();
     void abandon();
     void windUp();
     bool takeTrace();
+    bool countTrace();
+    void clearCounts();
     void resynchronise();
     void showProgress();
     void pointer(int shape);

@@ -3,7 +3,6 @@
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
 #include "support/NumberText.h"
-#include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {
@@ -85,9 +84,8 @@ std::string measuredValue(int mode, const ZEL3Variables& mirror) {
 }  // namespace
 
 void ViewHeader::write(OutputFile& file) const {
-    const int mode = panel.InstrumentMode;
     const bool fault = mode == CF::DISTTOFAULTMEASURE;
-    const std::string measurement = measurementName(mode, mirror);
+    const std::string measurement = measurementName(mode, settings);
 
     if (hasMeasurement(mode)) {
         if (!measurement.empty()) field(file, "Trace Name", measurement);
@@ -97,53 +95,53 @@ void ViewHeader::write(OutputFile& file) const {
     const double now = clock.date();
     field(file, "Date", clock.dateText(now));
     field(file, kTime, clock.timeText(now));
-    number(file, "Instrument Model Number", mirror.InstrumentModel);
-    number(file, "Instrument Serial Number", mirror.InstrumentSerial);
+    number(file, "Instrument Model Number", settings.InstrumentModel);
+    number(file, "Instrument Serial Number", settings.InstrumentSerial);
     measurementType(file, mode, measurement);
-    field(file, kDynamicRange, mirror.DynamicRangeMode != 0 ? "Low Noise" : "Low Distortion");
+    field(file, kDynamicRange, settings.DynamicRangeMode != 0 ? "Low Noise" : "Low Distortion");
     if (!measurement.empty()) field(file, "Measurement", measurement);
-    number(file, "Center Frequency", mirror.CenterFrequency);
-    field(file, "Span", mirror.Span == 0 ? kZeroSpan : generalNumber(mirror.Span));
-    if (!fault) number(file, "Frequency Offset", mirror.FrequencyOffset);
-    number(file, kSweepTime, mirror.SweepTime);
+    number(file, "Center Frequency", settings.CenterFrequency);
+    field(file, "Span", settings.Span == 0 ? kZeroSpan : generalNumber(settings.Span));
+    if (!fault) number(file, "Frequency Offset", settings.FrequencyOffset);
+    number(file, kSweepTime, settings.SweepTime);
     if (!fault) {
-        coded(file, "Trigger Mode", CodeTable::TriggerSource, mirror.TriggerSource);
-        number(file, "Trigger Delay", mirror.TriggerDelay);
-        number(file, "Trigger Level", mirror.TriggerLevelValue);
+        coded(file, "Trigger Mode", CodeTable::TriggerSource, settings.TriggerSource);
+        number(file, "Trigger Delay", settings.TriggerDelay);
+        number(file, "Trigger Level", settings.TriggerLevelValue);
     }
 
     struct Bandwidth {
         const char* name;
         const char* word;
         CodeTable table;
-        double& value;
+        double value;
     };
     const Bandwidth bandwidths[] = {
-        {kResolutionBandwidth, "RBW", CodeTable::ResolutionBandwidth, mirror.ResolutionBandwidth},
-        {kVideoBandwidth, "VBW", CodeTable::VideoBandwidth, mirror.VideoBandwidth},
+        {kResolutionBandwidth, "RBW", CodeTable::ResolutionBandwidth, settings.ResolutionBandwidth},
+        {kVideoBandwidth, "VBW", CodeTable::VideoBandwidth, settings.VideoBandwidth},
     };
     for (const Bandwidth& row : bandwidths) {
         if (row.value == 0) {
-            askBandwidth(row.word, row.value);
+            askBandwidth(row.word);
         } else if (const CodeRow* code = findCode(row.table, row.value)) {
             number(file, row.name, code->number);
         }
     }
 
-    coded(file, kReferenceUnit, CodeTable::ReferenceUnit, mirror.ReferenceUnit);
-    coded(file, kReferenceRange, CodeTable::Range, shownRangeCode(panel, mirror));
-    number(file, kReferenceLevel, mirror.ReferenceLevel);
-    number(file, "Reference Offset", mirror.ReferenceOffset);
+    coded(file, kReferenceUnit, CodeTable::ReferenceUnit, settings.ReferenceUnit);
+    coded(file, kReferenceRange, CodeTable::Range, settings.ReferenceRange);
+    number(file, kReferenceLevel, settings.ReferenceLevel);
+    number(file, "Reference Offset", settings.ReferenceOffset);
     field(file, "Input Value (Ohm)", "50");
-    coded(file, "Trace Mode", CodeTable::TraceMode, mirror.TraceMode);
-    coded(file, kTraceDetector, CodeTable::Detector, mirror.TraceDetector);
+    coded(file, "Trace Mode", CodeTable::TraceMode, settings.TraceMode);
+    coded(file, kTraceDetector, CodeTable::Detector, settings.TraceDetector);
     field(file, "RF Attenuator Setting", "0");
-    if (mode == CF::CHANNELPOWER) number(file, "Channel Bandwidth", mirror.ChannelPowerBandwidth);
-    if (mode == CF::OCCBANDWIDTH) number(file, "Channel Bandwidth", mirror.OccBWChannelBandwidth);
-    if (mode == CF::TDMAPOWERMODE) number(file, "TDMA Time", mirror.TDMAMeasTime);
+    if (mode == CF::CHANNELPOWER) number(file, "Channel Bandwidth", settings.ChannelPowerBandwidth);
+    if (mode == CF::OCCBANDWIDTH) number(file, "Channel Bandwidth", settings.OccBWChannelBandwidth);
+    if (mode == CF::TDMAPOWERMODE) number(file, "TDMA Time", settings.TDMAMeasTime);
     if (fault) {
         field(file, "Cable", "<none>");
-        field(file, "Cable Length", generalNumber(mirror.CableLength) + " m");
+        field(file, "Cable Length", generalNumber(settings.CableLength) + " m");
     } else {
         field(file, "Transducer", "- - -");
         field(file, "Transducer (dB)", "- - -");

@@ -60,11 +60,13 @@ class AtEnd {
 
 }  // namespace
 
-ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, GraphScaling& scaling,
-                       const TraceConversion& conversion, const Interlock& interlock)
+ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, FileOps& files,
+                       GraphScaling& scaling, const TraceConversion& conversion,
+                       const Interlock& interlock)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
+      onGraph_(onGraph),
       files_(files),
       scaling_(scaling),
       interlock_(interlock),
@@ -72,7 +74,7 @@ ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, Grap
       events_(interlock.session().events),
       boxes_(interlock.session().boxes),
       conversion_(conversion),
-      rows_(forms.controller, mirror, conversion) {
+      rows_(forms.controller, mirror) {
     handlers_.on(panel_.LoadData.Clicked, [this] { LoadData_Click(); });
     handlers_.on(panel_.OpenFile, [this](const std::string& path) {
         if (loading_ || interlock_.refuses(panel_.LoadData)) return;
@@ -308,11 +310,29 @@ void ViewReader::showTrace(const Header& header, bool series) {
 
     panel_.CWGraph1.plotY(values, first, increment);
     scaling_.BuildXYVectors(increment);
-    conversion_.colour(values);
+    panel_.TraceColours = conversion_.colour(values);
     forms_.waterfall.Graph3D.plotCurve(panel_.YVector, panel_.XVector, values, panel_.TraceColours);
     panel_.CWGraph1.Old = false;
+    keepAsSweep(increment);
     constexpr std::int32_t kLastRow = 2147483647;
     if (panel_.YVectorVal < kLastRow) ++panel_.YVectorVal;
+}
+
+void ViewReader::keepAsSweep(double increment) {
+    Sweep sweep;
+    sweep.physical = panel_.RawTraceData;
+    sweep.shown = panel_.DataValArrayToLoad;
+    sweep.colours = panel_.TraceColours;
+    sweep.wanted = sweep.came = sweep.physical.size();
+    sweep.settings = mirror_;
+    sweep.settings.ReferenceRange = LevelRange::ofDecibels(mirror_.ReferenceRange).code();
+    if (panel_.ViewSpan == 0) sweep.settings.Span = 0;
+    sweep.settingsKept = true;
+    sweep.instrumentMode = panel_.InstrumentMode;
+    sweep.axis = {panel_.ViewStart, panel_.ViewStop,       panel_.CWGraph1.firstX(),
+                  increment,        panel_.TraceIntervals, panel_.Shown.xUnit};
+    onGraph_ = std::move(sweep);
+    panel_.CWGraph1.Incomplete = "";
 }
 
 void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
@@ -364,6 +384,7 @@ void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
     graph.showYLabels(true);
     graph.plotY(values, xs.front(), increment);
     graph.Old = false;
+    keepAsSweep(increment);
     panel_.TraceLoaded();
 }
 

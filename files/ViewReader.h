@@ -10,6 +10,7 @@
 #include "model/ZEL3Variables.h"
 #include "trace/GraphScaling.h"
 #include "trace/Interlock.h"
+#include "trace/Sweep.h"
 #include "trace/TraceConversion.h"
 
 namespace zel {
@@ -17,8 +18,10 @@ namespace zel {
 class ViewReader {
   public:
     /// Connects the menu entry and the front's request to open a file.
-    ViewReader(Forms& forms, ZEL3Variables& mirror, FileOps& files, GraphScaling& scaling,
-               const TraceConversion& conversion, const Interlock& interlock);
+    /// `onGraph` takes each trace that is shown.
+    ViewReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, FileOps& files,
+               GraphScaling& scaling, const TraceConversion& conversion,
+               const Interlock& interlock);
 
     void LoadData_Click();
     /// Reads and shows a file; what cannot be read is told in a box. Nothing happens while another
@@ -48,6 +51,7 @@ class ViewReader {
     void rememberShown(const FieldList& lines, int end);
     void showTraces(const FieldList& lines, Header header, bool series);
     void showTrace(const Header& header, bool series);
+    void keepAsSweep(double increment);
     void spread(bool zeroSpan, double first, double last);
     bool pause();
     void progress(const std::string& what, double part);
@@ -56,6 +60,7 @@ class ViewReader {
     Forms& forms_;
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
+    Sweep& onGraph_;
     FileOps& files_;
     GraphScaling& scaling_;
     const Interlock& interlock_;

@@ -30,11 +30,13 @@ constexpr AutoBandwidth kAutoBandwidths[] = {
 
 }  // namespace
 
-ViewWriter::ViewWriter(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
-                       FileOps& files, const Clock& clock, MessageBoxes& boxes)
+ViewWriter::ViewWriter(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph,
+                       CommandExchange& exchange, FileOps& files, const Clock& clock,
+                       MessageBoxes& boxes)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
+      onGraph_(onGraph),
       exchange_(exchange),
       files_(files),
       clock_(clock),
@@ -44,12 +46,20 @@ ViewWriter::ViewWriter(Forms& forms, ZEL3Variables& mirror, CommandExchange& exc
 }
 
 void ViewWriter::SaveCurrentView_Click() {
+    const bool power = panel_.InstrumentMode == CF::POWERSENSOR;
+    if (!power && onGraph_.incomplete()) {
+        boxes_.show(
+            {BoxIcon::Exclamation, "The trace is incomplete, " + std::to_string(onGraph_.came) +
+                                       " of " + std::to_string(onGraph_.wanted) +
+                                       " samples came, and is not saved. Read a new one first."});
+        return;
+    }
     panel_.DataFileName = panel_.isSpecMeas ? forms_.specialMeas.DataFileNameSpec
                                             : files_.ShowSaveDataDialog(FileOps::kCsvFilter);
     if (panel_.isSpecMeas) forms_.specialMeas.ResolveName(panel_.DataFileName);
     if (panel_.DataFileName.empty()) return;
     fromMenu_ = true;
-    SaveView(panel_.InstrumentMode == CF::POWERSENSOR ? "power" : "trace");
+    SaveView(power ? "power" : "trace");
     fromMenu_ = false;
 }
 
@@ -74,32 +84,39 @@ void ViewWriter::SaveTraceView(bool withHeader) {
     WriteFooterAndCloseFileZELViewFormat(file);
 }
 
-void ViewWriter::bandwidth(const char* word, double& value) {
+void ViewWriter::bandwidth(const char* word) {
+    double& value =
+        std::string_view(word) == "RBW" ? mirror_.ResolutionBandwidth : mirror_.VideoBandwidth;
+    double& ofSweep = std::string_view(word) == "RBW" ? onGraph_.settings.ResolutionBandwidth
+                                                      : onGraph_.settings.VideoBandwidth;
     if (panel_.isConnected) {
         std::string answer;
-        if (exchange_.GetInstrument(word, answer)) value = leadingNumber(answer);
+        if (exchange_.GetInstrument(word, answer)) ofSweep = value = leadingNumber(answer);
         return;
     }
-    value = kUnknownBandwidth;
+    ofSweep = value = kUnknownBandwidth;
     for (const AutoBandwidth& row : kAutoBandwidths)
         if (std::string_view(word) == row.word) boxes_.show({BoxIcon::Exclamation, row.message});
 }
 
 void ViewWriter::WriteViewHeader(OutputFile& file, bool withHeader) {
     if (!withHeader) return;
-    ViewHeader{panel_, mirror_, clock_,
-               [this](const char* word, double& value) { bandwidth(word, value); }}
+    followMirror(onGraph_, mirror_);
+    const bool read = onGraph_.wanted > 0;  // else there is only what the panel has now
+    ViewHeader{read ? onGraph_.settings : mirror_,
+               read ? onGraph_.instrumentMode : panel_.InstrumentMode, mirror_, clock_,
+               [this](const char* word) { bandwidth(word); }}
         .write(file);
 }
 
 void ViewWriter::WriteViewData(OutputFile& file) {
-    const bool zeroSpan = panel_.ViewSpan == 0;
-    const double step = zeroSpan || panel_.TraceIntervals == 0
-                            ? 0
-                            : (panel_.ViewStop - panel_.ViewStart) / panel_.TraceIntervals;
-    const std::vector<double>& values = panel_.RawTraceData;
-    const bool pairs = mirror_.TraceDetector == DETAUTOPEAK;
-    double x = zeroSpan ? 0 : panel_.ViewStart;
+    const SweepAxis& axis = onGraph_.axis;
+    const bool zeroSpan = onGraph_.settings.Span == 0;
+    const double step =
+        zeroSpan || axis.intervals == 0 ? 0 : (axis.stop - axis.start) / axis.intervals;
+    const std::vector<double>& values = onGraph_.physical;
+    const bool pairs = onGraph_.autoPeak();
+    double x = zeroSpan ? 0 : axis.start;
     for (std::size_t i = 0; i < values.size(); i += pairs ? 2 : 1) {
         if (i > 0) x += step;
         panel_.ViewXOffset = x;

@@ -10,19 +10,21 @@
 #include "model/ZEL3Variables.h"
 #include "platform/Clock.h"
 #include "platform/MessageBox.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 
 class ViewWriter {
   public:
     /// Connects the menu entry and the read cycle's request to save.
-    ViewWriter(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange, FileOps& files,
-               const Clock& clock, MessageBoxes& boxes);
+    ViewWriter(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, CommandExchange& exchange,
+               FileOps& files, const Clock& clock, MessageBoxes& boxes);
 
     /// Where the traces of a recording go; empty while none runs. A file dialog that is used
     /// meanwhile does not turn the recording aside.
     std::string RecordingFileName;
 
+    /// Refused in words while the trace on the graph is incomplete.
     void SaveCurrentView_Click();
     /// "trace" or "power"; any other word does nothing.
     void SaveView(const std::string& kind);
@@ -46,13 +48,14 @@ class ViewWriter {
   private:
     OutputFile target() const;
     void save(const std::string& kind);
-    void bandwidth(const char* word, double& value);
+    void bandwidth(const char* word);
     void finish(OutputFile& file);
     std::string nowText() const { return clock_.dateTimeText(clock_.date()); }
 
     Forms& forms_;
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
+    Sweep& onGraph_;
     CommandExchange& exchange_;
     FileOps& files_;
     const Clock& clock_;

@@ -89,7 +89,7 @@ class ControllerForm : public Form {
     bool SingleSweepModeActive = false;
     std::string mLoadOption;
     bool isConnected = false;  ///< the handshake is done
-    bool LinkLost = false;     ///< the continuous view ended because the line had died
+    bool LinkLost = false;     ///< the line has died: what is shown will not become newer
     double RecordTimeValue = 0;
     bool ErrorFlag = false;  ///< a link failure was told already
     bool ChoiceBoxActivated = false;

@@ -47,11 +47,18 @@ class TimeForm : public Form {
   public:
     TimeForm() : Form("TimeForm") {
         Caption = "Record Data";
-        addVariables(
-            {{"ContinuousRecording", &ContinuousRecording}, {"RecordedCount", &RecordedCount}});
+        addVariables({{"ContinuousRecording", &ContinuousRecording},
+                      {"RecordedCount", &RecordedCount},
+                      {"TickCount", &TickCount},
+                      {"IncompleteCount", &IncompleteCount},
+                      {"FailedCount", &FailedCount}});
     }
     bool ContinuousRecording = false;  ///< traces are appended to the file
     double RecordedCount = 0;          ///< traces taken so far; 0 asks for the full read cycle
+    double TickCount = 0;              ///< attempts of this recording, be they good or not
+    double IncompleteCount = 0;        ///< of them, traces of which samples are missing
+    double FailedCount = 0;            ///< of them, those that brought no trace
+    Event<> Ticked;                    ///< an attempt is over
     Label lblRecText{*this, "lblRecText", "Record data every"};
     TextBox TimeIntervalBox{*this, "TimeIntervalBox"};  ///< s
     Button SubmitTimeButton{*this, "SubmitTimeButton", "OK"};

@@ -23,13 +23,14 @@ struct SavedFiles {
     FileOps files{forms.controller, platform.fileDialogs, platform.folder, platform.files,
                   platform.clock};
     GraphScaling scaling{forms.controller, forms.waterfall, mirror, platform.clock};
-    TraceConversion conversion{forms.controller, mirror, forms.waterfall.Graph3D};
+    TraceConversion conversion{forms.controller, forms.waterfall.Graph3D};
+    Sweep onGraph;
     ZELBas line;
     Interlock interlock{
         forms,
         line,
         {platform.clock, platform.events, platform.boxes, forms.controller.DebugTextBox}};
-    ViewReader reader{forms, mirror, files, scaling, conversion, interlock};
+    ViewReader reader{forms, mirror, onGraph, files, scaling, conversion, interlock};
 };
 
 inline std::string textOf(const std::uint8_t* data, std::size_t size) {

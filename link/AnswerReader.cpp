@@ -64,7 +64,10 @@ std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
         if (!link_.usable()) {
             // A view that has lost its line says so once.
             const bool told = panel_.ContinuosLoopActive && state_.ExchangeFailed;
-            if (!state_.DialCancelled && !told) {
+            if (link_.isTcp()) {
+                link_.tellLoss();
+                if (!panel_.isConnected) takeConnectionDown();
+            } else if (!state_.DialCancelled && !told) {
                 std::string text = "Port not open!";
                 if (!link_.problem().empty()) text += kCrLf + link_.problem();
                 session_.boxes.show({BoxIcon::Critical, text});
@@ -93,6 +96,7 @@ std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
         notice_.tell(StopwatchA_.Elapsed(), timeoutMs);
         session_.events.wait(kPollMs);
     }
+    state_.AnswerOverdue = true;
     if (panel_.isConnected) {
         const bool told = quietWhenFailed && state_.ExchangeFailed;
         state_.ExchangeFailed = true;
@@ -145,6 +149,10 @@ void AnswerReader::giveUpConnecting() {
         }
         panel_.ErrorFlag = false;
     }
+    takeConnectionDown();
+}
+
+void AnswerReader::takeConnectionDown() {
     if (panel_.ConnectionState == ControllerForm::DIRECTCON) link_.CloseComPort();
     AttemptAbandoned();
     dialog_.OnPic.Visible = false;

@@ -42,6 +42,7 @@ class AnswerReader {
     void judgeNoise();
     void giveUpConnecting();
     void leave();
+    void takeConnectionDown();
 
     ControllerForm& panel_;
     MainForm& dialog_;

@@ -26,26 +26,21 @@ void PrependBytes(std::string& bytes, std::size_t count, char byte) {
     bytes.insert(0, head);
 }
 
-BinaryReader::BinaryReader(Forms& forms, ZELBas& state, ByteLink& link, const Socket& TCPSocket,
-                           const Session& session)
+BinaryReader::BinaryReader(Forms& forms, ZELBas& state, ByteLink& link, const Session& session)
     : panel_(forms.controller),
       dialog_(forms.main),
       state_(state),
       link_(link),
-      socket_(TCPSocket),
       session_(session),
       StopwatchB_(session.clock),
       tail_(session.clock) {}
-
-bool BinaryReader::linkLost() const {
-    if (!link_.isTcp()) return !link_.portOpen();
-    return socket_.state() != SocketState::Connected;
-}
 
 std::string BinaryReader::ReadBinaryBuffer(std::int16_t length) {
     std::string bytes;
     if (link_.usable()) {
         bytes = ReadBinaryBytes(length);
+    } else if (link_.isTcp()) {
+        link_.tellLoss();
     } else {
         session_.boxes.show({BoxIcon::Critical, "Port is not open!"});
     }
@@ -57,7 +52,7 @@ std::string BinaryReader::ReadBinaryBuffer(std::int16_t length) {
 std::string BinaryReader::ReadBinaryChunk(std::int16_t seconds) {
     StopwatchB_.Reset();
     std::string chunk = link_.takeBytes();
-    while (chunk.empty() && StopwatchB_.Elapsed() <= seconds * 1000 && !linkLost()) {
+    while (chunk.empty() && StopwatchB_.Elapsed() <= seconds * 1000 && link_.usable()) {
         session_.events.wait(kPollMs);
         chunk = link_.takeBytes();
     }
@@ -67,7 +62,7 @@ std::string BinaryReader::ReadBinaryChunk(std::int16_t seconds) {
 std::string BinaryReader::takeTail(std::size_t missing) {
     std::string tail;
     tail_.Reset();
-    while (tail.size() < missing && tail_.Elapsed() <= kTailMs && !linkLost()) {
+    while (tail.size() < missing && tail_.Elapsed() <= kTailMs && link_.usable()) {
         session_.events.wait(kPollMs);
         tail += link_.takeBytes();
     }
@@ -94,8 +89,14 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
     }
     StopwatchB_.Reset();
     if (isBareStatus(chunk) && chunk[0] != '0') {
-        state_.TCPDataArrived = false;
-        return chunk;
+        // A refusal has nothing behind it: samples there tell that the digit itself is wrong.
+        session_.events.wait(kPollMs);
+        const std::string behind = link_.takeBytes();
+        if (behind.empty()) {
+            state_.TCPDataArrived = false;
+            return chunk;
+        }
+        chunk += behind;
     }
     if (!chunk.empty()) {
         chunk.erase(0, kStatusBytes);
@@ -107,7 +108,7 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
             session_.events.pump();
             if (StopwatchB_.Elapsed() > kStallMs) break;
             if (result.size() + 2 >= wanted) break;
-            if (chunk.empty() && linkLost()) break;
+            if (chunk.empty() && !link_.usable()) break;
             if (chunk.empty()) session_.events.wait(kPollMs);
         }
         // The end of the block is near or the instrument has stopped: the chunk at hand and the
@@ -118,12 +119,8 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         if (result.size() > wanted) result.resize(wanted);
     }
     state_.TCPDataArrived = false;
-    if (link_.isTcp() && linkLost() && result.size() < wanted) {
-        if (panel_.ErrorFlag)
-            session_.boxes.show({BoxIcon::Critical, std::string("TCP/IP Socket error") + kCrLf +
-                                                        "Please make a new connection."});
-        return "";
-    }
+    if (result.size() < wanted) state_.AnswerOverdue = true;
+    if (link_.isTcp() && result.size() < wanted && !link_.usable()) link_.tellLoss();
     return result;
 }
 

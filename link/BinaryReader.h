@@ -8,7 +8,6 @@
 #include "link/ByteLink.h"
 #include "link/ZELBas.h"
 #include "platform/Session.h"
-#include "platform/Socket.h"
 
 namespace zel {
 
@@ -17,8 +16,7 @@ void PrependBytes(std::string& bytes, std::size_t count, char byte);
 
 class BinaryReader {
   public:
-    BinaryReader(Forms& forms, ZELBas& state, ByteLink& link, const Socket& TCPSocket,
-                 const Session& session);
+    BinaryReader(Forms& forms, ZELBas& state, ByteLink& link, const Session& session);
 
     /// The checked entry to `ReadBinaryBytes`; tells a closed port.
     std::string ReadBinaryBuffer(std::int16_t length);
@@ -29,14 +27,12 @@ class BinaryReader {
     std::string ReadBinaryChunk(std::int16_t seconds);
 
   private:
-    bool linkLost() const;
     std::string takeTail(std::size_t missing);
 
     ControllerForm& panel_;
     MainForm& dialog_;
     ZELBas& state_;
     ByteLink& link_;
-    const Socket& socket_;
     Session session_;
     Stopwatch StopwatchB_;
     Stopwatch tail_;

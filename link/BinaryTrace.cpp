@@ -10,6 +10,7 @@ namespace zel {
 namespace {
 
 constexpr std::size_t kBlockBytes = 1204;  // 301 samples, without the separator
+constexpr std::size_t kSampleBytes = 4;
 constexpr int kReRequestMs = 10000;
 constexpr int kPollMs = 20;
 
@@ -47,14 +48,15 @@ bool BinaryTrace::mayAskAgain(const Round& round) const {
     return !stopped && !disconnected && link_.usable();
 }
 
-bool BinaryTrace::GetTraceBinary(std::vector<double>& values, bool doubleBlock) {
+bool BinaryTrace::GetTraceBinary(RawTrace& trace, bool doubleBlock) {
     const DialogueScope scope(state_);
+    trace.wanted = trace.came = 0;
     const Round round = beginRound();
     for (;;) {
         session_.DebugLine("Binary trace transfer starting");
         const auto t0 = static_cast<float>(session_.clock.secondsOfDay());
         bool success = false;
-        switch (readOnce(values, doubleBlock, success)) {
+        switch (readOnce(trace, doubleBlock, success)) {
             case Outcome::AskAgain:
                 if (mayAskAgain(round)) continue;
                 return false;
@@ -70,8 +72,7 @@ bool BinaryTrace::GetTraceBinary(std::vector<double>& values, bool doubleBlock) 
     }
 }
 
-BinaryTrace::Outcome BinaryTrace::readOnce(std::vector<double>& values, bool doubleBlock,
-                                           bool& success) {
+BinaryTrace::Outcome BinaryTrace::readOnce(RawTrace& trace, bool doubleBlock, bool& success) {
     state_.InputBuffer.clear();
     link_.WriteToLink("GET\r");
     delay(DelayPlace::AfterTraceGet);
@@ -86,7 +87,7 @@ BinaryTrace::Outcome BinaryTrace::readOnce(std::vector<double>& values, bool dou
     delay(DelayPlace::AfterTraceKeyword);
     const bool open = link_.usable();  // a port closed before is told by the read
     const std::string bytes = bytes_.ReadBinaryBuffer(doubleBlock ? kDoubleBytes : kSingleBytes);
-    if (bytes.size() == 2) {
+    if (bytes.size() == 2 && bytes[1] == '\r') {
         status = bytes[0] - '0';
         if (status == 1) return Outcome::AskAgain;
         if (status > 1 && status <= 7) {
@@ -94,30 +95,35 @@ BinaryTrace::Outcome BinaryTrace::readOnce(std::vector<double>& values, bool dou
             return Outcome::Done;
         }
     }
-    if (!link_.usable()) {  // the device has gone in the middle
-        std::string text = "Port is not open!";
-        if (!link_.problem().empty()) text += kCrLf + link_.problem();
-        if (open) session_.boxes.show({BoxIcon::Critical, text});
+    decode(bytes, doubleBlock, trace);
+    if (!link_.usable() && !trace.whole()) {  // the line has gone in the middle
+        if (open && !link_.isTcp()) {
+            std::string text = "Port is not open!";
+            if (!link_.problem().empty()) text += kCrLf + link_.problem();
+            session_.boxes.show({BoxIcon::Critical, text});
+        }
         state_.ExchangeFailed = true;
         return Outcome::Failed;
     }
-    decode(bytes, doubleBlock, values);
     success = true;
     return Outcome::Done;
 }
 
-void BinaryTrace::decode(const std::string& bytes, bool doubleBlock, std::vector<double>& values) {
-    values.resize(doubleBlock ? kDoubleSamples : kSingleSamples);
+void BinaryTrace::decode(const std::string& bytes, bool doubleBlock, RawTrace& trace) {
+    const std::size_t asked = doubleBlock ? kDoubleBytes : kSingleBytes;
+    trace.wanted = doubleBlock ? kDoubleSamples : kSingleSamples;
+    trace.values.resize(trace.wanted);
     std::size_t output = 0;
     std::int16_t& index = state_.BinaryDecodeIndex;
-    const int last = static_cast<int>(bytes.size()) - 1 - 4;
-    for (index = 0; index <= last && output < values.size();
-         index = static_cast<std::int16_t>(index + 4)) {
+    for (index = 0; output < trace.wanted; index = static_cast<std::int16_t>(index + 4)) {
         if (doubleBlock && index == static_cast<std::int16_t>(kBlockBytes)) ++index;
         if (static_cast<std::size_t>(index) + 4 > bytes.size()) break;
-        values[output++] =
+        trace.values[output++] =
             int32FromLittleEndian(reinterpret_cast<const unsigned char*>(bytes.data()) + index);
     }
+    // Less than a sample is missing: nobody knows where, and all behind that place is shifted.
+    const bool lostInside = bytes.size() < asked && bytes.size() + kSampleBytes > asked;
+    trace.came = lostInside ? 0 : output;
 }
 
 bool BinaryTrace::GetCTraceBinary(std::vector<double>& values) {
@@ -184,7 +190,11 @@ std::string BinaryTrace::ReadLiteralBytes(std::int32_t count) {
     state_.ComplexTraceRequested = false;
     for (;;) {
         if (!link_.usable()) {
-            session_.boxes.show({BoxIcon::Critical, "Port is not open!"});
+            if (link_.isTcp()) {
+                link_.tellLoss();
+            } else {
+                session_.boxes.show({BoxIcon::Critical, "Port is not open!"});
+            }
             return "";
         }
         if (!mayAskAgain(round)) return "";

@@ -10,6 +10,7 @@
 #include "link/BinaryReader.h"
 #include "link/ByteLink.h"
 #include "link/LinkDelays.h"
+#include "link/RawTrace.h"
 #include "link/ZELBas.h"
 #include "platform/Session.h"
 
@@ -27,9 +28,10 @@ class BinaryTrace {
     BinaryTrace(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
                 BinaryReader& bytes, const Session& session);
 
-    /// TRACEBIN: 301 or 602 raw samples. A transfer that stops leaves the tail of `values` as it
-    /// was and is a success all the same; a refusal or a lost link is none.
-    bool GetTraceBinary(std::vector<double>& values, bool doubleBlock);
+    /// TRACEBIN: 301 or 602 raw samples. A transfer that stops leaves the tail of the values as it
+    /// was and is a success all the same, with `came` below `wanted`; a refusal or a lost link is
+    /// none.
+    bool GetTraceBinary(RawTrace& trace, bool doubleBlock);
     /// CTRACEBIN: 602 raw samples, the level block and the phase block.
     bool GetCTraceBinary(std::vector<double>& values);
     /// Exactly `count` characters through the text path, asked for again every 10 s of silence;
@@ -47,8 +49,8 @@ class BinaryTrace {
 
     Round beginRound() const;
     bool mayAskAgain(const Round& round) const;
-    Outcome readOnce(std::vector<double>& values, bool doubleBlock, bool& success);
-    void decode(const std::string& bytes, bool doubleBlock, std::vector<double>& values);
+    Outcome readOnce(RawTrace& trace, bool doubleBlock, bool& success);
+    void decode(const std::string& bytes, bool doubleBlock, RawTrace& trace);
     Outcome readComplexOnce(std::vector<double>& values, bool& success);
     void delay(DelayPlace place);
     void startingError(int status, const char* keyword);

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "link/WaitNotice.h"
 #include "platform/LinkAddress.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
@@ -81,11 +82,30 @@ void ByteLink::OpenPortFromDialog() {
     boxes_.show({BoxIcon::Warning, text});
 }
 
+bool ByteLink::usable() const {
+    if (!isTcp()) return portOpen();
+    return socket_.state() == SocketState::Connected || !socket_.peekData().empty();
+}
+
+void ByteLink::tellLoss() {
+    showLinkLost(panel_, true);
+    if (state_.LossTold) return;
+    state_.LossTold = true;
+    const SocketState state = socket_.state();
+    const char* reason = state == SocketState::PeerClosing ? "The other end closed the connection."
+                         : state == SocketState::Error     ? "The connection broke."
+                                                           : "The connection is closed.";
+    boxes_.show({BoxIcon::Critical, std::string("TCP/IP Socket error") + kCrLf +
+                                        "Please make a new connection." + kCrLf + reason});
+}
+
 void ByteLink::WriteToLink(const std::string& text) {
     const std::optional<std::string> bytes = toWindows1252(text);
     if (!bytes) return;
+    if (state_.AnswerOverdue) takeBytes();
+    state_.AnswerOverdue = false;
     if (isTcp()) {
-        socket_.sendData(*bytes);
+        if (socket_.sendData(*bytes)) state_.LossTold = false;
     } else if (dialog_.IsConnectedToPort) {
         port_.output(*bytes);
         debug_.output("-> " + text);

@@ -24,7 +24,8 @@ class ByteLink {
     /// Takes port and baud rate from the dialog's lists and tells what is wrong with them.
     void OpenPortFromDialog();
     /// Sends the text, a byte a character; dropped silently when the port was not opened, and when
-    /// `wireProblem` names a character of it.
+    /// `wireProblem` names a character of it. An answer that came late, behind a time-out, is
+    /// thrown away before.
     void WriteToLink(const std::string& text);
     /// What has arrived, possibly nothing. Serial never waits; TCP waits up to 0.1 s with `wait`
     /// and reads nothing without.
@@ -36,8 +37,11 @@ class ByteLink {
 
     bool isTcp() const;
     bool portOpen() const { return port_.isOpen(); }
-    /// A line can be expected: the serial port is open, or the link is a socket.
-    bool usable() const { return isTcp() || portOpen(); }
+    /// Bytes can come or have come: the serial port is open, or the socket is connected or holds
+    /// what came ahead of its end.
+    bool usable() const;
+    /// Tells once a connection that a socket has ended, and why.
+    void tellLoss();
     /// Why the port was lost or could not be opened, for a user; empty when nothing is known.
     std::string problem() const { return port_.problem(); }
     /// Binary reads: takes what has arrived on either link, without waiting.

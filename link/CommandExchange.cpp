@@ -1,5 +1,7 @@
 #include "link/CommandExchange.h"
 
+#include <algorithm>
+#include <iterator>
 #include <string_view>
 
 #include "link/InstrumentErrors.h"
@@ -21,6 +23,13 @@ constexpr int kOwedAnswerMs = 2000;
 constexpr int kAfterOwedMs = 50;
 constexpr std::string_view kSweepTimeSetting = "SWPTIME,";
 constexpr int kFarewellMs = 500;  // for each of its answers
+
+constexpr std::string_view kHarmlessCommands[] = {"WAIT", "INIT", "REMOTE", "LOCAL"};
+
+bool changesSettings(const std::string& command) {
+    return std::find(std::begin(kHarmlessCommands), std::end(kHarmlessCommands), command) ==
+           std::end(kHarmlessCommands);
+}
 
 }  // namespace
 
@@ -108,6 +117,7 @@ bool CommandExchange::refuseCommand(const std::string& keyword, int status, floa
 bool CommandExchange::CmdInstrument(const std::string& keyword) {
     const DialogueScope scope(state_);
     if (!sendable(keyword, session_.boxes)) return false;
+    if (changesSettings(keyword)) SettingBegins();
     float t0 = 0;
     beginLine("CMD", keyword, t0);
     link_.drain(kDrainReads);
@@ -116,7 +126,8 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
     state_.InputBuffer.clear();
     const Stopwatch firstAnswer(session_.clock);
     std::string answer = reader_.ReadAnswer();
-    while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs) {
+    const auto socketEnded = [this] { return link_.isTcp() && !link_.usable(); };
+    while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs && !socketEnded()) {
         session_.events.wait(kRetryPauseMs);
         answer = reader_.ReadAnswer();
     }
@@ -161,6 +172,7 @@ bool CommandExchange::triggeredDialogue(const std::string& keyword, std::int32_t
 bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
     const DialogueScope scope(state_);
     if (!sendable(keywordAndValue, session_.boxes)) return false;
+    SettingBegins();
     float t0 = 0;
     beginLine("SET", keywordAndValue, t0);
     link_.drain(kDrainReads);
@@ -231,12 +243,15 @@ bool CommandExchange::readValue(std::string& value) {
     // On TCP the value came in one packet with the status line, and a read would throw it away.
     Stopwatch waited(session_.clock);
     auto end = state_.InputBuffer.find('\r');
-    while (end == std::string::npos && waited.Elapsed() <= kValueWaitMs) {
+    while (end == std::string::npos && waited.Elapsed() <= kValueWaitMs && link_.usable()) {
         session_.events.wait(kValuePollMs);
         state_.InputBuffer += link_.takeBytes();
         end = state_.InputBuffer.find('\r');
     }
-    if (end == std::string::npos) return false;
+    if (end == std::string::npos) {
+        state_.AnswerOverdue = true;
+        return false;
+    }
     value = state_.InputBuffer.substr(0, end);
     return true;
 }

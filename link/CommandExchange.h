@@ -9,6 +9,7 @@
 #include "link/ByteLink.h"
 #include "link/LinkDelays.h"
 #include "link/ZELBas.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 
 namespace zel {
@@ -30,6 +31,8 @@ class CommandExchange {
     bool SetInstrument(const std::string& keywordAndValue);
     /// Reads a value; left as it was on failure. An empty answer is a success.
     bool GetInstrument(const std::string& keyword, std::string& value);
+    /// A setting or a command that may change one goes out next: not WAIT, INIT, REMOTE, LOCAL.
+    Event<> SettingBegins;
     /// A dialogue is under way further up the stack, and only lets events run: the line is taken.
     bool busy() const { return state_.DialoguesUnderWay > 0; }
     /// The user does not wait any longer for what is under way; an answer that comes within

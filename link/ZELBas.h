@@ -21,7 +21,9 @@ struct ZELBas {
     bool ComplexTraceActive = false;
     bool ComplexTraceRequested = false;  ///< a complex transfer had to be asked for again
     std::int16_t BinaryDecodeIndex = 0;
-    double SweepTimeTold = 0;  ///< s, SWPTIME as the instrument last answered or accepted it
+    bool AnswerOverdue = false;  ///< an exchange ended in a time-out: its answer may still come
+    bool LossTold = false;       ///< the end of this connection was told to the user
+    double SweepTimeTold = 0;    ///< s, SWPTIME as the instrument last answered or accepted it
     /// Exchanges, transfers and whole cycles of them that have begun and not ended. What would
     /// begin another one waits until it is 0 again.
     int DialoguesUnderWay = 0;

@@ -46,7 +46,8 @@ class Graph : public Control {
     void setYRange(double minimum, double maximum);
     void showYLabels(bool show);
 
-    /// Replaces the plot: value i lies at x first + i * increment.
+    /// Replaces the plot: value i lies at x first + i * increment. A value that is no number is a
+    /// gap.
     void plotY(const std::vector<double>& values, double firstX, double increment);
     void clearPlot();
     const std::vector<double>& values() const { return values_; }
@@ -60,6 +61,8 @@ class Graph : public Control {
     Property<bool> Old{this, false};
     /// What the trace is, where it is not the last sweep; the next plot takes it away.
     Property<std::string> Note{this, ""};
+    /// Stands over a trace of which samples are missing ("INCOMPLETE 150/301"); else empty.
+    Property<std::string> Incomplete{this, ""};
 
     int cursorCount() const { return static_cast<int>(cursors_.size()); }
     /// 1-based as the panel counts them; an index out of range gives a cursor that nobody sees.

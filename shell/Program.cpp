@@ -72,12 +72,12 @@ struct Program::Rooms {
           link(forms, line, p.serialPort, p.tcpSocket, session, logs.line()),
           reader(forms, line, link, session),
           exchange(panel, line, link, reader, session),
-          bytes(forms, line, link, p.tcpSocket, session),
+          bytes(forms, line, link, session),
           binary(panel, line, link, reader, bytes, session),
           instrument{line, link, reader, exchange, binary},
           labels(panel, forms.main, mirror, exchange, p.events),
           marks(panel, mirror),
-          conversion(panel, mirror, forms.waterfall.Graph3D),
+          conversion(panel, forms.waterfall.Graph3D),
           scaling(panel, forms.waterfall, mirror, p.clock),
           graph(panel, mirror),
           rows(forms.waterfall),
@@ -86,13 +86,14 @@ struct Program::Rooms {
           history(forms),
           manualScale(panel, forms.manualScale, boxes),
           pace(panel, p.clock),
-          traces(forms, mirror, line, exchange, binary, conversion, scaling, pace, p.events, boxes),
+          traces(forms, mirror, onGraph, line, exchange, binary, conversion, scaling, pace,
+                 p.events, boxes),
           power(forms, exchange, p.events),
           interlock(forms, line, session),
           sweeps(forms, exchange, traces, power, session),
           files(panel, p.fileDialogs, p.folder, p.files, p.clock),
-          views(forms, mirror, exchange, files, p.clock, boxes),
-          viewReader(forms, mirror, files, scaling, conversion, interlock),
+          views(forms, mirror, onGraph, exchange, files, p.clock, boxes),
+          viewReader(forms, mirror, onGraph, files, scaling, conversion, interlock),
           recording(forms, mirror, instrument, sweeps, views, session),
           recent(panel, p.settings),
           fileMenu(panel, files, p.folder, boxes),
@@ -129,7 +130,9 @@ struct Program::Rooms {
         history.describe = [this] {
             OutputFile header(files.service(), "", OutputFile::Mode::Output);
             // What the instrument has on automatic is not asked for with each sweep.
-            ViewHeader{panel, mirror, platform.clock, [](const char*, double&) {}}.write(header);
+            ViewHeader{onGraph.settings, onGraph.instrumentMode, mirror, platform.clock,
+                       [](const char*) {}}
+                .write(header);
             return header.text();
         };
         handlers.on(p.endSignals.EndRequested,
@@ -143,6 +146,7 @@ struct Program::Rooms {
         timers.attach(panel.UpNow);
         panel.ShowHelp.connect([this](int context) { help.showTopic(context); });
         timers.attach(panel.PaceTimer);
+        exchange.SettingBegins.connect([this] { keepSettings(onGraph, mirror); });
         timers.attach(forms.time.X);
         viewReader.FileLoaded.connect([this](const std::string& path) { recent.add(path); });
         panel.UtilityTrouble.Clicked.connect([this] {
@@ -168,6 +172,7 @@ struct Program::Rooms {
     EndingBoxes boxes{platform.boxes, line};
     Session session{platform.clock, platform.events, boxes, panel.DebugTextBox};
     ZEL3Variables mirror;
+    Sweep onGraph;
     Logs logs;
     TimerDriver timers;
     ByteLink link;
@@ -238,6 +243,7 @@ Forms& Program::forms() { return rooms_->forms; }
 ZEL3Variables& Program::variables() { return rooms_->mirror; }
 ZELBas& Program::link() { return rooms_->line; }
 CommandExchange& Program::exchange() { return rooms_->exchange; }
+Sweep& Program::sweep() { return rooms_->onGraph; }
 TraceReader& Program::traces() { return rooms_->traces; }
 SweepHistory& Program::history() { return rooms_->history; }
 Logs& Program::logs() { return rooms_->logs; }

@@ -18,6 +18,7 @@ class Logs;
 class SweepHistory;
 class TraceReader;
 struct Scripts;
+struct Sweep;
 
 class Program {
   public:
@@ -37,6 +38,8 @@ class Program {
     Logs& logs();
     Interlock& interlock();
     Scripts& scripts();
+    /// The sweep on the graph, be it read or loaded.
+    Sweep& sweep();
 
     /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
     /// the server's window is closed; `ended` is then true.

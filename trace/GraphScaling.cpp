@@ -114,30 +114,17 @@ void GraphScaling::SetYAxisFormat() {
     if (mirror_.ReferenceRange > RANGE1DB) waterfall_.Graph3D.setFormat(3, "%");
 }
 
-void GraphScaling::DisplayDataOnGraph(double xStart, double xStop, double intervals,
-                                      const std::vector<double>& peakData,
-                                      const std::vector<double>& traceData) {
-    const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
-    const bool zeroSpan = mirror_.Span == 0;
-    const std::vector<double>& data = autoPeak ? peakData : traceData;
-    const double pairs = autoPeak ? 2 : 1;
-    // At zero span the last points lie beyond the sweep time by two steps: as the instrument's
-    // own display has it.
-    const double first = zeroSpan ? 0 : xStart;
-    const double increment = zeroSpan ? mirror_.SweepTime / (pairs * (intervals - 2))
-                                      : (xStop - xStart) / (pairs * intervals);
-    panel_.CWGraph1.plotY(data, first, increment);
-    if (autoPeak || zeroSpan) BuildXYVectors(increment);
-    // The full read cycle sizes the vectors before the new range: a row stands at its own x.
-    std::vector<double> xs = panel_.XVector;
-    const bool stale = xs.size() < data.size() || xs.empty() || xs.front() != first;
-    if (stale || std::fabs(xs.back() - xs.front() -
-                           increment * static_cast<double>(xs.size() - 1)) > increment / 2) {
-        xs.resize(data.size());
-        for (std::size_t i = 0; i < xs.size(); ++i)
-            xs[i] = first + static_cast<double>(i) * increment;
-    }
-    waterfall_.Graph3D.plotCurve(panel_.YVector, xs, data, panel_.TraceColours);
+void GraphScaling::DisplayDataOnGraph(const Sweep& sweep) {
+    panel_.CWGraph1.plotY(sweep.shown, sweep.axis.first, sweep.axis.increment);
+    panel_.CWGraph1.Incomplete = incompleteMark(sweep);
+    if (sweep.autoPeak() || sweep.settings.Span == 0) BuildXYVectors(sweep.axis.increment);
+    if (!sweep.whole()) return;
+    // The full read cycle sizes the vectors before it knows the new range: a row stands at its
+    // own x.
+    std::vector<double> xs(sweep.shown.size());
+    for (std::size_t i = 0; i < xs.size(); ++i)
+        xs[i] = sweep.axis.first + static_cast<double>(i) * sweep.axis.increment;
+    waterfall_.Graph3D.plotCurve(panel_.YVector, xs, sweep.shown, sweep.colours);
 }
 
 void GraphScaling::SetAnnotation(double percent) {

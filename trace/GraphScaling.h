@@ -8,6 +8,7 @@
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
 #include "platform/Clock.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 
@@ -28,12 +29,8 @@ class GraphScaling {
     void setGraphYAxis(double level, int rangeByte, bool useRangeCode);
     void SetYAxisFormat();
     void addWaterfallRowLimit();
-    /// Plots the data of the detector in use: a value every `(xStop - xStart) / intervals`, half
-    /// of that for the pairs of the auto peak detector; at zero span the sweep time spreads over
-    /// two intervals less.
-    void DisplayDataOnGraph(double xStart, double xStop, double intervals,
-                            const std::vector<double>& peakData,
-                            const std::vector<double>& traceData);
+    /// Plots a sweep; only a whole one goes into the waterfall.
+    void DisplayDataOnGraph(const Sweep& sweep);
     /// The trigger line at `percent` of the display's height.
     void SetAnnotation(double percent);
     /// Switches the trigger line on where it last stood, or off.

@@ -32,7 +32,10 @@ void PaceMonitor::cycleBegins() {
 
 void PaceMonitor::sweepWaitBegins() { waitStart_ = clock_.micros(); }
 
-void PaceMonitor::sweepWaitEnds() { waited_ = clock_.micros() - waitStart_; }
+void PaceMonitor::sweepWaitEnds() {
+    waited_ = clock_.micros() - waitStart_;
+    sweepDate_ = clock_.date();
+}
 
 void PaceMonitor::drawn() {
     const std::int64_t now = clock_.micros();

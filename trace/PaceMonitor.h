@@ -19,6 +19,8 @@ class PaceMonitor {
     void sweepWaitBegins();
     void sweepWaitEnds();
     void drawn();
+    /// Date at which the last wait for a sweep ended, days.
+    double sweepDate() const { return sweepDate_; }
     /// Writes the line and the mark anew.
     void show();
 
@@ -37,6 +39,7 @@ class PaceMonitor {
     std::int64_t cycleMicros_ = 0;  // of the last whole cycle
     std::int64_t sweepMicros_ = 0;  // of it, waiting for the sweep
     std::int64_t waited_ = 0;
+    double sweepDate_ = 0;
     std::deque<std::int64_t> drawnAt_;
 };
 

@@ -12,109 +12,109 @@ namespace {
 constexpr int kDecibelDecimals = 3;
 constexpr int kVoltDecimals = 10;
 constexpr int kOtherDecimals = 20;
-constexpr double kDivisions = 10;
 
-}  // namespace
+bool isLogarithmicUnit(const Sweep& sweep) { return sweep.settings.ReferenceUnit < UNITV; }
 
-bool TraceConversion::isLogarithmicUnit() const { return mirror_.ReferenceUnit < UNITV; }
-
-void TraceConversion::SelectRawScale() {
-    panel_.RawScale = mirror_.ReferenceUnit == UNITV   ? 1e6
-                      : mirror_.ReferenceUnit == UNITW ? 1e9
-                                                       : 1e3;
-}
-
-void TraceConversion::ConvertTrace() {
-    const int decimals = mirror_.ReferenceUnit == UNITV ? kVoltDecimals : kOtherDecimals;
-    if (mirror_.TraceDetector == DETAUTOPEAK) {
-        CalculateDataAutoPeak(decimals);
-    } else {
-        CalculateDataNotAutoPeak(decimals);
-    }
-}
-
-double TraceConversion::ClipToReferenceLevel(double& value) const {
-    if (value > mirror_.ReferenceLevel) value = mirror_.ReferenceLevel;
-    return value;
-}
-
-double TraceConversion::ClipToBottom(double value, bool useRangeCode) const {
-    const double range = std::nearbyint(mirror_.ReferenceRange);
-    const double perDivision = useRangeCode ? decibelsPerDivision(range) : range;
-    double top = mirror_.ReferenceLevel;
-    if (mirror_.ReferenceUnit == UNITV) top = VoltsToDbm(top);
-    if (mirror_.ReferenceUnit == UNITW) top = WattsToDbm(top);
-    const double bottom = top - kDivisions * perDivision;
-    // A value that is no number (the logarithm of a negative sample) lies at the bottom as well.
-    return value >= bottom ? value : bottom;
-}
-
-double TraceConversion::linearDisplayValue(double value, bool clearOtherUnits) const {
-    if (mirror_.ReferenceRange > RANGE1DB) return LinearToPercent(value, mirror_.ReferenceLevel);
-    if (mirror_.ReferenceUnit == UNITV) return VoltsToDbm(value);
-    if (mirror_.ReferenceUnit == UNITW) return WattsToDbm(value);
+double linearDisplayValue(const ZEL3Variables& settings, double value, bool clearOtherUnits) {
+    if (settings.ReferenceRange > RANGE1DB) return LinearToPercent(value, settings.ReferenceLevel);
+    if (settings.ReferenceUnit == UNITV) return VoltsToDbm(value);
+    if (settings.ReferenceUnit == UNITW) return WattsToDbm(value);
     return clearOtherUnits ? 0 : value;
 }
 
-void TraceConversion::CalculateDataNotAutoPeak(int decimals) {
-    std::vector<double>& trace = panel_.TraceData;
-    std::vector<double>& raw = panel_.RawTraceData;
-    raw.assign(trace.size(), 0);
-    for (std::size_t i = 0; i < trace.size(); ++i) {
-        const double sample = trace[i] / panel_.RawScale;
-        if (isLogarithmicUnit()) {
-            raw[i] = trace[i] = roundHalfEven(sample, kDecibelDecimals);
-            ClipToReferenceLevel(trace[i]);
-            if (mirror_.ReferenceRange >= RANGELIN && mirror_.ReferenceRange <= RANGEVSWR11)
-                trace[i] = DbmToPercent(trace[i], mirror_.ReferenceLevel);
+/// Calls `body(index, value in the unit)` for every sample that came; the others are no number.
+template <class Body>
+void convertEach(Sweep& sweep, const Body& body) {
+    sweep.physical = sweep.shown = sweep.raw;
+    for (std::size_t i = 0; i < sweep.raw.size(); ++i)
+        if (!std::isnan(sweep.raw[i])) body(i, sweep.raw[i] / sweep.rawScale);
+}
+
+}  // namespace
+
+VerticalScale verticalScale(const Sweep& sweep) {
+    return {sweep.settings.ReferenceUnit, sweep.settings.ReferenceLevel,
+            LevelRange::ofCode(sweep.settings.ReferenceRange)};
+}
+
+void TraceConversion::SelectRawScale(Sweep& sweep) {
+    const double unit = sweep.settings.ReferenceUnit;
+    sweep.rawScale = unit == UNITV ? 1e6 : unit == UNITW ? 1e9 : 1e3;
+}
+
+void TraceConversion::ConvertTrace(Sweep& sweep) {
+    const int decimals = sweep.settings.ReferenceUnit == UNITV ? kVoltDecimals : kOtherDecimals;
+    if (sweep.autoPeak()) {
+        CalculateDataAutoPeak(sweep, decimals);
+    } else {
+        CalculateDataNotAutoPeak(sweep, decimals);
+    }
+}
+
+void TraceConversion::extend(std::size_t index, double shown) {
+    if (index == 0 && graph3D_.plotCount() == 1) {
+        panel_.TraceMinimum = panel_.TraceMaximum = shown;
+        return;
+    }
+    if (panel_.TraceMinimum > shown) panel_.TraceMinimum = shown;
+    if (panel_.TraceMaximum < shown) panel_.TraceMaximum = shown;
+}
+
+void TraceConversion::CalculateDataNotAutoPeak(Sweep& sweep, int decimals) {
+    const ZEL3Variables& settings = sweep.settings;
+    const VerticalScale scale = verticalScale(sweep);
+    const bool logarithmic = isLogarithmicUnit(sweep);
+    convertEach(sweep, [&](std::size_t i, double sample) {
+        double& saved = sweep.physical[i];
+        double& shown = sweep.shown[i];
+        if (logarithmic) {
+            saved = shown = roundHalfEven(sample, kDecibelDecimals);
+            scale.ClipToReferenceLevel(shown);
+            if (settings.ReferenceRange >= RANGELIN && settings.ReferenceRange <= RANGEVSWR11)
+                shown = DbmToPercent(shown, settings.ReferenceLevel);
         } else {
             // The saved value is clipped too, unlike that of the auto peak detector: both are
             // meant, and so is the zero of a linear unit that is neither volt nor watt.
-            raw[i] = roundHalfEven(sample, decimals);
-            trace[i] = linearDisplayValue(ClipToReferenceLevel(raw[i]), true);
+            saved = roundHalfEven(sample, decimals);
+            shown = linearDisplayValue(settings, scale.ClipToReferenceLevel(saved), true);
         }
-        trace[i] = ClipToBottom(trace[i], true);
-        if (i == 0 && graph3D_.plotCount() == 1) {
-            panel_.TraceMinimum = panel_.TraceMaximum = trace[0];
-        } else {
-            if (panel_.TraceMinimum > trace[i]) panel_.TraceMinimum = trace[i];
-            if (panel_.TraceMaximum < trace[i]) panel_.TraceMaximum = trace[i];
-        }
-    }
-    colour(trace);
+        shown = scale.ClipToBottom(shown);
+        extend(i, shown);
+    });
+    sweep.colours = colour(sweep.shown);
 }
 
-void TraceConversion::CalculateDataAutoPeak(int decimals) {
-    std::vector<double>& trace = panel_.PeakTraceData;
-    std::vector<double>& raw = panel_.RawTraceData;
-    raw.assign(trace.size(), 0);
-    for (std::size_t i = 0; i < trace.size(); ++i) {
-        const double sample = trace[i] / panel_.RawScale;
-        if (isLogarithmicUnit()) {
-            raw[i] = trace[i] = roundHalfEven(sample, kDecibelDecimals);
-            ClipToReferenceLevel(trace[i]);
-            if (mirror_.ReferenceRange > RANGE1DB)
-                trace[i] = DbmToPercent(trace[i], mirror_.ReferenceLevel);
+void TraceConversion::CalculateDataAutoPeak(Sweep& sweep, int decimals) {
+    const ZEL3Variables& settings = sweep.settings;
+    const VerticalScale scale = verticalScale(sweep);
+    const bool logarithmic = isLogarithmicUnit(sweep);
+    convertEach(sweep, [&](std::size_t i, double sample) {
+        double& shown = sweep.shown[i];
+        if (logarithmic) {
+            sweep.physical[i] = shown = roundHalfEven(sample, kDecibelDecimals);
+            scale.ClipToReferenceLevel(shown);
+            if (settings.ReferenceRange > RANGE1DB)
+                shown = DbmToPercent(shown, settings.ReferenceLevel);
         } else {
-            raw[i] = trace[i] = roundHalfEven(sample, decimals);
-            trace[i] = linearDisplayValue(ClipToReferenceLevel(trace[i]), false);
+            sweep.physical[i] = shown = roundHalfEven(sample, decimals);
+            shown = linearDisplayValue(settings, scale.ClipToReferenceLevel(shown), false);
         }
-        trace[i] = ClipToBottom(trace[i], true);
-    }
-    colour(trace);
+        shown = scale.ClipToBottom(shown);
+    });
+    sweep.colours = colour(sweep.shown);
 }
 
-void TraceConversion::colour(const std::vector<double>& shown) const {
+std::vector<double> TraceConversion::colour(const std::vector<double>& shown) const {
     const double low = graph3D_.axis(3).Minimum;
     const double height = graph3D_.axis(3).Maximum - low;
-    std::vector<double>& colours = panel_.TraceColours;
-    colours.resize(shown.size());
+    std::vector<double> colours(shown.size());
     for (std::size_t i = 0; i < shown.size(); ++i)
         colours[i] = height == 0 ? 0 : 100 * (shown[i] - low) / height;
-    if (colours.empty()) return;
+    if (colours.empty()) return colours;
     // The first and the last pin the colour scale.
     colours.front() = 0;
     colours.back() = 100;
+    return colours;
 }
 
 }  // namespace zel

@@ -4,39 +4,38 @@
 #include <vector>
 
 #include "forms/ControllerForm.h"
-#include "forms/Forms.h"
-#include "model/ZEL3Variables.h"
+#include "platform/Graph3D.h"
+#include "trace/Sweep.h"
+#include "trace/VerticalScale.h"
 
 namespace zel {
 
-/// Reads and writes the trace arrays of the panel, in the unit, range and level of the mirror.
+/// Works in the unit, range and level that the sweep was read with. A sample that did not come
+/// stays none.
 class TraceConversion {
   public:
-    TraceConversion(ControllerForm& panel, const ZEL3Variables& mirror, const Graph3D& graph3D)
-        : panel_(panel), mirror_(mirror), graph3D_(graph3D) {}
+    TraceConversion(ControllerForm& panel, const Graph3D& graph3D)
+        : panel_(panel), graph3D_(graph3D) {}
 
     /// Divisor from raw sample to unit: thousandths of a dB, microvolts or nanowatts.
-    void SelectRawScale();
-    void ConvertTrace();
-    /// `PeakTraceData` of the auto peak detector; values in volts are rounded to `decimals`.
-    void CalculateDataAutoPeak(int decimals);
-    /// `TraceData` of any other detector.
-    void CalculateDataNotAutoPeak(int decimals);
-    /// Lowers the value itself to the reference level, and returns it.
-    double ClipToReferenceLevel(double& value) const;
-    /// Lifts a value to the bottom of the display, ten divisions below the top. With
-    /// `useRangeCode` the range is a code, without it dB a division.
-    double ClipToBottom(double value, bool useRangeCode) const;
-    /// `TraceColours` of the values that the graph shows, by the range of the waterfall's axis 3.
-    void colour(const std::vector<double>& shown) const;
+    static void SelectRawScale(Sweep& sweep);
+    /// Fills `physical`, `shown` and `colours` from `raw`.
+    void ConvertTrace(Sweep& sweep);
+    /// Of the auto peak detector; values in volts are rounded to `decimals`.
+    void CalculateDataAutoPeak(Sweep& sweep, int decimals);
+    /// Of any other detector; keeps the extremes of the shown values.
+    void CalculateDataNotAutoPeak(Sweep& sweep, int decimals);
+    /// Colours of the values that the graph shows, by the range of the waterfall's axis 3.
+    std::vector<double> colour(const std::vector<double>& shown) const;
 
   private:
-    bool isLogarithmicUnit() const;
-    double linearDisplayValue(double value, bool clearOtherUnits) const;
+    void extend(std::size_t index, double shown);
 
-    ControllerForm& panel_;
-    const ZEL3Variables& mirror_;
+    ControllerForm& panel_;  ///< holds the extremes, which run over many traces
     const Graph3D& graph3D_;
 };
+
+/// The scale that a sweep was read with.
+VerticalScale verticalScale(const Sweep& sweep);
 
 }  // namespace zel

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
+#include <utility>
 
 #include "model/CodeTables.h"
 #include "support/NumberText.h"
@@ -13,6 +15,7 @@ namespace {
 constexpr std::size_t kBlock = 301;
 constexpr std::size_t kSecondBlock = 300;  // the pair of point i is (sample i, sample i - 1)
 constexpr double kIntervals = 300;
+constexpr double kNone = std::numeric_limits<double>::quiet_NaN();
 
 std::uint8_t byteOf(double number) {
     return static_cast<std::uint8_t>(static_cast<int>(std::clamp(number, 0.0, 255.0)));
@@ -20,13 +23,14 @@ std::uint8_t byteOf(double number) {
 
 }  // namespace
 
-TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, ZELBas& state,
+TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, ZELBas& state,
                          CommandExchange& exchange, BinaryTrace& binary,
                          TraceConversion& conversion, GraphScaling& scaling, PaceMonitor& pace,
                          Events& events, MessageBoxes& boxes)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
+      onGraph_(onGraph),
       state_(state),
       exchange_(exchange),
       binary_(binary),
@@ -123,56 +127,87 @@ void TraceReader::begin() {
     panel_.PlaySingleButton.Enabled = false;
 }
 
-void TraceReader::viewRange() {
-    panel_.ViewCenter = mirror_.CenterFrequency;
-    panel_.ViewSpan = mirror_.Span;
+SweepAxis TraceReader::viewRange() const {
+    SweepAxis axis;
+    axis.unit = GetDimension(panel_, mirror_);
+    axis.intervals = kIntervals;
     const bool distance = panel_.InstrumentMode == ControllerForm::DISTTOFAULTMEASURE;
-    if (panel_.ViewSpan != 0 && !distance) {
-        panel_.ViewStart = panel_.ViewCenter - panel_.ViewSpan / 2;
-        panel_.ViewStop = panel_.ViewCenter + panel_.ViewSpan / 2;
+    if (mirror_.Span != 0 && !distance) {
+        axis.start = mirror_.CenterFrequency - mirror_.Span / 2;
+        axis.stop = mirror_.CenterFrequency + mirror_.Span / 2;
     } else {
-        panel_.ViewStart = 0;
-        panel_.ViewStop = distance ? mirror_.CableLength : mirror_.SweepTime;
+        axis.stop = distance ? mirror_.CableLength : mirror_.SweepTime;
+    }
+    return axis;
+}
+
+void TraceReader::takeSamples(const RawTrace& trace) {
+    last_.wanted = trace.wanted;
+    last_.came = trace.came;
+    std::vector<double> wire = trace.values;
+    std::fill(wire.begin() + static_cast<std::ptrdiff_t>(trace.came), wire.end(), kNone);
+    if (!last_.autoPeak()) {
+        last_.raw = std::move(wire);
+        return;
+    }
+    // The second block is taken from one sample too early, as the instrument's own display has
+    // it: its first value is the first block's last, and its own last one is dropped.
+    last_.raw.resize(2 * kBlock);
+    for (std::size_t i = 0; i < kBlock; ++i) {
+        last_.raw[2 * i] = wire[i];
+        last_.raw[2 * i + 1] = wire[kSecondBlock + i];
     }
 }
 
-bool TraceReader::ReadTraceData(double& /*xFirstRef*/, double& /*xLastRef*/) {
-    if (mirror_.TraceDetector == DETAUTOPEAK) {
-        std::vector<double>& peak = panel_.PeakTraceData;
-        if (!binary_.GetTraceBinary(peak, true)) return false;
-        // The second block is taken from one sample too early, on purpose: its first value is the
-        // first block's last, and its own last one is dropped.
-        const std::vector<double> first(peak.begin(), peak.begin() + kBlock);
-        const std::vector<double> second(peak.begin() + kSecondBlock,
-                                         peak.begin() + kSecondBlock + kBlock);
-        for (std::size_t i = 0; i < kBlock; ++i) {
-            peak[2 * i] = first[i];
-            peak[2 * i + 1] = second[i];
+bool TraceReader::ReadTraceData(double xFirst, double xLast) {
+    last_.settings = mirror_;
+    last_.instrumentMode = panel_.InstrumentMode;
+    last_.time = pace_.sweepDate();
+    if (!last_.autoPeak()) {
+        panel_.TraceIntervals = kIntervals;
+        scaling_.SizeXYVectors(static_cast<int>(kIntervals));
+        double x = xFirst;
+        for (double& value : panel_.XVector) {
+            value = x;
+            x += (xLast - xFirst) / kIntervals;
         }
-        return true;
+        std::fill(panel_.YVector.begin(), panel_.YVector.end(), panel_.YVectorVal);
     }
-    panel_.TraceIntervals = kIntervals;
-    scaling_.SizeXYVectors(static_cast<int>(kIntervals));
-    const double step = (panel_.ViewStop - panel_.ViewStart) / panel_.TraceIntervals;
-    double x = panel_.ViewStart;
-    for (double& value : panel_.XVector) {
-        value = x;
-        x += step;
+    RawTrace trace;
+    const bool done = binary_.GetTraceBinary(trace, last_.autoPeak());
+    if (trace.wanted == 0) return done;  // refused, or silent ahead of the transfer
+    takeSamples(trace);
+    last_.axis = viewRange();
+    placePoints(last_);
+    TraceConversion::SelectRawScale(last_);
+    if (!done) {
+        conversion_.ConvertTrace(last_);  // for whoever shows what came before the end
+        if (last_.incomplete()) CutShort(last_);
     }
-    std::fill(panel_.YVector.begin(), panel_.YVector.end(), panel_.YVectorVal);
-    return binary_.GetTraceBinary(panel_.TraceData, false);
+    return done;
+}
+
+void TraceReader::writeForm() const {
+    panel_.ViewCenter = last_.settings.CenterFrequency;
+    panel_.ViewSpan = last_.settings.Span;
+    panel_.ViewXOffset = panel_.ViewSpan == 0 ? 0 : last_.axis.start;
+    panel_.RawScale = last_.rawScale;
+    panel_.RawTraceData = last_.physical;
+    (last_.autoPeak() ? panel_.PeakTraceData : panel_.TraceData) = last_.shown;
+    panel_.TraceColours = last_.colours;
+    panel_.Shown = {};
+    panel_.Shown.xUnit = last_.axis.unit;
+    panel_.Shown.instrumentMode = last_.instrumentMode;
 }
 
 void TraceReader::scaleAndConvert() {
-    panel_.Shown = {};
-    panel_.Shown.xUnit = GetDimension(panel_, mirror_);
-    panel_.Shown.instrumentMode = panel_.InstrumentMode;
-    conversion_.SelectRawScale();
-    panel_.ViewXOffset = panel_.ViewSpan == 0 ? 0 : panel_.ViewStart;
-    scaling_.setGraphAxes(panel_.ViewStart, panel_.ViewStop, mirror_.ReferenceLevel,
+    scaling_.setGraphAxes(last_.axis.start, last_.axis.stop, mirror_.ReferenceLevel,
                           byteOf(std::nearbyint(mirror_.ReferenceRange)), true);
-    conversion_.ConvertTrace();
-    if (recordsTraces()) panel_.SaveView("trace");
+    conversion_.ConvertTrace(last_);
+    writeForm();
+    onGraph_ = last_;
+    if (last_.incomplete()) CutShort(last_);
+    if (recordsTraces() && last_.whole()) panel_.SaveView("trace");
 }
 
 void TraceReader::waterfallRow() {
@@ -202,6 +237,7 @@ void TraceReader::ReadSingleTrace(bool& success) {
     success = false;
     const DialogueScope scope(state_);
     silenceToldHere_ = false;
+    last_ = {};
     if (!panel_.isConnected) {
         boxes_.show({BoxIcon::Information, "Please connect to the intrument first."});
         return;
@@ -212,21 +248,18 @@ void TraceReader::ReadSingleTrace(bool& success) {
     Step step = askSettings();
     if (step == Step::Ok) step = wait();
     if (step == Step::LinkFailed) return abortView(success);
-    double first = panel_.ViewStart;
-    double last = panel_.ViewStop;
-    if (step == Step::Refused || !ReadTraceData(first, last)) {
+    // The x values for the waterfall are those of the trace before.
+    if (step == Step::Refused || !ReadTraceData(panel_.ViewStart, panel_.ViewStop)) {
         panel_.MousePointer = 0;
         return;
     }
-    viewRange();
     if (!panel_.ContinuosLoopActive) {
         forms_.waterfall.resetRowCount();
         forms_.waterfall.Graph3D.clearValueLabels(2);
     }
     scaleAndConvert();
     waterfallRow();
-    scaling_.DisplayDataOnGraph(panel_.ViewStart, panel_.ViewStop, panel_.TraceIntervals,
-                                panel_.PeakTraceData, panel_.TraceData);
+    scaling_.DisplayDataOnGraph(onGraph_);
     pace_.drawn();
     panel_.RecordData.Visible = true;
     success = true;
@@ -239,6 +272,7 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     success = false;
     const DialogueScope scope(state_);
     silenceToldHere_ = false;
+    last_ = {};
     if (state_.ExchangeFailed) return abortView(success);
     const auto close = [this] {
         pointer(0);
@@ -259,13 +293,10 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     if (step == Step::Ok) step = wait();
     if (step == Step::LinkFailed) return abortView(success);
     if (step == Step::Refused) return close();
-    viewRange();
-    double first = panel_.ViewStart;
-    double last = panel_.ViewStop;
-    if (!ReadTraceData(first, last)) return close();
+    const SweepAxis axis = viewRange();
+    if (!ReadTraceData(axis.start, axis.stop)) return close();
     scaleAndConvert();
-    scaling_.DisplayDataOnGraph(panel_.ViewStart, panel_.ViewStop, panel_.TraceIntervals,
-                                panel_.PeakTraceData, panel_.TraceData);
+    scaling_.DisplayDataOnGraph(onGraph_);
     pace_.drawn();
     panel_.RecordData.Visible = true;
     success = true;

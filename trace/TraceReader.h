@@ -11,6 +11,7 @@
 #include "platform/MessageBox.h"
 #include "trace/GraphScaling.h"
 #include "trace/PaceMonitor.h"
+#include "trace/Sweep.h"
 #include "trace/TraceConversion.h"
 
 namespace zel {
@@ -26,14 +27,20 @@ struct ReadAgain {
 
 class TraceReader {
   public:
-    TraceReader(Forms& forms, ZEL3Variables& mirror, ZELBas& state, CommandExchange& exchange,
-                BinaryTrace& binary, TraceConversion& conversion, GraphScaling& scaling,
-                PaceMonitor& pace, Events& events, MessageBoxes& boxes);
+    /// `onGraph` takes each sweep that is drawn.
+    TraceReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, ZELBas& state,
+                CommandExchange& exchange, BinaryTrace& binary, TraceConversion& conversion,
+                GraphScaling& scaling, PaceMonitor& pace, Events& events, MessageBoxes& boxes);
 
-    /// The full cycle. True in `success` when a trace was read and drawn.
+    /// The full cycle. True in `success` when a trace was read and drawn, be it incomplete.
     void ReadSingleTrace(bool& success);
     /// The selective cycle: only the settings that are asked for, and those that are unsure.
     void ReadSingleTrace2(const ReadAgain& again, bool& success);
+    /// The sweep of the last cycle, also where the link ended in the middle of its transfer and
+    /// nothing was drawn; `wanted` is 0 when no transfer began.
+    const Sweep& lastSweep() const { return last_; }
+    /// The last sweep is incomplete, be it drawn or not.
+    Event<const Sweep&> CutShort;
 
   private:
     enum class Step { Ok, Refused, LinkFailed };
@@ -46,9 +53,11 @@ class TraceReader {
     Step askAgain(const ReadAgain& again);
     Step wait();
     void begin();
-    void viewRange();
-    bool ReadTraceData(double& xFirstRef, double& xLastRef);
+    SweepAxis viewRange() const;
+    bool ReadTraceData(double xFirst, double xLast);
+    void takeSamples(const RawTrace& trace);
     void scaleAndConvert();
+    void writeForm() const;
     void waterfallRow();
     void abortView(bool& success);
     void pointer(int shape);
@@ -58,6 +67,7 @@ class TraceReader {
     Forms& forms_;
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
+    Sweep& onGraph_;
     ZELBas& state_;
     CommandExchange& exchange_;
     BinaryTrace& binary_;
@@ -67,6 +77,7 @@ class TraceReader {
     Events& events_;
     MessageBoxes& boxes_;
     bool silenceToldHere_ = false;  ///< a failure of this cycle's line has a box of its own
+    Sweep last_;
 };
 
 }  // namespace zel

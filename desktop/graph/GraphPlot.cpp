@@ -1,6 +1,7 @@
 #include "desktop/graph/GraphPlot.h"
 
 #include <cmath>
+#include <limits>
 
 #include "desktop/graph/DivisionTicker.h"
 #include "desktop/graph/PolylineClip.h"
@@ -95,14 +96,20 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     triggerText_->setFont(plotFont());
     triggerText_->setPositionAlignment(Qt::AlignLeft | Qt::AlignBottom);
     triggerText_->setVisible(false);
-    old_ = new QCPItemText(&plot_);
-    old_->position->setType(QCPItemPosition::ptAxisRectRatio);
-    old_->position->setCoords(0.5, 0.04);
-    old_->setPositionAlignment(Qt::AlignHCenter | Qt::AlignTop);
+    old_ = addNote(0.04);
     old_->setText("OLD TRACE");
-    old_->setColor(colors_.trigger);
-    old_->setFont(plotFont());
-    old_->setVisible(false);
+    incomplete_ = addNote(0.10);
+}
+
+QCPItemText* GraphPlot::addNote(double height) {
+    auto* note = new QCPItemText(&plot_);
+    note->position->setType(QCPItemPosition::ptAxisRectRatio);
+    note->position->setCoords(0.5, height);
+    note->setPositionAlignment(Qt::AlignHCenter | Qt::AlignTop);
+    note->setColor(colors_.trigger);
+    note->setFont(plotFont());
+    note->setVisible(false);
+    return note;
 }
 
 AnnotationText* GraphPlot::addText(QCPLayoutGrid& grid, int row, int column,
@@ -144,6 +151,26 @@ void GraphPlot::setRanges(const Graph& graph) {
     set(plot_.yAxis, graph.yAxis());
 }
 
+void GraphPlot::takeTrace(const Graph& graph) {
+    const std::vector<double>& values = graph.values();
+    QVector<double> keys;
+    QVector<double> points;
+    keys.reserve(static_cast<qsizetype>(values.size()));
+    points.reserve(static_cast<qsizetype>(values.size()));
+    bool gap = true;
+    for (std::size_t i = 0; i < values.size(); ++i) {
+        // Of a pair one value may be missing: the line goes on through the other. Two and more
+        // make a gap, which is one point that is no number.
+        const bool missing = std::isnan(values[i]);
+        const bool alone = missing && i + 1 < values.size() && !std::isnan(values[i + 1]);
+        if (missing && (alone || gap)) continue;
+        gap = missing;
+        keys << graph.firstX() + static_cast<double>(i) * graph.increment();
+        points << values[i];
+    }
+    trace_->setData(keys, points, true);
+}
+
 void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     setRanges(graph);
     qSharedPointerCast<DivisionTicker>(plot_.xAxis->ticker())->setUnit(view.xUnit);
@@ -152,10 +179,7 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     plot_.yAxis->setTickLabels(graph.yAxis().ShowLabels);
     plot_.yAxis->setLabel(graph.yAxis().ShowLabels ? text(view.unit) : QString());
     if (!drawn_ || serial_ != graph.plotSerial()) {
-        const auto count = static_cast<int>(graph.values().size());
-        QVector<double> keys(count);
-        for (int i = 0; i < count; ++i) keys[i] = graph.firstX() + i * graph.increment();
-        trace_->setData(keys, QVector<double>(graph.values().begin(), graph.values().end()), true);
+        takeTrace(graph);
         serial_ = graph.plotSerial();
         drawn_ = true;
     }
@@ -177,6 +201,8 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     const std::string& note = graph.Note;
     old_->setText(note.empty() ? "OLD TRACE" : text(note));
     old_->setVisible(graph.Old || !note.empty());
+    incomplete_->setText(text(graph.Incomplete.get()));
+    incomplete_->setVisible(!graph.Incomplete.get().empty());
     QColor ink = colors_.trace;
     if (graph.Old) ink = ink.darker(200);
     if (trace_->pen().color() != ink) trace_->setPen(QPen(ink, trace_->pen().widthF()));
@@ -251,14 +277,16 @@ int GraphPlot::cursorAt(const QPointF& pixel) const {
 }
 
 QPointF GraphPlot::pointAt(double x) const {
-    const auto found = trace_->findBegin(x, true);
-    const auto data = trace_->data();
-    if (data->isEmpty()) return {x, 0};
-    auto at = data->at(found);
-    if (at == data->constEnd()) --at;
-    const auto next = at + 1;
-    if (next != data->constEnd() && std::fabs(next->key - x) < std::fabs(at->key - x)) at = next;
-    return {at->key, at->value};
+    // The nearest point that is a number: a cursor never stands in a gap.
+    QPointF nearest(x, 0);
+    double distance = std::numeric_limits<double>::infinity();
+    for (const QCPGraphData& point : *trace_->data()) {
+        const double away = std::fabs(point.key - x);
+        if (std::isnan(point.value) || away >= distance) continue;
+        distance = away;
+        nearest = {point.key, point.value};
+    }
+    return nearest;
 }
 
 }  // namespace zel

@@ -50,6 +50,8 @@ class GraphPlot {
         double x = 0;
     };
     AnnotationText* addText(QCPLayoutGrid& grid, int row, int column, Qt::Alignment alignment);
+    QCPItemText* addNote(double height);
+    void takeTrace(const Graph& graph);
     void styleAxes();
     void setRanges(const Graph& graph);
     void strike(const ViewAnnotations& view);
@@ -64,6 +66,7 @@ class GraphPlot {
     QCPItemStraightLine* trigger_ = nullptr;
     QCPItemText* triggerText_ = nullptr;
     QCPItemText* old_ = nullptr;
+    QCPItemText* incomplete_ = nullptr;
     unsigned long serial_ = 0;
     bool drawn_ = false;
 };

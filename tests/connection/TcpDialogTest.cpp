@@ -2,6 +2,7 @@
 
 #include "link/CommandExchange.h"
 #include "tests/connection/Bench.h"
+#include "trace/TraceReader.h"
 
 namespace zel {
 namespace {
@@ -191,14 +192,24 @@ TEST_F(TcpDialogTest, Quit_ConnectedSocket_StaysUp) {
     EXPECT_EQ(socket.state(), SocketState::Connected);
 }
 
-TEST_F(TcpDialogTest, PeerGoneInSession_TheNextExchangeEndsInItsTimeOut) {
+TEST_F(TcpDialogTest, PeerGoneInSession_EveryExchangeEndsAtOnceAndTheReasonIsToldOnce) {
     probed();
     Page(socket).whole();
     connectTcp();
     socket.peerCloses();
     std::string value;
-    EXPECT_LE(time([&] { EXPECT_FALSE(program.exchange().GetInstrument("FREQ", value)); }), 16'100);
-    EXPECT_EQ(shown(), Texts{"warning | ZELRemote | No response received!"});
+    bool success = true;
+    const auto useIt = [&] {
+        EXPECT_FALSE(program.exchange().GetInstrument("FREQ", value));
+        EXPECT_FALSE(program.exchange().SetInstrument("FREQ,1"));
+        EXPECT_FALSE(program.exchange().CmdInstrument("WAIT"));
+    };
+    EXPECT_LE(time(useIt), 1);
+    EXPECT_EQ(shown(), Texts{"critical | ZELRemote | TCP/IP Socket error\r\nPlease make a new "
+                             "connection.\r\nThe other end closed the connection."});
+    EXPECT_TRUE(panel.CWGraph1.Old);
+    program.traces().ReadSingleTrace(success);
+    EXPECT_FALSE(success);
 }
 
 }  // namespace

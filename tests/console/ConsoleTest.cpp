@@ -296,13 +296,20 @@ TEST(ControlActionsTest, Keys_ReachTheBoxByName) {
     EXPECT_EQ(pressNamedKey(box, "f2"), Done::NoKey);
 }
 
+Sweep sweepOf(std::vector<double> values, int detector, double first, double increment) {
+    Sweep sweep;
+    sweep.physical = std::move(values);
+    sweep.settings.TraceDetector = static_cast<std::uint8_t>(detector);
+    sweep.axis.first = first;
+    sweep.axis.increment = increment;
+    return sweep;
+}
+
 TEST(SweepRows, AutoPeak_GivesPairsAtTheFirstValuesPlace) {
-    ControllerForm panel;
-    panel.RawTraceData.assign(602, -50);
-    panel.RawTraceData[2] = -70.5;
-    panel.RawTraceData[3] = -60.25;
-    panel.CWGraph1.plotY(panel.RawTraceData, 1000, 5);
-    const auto rows = sweepRows(panel, true);
+    Sweep sweep = sweepOf(std::vector<double>(602, -50), DETAUTOPEAK, 1000, 5);
+    sweep.physical[2] = -70.5;
+    sweep.physical[3] = -60.25;
+    const auto rows = sweepRows(sweep);
     ASSERT_EQ(rows.size(), 301U);
     EXPECT_EQ(rows[0], "1000,-50,-50");
     EXPECT_EQ(rows[1], "1010,-70.5,-60.25");
@@ -310,20 +317,23 @@ TEST(SweepRows, AutoPeak_GivesPairsAtTheFirstValuesPlace) {
 }
 
 TEST(SweepRows, OtherDetector_GivesOneValueARowAndReadsBackExactly) {
-    ControllerForm panel;
-    panel.RawTraceData.assign(301, 0.1 + 0.2);
-    panel.CWGraph1.plotY(panel.RawTraceData, 0, 1.0 / 3);
-    const auto rows = sweepRows(panel, false);
+    const auto rows =
+        sweepRows(sweepOf(std::vector<double>(301, 0.1 + 0.2), DETSAMPLE, 0, 1.0 / 3));
     ASSERT_EQ(rows.size(), 301U);
     const auto comma = rows[1].find(',');
     EXPECT_EQ(leadingNumber(rows[1].substr(0, comma)), 1.0 / 3);
     EXPECT_EQ(leadingNumber(rows[1].substr(comma + 1)), 0.1 + 0.2);
 }
 
-TEST(SweepRows, NoTrace_GivesNoRows) {
-    const ControllerForm panel;
-    EXPECT_TRUE(sweepRows(panel, true).empty());
+TEST(SweepRows, PointThatDidNotComeWhole_HasNoRow) {
+    const double none = std::numeric_limits<double>::quiet_NaN();
+    EXPECT_EQ(sweepRows(sweepOf({-1, -2, none}, DETSAMPLE, 10, 5)),
+              (std::vector<std::string>{"10,-1", "15,-2"}));
+    EXPECT_EQ(sweepRows(sweepOf({-1, -2, -3, none}, DETAUTOPEAK, 10, 5)),
+              std::vector<std::string>{"10,-1,-2"});
 }
+
+TEST(SweepRows, NoTrace_GivesNoRows) { EXPECT_TRUE(sweepRows(Sweep{}).empty()); }
 
 TEST(GraphLines, PlotAndCursor_AreTold) {
     ControllerForm panel;

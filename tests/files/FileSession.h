@@ -49,20 +49,26 @@ struct FileSession : TestSession {
 
     /// A trace of these raw samples is on the graph, as behind a read cycle.
     void sweepOf(const std::vector<double>& samples) {
-        const bool pairs = mirror.TraceDetector == 0;
-        (pairs ? panel.PeakTraceData : panel.TraceData) = samples;
-        TraceConversion conversion(panel, mirror, forms.waterfall.Graph3D);
-        conversion.SelectRawScale();
-        conversion.ConvertTrace();
-        panel.TraceIntervals = 300;
-        panel.ViewSpan = mirror.Span;
-        panel.ViewStart = mirror.Span == 0 ? 0 : mirror.CenterFrequency - mirror.Span / 2;
-        panel.ViewStop =
-            mirror.Span == 0 ? mirror.SweepTime : mirror.CenterFrequency + mirror.Span / 2;
+        Sweep& sweep = program.sweep();
+        sweep = {};
+        sweep.raw = samples;
+        sweep.wanted = sweep.came = samples.size();
+        sweep.settings = mirror;
+        sweep.instrumentMode = panel.InstrumentMode;
+        if (mirror.Span == 0) {
+            sweep.axis.stop = mirror.SweepTime;
+        } else {
+            sweep.axis.start = mirror.CenterFrequency - mirror.Span / 2;
+            sweep.axis.stop = mirror.CenterFrequency + mirror.Span / 2;
+        }
+        placePoints(sweep);
+        panel.ViewStart = sweep.axis.start;
+        panel.ViewStop = sweep.axis.stop;
+        TraceConversion conversion(panel, forms.waterfall.Graph3D);
+        TraceConversion::SelectRawScale(sweep);
+        conversion.ConvertTrace(sweep);
     }
-    const std::vector<double>& drawn() const {
-        return mirror.TraceDetector == 0 ? panel.PeakTraceData : panel.TraceData;
-    }
+    const std::vector<double>& drawn() { return program.sweep().shown; }
     /// From 1.4995 GHz to 1.5005 GHz.
     void narrowSpan() {
         mirror.CenterFrequency = 1.5e9;

@@ -21,6 +21,7 @@ struct ShownFileTest : FileSession, ::testing::Test {
         writer.sweepOf(ramp(-35000, -100));
         text = writer.save("view.csv");
         writer.panel.InstrumentMode = CF::DISTTOFAULTMEASURE;
+        writer.sweepOf(ramp(-35000, -100));
         faults = writer.save("faults.csv");
     }
     void show(const std::string& what) {

@@ -55,8 +55,8 @@ TEST_F(ViewWriterTest, ZeroSpan_GivesEveryRowTheSameX) {
 TEST_F(ViewWriterTest, SmallX_HasNoLeadingZero) {
     panel.InstrumentMode = CF::DISTTOFAULTMEASURE;
     sweepOf(ramp(-35000, 0));
-    panel.ViewStart = 0;
-    panel.ViewStop = 150;
+    program.sweep().axis.start = 0;
+    program.sweep().axis.stop = 150;
     const Texts found = rows(save("view.csv"));
     ASSERT_EQ(found.size(), 301U);
     EXPECT_EQ(found[0], ".000;-35; ");
@@ -68,7 +68,7 @@ TEST_F(ViewWriterTest, LinearRange_SavesTheValuesUnconverted) {
     mirror.ReferenceRange = 4;
     sweepOf(ramp(-35250, 0));
     EXPECT_EQ(rows(save("view.csv")).at(0), "1499500000.000;-35.25; ");
-    EXPECT_NE(panel.TraceData.at(0), -35.25);
+    EXPECT_NE(drawn().at(0), -35.25);
 }
 
 TEST_F(ViewWriterTest, Noheader_LeavesAPlainTable) {
@@ -147,7 +147,8 @@ struct LogHead {
 TEST_F(ViewWriterTest, OldLog_NamesSpanDetectorAndRange) {
     // A writer beside the program's own: no menu reaches the older format.
     FileOps files(panel, platform.fileDialogs, platform.folder, platform.files, platform.clock);
-    ViewWriter writer(forms, mirror, program.exchange(), files, platform.clock, boxes);
+    ViewWriter writer(forms, mirror, program.sweep(), program.exchange(), files, platform.clock,
+                      boxes);
     const LogHead heads[] = {{3, 3, 1, "Data at;"},
                              {3, 4, 1, "Data(LIN) at;"},
                              {0, 3, 1, "Data(MinMax) at;"},

@@ -22,13 +22,14 @@ std::vector<double> asDoubles(const std::vector<std::int32_t>& samples) {
 std::string doubleBlock() { return traceBlock(ramp(-1000)) + traceBlock(ramp(70000)); }
 
 struct TraceRig : LineRig {
-    std::vector<double> values;
+    RawTrace trace;
+    std::vector<double>& values = trace.values;
     /// One round; the dialogue is given back for its timing.
     Dialogue& script(const std::string& bytes) {
         port.expect("GET\r").answer("0\r");
         return port.expect("TRACEBIN\r").answer(bytes);
     }
-    bool read(bool doubled = false) { return binary.GetTraceBinary(values, doubled); }
+    bool read(bool doubled = false) { return binary.GetTraceBinary(trace, doubled); }
 };
 
 struct Trace : TraceRig, ::testing::Test {};
@@ -283,18 +284,65 @@ TEST_F(Trace, PortDiesInTheMiddle_IsToldWithItsReasonAndFalse) {
     script("0\r" + levelBlock(1).substr(0, 500)).dies();
     values.assign(301, 42);
     EXPECT_LE(time([this] { EXPECT_FALSE(read()); }), 100);
-    EXPECT_EQ(values, std::vector<double>(301, 42));
+    EXPECT_EQ(trace.came, 125U);
+    EXPECT_EQ(values[124], 1);
+    EXPECT_EQ(values[125], 42);
     EXPECT_EQ(shown(), Texts{"critical | ZELRemote | Port is not open!\r\nCOM1 has gone."});
     EXPECT_TRUE(exchange.ExchangeFailed());
 }
 
-TEST_F(Trace, SocketDiesInTheMiddle_LeavesTheValues) {
+TEST_F(Trace, SocketDiesInTheMiddle_IsFalseAndKeepsWhatCame) {
     overTcp();
     socket.expect("GET\r").answer("0\r");
     socket.expect("TRACEBIN\r").answer("0\r" + levelBlock(1).substr(0, 500)).dies();
     values.assign(301, 42);
-    EXPECT_LE(time([this] { read(); }), 100);
-    EXPECT_EQ(values, std::vector<double>(301, 42));
+    EXPECT_LE(time([this] { EXPECT_FALSE(read()); }), 100);
+    EXPECT_EQ(trace.came, 125U);
+    EXPECT_EQ(trace.wanted, 301U);
+    EXPECT_EQ(values[125], 42);
+    EXPECT_EQ(shown().size(), 1U);
+    EXPECT_TRUE(exchange.ExchangeFailed());
+}
+
+/// What came of a transfer that brings the first `bytes` bytes of its block, or of both blocks.
+std::size_t cameOf(std::size_t bytes, bool doubled) {
+    TraceRig rig;
+    const std::string block = doubled ? doubleBlock() : traceBlock(ramp(0));
+    rig.script("0\r" + block.substr(0, bytes));
+    EXPECT_TRUE(rig.read(doubled));
+    EXPECT_EQ(rig.trace.wanted, doubled ? 602U : 301U);
+    EXPECT_EQ(rig.trace.whole(), bytes == block.size());
+    return rig.trace.came;
+}
+
+TEST(TransferThatIsCut, Single_CountsTheSamplesThatCame) {
+    EXPECT_EQ(cameOf(0, false), 0U);
+    EXPECT_EQ(cameOf(3, false), 0U);
+    EXPECT_EQ(cameOf(4, false), 1U);
+    EXPECT_EQ(cameOf(600, false), 150U);
+    EXPECT_EQ(cameOf(603, false), 150U);
+    EXPECT_EQ(cameOf(1201, false), 300U);
+    EXPECT_EQ(cameOf(1205, false), 301U);
+}
+
+TEST(TransferThatIsCut, LessThanASampleMissing_LeavesNoSampleToTrust) {
+    for (std::size_t bytes = 1202; bytes < 1205; ++bytes) EXPECT_EQ(cameOf(bytes, false), 0U);
+    for (std::size_t bytes = 2407; bytes < 2410; ++bytes) EXPECT_EQ(cameOf(bytes, true), 0U);
+}
+
+TEST(TransferThatIsCut, Double_DoesNotCountTheSeparator) {
+    EXPECT_EQ(cameOf(1204, true), 301U);
+    EXPECT_EQ(cameOf(1205 + 3, true), 301U);
+    EXPECT_EQ(cameOf(1205 + 4, true), 302U);
+    EXPECT_EQ(cameOf(2406, true), 601U);
+    EXPECT_EQ(cameOf(2410, true), 602U);
+}
+
+TEST_F(Trace, DigitOfARefusalWithSamplesBehindIt_IsAWrongDigit) {
+    script("1\r" + traceBlock(ramp(5))).chunks({2}, 5);
+    EXPECT_TRUE(read());
+    EXPECT_TRUE(trace.whole());
+    EXPECT_EQ(values, asDoubles(ramp(5)));
 }
 
 }  // namespace

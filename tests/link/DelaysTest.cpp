@@ -100,16 +100,16 @@ void scriptComplexTrace(LineRig& rig) {
 }
 
 TEST(Delays, Trace_ByKind) {
-    std::vector<double> values;
+    RawTrace trace;
     const Times times =
-        timesByKind(scriptTrace, [&](LineRig& rig) { rig.binary.GetTraceBinary(values, false); });
+        timesByKind(scriptTrace, [&](LineRig& rig) { rig.binary.GetTraceBinary(trace, false); });
     EXPECT_EQ(times, (Times{0, 200, 500, 0, 500}));
 }
 
 TEST_F(ModemDelays, Trace_100BehindGetAnd100BehindTheKeyword) {
     scriptTrace(*this);
-    std::vector<double> values;
-    binary.GetTraceBinary(values, false);
+    RawTrace trace;
+    binary.GetTraceBinary(trace, false);
     EXPECT_EQ(debug.momentOf("-> TRACEBIN\r"), 100);
     EXPECT_EQ(now(), 200);
 }

@@ -76,7 +76,7 @@ struct LineRig {
     ByteLink link{forms, state, port, socket, session, debug};
     AnswerReader reader{forms, state, link, session};
     CommandExchange exchange{panel, state, link, reader, session};
-    BinaryReader byteReader{forms, state, link, socket, session};
+    BinaryReader byteReader{forms, state, link, session};
     BinaryTrace binary{panel, state, link, reader, byteReader, session};
 
     /// The same session over a socket, whose script is `socket`.

@@ -254,6 +254,18 @@ TEST_F(GraphScalingTest, SetGraphAxes_CallsTheWaterfallInItsOrder) {
     expectLevels(-120, -20);
 }
 
+/// A whole sweep without an axis.
+Sweep sweepOf(int detector, double span, double sweepTime) {
+    Sweep sweep;
+    sweep.settings.TraceDetector = static_cast<std::uint8_t>(detector);
+    sweep.settings.Span = span;
+    sweep.settings.SweepTime = sweepTime;
+    sweep.shown.assign(detector == DETAUTOPEAK ? 602 : 301, -40);
+    sweep.colours.assign(sweep.shown.size(), 50);
+    sweep.wanted = sweep.came = sweep.shown.size();
+    return sweep;
+}
+
 struct PlotRow {
     double span;
     int detector;
@@ -264,13 +276,12 @@ struct PlotRow {
 class Plotted : public GraphScalingTest, public ::testing::WithParamInterface<PlotRow> {};
 
 TEST_P(Plotted, DisplayDataOnGraph_HasItsFirstXAndIncrement) {
-    mirror.Span = GetParam().span;
-    mirror.SweepTime = 0.5;
-    mirror.TraceDetector = static_cast<std::uint8_t>(GetParam().detector);
-    const std::vector<double> peak(602, 1);
-    const std::vector<double> trace(301, 2);
-    scaling.DisplayDataOnGraph(1e9, 1.6e9, 300, peak, trace);
-    EXPECT_EQ(graph.values(), GetParam().detector == DETAUTOPEAK ? peak : trace);
+    Sweep sweep = sweepOf(GetParam().detector, GetParam().span, 0.5);
+    sweep.axis.start = 1e9;
+    sweep.axis.stop = 1.6e9;
+    placePoints(sweep);
+    scaling.DisplayDataOnGraph(sweep);
+    EXPECT_EQ(graph.values(), sweep.shown);
     EXPECT_EQ(graph.firstX(), GetParam().first);
     EXPECT_DOUBLE_EQ(graph.increment(), GetParam().increment);
 }
@@ -282,27 +293,40 @@ INSTANTIATE_TEST_SUITE_P(Cases, Plotted,
                                            PlotRow{0, DETAUTOPEAK, 0, 0.5 / 596}));
 
 TEST_F(GraphScalingTest, DisplayDataOnGraph_AtZeroSpan_EndsTwoStepsBeyondTheSweepTime) {
-    mirror.Span = 0;
-    mirror.SweepTime = 0.298;
-    mirror.TraceDetector = DETSAMPLE;
-    scaling.DisplayDataOnGraph(0, 0.298, 300, {}, std::vector<double>(301, 0));
+    Sweep sweep = sweepOf(DETSAMPLE, 0, 0.298);
+    sweep.axis.stop = 0.298;
+    placePoints(sweep);
+    scaling.DisplayDataOnGraph(sweep);
     EXPECT_NEAR(graph.firstX() + 300 * graph.increment(), 0.3, 1e-12);
 }
 
 TEST_F(GraphScalingTest, DisplayDataOnGraph_AutoPeak_GivesTheWaterfallItsCurve) {
-    mirror.TraceDetector = DETAUTOPEAK;
     panel.YVectorVal = 3;
     panel.ViewStart = 100;
-    panel.TraceColours.assign(602, 50);
-    const std::vector<double> peak(602, -40);
-    scaling.DisplayDataOnGraph(100, 700, 300, peak, {});
+    Sweep sweep = sweepOf(DETAUTOPEAK, 600, 0);
+    sweep.axis.start = 100;
+    sweep.axis.stop = 700;
+    placePoints(sweep);
+    scaling.DisplayDataOnGraph(sweep);
     const GraphCurve3D& curve = graph3D.plots().back();
     EXPECT_EQ(curve.depth, std::vector<double>(602, 3));
     ASSERT_EQ(curve.x.size(), 602U);
     EXPECT_EQ(curve.x.front(), 100);
     EXPECT_NEAR(curve.x.back(), 701, 1e-9);
-    EXPECT_EQ(curve.level, peak);
-    EXPECT_EQ(curve.colour, panel.TraceColours);
+    EXPECT_EQ(curve.level, sweep.shown);
+    EXPECT_EQ(curve.colour, sweep.colours);
+}
+
+TEST_F(GraphScalingTest, DisplayDataOnGraph_IncompleteSweep_IsMarkedAndNoRowOfTheWaterfall) {
+    Sweep sweep = sweepOf(DETSAMPLE, 600, 0);
+    sweep.came = 150;
+    scaling.DisplayDataOnGraph(sweep);
+    EXPECT_EQ(graph.Incomplete.get(), "INCOMPLETE 150/301");
+    EXPECT_TRUE(graph3D.plots().back().level.empty());
+    sweep.came = 301;
+    scaling.DisplayDataOnGraph(sweep);
+    EXPECT_EQ(graph.Incomplete.get(), "");
+    EXPECT_EQ(graph3D.plots().back().level, sweep.shown);
 }
 
 TEST_F(GraphScalingTest, BuildXYVectors_Fills602ValuesFromTheViewsStart) {

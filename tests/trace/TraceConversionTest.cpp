@@ -1,6 +1,8 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <limits>
+#include <utility>
 #include <vector>
 
 #include "forms/Forms.h"
@@ -14,51 +16,54 @@ constexpr double kFiftyOhm = 16.9897000433602;  // 10 * log10(50)
 
 struct TraceConversionTest : ::testing::Test {
     ControllerForm panel;
-    ZEL3Variables mirror;
     WaterfallForm waterfall;
-    TraceConversion conversion{panel, mirror, waterfall.Graph3D};
+    Sweep sweep;
+    ZEL3Variables& settings = sweep.settings;
+    TraceConversion conversion{panel, waterfall.Graph3D};
 
-    TraceConversionTest() { mirror.TraceDetector = DETSAMPLE; }
+    TraceConversionTest() { settings.TraceDetector = DETSAMPLE; }
 
     void view(double unit, double range, double level) {
-        mirror.ReferenceUnit = unit;
-        mirror.ReferenceRange = range;
-        mirror.ReferenceLevel = level;
-        conversion.SelectRawScale();
+        settings.ReferenceUnit = unit;
+        settings.ReferenceRange = range;
+        settings.ReferenceLevel = level;
+        TraceConversion::SelectRawScale(sweep);
     }
-    /// Converts one raw sample of a detector that gives one a point.
-    void convert(double raw) {
-        panel.TraceData = {raw};
-        conversion.ConvertTrace();
+    /// Converts raw samples of a detector that gives one a point.
+    void convert(std::vector<double> raw) {
+        sweep.raw = std::move(raw);
+        conversion.ConvertTrace(sweep);
     }
-    void convertPeak(double raw) {
-        mirror.TraceDetector = DETAUTOPEAK;
-        panel.PeakTraceData = {raw};
-        conversion.ConvertTrace();
+    void convertPeak(std::vector<double> raw) {
+        settings.TraceDetector = DETAUTOPEAK;
+        convert(std::move(raw));
+    }
+    double bottom(double unit, LevelRange range, double level) const {
+        return VerticalScale{unit, level, range}.ClipToBottom(-500);
     }
 };
 
 TEST_F(TraceConversionTest, SelectRawScale_FollowsTheUnit) {
     const double wanted[] = {1e3, 1e3, 1e3, 1e3, 1e3, 1e3, 1e6, 1e9, 1e3};
     for (int unit = 0; unit <= 8; ++unit) {
-        mirror.ReferenceUnit = unit;
-        conversion.SelectRawScale();
-        EXPECT_EQ(panel.RawScale, wanted[unit]) << "unit " << unit;
+        settings.ReferenceUnit = unit;
+        TraceConversion::SelectRawScale(sweep);
+        EXPECT_EQ(sweep.rawScale, wanted[unit]) << "unit " << unit;
     }
 }
 
 TEST_F(TraceConversionTest, ExampleOnALogarithmicRange_IsDrawnAndSavedAsMeasured) {
     view(UNITDBM, RANGE10DB, -20);
-    convert(-35250);
-    EXPECT_EQ(panel.TraceData[0], -35.25);
-    EXPECT_EQ(panel.RawTraceData[0], -35.25);
+    convert({-35250});
+    EXPECT_EQ(sweep.shown[0], -35.25);
+    EXPECT_EQ(sweep.physical[0], -35.25);
 }
 
 TEST_F(TraceConversionTest, ExampleOnALinearRange_IsDrawnInPercentAndSavedAsMeasured) {
     view(UNITDBM, RANGELIN, -20);
-    convert(-35250);
-    EXPECT_NEAR(panel.TraceData[0], 17.2783, 1e-4);
-    EXPECT_EQ(panel.RawTraceData[0], -35.25);
+    convert({-35250});
+    EXPECT_NEAR(sweep.shown[0], 17.2783, 1e-4);
+    EXPECT_EQ(sweep.physical[0], -35.25);
 }
 
 /// What one raw sample becomes, for a detector that gives one a point and for auto peak.
@@ -80,16 +85,16 @@ class UnitAndRange : public TraceConversionTest, public ::testing::WithParamInte
 
 TEST_P(UnitAndRange, Sample_OfOneAPoint_IsShownAndSaved) {
     view(GetParam().unit, GetParam().range, GetParam().level);
-    convert(GetParam().raw);
-    EXPECT_NEAR(panel.TraceData[0], GetParam().shown, 1e-9);
-    EXPECT_NEAR(panel.RawTraceData[0], GetParam().saved, 1e-12);
+    convert({GetParam().raw});
+    EXPECT_NEAR(sweep.shown[0], GetParam().shown, 1e-9);
+    EXPECT_NEAR(sweep.physical[0], GetParam().saved, 1e-12);
 }
 
 TEST_P(UnitAndRange, Sample_OfAutoPeak_IsShownAndSaved) {
     view(GetParam().unit, GetParam().range, GetParam().level);
-    convertPeak(GetParam().raw);
-    EXPECT_NEAR(panel.PeakTraceData[0], GetParam().shownPeak, 1e-9);
-    EXPECT_NEAR(panel.RawTraceData[0], GetParam().savedPeak, 1e-12);
+    convertPeak({GetParam().raw});
+    EXPECT_NEAR(sweep.shown[0], GetParam().shownPeak, 1e-9);
+    EXPECT_NEAR(sweep.physical[0], GetParam().savedPeak, 1e-12);
 }
 
 std::vector<Case> decibelCases() {
@@ -146,95 +151,93 @@ INSTANTIATE_TEST_SUITE_P(Linear, UnitAndRange, ::testing::ValuesIn(linearCases()
 
 TEST_F(TraceConversionTest, DecibelUnit_RoundsToThreeDecimalsHalfToEven) {
     view(UNITDBM, RANGE10DB, 0);
-    panel.RawScale = 4000;  // makes ties of a thousandth
-    panel.TraceData = {-4002, -4006};
-    conversion.ConvertTrace();
-    EXPECT_DOUBLE_EQ(panel.RawTraceData[0], -1.0);
-    EXPECT_DOUBLE_EQ(panel.RawTraceData[1], -1.002);
+    sweep.rawScale = 4000;  // makes ties of a thousandth
+    convert({-4002, -4006});
+    EXPECT_DOUBLE_EQ(sweep.physical[0], -1.0);
+    EXPECT_DOUBLE_EQ(sweep.physical[1], -1.002);
 }
 
 TEST_F(TraceConversionTest, Volts_RoundToTenDecimals) {
     view(UNITV, RANGELIN, 1);
-    panel.RawScale = 3e6;
-    convert(1e6);
-    EXPECT_DOUBLE_EQ(panel.RawTraceData[0], 0.3333333333);
+    sweep.rawScale = 3e6;
+    convert({1e6});
+    EXPECT_DOUBLE_EQ(sweep.physical[0], 0.3333333333);
 }
 
 TEST_F(TraceConversionTest, Watts_KeepAllTheirDecimals) {
     view(UNITW, RANGELIN, 1);
-    panel.RawScale = 3e9;
-    convert(1);
-    EXPECT_DOUBLE_EQ(panel.RawTraceData[0], 1 / 3e9);
+    sweep.rawScale = 3e9;
+    convert({1});
+    EXPECT_DOUBLE_EQ(sweep.physical[0], 1 / 3e9);
 }
 
 TEST_F(TraceConversionTest, NegativeSampleOfALinearUnit_LiesAtTheBottom) {
     view(UNITV, RANGE10DB, 1);
-    convert(-5);
-    EXPECT_NEAR(panel.TraceData[0], 30 - kFiftyOhm - 100, 1e-9);
+    convert({-5});
+    EXPECT_NEAR(sweep.shown[0], 30 - kFiftyOhm - 100, 1e-9);
 }
 
 TEST_F(TraceConversionTest, ClipToReferenceLevel_LowersTheValueItself) {
-    mirror.ReferenceLevel = -20;
     double value = -5;
-    EXPECT_EQ(conversion.ClipToReferenceLevel(value), -20);
+    EXPECT_EQ((VerticalScale{UNITDBM, -20, LevelRange::ofCode(0)}.ClipToReferenceLevel(value)),
+              -20);
     EXPECT_EQ(value, -20);
 }
 
 TEST_F(TraceConversionTest, ClipToReferenceLevel_LeavesALowerValue) {
-    mirror.ReferenceLevel = -20;
     double value = -30;
-    EXPECT_EQ(conversion.ClipToReferenceLevel(value), -30);
+    EXPECT_EQ((VerticalScale{UNITDBM, -20, LevelRange::ofCode(0)}.ClipToReferenceLevel(value)),
+              -30);
     EXPECT_EQ(value, -30);
 }
 
 TEST_F(TraceConversionTest, ClipToBottom_WithRangeCode_CountsTenDivisions) {
     const double bottoms[] = {-120, -70, -40, -30, -120, -120, -120, -120, -120};
-    for (int range = RANGE10DB; range <= RANGEVSWR11; ++range) {
-        view(UNITDBM, range, -20);
-        EXPECT_EQ(conversion.ClipToBottom(-500, true), bottoms[range]) << "range " << range;
-    }
+    for (int range = RANGE10DB; range <= RANGEVSWR11; ++range)
+        EXPECT_EQ(bottom(UNITDBM, LevelRange::ofCode(range), -20), bottoms[range]) << range;
 }
 
 TEST_F(TraceConversionTest, ClipToBottom_WithoutRangeCode_TakesTheRangeAsDecibels) {
-    view(UNITDBM, 5, -20);
-    EXPECT_EQ(conversion.ClipToBottom(-500, false), -70);
+    EXPECT_EQ(bottom(UNITDBM, LevelRange::ofDecibels(5), -20), -70);
 }
 
 TEST_F(TraceConversionTest, ClipToBottom_RangeThatIsNotWhole_IsRounded) {
-    view(UNITDBM, 0.6, -20);
-    EXPECT_EQ(conversion.ClipToBottom(-500, true), -70);
+    EXPECT_EQ(bottom(UNITDBM, LevelRange::ofCode(0.6), -20), -70);
 }
 
 TEST_F(TraceConversionTest, ClipToBottom_InVoltsAndWatts_CountsFromTheLevelInDbm) {
-    view(UNITV, RANGE10DB, 1);
-    EXPECT_NEAR(conversion.ClipToBottom(-500, true), 30 - kFiftyOhm - 100, 1e-9);
-    view(UNITW, RANGE10DB, 0.001);
-    EXPECT_NEAR(conversion.ClipToBottom(-500, true), -100, 1e-9);
+    const LevelRange range = LevelRange::ofCode(RANGE10DB);
+    EXPECT_NEAR(bottom(UNITV, range, 1), 30 - kFiftyOhm - 100, 1e-9);
+    EXPECT_NEAR(bottom(UNITW, range, 0.001), -100, 1e-9);
 }
 
-TEST_F(TraceConversionTest, Detectors_ChooseTheArray) {
+TEST(LevelRange, Code_IsThatOfTheDecibels) {
+    EXPECT_EQ(LevelRange::ofDecibels(5).code(), RANGE5DB);
+    EXPECT_EQ(LevelRange::ofDecibels(RANGELIN).code(), RANGELIN);
+    EXPECT_EQ(LevelRange::ofCode(RANGE2DB).code(), RANGE2DB);
+    EXPECT_EQ(LevelRange::ofCode(RANGE2DB).perDivision(), 2);
+    EXPECT_EQ(LevelRange::ofDecibels(2).perDivision(), 2);
+}
+
+TEST_F(TraceConversionTest, SamplesThatDidNotCome_AreNoNumbersAndNoExtremes) {
+    const double none = std::numeric_limits<double>::quiet_NaN();
     view(UNITDBM, RANGE10DB, 0);
-    for (const int detector : {DETMINPEAK, DETMAXPEAK, DETSAMPLE, DETRMS}) {
-        mirror.TraceDetector = static_cast<std::uint8_t>(detector);
-        panel.TraceData = {-1000};
-        panel.PeakTraceData = {-2000, -3000};
-        conversion.ConvertTrace();
-        EXPECT_EQ(panel.TraceData[0], -1) << "detector " << detector;
-        EXPECT_EQ(panel.PeakTraceData[0], -2000) << "detector " << detector;
-        EXPECT_EQ(panel.RawTraceData.size(), 1U);
-    }
-    mirror.TraceDetector = DETAUTOPEAK;
-    conversion.ConvertTrace();
-    EXPECT_EQ(panel.PeakTraceData[1], -3);
-    EXPECT_EQ(panel.RawTraceData.size(), 2U);
+    convert({-10000, none, none});
+    EXPECT_EQ(sweep.shown[0], -10);
+    EXPECT_TRUE(std::isnan(sweep.shown[1]));
+    EXPECT_TRUE(std::isnan(sweep.physical[2]));
+    EXPECT_EQ(panel.TraceMinimum, -10);
+    EXPECT_EQ(panel.TraceMaximum, -10);
+    convertPeak({-10000, none});
+    EXPECT_EQ(sweep.physical[0], -10);
+    EXPECT_TRUE(std::isnan(sweep.shown[1]));
 }
 
 TEST_F(TraceConversionTest, Extremes_StartAtTheFirstPointWhileThereIsOnePlot) {
     view(UNITDBM, RANGE10DB, 0);
     panel.TraceMinimum = -500;
     panel.TraceMaximum = 500;
-    panel.TraceData = {-10000, -30000, -20000};
-    conversion.ConvertTrace();
+    convert({-10000, -30000, -20000});
     EXPECT_EQ(panel.TraceMinimum, -30);
     EXPECT_EQ(panel.TraceMaximum, -10);
 }
@@ -244,8 +247,7 @@ TEST_F(TraceConversionTest, Extremes_RunOnWhileTheWaterfallKeepsPlots) {
     waterfall.Graph3D.addPlot();
     panel.TraceMinimum = -50;
     panel.TraceMaximum = -5;
-    panel.TraceData = {-60000, -30000};
-    conversion.ConvertTrace();
+    convert({-60000, -30000});
     EXPECT_EQ(panel.TraceMinimum, -60);
     EXPECT_EQ(panel.TraceMaximum, -5);
 }
@@ -254,7 +256,7 @@ TEST_F(TraceConversionTest, Extremes_AreLeftAloneByAutoPeak) {
     view(UNITDBM, RANGE10DB, 0);
     panel.TraceMinimum = 1;
     panel.TraceMaximum = 2;
-    convertPeak(-50000);
+    convertPeak({-50000});
     EXPECT_EQ(panel.TraceMinimum, 1);
     EXPECT_EQ(panel.TraceMaximum, 2);
 }
@@ -262,34 +264,29 @@ TEST_F(TraceConversionTest, Extremes_AreLeftAloneByAutoPeak) {
 TEST_F(TraceConversionTest, Colours_SpreadOverTheThirdAxis) {
     view(UNITDBM, RANGE10DB, 0);
     waterfall.Graph3D.setRange(3, -100, 0);
-    panel.TraceData = {-10000, -25000, -80000, -10000};
-    conversion.ConvertTrace();
-    EXPECT_EQ(panel.TraceColours, (std::vector<double>{0, 75, 20, 100}));
+    convert({-10000, -25000, -80000, -10000});
+    EXPECT_EQ(sweep.colours, (std::vector<double>{0, 75, 20, 100}));
 }
 
 TEST_F(TraceConversionTest, Colours_OfAutoPeak_ArePinnedAtBothEndsToo) {
     view(UNITDBM, RANGE10DB, 0);
     waterfall.Graph3D.setRange(3, -100, 0);
-    mirror.TraceDetector = DETAUTOPEAK;
-    panel.PeakTraceData = {-10000, -40000, -10000};
-    conversion.ConvertTrace();
-    EXPECT_EQ(panel.TraceColours, (std::vector<double>{0, 60, 100}));
+    convertPeak({-10000, -40000, -10000});
+    EXPECT_EQ(sweep.colours, (std::vector<double>{0, 60, 100}));
 }
 
 TEST_F(TraceConversionTest, Colours_OnAnAxisOfNoHeight_AreFinite) {
     view(UNITDBM, RANGE10DB, 0);
     waterfall.Graph3D.setRange(3, -20, -20);
-    panel.TraceData = {-10000, -10000, -10000};
-    conversion.ConvertTrace();
-    EXPECT_EQ(panel.TraceColours[1], 0);
+    convert({-10000, -10000, -10000});
+    EXPECT_EQ(sweep.colours[1], 0);
 }
 
 TEST_F(TraceConversionTest, EmptyTrace_GivesEmptyArrays) {
     view(UNITDBM, RANGE10DB, 0);
-    panel.TraceData.clear();
-    conversion.ConvertTrace();
-    EXPECT_TRUE(panel.RawTraceData.empty());
-    EXPECT_TRUE(panel.TraceColours.empty());
+    convert({});
+    EXPECT_TRUE(sweep.physical.empty());
+    EXPECT_TRUE(sweep.colours.empty());
 }
 
 }  // namespace
