@@ -81,10 +81,14 @@ void PanelSession::complain(const std::string& what) {
 
 void PanelSession::serveLines() {
     while (!ended_ && !program_.ended()) {
-        if (microsLeft() > 0) {
-            idle(kLongestPumpMs);
-        } else if (interlock_.waiting() > 0 || !readAndExecute()) {
-            idle(kLookMs);
+        try {
+            if (microsLeft() > 0) {
+                idle(kLongestPumpMs);
+            } else if (interlock_.waiting() > 0 || !readAndExecute()) {
+                idle(kLookMs);
+            }
+        } catch (...) {
+            program_.showFailure();  // what a timer or the line set off
         }
     }
 }
@@ -153,7 +157,11 @@ void PanelSession::execute(std::string_view line) {
 void PanelSession::runCommand(const std::function<void()>& command) {
     interlock_.beginCommand();
     ++depth_;
-    command();
+    try {
+        command();
+    } catch (...) {
+        program_.showFailure();  // the session goes on
+    }
     --depth_;
     interlock_.endCommand();
     m_.output.settle();

@@ -8,6 +8,7 @@
 #include "desktop/StartOptions.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtPlatform.h"
+#include "desktop/windows/GuardedApplication.h"
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
 #include "rehearsal/Rehearsal.h"
@@ -31,7 +32,7 @@ int main(int argc, char** argv) {
     // These need no display.
     if (zel::asksForHelp(argc, argv))
         return zel::parseStartOptions(argc, argv, options, std::cout, std::cerr).value_or(0);
-    QApplication application(argc, argv);  // takes the toolkit's own options away
+    zel::GuardedApplication application(argc, argv);  // takes the toolkit's own options away
     zel::useEnglishMessages();
     QApplication::setApplicationName("ZELRemote");
     QApplication::setApplicationVersion(QString::fromStdString(zel::versionText(zel::kVersion)));
@@ -44,6 +45,7 @@ int main(int argc, char** argv) {
     zel::applyTheme(application, theme);
     zel::Program program(platform.bundle(), options.words);
     zel::offerRehearsal(program, platform.boxes, platform.files);
+    application.catchInto([&program] { program.showFailure(); });
     int result = 0;
     // Every wait and loop on the stack comes back, since the program has ended.
     program.Ended.connect([&] {

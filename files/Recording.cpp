@@ -5,8 +5,10 @@
 #include <filesystem>
 #include <limits>
 
+#include "files/ViewFormat.h"
 #include "model/CodeTables.h"
 #include "platform/KeyInput.h"
+#include "support/AtEnd.h"
 #include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/TimeText.h"
@@ -101,9 +103,13 @@ bool Recording::chooseFile() {
     // Emptied once; each trace is then appended to it.
     OutputFile file(writer_.files().service(), panel_.DataFileName, OutputFile::Mode::Output);
     const std::string problem = file.close();
-    if (problem.empty()) return true;
-    session_.boxes.show({BoxIcon::Critical, problem});
-    return false;
+    if (!problem.empty()) {
+        session_.boxes.show({BoxIcon::Critical, problem});
+        return false;
+    }
+    const std::string warning = oldLogWarning(panel_.DataFileName);
+    if (!warning.empty()) session_.boxes.show({BoxIcon::Exclamation, warning});
+    return true;
 }
 
 void Recording::SubmitTimeButton_Click() {
@@ -189,16 +195,21 @@ void Recording::X_Timer() {
         windUp();
         return;
     }
-    inTick_ = true;
     bool taken = true;
     {
+        inTick_ = true;
+        const AtEnd over([this] {
+            inTick_ = false;
+            panel_.MousePointer = 0;
+        });
         // What a user does meanwhile waits for the end of the cycle.
         const DialogueScope cycle = exchange_.hold();
         pointer(kHourglass);
-        if (!mirror_.ExternalTriggerActive) taken = takeTrace();
+        if (!mirror_.ExternalTriggerActive) {
+            exchange_.forgetFailure();
+            taken = takeTrace();
+        }
     }
-    inTick_ = false;
-    panel_.MousePointer = 0;
     dialog_.Ticked();
     if (!panel_.RecordData.Checked) {
         windUp();

@@ -30,6 +30,9 @@ class Recording {
 
     /// "trace.csv: 12 traces, 118 kB, 00:01:05, next in 3 s"; empty while nothing is recorded.
     std::string progressText() const;
+    /// A tick of the timer reads a trace: what fails is counted in the progress line and shown in
+    /// no box. A recording that has ended, as after a full disk, is no tick any more.
+    bool inTimedTick() const { return inTick_ && panel_.RecordData.Checked; }
 
   private:
     std::string missedText() const;

@@ -5,6 +5,7 @@
 
 namespace zel {
 
+inline constexpr const char* kTraceName = "Trace Name;";
 inline constexpr const char* kTime = "Time";
 inline constexpr const char* kMeasurementType = "Measurement Type";
 inline constexpr const char* kDynamicRange = "Dynamic Range";
@@ -22,5 +23,11 @@ inline constexpr const char* kMeasuredValue = "Measured Value";
 /// With `toCode` dB a division becomes a range code: 10, 5, 2, 1 give 0 to 3, anything else
 /// stays. Without it a range code becomes dB a division, 10 for a code that is none of 0 to 3.
 void MapRangeCode(int value, bool toCode, int& out);
+
+/// True for a path whose file name holds "dat", in either case: such a file is read as a log of the
+/// older format, whatever is in it.
+bool isNameOfOldLog(const std::string& path);
+/// What a user who saves under such a name has to know; empty for other names.
+std::string oldLogWarning(const std::string& path);
 
 }  // namespace zel

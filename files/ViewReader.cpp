@@ -3,10 +3,13 @@
 #include <algorithm>
 #include <cmath>
 #include <filesystem>
+#include <new>
 #include <stdexcept>
 
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
+#include "support/AtEnd.h"
+#include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "trace/FrequencyLabels.h"
@@ -44,19 +47,6 @@ std::string rowLabelOf(const FieldList& lines, int timeEntry, const std::string&
 }
 
 std::string percentText(double part) { return generalNumber(std::floor(part * 100)) + " %"; }
-
-/// Runs something at the end of a scope, whatever way it is left.
-template <class Action>
-class AtEnd {
-  public:
-    explicit AtEnd(Action action) : action_(std::move(action)) {}
-    ~AtEnd() { action_(); }
-    AtEnd(const AtEnd&) = delete;
-    AtEnd& operator=(const AtEnd&) = delete;
-
-  private:
-    Action action_;
-};
 
 }  // namespace
 
@@ -104,15 +94,22 @@ void ViewReader::loadFile(const std::string& path) {
                 if (size > kShownBytes)
                     progress("Reading", static_cast<double>(got) / static_cast<double>(size));
             });
-        // The name decides ahead of the contents.
-        if (contains(upperCase(name_), "DAT") || contains(text, "END OF LOG")) {
+        // The name decides before the contents.
+        if (isNameOfOldLog(path) || contains(text, "END OF LOG")) {
             LoadTheDataForOlderVersions(text);
+            if (startsWith(text, kTraceName))
+                boxes_.show({BoxIcon::Information,
+                             name_ + " begins as a saved view and was read as a log of the older " +
+                                 "format, because its name holds \"dat\"." + kCrLf +
+                                 "Under another name it shows the view."});
         } else {
             LoadTheData(text, files_.dateTimeOf(path), 0);
         }
         FileLoaded(path);
     } catch (const std::runtime_error& problem) {
         boxes_.show({BoxIcon::Critical, problem.what()});
+    } catch (const std::bad_alloc&) {
+        boxes_.show({BoxIcon::Critical, readProblem(path, "there is not enough memory for it")});
     }
 }
 
@@ -206,6 +203,15 @@ void ViewReader::LoadTheData(const std::string& text, const std::string& fileTim
     panel_.STOPFlag = true;
     panel_.YVectorVal = rowNumber;
     if (rowNumber == 0) forms_.waterfall.clearGraph();
+    const AtEnd done([this] {
+        panel_.PlaybackFrame.Visible = false;
+        panel_.STOPFlag = false;
+        panel_.Connection.Enabled = true;
+        panel_.Utility.Enabled = true;
+        panel_.PlayContinuousButton.Visible = true;
+        panel_.StopButton.Visible = false;
+        panel_.MousePointer = 0;
+    });
     panel_.MousePointer = kHourglass;
     events_.pump();
 
@@ -215,15 +221,7 @@ void ViewReader::LoadTheData(const std::string& text, const std::string& fileTim
     showTraces(lines, header, series);
     if (series) forms_.waterfall.styleLastRow();
 
-    panel_.PlaybackFrame.Visible = false;
-    panel_.STOPFlag = false;
-    panel_.Connection.Enabled = true;
-    panel_.Utility.Enabled = true;
-    panel_.PlayContinuousButton.Visible = true;
-    panel_.StopButton.Visible = false;
     forms_.waterfall.saveGraphView();
-    panel_.MousePointer = 0;
-    events_.pump();
 }
 
 void ViewReader::showTraces(const FieldList& lines, Header header, bool series) {

@@ -6,6 +6,7 @@
 #include "files/ViewFormat.h"
 #include "files/ViewHeader.h"
 #include "model/CodeTables.h"
+#include "support/AtEnd.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 
@@ -59,8 +60,12 @@ void ViewWriter::SaveCurrentView_Click() {
     if (panel_.isSpecMeas) forms_.specialMeas.ResolveName(panel_.DataFileName);
     if (panel_.DataFileName.empty()) return;
     fromMenu_ = true;
+    const AtEnd done([this] { fromMenu_ = false; });
     SaveView(power ? "power" : "trace");
-    fromMenu_ = false;
+    // A script names its files itself, and a power log is never loaded.
+    const std::string warning = oldLogWarning(panel_.DataFileName);
+    if (!warning.empty() && !panel_.isSpecMeas && !power)
+        boxes_.show({BoxIcon::Exclamation, warning});
 }
 
 void ViewWriter::SaveView(const std::string& kind) {

@@ -47,6 +47,8 @@ class CommandExchange {
     DialogueScope hold() { return DialogueScope(state_); }
     /// The last read of a line failed, or the link is gone: loops end.
     bool ExchangeFailed() const { return state_.ExchangeFailed; }
+    /// The next exchange starts as if none had failed before.
+    void forgetFailure() { state_.ExchangeFailed = false; }
 
   private:
     void beginLine(const char* kind, const std::string& text, float& t0);

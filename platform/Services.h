@@ -13,8 +13,11 @@ class SettingsStore {
     virtual ~SettingsStore() = default;
     virtual std::string get(const std::string& application, const std::string& section,
                             const std::string& key, const std::string& fallback) = 0;
-    virtual void set(const std::string& application, const std::string& section,
+    /// False when the value could not be stored.
+    virtual bool set(const std::string& application, const std::string& section,
                      const std::string& key, const std::string& value) = 0;
+    /// Where the settings are, for a message; empty where there is no such place.
+    virtual std::string place() { return {}; }
 };
 
 /// The link's debug channel: one text a call.

@@ -39,6 +39,7 @@
 #include "platform/TimerDriver.h"
 #include "script/Scripts.h"
 #include "shell/EndingBoxes.h"
+#include "shell/Guards.h"
 #include "shell/Logs.h"
 #include "shell/ProgramEnd.h"
 #include "shell/SecondTimer.h"
@@ -233,11 +234,19 @@ struct Program::Rooms {
 };
 
 Program::Program(const Platform& platform, std::string commandLine)
-    : rooms_(std::make_unique<Rooms>(platform, std::move(commandLine))) {
+    : guards_(std::make_unique<Guards>(platform)),
+      rooms_(std::make_unique<Rooms>(guards_->platform, std::move(commandLine))) {
+    guards_->boxes.quiet = [this] { return rooms_->recording.inTimedTick(); };
     rooms_->end.Ended.connect([this] { Ended(); });
 }
 
-Program::~Program() = default;
+Program::~Program() { guards_->boxes.quiet = nullptr; }
+
+void Program::showFailure() {
+    const Box box = failureBox();
+    rooms_->panel.MousePointer = 0;
+    guards_->boxes.show(box);
+}
 
 Forms& Program::forms() { return rooms_->forms; }
 ZEL3Variables& Program::variables() { return rooms_->mirror; }

@@ -12,6 +12,8 @@
 
 namespace zel {
 
+struct Guards;
+
 class CommandExchange;
 class Interlock;
 class Logs;
@@ -61,7 +63,12 @@ class Program {
     const std::string& endedBy() const;
     Event<> Ended;
 
+    /// Shows the exception that is being handled in a box; call it inside a catch alone. A front
+    /// catches what a handler throws and goes on.
+    void showFailure();
+
   private:
+    std::unique_ptr<Guards> guards_;
     struct Rooms;
     std::unique_ptr<Rooms> rooms_;
 };

@@ -70,10 +70,11 @@ std::string QtSettingsStore::get(const std::string& application, const std::stri
     return IniFile::load(file_).value(application, settingsKey(section, key)).value_or(fallback);
 }
 
-void QtSettingsStore::set(const std::string& application, const std::string& section,
+bool QtSettingsStore::set(const std::string& application, const std::string& section,
                           const std::string& key, const std::string& value) {
     IniFile settings = IniFile::load(file_);
-    if (settings.setValue(application, settingsKey(section, key), value)) settings.save(file_);
+    return settings.setValue(application, settingsKey(section, key), value) &&
+           settings.save(file_);
 }
 
 void QtDebugChannel::output(const std::string& text) {

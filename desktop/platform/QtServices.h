@@ -26,8 +26,9 @@ class QtSettingsStore : public SettingsStore {
     explicit QtSettingsStore(ApplicationFolder& folder);
     std::string get(const std::string& application, const std::string& section,
                     const std::string& key, const std::string& fallback) override;
-    void set(const std::string& application, const std::string& section, const std::string& key,
+    bool set(const std::string& application, const std::string& section, const std::string& key,
              const std::string& value) override;
+    std::string place() override { return file_; }
 
   private:
     std::string file_;

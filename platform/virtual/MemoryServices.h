@@ -18,15 +18,17 @@ class MemorySettings : public SettingsStore {
   public:
     using Key = std::tuple<std::string, std::string, std::string>;
     std::map<Key, std::string> values;
+    bool works = true;  ///< false: nothing can be stored
 
     std::string get(const std::string& application, const std::string& section,
                     const std::string& key, const std::string& fallback) override {
         const auto found = values.find(Key{application, section, key});
         return found == values.end() ? fallback : found->second;
     }
-    void set(const std::string& application, const std::string& section, const std::string& key,
+    bool set(const std::string& application, const std::string& section, const std::string& key,
              const std::string& value) override {
-        values[Key{application, section, key}] = value;
+        if (works) values[Key{application, section, key}] = value;
+        return works;
     }
 };
 

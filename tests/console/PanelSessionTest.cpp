@@ -2,7 +2,10 @@
 #include <sys/ioctl.h>
 #include <unistd.h>
 
+#include <functional>
+#include <new>
 #include <sstream>
+#include <stdexcept>
 #include <string>
 
 #include "ZELSim/InProcessPort.h"
@@ -23,6 +26,8 @@ struct PanelSessionTest : ::testing::Test {
 
     PanelSessionTest() { platform.ports.ports = {kSimulatorPort}; }
 
+    std::function<void(Program&)> prepare;  ///< called before the session starts
+
     std::string play(const std::string& lines, const std::string& words = "") {
         out.str("");
         errors.str("");
@@ -39,6 +44,7 @@ struct PanelSessionTest : ::testing::Test {
                          platform.clipboard, platform.launcher, platform.startup, platform.folder,
                          dialogs, platform.files, platform.endSignals},
                         words);
+        if (prepare) prepare(program);
         PanelSession session(program,
                              {platform.clock, events, input, output, errorOutput, answers, true},
                              LinkAddress{LinkAddress::Kind::Serial, kSimulatorPort, 57600});
@@ -107,6 +113,22 @@ TEST_F(PanelSessionTest, HiddenDisabledAndLockedControls_AreRefused) {
               "refused: DebugTextBox is locked\nrefused: DebugTextBox is locked\n"
               "refused: DebugTextBox is locked\n\n");
     EXPECT_EQ(status, kDone);
+}
+
+TEST_F(PanelSessionTest, HandlerThatThrows_EndsInABoxAndTheSessionGoesOn) {
+    prepare = [](Program& program) {
+        program.forms().controller.FrequencyButton.Clicked.connect([] { throw std::bad_alloc(); });
+    };
+    EXPECT_EQ(play("click FrequencyButton\nshow State\n"),
+              "box[critical] ZELRemote | There is not enough memory for this. It was not "
+              "finished.\n0\n");
+    EXPECT_EQ(status, kDone);
+}
+
+TEST_F(PanelSessionTest, TimerThatThrows_EndsInABoxAndTheSessionGoesOn) {
+    platform.events.schedule(50, [] { throw std::runtime_error("no room"); });
+    EXPECT_EQ(play("pump 100\nshow State\n"),
+              "box[critical] ZELRemote | This could not be finished: no room\n0\n");
 }
 
 TEST_F(PanelSessionTest, BoxOfTheSameText_WithinOneLine_PrintsOnceWithItsCount) {

@@ -193,6 +193,13 @@ TEST_F(RecordingTest, FileThatCannotBeMade_IsToldAndDoesNotStartIt) {
     EXPECT_FALSE(forms.time.X.Enabled);
 }
 
+TEST_F(RecordingTest, NameWithDat_IsSaidToBeReadAsAnOldLog) {
+    begin("1", "data1.csv");
+    EXPECT_EQ(boxes.texts().size(), 1U);
+    EXPECT_NE(boxes.texts().at(0).find("The name data1.csv holds \"dat\""), std::string::npos);
+    EXPECT_TRUE(panel.RecordData.Checked);
+}
+
 TEST_F(RecordingTest, SecondSubmit_DoesNothing) {
     begin("1");
     forms.time.TimeIntervalBox.Text = "9";

@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <new>
 
 #include "files/ViewFormat.h"
 #include "files/ViewReader.h"
@@ -235,6 +236,48 @@ TEST_F(ViewReaderTest, NameWithDat_GoesToTheOldReader) {
         load(kHead + rowsText(301), name);
         EXPECT_EQ(mirror.ReferenceLevel, -77) << name;
     }
+}
+
+TEST_F(ViewReaderTest, ViewUnderANameWithDat_IsSaidToBeReadAsAnOldLog) {
+    load("Trace Name;Analyzer\r\n" + kHead + rowsText(301), "update.csv");
+    EXPECT_EQ(boxes.texts(),
+              Texts{"update.csv begins as a saved view and was read as a log of the older format, "
+                    "because its name holds \"dat\".\r\nUnder another name it shows the view."});
+}
+
+TEST_F(ViewReaderTest, OldLogUnderANameWithDat_IsReadInSilence) {
+    load("Data at;2020-01-01 12:00:00;\r\n____\r\n \r\n100.000;-35; \r\n200.000;-36; \r\n",
+         "old.dat");
+    EXPECT_EQ(boxes.texts(), Texts{});
+    EXPECT_EQ(shown().size(), 2U);
+}
+
+TEST_F(ViewReaderTest, FileAboveTheLimit_IsRefusedWithItsSizeAndTheLimit) {
+    FileProblem problem;
+    platform.files.put("/views/large", std::string(2'000'000, 'x'));
+    EXPECT_FALSE(readFile(platform.files, "/views/large", 1'000'000, problem));
+    EXPECT_EQ(problem, "it has 2.0 MB, and the limit is 1.0 MB");
+    EXPECT_EQ(FileOps::kLargestFile, 1073741824U);
+}
+
+TEST_F(ViewReaderTest, DiskThatBreaksWhileItIsRead_IsReported) {
+    platform.files.readable = 1000;
+    load(kHead + rowsText(301));
+    EXPECT_EQ(boxes.texts(),
+              Texts{"The file " + folder.file("view.csv") + " cannot be read: Input/output error"});
+    EXPECT_TRUE(shown().empty());
+}
+
+TEST_F(ViewReaderTest, HandlerThatRunsOutOfMemory_LeavesThePanelUsable) {
+    panel.TraceLoaded.connect([] { throw std::bad_alloc(); });
+    load(kHead + rowsText(301));
+    EXPECT_EQ(boxes.texts(), Texts{"The file " + folder.file("view.csv") +
+                                   " cannot be read: there is not enough memory for it"});
+    EXPECT_TRUE(panel.Connection.Enabled);
+    EXPECT_TRUE(panel.Utility.Enabled);
+    EXPECT_TRUE(panel.PlayContinuousButton.Visible);
+    EXPECT_FALSE(panel.StopButton.Visible);
+    EXPECT_EQ(panel.MousePointer.get(), 0);
 }
 
 TEST_F(ViewReaderTest, FolderWithDat_DoesNotDecide) {

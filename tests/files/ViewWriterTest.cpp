@@ -87,6 +87,17 @@ TEST_F(ViewWriterTest, SecondSave_ReplacesTheFile) {
     EXPECT_EQ(save("view.csv").size(), first.size());
 }
 
+TEST_F(ViewWriterTest, NameWithDat_IsSaidToBeReadAsAnOldLog) {
+    sweepOf(ramp(-35250, 0));
+    EXPECT_FALSE(save("update.csv").empty());
+    EXPECT_EQ(boxes.texts(), Texts{"The name update.csv holds \"dat\": when it is loaded, the file "
+                                   "is read as a log of the older format.\r\n"
+                                   "Choose another name to load it as a view."});
+    EXPECT_EQ(boxes.boxes()[0].icon, BoxIcon::Exclamation);
+    save("view.csv");
+    EXPECT_EQ(boxes.texts().size(), 1U);
+}
+
 TEST_F(ViewWriterTest, WhileRecording_ASaveAppends) {
     sweepOf(ramp(-35250, 0));
     const std::string first = save("view.csv");

@@ -1,0 +1,47 @@
+#include "shell/Guards.h"
+
+#include <exception>
+#include <new>
+
+#include "support/Text.h"
+
+namespace zel {
+
+BoxAnswer QuietBoxes::show(const Box& box) {
+    if (box.buttons == BoxButtons::Ok && quiet && quiet()) return BoxAnswer::Ok;
+    return boxes_.show(box);
+}
+
+bool ReportedSettings::set(const std::string& application, const std::string& section,
+                           const std::string& key, const std::string& value) {
+    if (settings_.set(application, section, key, value)) return true;
+    if (!std::exchange(reported_, true)) {
+        std::string text = "The settings cannot be stored";
+        if (const std::string file = settings_.place(); !file.empty()) text += " in " + file;
+        boxes_.show({BoxIcon::Exclamation,
+                     text + "." + kCrLf + "The program goes on and forgets them at its end."});
+    }
+    return false;
+}
+
+Guards::Guards(const Platform& front)
+    : boxes(front.boxes),
+      settings(front.settings, boxes),
+      platform{
+          front.clock,     front.events,       boxes,        front.serialPort,  front.serialPorts,
+          front.tcpSocket, front.serverSocket, settings,     front.debug,       front.clipboard,
+          front.launcher,  front.startup,      front.folder, front.fileDialogs, front.files} {}
+
+Box failureBox() {
+    try {
+        throw;
+    } catch (const std::bad_alloc&) {
+        return {BoxIcon::Critical, "There is not enough memory for this. It was not finished."};
+    } catch (const std::exception& problem) {
+        return {BoxIcon::Critical, "This could not be finished: " + std::string(problem.what())};
+    } catch (...) {
+        return {BoxIcon::Critical, "This could not be finished, for an unknown reason."};
+    }
+}
+
+}  // namespace zel
