@@ -121,7 +121,7 @@ TEST_F(PanelSessionTest, HandlerThatThrows_EndsInABoxAndTheSessionGoesOn) {
     };
     EXPECT_EQ(play("click FrequencyButton\nshow State\n"),
               "box[critical] ZELRemote | There is not enough memory for this. It was not "
-              "finished.\n0\n");
+              "finished.\n3\n");
     EXPECT_EQ(status, kDone);
 }
 
