@@ -16,6 +16,7 @@ namespace {
 
 using SteadyClock = std::chrono::steady_clock;
 
+constexpr long kAwayNanos = 50'000'000;  // between two looks at a terminal that nobody has open
 constexpr std::size_t kReadSize = 4096;
 constexpr std::size_t kMostPending = 65536;  // bytes that the host has not taken yet
 
@@ -25,7 +26,7 @@ void askEnd(int) { endAsked = 1; }
 
 class Loop {
   public:
-    Loop(Wire& wire, Endpoint& endpoint)
+    Loop(HostLine& wire, Endpoint& endpoint)
         : wire_(wire), endpoint_(endpoint), seen_(SteadyClock::now()) {
         sigprocmask(SIG_SETMASK, nullptr, &whileWaiting_);
         for (const int ending : {SIGINT, SIGTERM, SIGHUP}) {
@@ -77,6 +78,8 @@ class Loop {
     }
 
     void hangUp() {
+        // A terminal that nobody has open says so until somebody opens it.
+        away_ = true;
         endpoint_.lost();
         wire_.reset();
         pending_.clear();
@@ -96,12 +99,14 @@ class Loop {
     bool wait() {
         std::array<pollfd, 2> watched{};
         const bool mayRead = !wire_.congested() && pending_.size() < kMostPending;
-        watched[0].fd = endpoint_.line();
+        watched[0].fd = away_ ? -1 : endpoint_.line();
         watched[0].events =
             static_cast<short>((mayRead ? POLLIN : 0) | (pending_.empty() ? 0 : POLLOUT));
         watched[1].fd = endpoint_.door();
         watched[1].events = POLLIN;
-        const auto limit = patience();
+        const std::optional<timespec> limit =
+            away_ && endpoint_.line() >= 0 ? std::optional(timespec{0, kAwayNanos}) : patience();
+        away_ = false;
         const int count =
             ppoll(watched.data(), watched.size(), limit ? &*limit : nullptr, &whileWaiting_);
         if (count < 0) {
@@ -128,11 +133,12 @@ class Loop {
         }
     }
 
-    Wire& wire_;
+    HostLine& wire_;
     Endpoint& endpoint_;
     SteadyClock::time_point seen_;
     sigset_t whileWaiting_{};
     std::string pending_;
+    bool away_ = false;
 };
 
 }  // namespace
@@ -152,6 +158,6 @@ void catchEndSignals() {
     sigaction(SIGPIPE, &ignored, nullptr);
 }
 
-bool serve(Wire& wire, Endpoint& endpoint) { return Loop(wire, endpoint).run(); }
+bool serve(HostLine& wire, Endpoint& endpoint) { return Loop(wire, endpoint).run(); }
 
 }  // namespace zelsim

@@ -4,7 +4,7 @@
 #include <functional>
 #include <string>
 
-#include "ZELSim/Wire.h"
+#include "ZELSim/HostLine.h"
 
 namespace zelsim {
 
@@ -28,6 +28,6 @@ class Endpoint {
 /// called once, before `serve`.
 void catchEndSignals();
 /// Serves the wire at the endpoint until SIGINT, SIGTERM or SIGHUP. False when waiting failed.
-bool serve(Wire& wire, Endpoint& endpoint);
+bool serve(HostLine& wire, Endpoint& endpoint);
 
 }  // namespace zelsim

@@ -46,7 +46,7 @@ bool PtyEndpoint::fail(const std::string& what) {
     return false;
 }
 
-bool PtyEndpoint::open(const std::string& link, int baud, bool strictBaud) {
+bool PtyEndpoint::open(const std::string& link, int baud, bool strictBaud, bool noticesClose) {
     strictBaud_ = strictBaud;
     master_ = posix_openpt(O_RDWR | O_NOCTTY | O_CLOEXEC);
     if (master_ < 0 || grantpt(master_) != 0 || unlockpt(master_) != 0) {
@@ -73,6 +73,10 @@ bool PtyEndpoint::open(const std::string& link, int baud, bool strictBaud) {
         fcntl(master_, F_SETFL, fcntl(master_, F_GETFL) | O_NONBLOCK) != 0) {
         return fail(device_);
     }
+    if (noticesClose) {
+        close(slave_);
+        slave_ = -1;
+    }
     return link.empty() || makeLink(link);
 }
 
@@ -94,7 +98,7 @@ bool PtyEndpoint::makeLink(const std::string& link) {
 
 int PtyEndpoint::hostBaud() const {
     termios mode{};
-    if (!strictBaud_ || tcgetattr(slave_, &mode) != 0) {
+    if (!strictBaud_ || tcgetattr(master_, &mode) != 0) {
         return 0;
     }
     for (const auto& [rate, speed] : kSpeeds) {

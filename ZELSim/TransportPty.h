@@ -16,8 +16,9 @@ class PtyEndpoint : public Endpoint {
 
     /// Makes the terminal, with a symbolic link to its device where `link` is not empty (an old
     /// symbolic link of that name is replaced). With `strictBaud` the rate that the host sets is
-    /// looked at; `baud` is what it is set to at first. False: `problem` says why.
-    bool open(const std::string& link, int baud, bool strictBaud);
+    /// looked at; `baud` is what it is set to at first. With `noticesClose` a host that closes the
+    /// terminal is noticed, as by a modem that sees DTR. False: `problem` says why.
+    bool open(const std::string& link, int baud, bool strictBaud, bool noticesClose = false);
     const std::string& device() const { return device_; }
     const std::string& problem() const { return problem_; }
 
@@ -33,7 +34,7 @@ class PtyEndpoint : public Endpoint {
     bool makeLink(const std::string& link);
 
     int master_ = -1;
-    int slave_ = -1;  // kept open, so that the line survives hosts that close it
+    int slave_ = -1;  // kept open where the line is to survive hosts that close it
     bool strictBaud_ = false;
     std::string device_;
     std::string link_;

@@ -29,13 +29,15 @@ std::string statusLine(int status) { return std::to_string(status) + kCr; }
 
 Wire::Wire(Device& device, const WireSetup& setup)
     : device_(device),
-      baud_(setup.baud),
+      baud_(setup.baud > 0 ? setup.baud : baudOfCode(static_cast<int>(device.settings().baud))),
+      paced_(setup.baud > 0),
+      strict_(setup.baud > 0 || setup.strictBaud),
       answering_(std::max(setup.answering, 0.0)),
       whole_(setup.wholeAnswers),
       faults_(setup.faults, device.seed()) {}
 
 void Wire::receive(std::string_view bytes) {
-    if (baud_ > 0 && hostBaud_ > 0 && hostBaud_ != baud_) {
+    if (strict_ && hostBaud_ > 0 && hostBaud_ != baud_) {
         noise(bytes);
         return;
     }
@@ -148,7 +150,6 @@ void Wire::secondLine(const std::string& text) {
         }
         return;
     }
-    const double baudBefore = device_.settings().baud;
     const Answer answer = execute(device_, verb, text);
     if (answer.waitsForSweep) {
         waiting_ = true;
@@ -166,7 +167,9 @@ void Wire::secondLine(const std::string& text) {
     if (!verdict.silent) {
         send(std::move(bytes), verdict.delay);
     }
-    if (baud_ > 0 && device_.settings().baud != baudBefore) {
+    // The answer still goes out at the old rate.
+    if (verb == Verb::Set && answer.status == kAccepted &&
+        upperCase(text.substr(0, end)) == "BAUD") {
         baud_ = baudOfCode(static_cast<int>(device_.settings().baud));
     }
 }

@@ -11,6 +11,7 @@
 
 #include "ZELSim/Device.h"
 #include "ZELSim/Faults.h"
+#include "ZELSim/HostLine.h"
 #include "ZELSim/Words.h"
 
 namespace zelsim {
@@ -18,32 +19,28 @@ namespace zelsim {
 struct WireSetup {
     int baud = 0;          ///< 10 bits a byte in both directions; 0: no time on the line
     double answering = 0;  ///< s that the instrument takes for each answer
+    /// A host at another rate than the instrument's gets noise also where no time is on the line.
+    bool strictBaud = false;
     /// An answer is handed out in one piece when its last byte is due (packets of a network).
     bool wholeAnswers = false;
     std::vector<FaultRule> faults = {};
 };
 
-/// All times are durations in seconds; nothing here looks at a clock.
-class Wire {
+class Wire : public HostLine {
   public:
     Wire(Device& device, const WireSetup& setup);
 
-    /// The host sends bytes now.
-    void receive(std::string_view bytes);
-    /// Time passes, for the device too.
-    void advance(double seconds);
-    /// Takes the bytes that have reached the host by now.
-    std::string take();
-    /// Seconds until `take` will have something (more), or the next look is worth while; nothing
-    /// when only the host can set things going.
-    std::optional<double> nextDue() const;
-    /// The line was cut and made again: half a line and what was on its way are gone.
-    void reset();
-    /// True while so much waits that the sender should pause.
-    bool congested() const;
-    /// The baud rate that the host's port is set to, 0 unknown. On a paced line another rate than
-    /// the instrument's makes noise of both directions.
-    void setHostBaud(int baud) { hostBaud_ = baud; }
+    void receive(std::string_view bytes) override;
+    /// For the device too.
+    void advance(double seconds) override;
+    std::string take() override;
+    std::optional<double> nextDue() const override;
+    void reset() override;
+    bool congested() const override;
+    /// On a paced or strict line another rate than the instrument's makes noise of both
+    /// directions.
+    void setHostBaud(int baud) override { hostBaud_ = baud; }
+    /// The rate of the instrument's port.
     int baud() const { return baud_; }
 
   private:
@@ -60,7 +57,7 @@ class Wire {
     };
 
     double now() const { return device_.now(); }
-    double byteTime() const { return baud_ > 0 ? 10.0 / baud_ : 0.0; }
+    double byteTime() const { return paced_ && baud_ > 0 ? 10.0 / baud_ : 0.0; }
     void run(double target);
     bool step(double target);
     void handle(const Line& line);
@@ -72,6 +69,8 @@ class Wire {
 
     Device& device_;
     int baud_;
+    bool paced_;
+    bool strict_;
     double answering_;
     int hostBaud_ = 0;
     bool whole_;

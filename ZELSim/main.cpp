@@ -1,12 +1,15 @@
 // ZELSim: a simulated instrument on a pseudo terminal or a TCP port.
 
 #include <CLI/CLI.hpp>
+#include <fstream>
 #include <iostream>
+#include <memory>
 #include <string>
 #include <vector>
 
 #include "ZELSim/Device.h"
 #include "ZELSim/Faults.h"
+#include "ZELSim/Modem.h"
 #include "ZELSim/TransportPty.h"
 #include "ZELSim/TransportTcp.h"
 #include "ZELSim/Wire.h"
@@ -18,7 +21,8 @@ namespace {
 
 struct Options {
     bool pty = false;
-    bool strictBaud = false;
+    bool modem = false;
+    std::string phonebook;
     std::string link;
     std::string tcp;
     std::vector<std::string> faults;
@@ -31,9 +35,9 @@ int fail(const std::string& problem) {
     return zel::kLinkFailed;
 }
 
-int servePty(const Options& options, zelsim::Wire& wire) {
+int servePty(const Options& options, zelsim::HostLine& line) {
     zelsim::PtyEndpoint endpoint;
-    if (!endpoint.open(options.link, options.wire.baud, options.strictBaud)) {
+    if (!endpoint.open(options.link, options.wire.baud, options.wire.strictBaud, options.modem)) {
         return fail(endpoint.problem());
     }
     std::cout << endpoint.device() << '\n';
@@ -41,7 +45,7 @@ int servePty(const Options& options, zelsim::Wire& wire) {
         std::cout << options.link << '\n';
     }
     std::cout.flush();
-    return zelsim::serve(wire, endpoint) ? 0 : fail("cannot wait for the line");
+    return zelsim::serve(line, endpoint) ? 0 : fail("cannot wait for the line");
 }
 
 int serveTcp(const Options& options, zelsim::Wire& wire) {
@@ -53,7 +57,25 @@ int serveTcp(const Options& options, zelsim::Wire& wire) {
     return zelsim::serve(wire, endpoint) ? 0 : fail("cannot wait for the line");
 }
 
+bool readPhonebook(const std::string& file, zelsim::Phonebook& book) {
+    if (file.empty()) {
+        book = zelsim::Phonebook::standard();
+        return true;
+    }
+    std::ifstream text(file);
+    std::string problem = text ? "" : "cannot be read";
+    if (text && book.read(text, problem)) {
+        return true;
+    }
+    std::cerr << "ZELSim: " << file << ": " << problem << '\n';
+    return false;
+}
+
 int run(Options& options) {
+    zelsim::Phonebook book;
+    if (!readPhonebook(options.phonebook, book)) {
+        return kWrongUse;
+    }
     for (const std::string& text : options.faults) {
         std::string problem;
         const auto rule = zelsim::parseFault(text, problem);
@@ -67,7 +89,14 @@ int run(Options& options) {
     zelsim::catchEndSignals();
     zelsim::Device device(options.device);
     zelsim::Wire wire(device, options.wire);
-    return options.pty ? servePty(options, wire) : serveTcp(options, wire);
+    if (!options.pty) {
+        return serveTcp(options, wire);
+    }
+    if (!options.modem) {
+        return servePty(options, wire);
+    }
+    zelsim::Modem modem(wire, std::move(book));
+    return servePty(options, modem);
 }
 
 }  // namespace
@@ -78,7 +107,7 @@ int main(int argc, char** argv) {
         "ZELSim, a simulated ZEL3 spectrum analyser: it speaks the instrument's line protocol on\n"
         "a pseudo terminal or a TCP port until it is ended. It prints the name of the terminal\n"
         "(and of the link), or the address and port."};
-    app.footer(std::string(zelsim::faultHelp()));
+    app.footer(std::string(zelsim::faultHelp()) + "\n" + std::string(zelsim::phonebookHelp()));
     app.set_version_flag("-v,--version", "ZELSim " + zel::versionText(zel::kVersion));
     auto* pty = app.add_flag("--pty", options.pty, "Serve a pseudo terminal");
     app.add_option("--link", options.link, "Make a symbolic link of this name to the terminal")
@@ -92,9 +121,17 @@ int main(int argc, char** argv) {
                    "Pace the line: 10 bits a byte at N baud, both ways (0: as fast as it goes)")
         ->type_name("N")
         ->check(CLI::Range(0, 4000000));
-    app.add_flag("--strict-baud", options.strictBaud,
-                 "With --pty and --baud: a host port at another rate gets noise")
-        ->needs(pty);
+    auto* strict = app.add_flag("--strict-baud", options.wire.strictBaud,
+                                "With --pty: a host port at another rate than the instrument's\n"
+                                "(--baud, else 57600; BAUD changes it) gets noise")
+                       ->needs(pty);
+    auto* modem = app.add_flag("--modem", options.modem,
+                               "With --pty: a modem stands ahead of the instrument, see below")
+                      ->needs(pty)
+                      ->excludes(strict);
+    app.add_option("--phonebook", options.phonebook, "What becomes of calls, by number")
+        ->type_name("FILE")
+        ->needs(modem);
     app.add_option("--seed", options.device.seed, "Seed of the noise and of the moving signals (1)")
         ->type_name("N");
     zel::numberOption(app, "--speed", options.device.speed, 1e-3, 1e9,
