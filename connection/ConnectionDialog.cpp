@@ -1,5 +1,7 @@
 #include "connection/ConnectionDialog.h"
 
+#include <utility>
+
 #include "link/RS232Ops.h"
 #include "platform/ModalForm.h"
 
@@ -31,6 +33,16 @@ ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, Handshake& hand
     dialog_.Load.connect([this] { Form_Load(); });
     panel_.Direct.Clicked.connect([this] { Direct_Click(); });
     panel_.ImmConnect.Clicked.connect([this] { ImmConnect_Click(); });
+    const std::pair<MenuItem*, std::int16_t> dialled[] = {{&panel_.Modem, CF::MODEMCON},
+                                                          {&panel_.GSM, CF::GSMCON},
+                                                          {&panel_.ModemToGSM, CF::MODEMGSMCON},
+                                                          {&panel_.GSMToModem, CF::GSMMODEMCON}};
+    for (const auto& [item, kind] : dialled) {
+        item->Clicked.connect([this, kind = kind] {
+            panel_.immConnectState = false;
+            SetConnectionKind(kind);
+        });
+    }
     dialog_.ZELButton.Clicked.connect([this] { ZELButton_Click(); });
     dialog_.LoadSettingsButton.Clicked.connect([this] { profiles_.LoadSettings_Click(); });
     dialog_.SaveSettingsButton.Clicked.connect([this] { profiles_.SaveSettings_Click(); });
@@ -87,7 +99,11 @@ void ConnectionDialog::SetConnectionKind(std::int16_t kind) {
     dialog_.ModemConnectionFrame.Visible = !direct;
     dialog_.DisconnectButton2.Visible = !direct;
     dialog_.CancelConnButton.Visible = !direct;
-    if (!direct) dialog_.CancelButton.Visible = false;
+    if (!direct) {
+        dialog_.CancelButton.Visible = false;
+        dialog_.LoadSettingsButton.Visible = true;
+        dialog_.SaveSettingsButton.Visible = true;
+    }
     profiles_.LoadSettings_Click();
     if (!panel_.immConnectState) showModal();
 }

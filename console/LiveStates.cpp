@@ -38,6 +38,9 @@ LiveStates::States LiveStates::now() const {
     if (panel.STOPFlag || panel.ContinuosLoopActive) states.insert(&panel.STOPFlag);
     if (panel.isSpecMeas) states.insert(&panel.isSpecMeas);
     if (forms_.time.ContinuousRecording) states.insert(&forms_.time.ContinuousRecording);
+    // Ways to the instrument that may take minutes; an ordinary exchange is none of them.
+    for (const bool* state : {&forms_.main.Dialling, &forms_.devicesChoice.Configuring})
+        if (*state) states.insert(state);
     return states;
 }
 

@@ -37,7 +37,17 @@ class TCPConnectionForm : public Form {
 
 class DevicesChoiceForm : public Form {
   public:
-    DevicesChoiceForm() : Form("DevicesChoiceForm") { Caption = "Communication Device"; }
+    DevicesChoiceForm() : Form("DevicesChoiceForm") {
+        Caption = "Communication Device";
+        addVariables({{"Configuring", &Configuring}});
+    }
+    bool Configuring = false;  ///< a device gets its commands
+    DropDownList AvailableDevicesChoice{*this, "AvailableDevicesChoice"};
+    DropDownList DevicesPortList{*this, "DevicesPortList", true};
+    DropDownList DevicesBaudList{*this, "DevicesBaudList", true};
+    Label DeviceStatusLabel{*this, "DeviceStatusLabel"};
+    Button SetDeviceButton{*this, "SetDeviceButton", "Set"};
+    Button CloseDevicesButton{*this, "CloseDevicesButton", "Close"};
 };
 
 /// The recording's dialog.

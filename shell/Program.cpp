@@ -3,6 +3,8 @@
 #include <utility>
 
 #include "connection/ConnectionDialog.h"
+#include "connection/Devices.h"
+#include "connection/Dialling.h"
 #include "connection/Disconnection.h"
 #include "connection/Handshake.h"
 #include "connection/Profiles.h"
@@ -57,6 +59,30 @@
 #include "waterfall/WaterfallView.h"
 
 namespace zel {
+
+namespace {
+
+std::int16_t connectionKind(LinkAddress::Kind kind) {
+    using Kind = LinkAddress::Kind;
+    switch (kind) {
+        case Kind::TwoModems:
+            return ControllerForm::MODEMCON;
+        case Kind::TwoPhones:
+            return ControllerForm::GSMCON;
+        case Kind::ModemToPhone:
+            return ControllerForm::MODEMGSMCON;
+        case Kind::PhoneToModem:
+            return ControllerForm::GSMMODEMCON;
+        case Kind::Serial:
+            return ControllerForm::DIRECTCON;
+        case Kind::Tcp:
+        case Kind::Tls:
+            break;
+    }
+    return ControllerForm::TCPCON;
+}
+
+}  // namespace
 
 // In the order of the house: a room below stands ahead of those that use it.
 struct Program::Rooms {
@@ -117,6 +143,9 @@ struct Program::Rooms {
                     p.events, p.boxes),
           disconnection(forms, link, exchange, p.tcpSocket, sessionClock, graph, p.clock, p.events,
                         p.boxes),
+          dialling(forms, line, link, dialog, handshake, disconnection, sessionClock, traces,
+                   p.clock, p.events, p.boxes),
+          devices(forms, p.serialPort, p.serialPorts, p.folder, p.clock, p.events, p.boxes),
           remote(panel, exchange, p.events, p.boxes),
           serverMode(forms, p.startup, p.events),
           startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
@@ -193,6 +222,8 @@ struct Program::Rooms {
     ConnectionDialog dialog;
     TcpDialog tcpDialog;
     Disconnection disconnection;
+    Dialling dialling;
+    Devices devices;
     RemoteToggle remote;
     ServerMode serverMode;
     StartUp startUp;
@@ -224,7 +255,7 @@ void Program::start() {
 
 bool Program::connect(const LinkAddress& address, bool readTrace) {
     ControllerForm& panel = rooms_->panel;
-    if (address.kind == LinkAddress::Kind::Tcp) {
+    if (address.overNetwork()) {
         TCPConnectionForm& dialog = rooms_->forms.tcpConnection;
         panel.ConnectionState = ControllerForm::TCPCON;
         dialog.load();
@@ -235,14 +266,33 @@ bool Program::connect(const LinkAddress& address, bool readTrace) {
     }
     const bool quick = panel.immConnectState;
     panel.immConnectState = true;
-    rooms_->dialog.SetConnectionKind(ControllerForm::DIRECTCON);
+    rooms_->dialog.SetConnectionKind(connectionKind(address.kind));
     panel.immConnectState = quick;
     MainForm& dialog = rooms_->forms.main;
     dialog.COMList.setText(address.port);
     dialog.BaudList.setText(std::to_string(address.number));
-    rooms_->dialog.connectDirect(readTrace);
+    if (address.dialled()) {
+        dialog.TelNumberBox.Text = address.phone;
+        rooms_->dialling.dial(readTrace);
+    } else {
+        rooms_->dialog.connectDirect(readTrace);
+    }
     rooms_->softPanel.SetButtonsStatus(ControllerForm::Freq);
     return panel.isConnected;
+}
+
+std::vector<std::string> Program::deviceNames() {
+    return rooms_->devices.ReadCommunicationDevices();
+}
+
+bool Program::configureDevice(const std::string& name, const std::string& port, int baud) {
+    DevicesChoiceForm& form = rooms_->forms.devicesChoice;
+    form.load();
+    form.AvailableDevicesChoice.setItems(rooms_->devices.ReadCommunicationDevices());
+    form.AvailableDevicesChoice.setText(name);
+    form.DevicesPortList.setText(port);
+    form.DevicesBaudList.setText(std::to_string(baud));
+    return rooms_->devices.SetCommunicationDevice();
 }
 
 void Program::disconnect() {

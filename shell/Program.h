@@ -3,6 +3,7 @@
 
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "forms/Forms.h"
 #include "link/ZELBas.h"
@@ -41,6 +42,10 @@ class Program {
     /// showing the dialog. With `readTrace` one sweep is read and drawn as the dialog does. True
     /// when an instrument is connected.
     bool connect(const LinkAddress& address, bool readTrace);
+    /// The communication devices that have commands; "NONE" alone when there are none.
+    std::vector<std::string> deviceNames();
+    /// Sends a device its commands, through the dialog's routines. True when it took them.
+    bool configureDevice(const std::string& name, const std::string& port, int baud);
     /// LOCAL and the close, without the question; nothing when not connected.
     void disconnect();
 
