@@ -74,7 +74,7 @@ bool readPhonebook(const std::string& file, zelsim::Phonebook& book) {
 int run(Options& options) {
     zelsim::Phonebook book;
     if (!readPhonebook(options.phonebook, book)) {
-        return kWrongUse;
+        return zel::kWrongUse;
     }
     for (const std::string& text : options.faults) {
         std::string problem;

@@ -182,7 +182,7 @@ bool Devices::sendCommand(const std::string& command) {
     }
     if (cancelled_) return false;
     std::string text = "No device found at this port!";
-    if (!answer.empty()) text += std::string(kCrLf) + "CODE:" + kCrLf + wireToUtf8(answer);
+    if (!answer.empty()) text += std::string(kCrLf) + "CODE:" + kCrLf + bytesToUtf8(answer);
     boxes_.show({BoxIcon::Critical, text});
     return false;
 }

@@ -129,7 +129,7 @@ bool Dialling::call(const std::string& number) {
     if (!awaitCall(dialled, collected_)) return false;
     collectRest(dialled, collected_);
     if (!link_.portOpen()) return false;
-    form_.AirBaudRateText.Text = wireToUtf8(replaceAll(collected_, kCrLf, " "));
+    form_.AirBaudRateText.Text = bytesToUtf8(replaceAll(collected_, kCrLf, " "));
     bool ok = false;
     CheckAnswer(collected_, ok);
     return ok;
@@ -196,7 +196,7 @@ bool Dialling::awaitCall(const std::string& dialled, std::string& answer) {
         DebugLine(panel_, std::to_string(answer.size()));
         if (answer.size() > 1) {
             if (!pause(kAnswerPauseMs)) return false;
-            DebugLine(panel_, "----->" + wireToUtf8(answer));
+            DebugLine(panel_, "----->" + bytesToUtf8(answer));
             DebugLine(panel_, std::to_string(answer.size()));
         }
         if (answer.size() >= kShortestAnswer) return true;
@@ -236,7 +236,7 @@ void Dialling::CheckAnswer(const std::string& text, bool& ok) {
 void Dialling::session(const std::string& answer, bool readTrace) {
     form_.MousePointer = 0;
     events_.pump();
-    DebugLine(panel_, wireToUtf8(answer));
+    DebugLine(panel_, bytesToUtf8(answer));
     if (!pause(kCarrierSettlesMs)) return;
     link_.ReadFromLink(true);
     form_.ModemConnected = true;

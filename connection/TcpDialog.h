@@ -1,6 +1,8 @@
 #pragma once
 // The dialog that connects to a copy of the program in server mode.
 
+#include <string>
+
 #include "connection/Handshake.h"
 #include "connection/SessionClock.h"
 #include "forms/Forms.h"
@@ -30,7 +32,13 @@ class TcpDialog {
 
   private:
     bool awaitConnection();
+    bool open(const std::string& host, const std::string& portText);
     bool probe();
+    void emptySocket();
+    void saveSettings();
+    void loadRecent();
+    void rememberServer(const std::string& server);
+    void chooseRecent();
 
     Forms& forms_;
     ControllerForm& panel_;
@@ -44,6 +52,7 @@ class TcpDialog {
     Events& events_;
     MessageBoxes& boxes_;
     Stopwatch StopwatchA_;
+    bool quit_ = false;  ///< the user has given up
 };
 
 }  // namespace zel

@@ -39,7 +39,8 @@ LiveStates::States LiveStates::now() const {
     if (panel.isSpecMeas) states.insert(&panel.isSpecMeas);
     if (forms_.time.ContinuousRecording) states.insert(&forms_.time.ContinuousRecording);
     // Ways to the instrument that may take minutes; an ordinary exchange is none of them.
-    for (const bool* state : {&forms_.main.Dialling, &forms_.devicesChoice.Configuring})
+    for (const bool* state : {&forms_.main.Dialling, &forms_.devicesChoice.Configuring,
+                              &forms_.server.ServerConnecting, &forms_.tcpConnection.Connecting})
         if (*state) states.insert(state);
     return states;
 }

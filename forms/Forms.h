@@ -7,30 +7,26 @@
 
 #include "forms/ControllerForm.h"
 #include "forms/MainForm.h"
+#include "forms/ServerForm.h"
 #include "forms/WaterfallForm.h"
 #include "platform/Controls.h"
 
 namespace zel {
 
-/// The server's window.
-class ServerForm : public Form {
-  public:
-    ServerForm() : Form("ServerForm") {
-        Caption = "Server Mode";
-        addVariables({{"doBinaryData", &doBinaryData}});
-    }
-    std::vector<std::string> CommPorts;
-    bool doBinaryData = false;
-    TextBox localPortTextBox{*this, "localPortTextBox", "2277"};
-    TextBox txtDebug{*this, "txtDebug"};
-};
-
 class TCPConnectionForm : public Form {
   public:
-    TCPConnectionForm() : Form("TCPConnectionForm") { Caption = "TCP/IP Connection"; }
+    TCPConnectionForm() : Form("TCPConnectionForm") {
+        Caption = "TCP/IP Connection";
+        addVariables({{"Connecting", &Connecting}});
+    }
+    bool Connecting = false;  ///< the socket is being connected
+    DropDownList RecentServersList{*this, "RecentServersList"};
     TextBox IPAdressTextBox{*this, "IPAdressTextBox"};
     TextBox RemotePortTextBox{*this, "RemotePortTextBox"};
+    CheckBox chkTls{*this, "chkTls", "Encrypt the connection (TLS)"};
+    TextBox FingerprintTextBox{*this, "FingerprintTextBox"};
     TextBox IDTextBox{*this, "IDTextBox"};
+    Label lblReason{*this, "lblReason"};  ///< why there is no connection
     Button ConnectTCPButton{*this, "ConnectTCPButton", "Connect"};
     Button QuitTCPButton{*this, "QuitTCPButton", "Close"};
 };

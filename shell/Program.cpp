@@ -38,6 +38,8 @@
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
 #include "platform/TimerDriver.h"
+#include "server/ServerBridge.h"
+#include "server/ServerDialog.h"
 #include "shell/Logs.h"
 #include "shell/ProgramEnd.h"
 #include "shell/SecondTimer.h"
@@ -147,9 +149,12 @@ struct Program::Rooms {
                    p.clock, p.events, p.boxes),
           devices(forms, p.serialPort, p.serialPorts, p.folder, p.clock, p.events, p.boxes),
           remote(panel, exchange, p.events, p.boxes),
+          bridge(panel, forms.server, p.serverPort, p.serverSocket, session),
+          serverDialog(forms, bridge, p.serverSocket, {p.serialPorts, p.settings, p.clipboard},
+                       session),
           serverMode(forms, p.startup, p.events),
           startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
-          second(forms, p.serverSocket, sessionClock),
+          second(panel, bridge, sessionClock),
           end(forms, p.boxes) {
         panel.CommandLine = std::move(commandLine);
         history.describe = [this] {
@@ -225,6 +230,8 @@ struct Program::Rooms {
     Dialling dialling;
     Devices devices;
     RemoteToggle remote;
+    ServerBridge bridge;
+    ServerDialog serverDialog;
     ServerMode serverMode;
     StartUp startUp;
     SecondTimer second;
@@ -240,6 +247,8 @@ Program::~Program() = default;
 
 Forms& Program::forms() { return rooms_->forms; }
 ZEL3Variables& Program::variables() { return rooms_->mirror; }
+ServerBridge& Program::server() { return rooms_->bridge; }
+ServerDialog& Program::serverDialog() { return rooms_->serverDialog; }
 ZELBas& Program::link() { return rooms_->line; }
 CommandExchange& Program::exchange() { return rooms_->exchange; }
 TraceReader& Program::traces() { return rooms_->traces; }
@@ -261,6 +270,8 @@ bool Program::connect(const LinkAddress& address, bool readTrace) {
         dialog.load();
         dialog.IPAdressTextBox.Text = address.port;
         dialog.RemotePortTextBox.Text = std::to_string(address.number);
+        dialog.chkTls.setValue(address.kind == LinkAddress::Kind::Tls);
+        dialog.FingerprintTextBox.Text = address.pinned;
         rooms_->tcpDialog.connect(readTrace);
         return panel.isConnected;
     }

@@ -15,6 +15,8 @@ namespace zel {
 
 class CommandExchange;
 class Logs;
+class ServerBridge;
+class ServerDialog;
 class SweepHistory;
 class TraceReader;
 
@@ -34,6 +36,8 @@ class Program {
     /// The sweeps of the last while.
     SweepHistory& history();
     Logs& logs();
+    ServerBridge& server();
+    ServerDialog& serverDialog();
 
     /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
     /// the server's window is closed; `ended` is then true.

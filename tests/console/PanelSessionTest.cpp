@@ -32,11 +32,11 @@ struct PanelSessionTest : ::testing::Test {
         ConsoleBoxes boxes(output, answers);
         ConsoleFileDialogs dialogs(answers);
         ServingEvents events(platform.events);
-        Program program(
-            {platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
-             platform.serverSocket, platform.settings, platform.debug, platform.clipboard,
-             platform.launcher, platform.startup, platform.folder, dialogs, platform.files},
-            words);
+        Program program({platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
+                         platform.serverPort, platform.serverSocket, platform.settings,
+                         platform.debug, platform.clipboard, platform.launcher, platform.startup,
+                         platform.folder, dialogs, platform.files},
+                        words);
         PanelSession session(program,
                              {platform.clock, events, input, output, errorOutput, answers, true},
                              LinkAddress{LinkAddress::Kind::Serial, kSimulatorPort, 57600});
