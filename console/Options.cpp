@@ -62,9 +62,7 @@ std::string rowsProblem(const std::string& file) {
 std::string listenProblem(const std::string& place) {
     const auto colon = place.rfind(':');
     const std::string port = colon == std::string::npos ? place : place.substr(colon + 1);
-    const bool digits = !port.empty() && port.size() <= 5 &&
-                        port.find_first_not_of("0123456789") == std::string::npos;
-    if (digits && std::stoi(port) <= kHighestPort) return {};
+    if (wholeNumber(port, 0, kHighestPort)) return {};
     return "takes [ADDRESS:]PORT, not " + place;
 }
 
