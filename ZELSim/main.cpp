@@ -3,7 +3,7 @@
 #include <CLI/CLI.hpp>
 #include <fstream>
 #include <iostream>
-#include <memory>
+#include <locale>
 #include <string>
 #include <vector>
 
@@ -62,7 +62,9 @@ bool readPhonebook(const std::string& file, zelsim::Phonebook& book) {
         book = zelsim::Phonebook::standard();
         return true;
     }
-    std::ifstream text(file);
+    std::ifstream text;
+    text.imbue(std::locale::classic());
+    text.open(file);
     std::string problem = text ? "" : "cannot be read";
     if (text && book.read(text, problem)) {
         return true;
