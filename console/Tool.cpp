@@ -11,6 +11,7 @@
 #include "console/LineInput.h"
 #include "console/LineOutput.h"
 #include "console/PanelSession.h"
+#include "console/ServeVerb.h"
 #include "console/ServingEvents.h"
 #include "console/Verbs.h"
 #include "desktop/platform/QtSignals.h"
@@ -96,8 +97,11 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
     ProgressBar progress;
     if (streams.errorsAreTerminal)
         progress = [&streams](int done, int wanted) { drawBar(streams.errors, done, wanted); };
-    return runVerb(options, {stage.program, stage.events, stage.answers, stage.boxes, output,
-                             errors, writeGraphImage, writeRowsImage, progress});
+    const VerbStage verbs{stage.program, stage.events,    stage.answers,  stage.boxes, output,
+                          errors,        writeGraphImage, writeRowsImage, progress};
+    if (options.verb == Verb::Serve) return runServer(options, verbs);
+    if (options.verb == Verb::Devices) return runDevices(options, verbs);
+    return runVerb(options, verbs);
 }
 
 }  // namespace

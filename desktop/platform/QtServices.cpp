@@ -31,6 +31,16 @@ QString autostartEntry(const std::string& linkName) {
     return folder + "/" + name + ".desktop";
 }
 
+/// A new folder gets the files that users may change; a file that is there stays.
+void fillFromDefaults(const QString& folder) {
+    const QDir defaults(":/defaults");
+    for (const QString& name : defaults.entryList(QDir::Files)) {
+        QFile file(folder + "/" + name);
+        if (file.exists() || !QFile::copy(defaults.filePath(name), file.fileName())) continue;
+        file.setPermissions(file.permissions() | QFile::WriteOwner);
+    }
+}
+
 }  // namespace
 
 QtApplicationFolder::QtApplicationFolder(const QString& home) {
@@ -41,6 +51,7 @@ QtApplicationFolder::QtApplicationFolder(const QString& home) {
             QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) + "/ZELRemote";
     QDir().mkpath(folder);
     path_ = QDir(folder).absolutePath().toStdString();
+    fillFromDefaults(folder);
 }
 
 std::string QtApplicationFolder::programPath() {
