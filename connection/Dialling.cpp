@@ -58,8 +58,8 @@ std::string callAnswer(std::string text, const std::string& dialled) {
     return text;
 }
 
-Dialling::Dialling(Forms& forms, const InstrumentLink& link, ConnectionDialog& dialog, SessionStart& start,
-             Disconnection& disconnection, const Session& session)
+Dialling::Dialling(Forms& forms, const InstrumentLink& link, ConnectionDialog& dialog,
+                   SessionStart& start, Disconnection& disconnection, const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       form_(forms.main),
@@ -176,7 +176,8 @@ void Dialling::awaitOk() {
 /// False when the port was closed meanwhile: the user cancelled, or the device has gone.
 bool Dialling::pause(int ms) {
     const Stopwatch watch(session_.clock);
-    while (link_.bytes.portOpen() && watch.Elapsed() < ms) session_.events.wait(ms - watch.Elapsed());
+    while (link_.bytes.portOpen() && watch.Elapsed() < ms)
+        session_.events.wait(ms - watch.Elapsed());
     return link_.bytes.portOpen();
 }
 

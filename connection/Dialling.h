@@ -23,8 +23,8 @@ std::string callAnswer(std::string text, const std::string& dialled);
 class Dialling {
   public:
     /// Connects the dialog's dial and cancel buttons.
-    Dialling(Forms& forms, const InstrumentLink& link, ConnectionDialog& dialog, SessionStart& start,
-             Disconnection& disconnection, const Session& session);
+    Dialling(Forms& forms, const InstrumentLink& link, ConnectionDialog& dialog,
+             SessionStart& start, Disconnection& disconnection, const Session& session);
 
     void DialButton_Click();
     void CancelButton_Click();

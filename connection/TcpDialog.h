@@ -3,6 +3,7 @@
 
 #include <string>
 
+#include "connection/SessionStart.h"
 #include "forms/Forms.h"
 #include "link/InstrumentLink.h"
 #include "platform/Services.h"

@@ -42,7 +42,6 @@ class QtSocket : public Socket {
     bool failed_ = false;
     std::string problem_;  ///< of the failure
     bool peerClosed_ = false;
-    std::string problem_;
     int source_ = 0;
 };
 

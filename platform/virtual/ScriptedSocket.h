@@ -35,7 +35,6 @@ class ScriptedSocket : public Socket {
     void begin();
     /// What the far end has not taken.
     void setBacklog(std::size_t bytes) { backlog_ = bytes; }
-    void setProblem(std::string text) { problem_ = std::move(text); }
 
     const std::string& failure() const { return script_.failure(); }
     std::string leftOver() const { return script_.leftOver(); }
