@@ -32,8 +32,9 @@ InProcessPort::~InProcessPort() {
 
 bool InProcessPort::open(const zel::SerialSetup& setup) {
     catchUp();
-    wire_.reset();
-    wire_.setHostBaud(baudOfSettings(setup.Settings));
+    line_ = setup.CommPort == kModemPort ? static_cast<HostLine*>(&modem_) : &wire_;
+    line_->reset();
+    line_->setHostBaud(baudOfSettings(setup.Settings));
     waiting_.clear();
     open_ = true;
     return true;
@@ -41,7 +42,7 @@ bool InProcessPort::open(const zel::SerialSetup& setup) {
 
 void InProcessPort::close() {
     open_ = false;
-    wire_.reset();
+    line_->reset();
     waiting_.clear();
     if (task_) {
         events_.cancel(*task_);
@@ -62,16 +63,16 @@ void InProcessPort::output(std::string_view bytes) {
         return;
     }
     catchUp();
-    wire_.receive(bytes);
+    line_->receive(bytes);
     watch();
 }
 
 void InProcessPort::catchUp() {
     const std::int64_t now = clock_.micros();
     constexpr double perSecond = 1e6;
-    wire_.advance(static_cast<double>(now - seen_) / perSecond);
+    line_->advance(static_cast<double>(now - seen_) / perSecond);
     seen_ = now;
-    waiting_ += wire_.take();
+    waiting_ += line_->take();
 }
 
 // Has the event loop come back when the next bytes are there.
@@ -80,7 +81,7 @@ void InProcessPort::watch() {
         events_.cancel(*task_);
         task_.reset();
     }
-    if (const auto due = wire_.nextDue()) {
+    if (const auto due = line_->nextDue()) {
         // A little late rather than a little early, by the clock's own step.
         constexpr double step = 0.001;
         const double ms = *due * 1000;

@@ -7,6 +7,7 @@
 #include <string_view>
 
 #include "ZELSim/Device.h"
+#include "ZELSim/Modem.h"
 #include "ZELSim/Wire.h"
 #include "platform/Clock.h"
 #include "platform/Events.h"
@@ -22,8 +23,11 @@ class InProcessPort : public zel::SerialPort {
     InProcessPort(const InProcessPort&) = delete;
     InProcessPort& operator=(const InProcessPort&) = delete;
 
-    /// Any name will do. On a paced line the baud rate of the setup has to fit the instrument's,
-    /// else only noise comes.
+    /// The port of this name has a modem with the standard phonebook ahead of the instrument.
+    static constexpr const char* kModemPort = "/dev/modem";
+
+    /// Any other name reaches the instrument. On a paced line the baud rate of the setup has to fit
+    /// the instrument's, else only noise comes.
     bool open(const zel::SerialSetup& setup) override;
     void close() override;
     bool isOpen() const override { return open_; }
@@ -42,6 +46,8 @@ class InProcessPort : public zel::SerialPort {
     zel::Events& events_;
     Device device_;
     Wire wire_;
+    Modem modem_{wire_, Phonebook::standard()};
+    HostLine* line_ = &wire_;
     bool open_ = false;
     std::int64_t seen_;  // microseconds of the clock up to which the wire's time has run
     std::string waiting_;

@@ -1,5 +1,7 @@
 #include "connection/ConnectionDialog.h"
 
+#include <utility>
+
 #include "link/RS232Ops.h"
 #include "platform/ModalForm.h"
 
@@ -27,6 +29,16 @@ ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, SessionStart& s
     handlers_.on(dialog_.Load, [this] { Form_Load(); });
     handlers_.on(panel_.Direct.Clicked, [this] { Direct_Click(); });
     handlers_.on(panel_.ImmConnect.Clicked, [this] { ImmConnect_Click(); });
+    const std::pair<MenuItem*, std::int16_t> dialled[] = {{&panel_.Modem, CF::MODEMCON},
+                                                          {&panel_.GSM, CF::GSMCON},
+                                                          {&panel_.ModemToGSM, CF::MODEMGSMCON},
+                                                          {&panel_.GSMToModem, CF::GSMMODEMCON}};
+    for (const auto& [item, kind] : dialled) {
+        handlers_.on(item->Clicked, [this, kind = kind] {
+            panel_.immConnectState = false;
+            SetConnectionKind(kind);
+        });
+    }
     handlers_.on(dialog_.ZELButton.Clicked, [this] { ZELButton_Click(); });
     handlers_.on(dialog_.LoadSettingsButton.Clicked, [this] { profiles_.LoadSettings_Click(); });
     handlers_.on(dialog_.SaveSettingsButton.Clicked, [this] { profiles_.SaveSettings_Click(); });
@@ -83,7 +95,11 @@ void ConnectionDialog::SetConnectionKind(std::int16_t kind) {
     dialog_.ModemConnectionFrame.Visible = !direct;
     dialog_.DisconnectButton2.Visible = !direct;
     dialog_.CancelConnButton.Visible = !direct;
-    if (!direct) dialog_.CancelButton.Visible = false;
+    if (!direct) {
+        dialog_.CancelButton.Visible = false;
+        dialog_.LoadSettingsButton.Visible = true;
+        dialog_.SaveSettingsButton.Visible = true;
+    }
     profiles_.LoadSettings_Click();
     if (!panel_.immConnectState) showModal();
 }

@@ -1,5 +1,7 @@
 #include "connection/Disconnection.h"
 
+#include <algorithm>
+
 #include "link/WaitNotice.h"
 #include "support/CommandWord.h"
 
@@ -10,6 +12,7 @@ using CF = ControllerForm;
 
 constexpr int kModemAnswerMs = 5001;
 constexpr int kModemPauseMs = 500;
+constexpr int kModemSilenceMs = 1000;
 constexpr int kPollMs = 20;
 constexpr std::size_t kLongestModemAnswer = 4096;
 
@@ -138,10 +141,13 @@ void Disconnection::notConnectedLook() {
 }
 
 void Disconnection::HangUpModem() {
+    // A modem takes "+++" for a command only with a second of silence ahead of it and behind it.
     // The answers make no difference: the hang-up goes on in any case.
+    session_.events.sleep(kModemSilenceMs);
     link_.WriteToLink("+++");
     awaitModemAnswer();
-    session_.events.sleep(kModemPauseMs);
+    const std::int32_t silent = StopwatchA_.Elapsed();
+    session_.events.sleep(std::max(kModemPauseMs, kModemSilenceMs - silent));
     link_.WriteToLink("ATH0\r");
     awaitModemAnswer();
 }

@@ -1,5 +1,9 @@
 #include "connection/TcpDialog.h"
 
+#include <algorithm>
+#include <utility>
+#include <vector>
+
 #include "connection/Profiles.h"
 #include "link/WaitNotice.h"
 #include "platform/ModalForm.h"
@@ -13,7 +17,11 @@ namespace {
 constexpr const char* kSection = "TCPCON";
 constexpr int kPollMs = 50;
 constexpr int kProbeMs = 5000;
+constexpr int kConnectMs = 30'000;
+constexpr int kAnswerRestMs = 250;
 constexpr double kHighestPort = 65535;
+constexpr std::size_t kMostRecent = 8;
+constexpr std::size_t kMostStale = 1U << 20;  // bytes that a server may have waiting
 
 struct StateText {
     SocketState state;
@@ -40,14 +48,61 @@ TcpDialog::TcpDialog(Forms& forms, const InstrumentLink& link, SessionStart& sta
       session_(session),
       StopwatchA_(session.clock) {
     handlers_.on(dialog_.Load, [this] { Form_Load(); });
+    handlers_.on(dialog_.RecentServersList.Clicked, [this] { chooseRecent(); });
     handlers_.on(panel_.TCPConnection.Clicked, [this] { TCPConnection_Click(); });
     handlers_.on(dialog_.ConnectTCPButton.Clicked, [this] { ConnectTCPButton_Click(); });
     handlers_.on(dialog_.QuitTCPButton.Clicked, [this] { QuitTCPButton_Click(); });
 }
 
 void TcpDialog::Form_Load() {
-    dialog_.IPAdressTextBox.Text = settings_.get(kProgramName, kSection, "RemoteIP", "");
-    dialog_.RemotePortTextBox.Text = settings_.get(kProgramName, kSection, "RemotePort", "");
+    const auto get = [this](const char* key) {
+        return settings_.get(kProgramName, kSection, key, "");
+    };
+    dialog_.IPAdressTextBox.Text = get("RemoteIP");
+    dialog_.RemotePortTextBox.Text = get("RemotePort");
+    dialog_.chkTls.setValue(get("Tls") == "1");
+    dialog_.FingerprintTextBox.Text = get("Fingerprint");
+    dialog_.lblReason.Caption = "";
+    loadRecent();
+}
+
+void TcpDialog::loadRecent() {
+    std::vector<std::string> servers;
+    for (std::size_t i = 1; i <= kMostRecent; ++i) {
+        std::string server =
+            settings_.get(kProgramName, kSection, "Recent" + std::to_string(i), "");
+        if (!server.empty()) servers.push_back(std::move(server));
+    }
+    dialog_.RecentServersList.setItems(std::move(servers));
+}
+
+/// "HOST:PORT" comes first in the list of recent servers.
+void TcpDialog::rememberServer(const std::string& server) {
+    std::vector<std::string> servers = dialog_.RecentServersList.items();
+    servers.erase(std::remove(servers.begin(), servers.end(), server), servers.end());
+    servers.insert(servers.begin(), server);
+    if (servers.size() > kMostRecent) servers.resize(kMostRecent);
+    for (std::size_t i = 0; i < servers.size(); ++i)
+        settings_.set(kProgramName, kSection, "Recent" + std::to_string(i + 1), servers[i]);
+    dialog_.RecentServersList.setItems(std::move(servers));
+}
+
+void TcpDialog::chooseRecent() {
+    const std::string server = dialog_.RecentServersList.Text();
+    const auto colon = server.rfind(':');
+    if (colon == std::string::npos) return;
+    dialog_.IPAdressTextBox.Text = server.substr(0, colon);
+    dialog_.RemotePortTextBox.Text = server.substr(colon + 1);
+}
+
+void TcpDialog::saveSettings() {
+    const auto set = [this](const char* key, const std::string& value) {
+        settings_.set(kProgramName, kSection, key, value);
+    };
+    set("RemoteIP", dialog_.IPAdressTextBox.Text);
+    set("RemotePort", dialog_.RemotePortTextBox.Text);
+    set("Tls", dialog_.chkTls.Value() ? "1" : "0");
+    set("Fingerprint", dialog_.FingerprintTextBox.Text);
 }
 
 void TcpDialog::TCPConnection_Click() {
@@ -58,6 +113,7 @@ void TcpDialog::TCPConnection_Click() {
 void TcpDialog::ConnectTCPButton_Click() { connect(true); }
 
 void TcpDialog::connect(bool readTrace) {
+    if (dialog_.Connecting) return;
     const std::string portText = trimmed(dialog_.RemotePortTextBox.Text.get());
     const double port = leadingNumber(portText);
     if (!IsNumericText(portText) || port < 1 || port > kHighestPort) {
@@ -65,29 +121,47 @@ void TcpDialog::connect(bool readTrace) {
         session_.boxes.show({BoxIcon::Plain, "Please enter a valid TCP port!"});
         return;
     }
-    settings_.set(kProgramName, kSection, "RemoteIP", dialog_.IPAdressTextBox.Text);
-    settings_.set(kProgramName, kSection, "RemotePort", dialog_.RemotePortTextBox.Text);
+    saveSettings();
     const DialogueScope scope(link_.state);
     dialog_.AdviceLabel.Caption = "";
     start_.setClock("start");
-    if (socket_.state() != SocketState::Closed) socket_.close();
-    const std::string host = trimmed(dialog_.IPAdressTextBox.Text.get());
-    socket_.connectTo(host, static_cast<int>(port));
-    const std::string where = host + ":" + portText;
-    if (!awaitConnection(where)) return;
-    dialog_.IDTextBox.Text = "CONNECTED to " + where;
-    if (!probe()) {
-        if (left()) return giveUp();
-        dialog_.AdviceLabel.Caption = connectionAdvice(forms_);
-        session_.boxes.show(
-            {BoxIcon::Information, "No M&T ZEL3 found at the specified adress!", "No ZEL3 found"});
-        start_.setClock("stop");
-        return;
-    }
-    socket_.getData();
+    quit_ = false;
+    dialog_.lblReason.Caption = "";
+    dialog_.Connecting = true;
+    const bool found = open(trimmed(dialog_.IPAdressTextBox.Text.get()), portText);
+    dialog_.Connecting = false;
+    if (!found) return;
     start_.connect();
     dialog_.Hide();
     if (readTrace) start_.readFirstSweep();
+}
+
+/// Connects and looks whether an instrument is behind the server.
+bool TcpDialog::open(const std::string& host, const std::string& portText) {
+    if (socket_.state() != SocketState::Closed) socket_.close();
+    const int port = static_cast<int>(leadingNumber(portText));
+    if (dialog_.chkTls.Value()) {
+        std::string pinned = lowerCase(trimmed(dialog_.FingerprintTextBox.Text.get()));
+        pinned = replaceAll(replaceAll(pinned, ":", ""), " ", "");
+        socket_.connectTls(host, port, pinned);
+    } else {
+        socket_.connectTo(host, port);
+    }
+    const std::string where = host + ":" + portText;
+    if (!awaitConnection(where)) return false;
+    dialog_.IDTextBox.Text = "CONNECTED to " + where;
+    rememberServer(host + ":" + portText);
+    if (probe()) return true;
+    if (quit_) return false;
+    if (left()) {
+        giveUp();
+        return false;
+    }
+    dialog_.AdviceLabel.Caption = connectionAdvice(forms_);
+    session_.boxes.show(
+        {BoxIcon::Information, "No M&T ZEL3 found at the specified adress!", "No ZEL3 found"});
+    start_.setClock("stop");
+    return false;
 }
 
 bool TcpDialog::left() const { return link_.state.mustLeave(session_.clock.micros()); }
@@ -99,21 +173,30 @@ void TcpDialog::giveUp() {
 }
 
 bool TcpDialog::awaitConnection(const std::string& where) {
+    StopwatchA_.Reset();
     for (;;) {
         if (left()) {
             giveUp();
             return false;
         }
         const SocketState state = socket_.state();
-        for (const StateText& row : kStateTexts)
-            if (row.state == state) dialog_.IDTextBox.Text = row.text;
+        if (!quit_)
+            for (const StateText& row : kStateTexts)
+                if (row.state == state) dialog_.IDTextBox.Text = row.text;
         if (state == SocketState::Connected) return true;
-        // A socket that the user closed meanwhile will not connect any more.
-        if (state == SocketState::Closed) return false;
         if (state == SocketState::Error) {
+            dialog_.lblReason.Caption = socket_.problem();
             if (!socket_.problem().empty())
                 session_.boxes.show({BoxIcon::Critical, "The connection to " + where +
                                                             " failed: " + socket_.problem()});
+            return false;
+        }
+        // A socket that the user closed meanwhile will not connect any more.
+        if (quit_ || state == SocketState::Closed) return false;
+        if (StopwatchA_.Elapsed() > kConnectMs) {
+            socket_.close();
+            dialog_.IDTextBox.Text = "TCP Socket Error.";
+            dialog_.lblReason.Caption = "The server did not answer within 30 seconds.";
             return false;
         }
         session_.events.wait(kPollMs);
@@ -123,16 +206,39 @@ bool TcpDialog::awaitConnection(const std::string& where) {
 bool TcpDialog::probe() {
     StopwatchA_.Reset();
     link_.bytes.WriteToLink("\r");
+    const auto lives = [this] { return !quit_ && socket_.state() == SocketState::Connected; };
     while (socket_.peekData().empty()) {
-        if (StopwatchA_.Elapsed() > kProbeMs || left()) return false;
+        if (StopwatchA_.Elapsed() > kProbeMs || !lives() || left()) return false;
         session_.events.wait(kPollMs);
     }
-    return true;
+    // The rest of the line may come in another packet.
+    StopwatchA_.Reset();
+    std::string answer = socket_.getData();
+    while (answer.find('\r') == std::string::npos && StopwatchA_.Elapsed() < kAnswerRestMs &&
+           lives()) {
+        session_.events.wait(kAnswerRestMs - StopwatchA_.Elapsed());
+        answer += socket_.getData();
+        if (answer.size() > kMostStale) break;
+    }
+    emptySocket();
+    return !quit_;
+}
+
+/// What a server had waiting for this client is no answer to what will be asked.
+void TcpDialog::emptySocket() {
+    std::size_t taken = 0;
+    for (;;) {
+        const std::size_t size = socket_.getData().size();
+        taken += size;
+        if (size == 0 || taken > kMostStale) return;
+    }
 }
 
 void TcpDialog::QuitTCPButton_Click() {
+    quit_ = true;
     link_.exchange.leaveWait(0);
-    if (socket_.state() == SocketState::Open || socket_.state() == SocketState::Connecting)
+    const SocketState state = socket_.state();
+    if (state == SocketState::Open || state == SocketState::Connecting || dialog_.Connecting)
         socket_.close();
     dialog_.IDTextBox.Text = "";
     dialog_.unload(1);

@@ -1,6 +1,8 @@
 #pragma once
 // The dialog that connects to a copy of the program in server mode.
 
+#include <string>
+
 #include "connection/SessionStart.h"
 #include "forms/Forms.h"
 #include "link/InstrumentLink.h"
@@ -27,7 +29,13 @@ class TcpDialog {
     bool awaitConnection(const std::string& where);
     bool left() const;
     void giveUp();
+    bool open(const std::string& host, const std::string& portText);
     bool probe();
+    void emptySocket();
+    void saveSettings();
+    void loadRecent();
+    void rememberServer(const std::string& server);
+    void chooseRecent();
 
     Forms& forms_;
     ControllerForm& panel_;
@@ -38,6 +46,7 @@ class TcpDialog {
     SettingsStore& settings_;
     Session session_;
     Stopwatch StopwatchA_;
+    bool quit_ = false;  ///< the user has given up
     Handlers handlers_;
 };
 

@@ -13,6 +13,7 @@
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtPlatform.h"
 #include "platform/virtual/MemoryServices.h"
+#include "platform/virtual/ScriptedServer.h"
 #include "platform/virtual/ScriptedSocket.h"
 #include "platform/virtual/VirtualTime.h"
 #include "trace/ViewAnnotations.h"
@@ -39,7 +40,7 @@ class SimulatorFront : public Front {
     QtSignals& endSignals() override { return signals_; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
         return {clock_,        served,    boxes,  port_,      ports_,    tcpSocket_,
-                serverSocket_, settings_, debug_, clipboard_, launcher_, startup_,
+                serverPort_, serverSocket_, settings_, debug_, clipboard_, launcher_, startup_,
                 folder_,       dialogs,   files_, signals_};
     }
 
@@ -51,7 +52,8 @@ class SimulatorFront : public Front {
     zelsim::InProcessPort port_{clock_, events_, {}, {.answering = kAnswerSeconds}};
     FixedPortList ports_;
     ScriptedSocket tcpSocket_{events_};
-    ScriptedSocket serverSocket_{events_};
+    zelsim::InProcessPort serverPort_{clock_, events_, {}, {.answering = kAnswerSeconds}};
+    ScriptedServer serverSocket_{events_};
     QtApplicationFolder folder_;
     QtSettingsStore settings_{folder_};
     SilentDebugChannel debug_;
@@ -69,7 +71,7 @@ class PortFront : public Front {
     QtSignals& endSignals() override { return qt_.endSignals; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
         return {qt_.clock,     served,           boxes,        qt_.serialPort, qt_.serialPorts,
-                qt_.tcpSocket, qt_.serverSocket, qt_.settings, qt_.debug,      clipboard_,
+                qt_.tcpSocket, qt_.serverPort, qt_.serverSocket, qt_.settings, qt_.debug,      clipboard_,
                 qt_.launcher,  qt_.startup,      qt_.folder,   dialogs,        qt_.files,
                 qt_.endSignals};
     }

@@ -8,6 +8,7 @@
 
 #include "desktop/platform/CommonOptions.h"
 #include "link/WireText.h"
+#include "server/Networks.h"
 #include "support/NumberOption.h"
 #include "support/Text.h"
 
@@ -16,9 +17,12 @@ namespace {
 
 constexpr int kMostSweeps = 1000000;
 constexpr const char* kAddresses =
-    "serial:DEVICE[@BAUD] (57600), tcp:HOST:PORT, or sim: for the built-in simulator";
+    "serial:DEVICE[@BAUD] (57600), tcp:HOST:PORT, tls:HOST:PORT[,FINGERPRINT], modem:, gsm:, "
+    "modemgsm: or gsmmodem:DEVICE[@BAUD],NUMBER, or sim: for the built-in simulator";
 constexpr double kShortestInterval = 0.001;
 constexpr double kLongestInterval = 2'000'000;
+constexpr int kHighestBaud = 4000000;
+constexpr int kHighestPort = 65535;
 constexpr const char* kImageEndings[] = {".wmf", ".svg", ".png", ".pdf"};
 constexpr const char* kRowsEndings[] = {".svg", ".png", ".pdf"};
 
@@ -53,6 +57,17 @@ std::string imageProblem(const std::string& file) {
 
 std::string rowsProblem(const std::string& file) {
     return endsIn(file, kRowsEndings) ? "" : "takes a file that ends in .svg, .png or .pdf";
+}
+
+std::string listenProblem(const std::string& place) {
+    const auto colon = place.rfind(':');
+    const std::string port = colon == std::string::npos ? place : place.substr(colon + 1);
+    if (wholeNumber(port, 0, kHighestPort)) return {};
+    return "takes [ADDRESS:]PORT, not " + place;
+}
+
+std::string networkProblem(const std::string& text) {
+    return networkOf(text) ? std::string() : "takes ADDRESS or ADDRESS/BITS, not " + text;
 }
 
 struct Parser {
@@ -107,6 +122,56 @@ struct Parser {
         CLI::App* panel =
             verb(Verb::Panel, "panel", "Works the panel by the names of its controls");
         panel->add_option("FILE", options.argument, "Lines of commands; standard input without it");
+        addRemoteVerbs(options);
+    }
+
+    void addRemoteVerbs(Options& options) {
+        ServeOptions& to = options.serve;
+        CLI::App* serve = verb(Verb::Serve, "serve", "Serves an instrument at a TCP port");
+        serve->add_option("--serial", to.serial, "Serial port of the instrument")
+            ->type_name("DEVICE")
+            ->required();
+        serve->add_option("--baud", to.baud, "Its baud rate; searched without it")
+            ->type_name("N")
+            ->check(CLI::Range(1, kHighestBaud));
+        serve
+            ->add_option("--listen", to.listen,
+                         "Where clients connect (127.0.0.1:2277; port 0: any free one; address *: "
+                         "all)")
+            ->type_name("[ADDRESS:]PORT")
+            ->check(listenProblem, "");
+        serve
+            ->add_option("--allow", to.allow,
+                         "Who may connect: ADDRESS or ADDRESS/BITS, as often as you like (the "
+                         "loopback and private ranges)")
+            ->type_name("NET")
+            ->allow_extra_args(false)
+            ->check(networkProblem, "");
+        serve->add_flag("--keep", to.keep, "Keep the client at work: refuse newcomers");
+        serve->add_option("--group", to.group, "Quiet ms that end a group of bytes (10)")
+            ->type_name("MS")
+            ->check(CLI::Range(0, 100));
+        CLI::Option* certificate =
+            serve->add_option("--tls-certificate", to.tlsCertificate, "Serve TLS, with this chain")
+                ->type_name("FILE");
+        CLI::Option* key =
+            serve->add_option("--tls-key", to.tlsKey, "Private key of the certificate")
+                ->type_name("FILE")
+                ->needs(certificate);
+        certificate->needs(key);
+        serve->add_option("--tls-clients", to.tlsClients, "Authority that clients must be of")
+            ->type_name("FILE")
+            ->needs(certificate);
+        CLI::App* devices =
+            verb(Verb::Devices, "devices", "Lists communication devices, or configures one");
+        CLI::Option* port =
+            devices->add_option("--serial", to.serial, "Port of the device")->type_name("DEVICE");
+        devices->add_option("--configure", to.configure, "Sends this device its commands")
+            ->type_name("NAME")
+            ->needs(port);
+        devices->add_option("--baud", to.baud, "Baud rate (57600)")
+            ->type_name("N")
+            ->check(CLI::Range(1, kHighestBaud));
     }
 
     static CLI::Option* outputOption(CLI::App* verb, Options& options, const char* what) {
@@ -139,7 +204,9 @@ struct Parser {
 };
 
 std::string missing(const Options& options) {
-    if (options.verb == Verb::Panel || options.verb == Verb::Show) return {};
+    if (options.verb == Verb::Panel || options.verb == Verb::Show || options.verb == Verb::Serve ||
+        options.verb == Verb::Devices)
+        return {};
     if (options.verb == Verb::Run && !options.address) return {};
     if (!options.address) return "this verb needs an instrument: --connect URL";
     if (upperCase(options.words).find("SERVER") != std::string::npos)

@@ -4,12 +4,27 @@
 #include <optional>
 #include <ostream>
 #include <string>
+#include <vector>
 
 #include "console/Address.h"
 
 namespace zel {
 
-enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Run, Panel };
+enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Run, Panel, Serve, Devices };
+
+/// What the server and the devices take.
+struct ServeOptions {
+    std::string serial;
+    int baud = 0;  ///< 0: searched, or the usual one
+    std::string listen = "127.0.0.1:2277";
+    std::vector<std::string> allow;
+    bool keep = false;
+    int group = 10;  ///< ms
+    std::string tlsCertificate;
+    std::string tlsKey;
+    std::string tlsClients;
+    std::string configure;  ///< name of a device
+};
 
 struct Options {
     std::optional<ConnectAddress> address;
@@ -25,6 +40,7 @@ struct Options {
     std::string image;        ///< file of the graph's picture; empty for none
     std::string waterfall;    ///< file of the rows in depth; empty for none
     std::string spectrogram;  ///< file of the rows from above; empty for none
+    ServeOptions serve;
 };
 
 /// Fills the options. An exit status when the run is over with that: 0 behind a help text on

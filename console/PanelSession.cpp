@@ -281,8 +281,7 @@ void PanelSession::image3d(std::string_view rest) {
 void PanelSession::connect(std::string_view) {
     if (!address_) return complain("connect needs the option --connect");
     const ControllerForm& panel = program_.forms().controller;
-    const bool tcp = address_->kind == LinkAddress::Kind::Tcp;
-    const MenuItem& item = tcp ? panel.TCPConnection : panel.Direct;
+    const MenuItem& item = address_->overNetwork() ? panel.TCPConnection : panel.Direct;
     if (const Done refused = refusal(item, false); refused != Done::Yes)
         return tell(refused, item.name());
     if (program_.connect(*address_, true) || program_.ended()) return;

@@ -13,6 +13,7 @@
 #include "console/LineOutput.h"
 #include "console/PanelSession.h"
 #include "console/RunScript.h"
+#include "console/ServeVerb.h"
 #include "console/ServingEvents.h"
 #include "console/Verbs.h"
 #include "desktop/platform/QtSignals.h"
@@ -124,8 +125,11 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
         return runScript(given, {stage.program, stage.files, stage.events, input, virtualTime,
                                  stage.boxes, stage.dialogs, stage.answers, errors, progressLine});
     };
-    return runVerb(options, {stage.program, stage.events, stage.answers, stage.boxes, output,
-                             errors, writeGraphImage, writeRowsImage, progress, script});
+    const VerbStage verbs{stage.program, stage.events,    stage.answers,  stage.boxes, output,
+                          errors,        writeGraphImage, writeRowsImage, progress,    script};
+    if (options.verb == Verb::Serve) return runServer(options, verbs);
+    if (options.verb == Verb::Devices) return runDevices(options, verbs);
+    return runVerb(options, verbs);
 }
 
 }  // namespace

@@ -41,7 +41,7 @@ struct Run {
 int info(const Run& run) {
     Forms& forms = run.program().forms();
     const ZEL3Variables& mirror = run.program().variables();
-    const bool tcp = run.options.address->link.kind == LinkAddress::Kind::Tcp;
+    const bool tcp = run.options.address->link.overNetwork();
     const std::pair<const char*, std::string> lines[] = {
         {"Identity", tcp ? forms.tcpConnection.IDTextBox.Text : forms.main.IDText.Text},
         {"Model", std::to_string(mirror.InstrumentModel)},

@@ -8,38 +8,44 @@
 #include "forms/ControllerForm.h"
 #include "forms/MainForm.h"
 #include "forms/ScriptForms.h"
+#include "forms/ServerForm.h"
 #include "forms/WaterfallForm.h"
 #include "platform/Controls.h"
 
 namespace zel {
 
-/// The server's window.
-class ServerForm : public Form {
-  public:
-    ServerForm() : Form("ServerForm") {
-        Caption = "Server Mode";
-        addVariables({{"doBinaryData", &doBinaryData}});
-    }
-    std::vector<std::string> CommPorts;
-    bool doBinaryData = false;
-    TextBox localPortTextBox{*this, "localPortTextBox", "2277"};
-    TextBox txtDebug{*this, "txtDebug"};
-};
-
 class TCPConnectionForm : public Form {
   public:
-    TCPConnectionForm() : Form("TCPConnectionForm") { Caption = "TCP/IP Connection"; }
+    TCPConnectionForm() : Form("TCPConnectionForm") {
+        Caption = "TCP/IP Connection";
+        addVariables({{"Connecting", &Connecting}});
+    }
+    bool Connecting = false;  ///< the socket is being connected
+    DropDownList RecentServersList{*this, "RecentServersList"};
     TextBox IPAdressTextBox{*this, "IPAdressTextBox"};
     TextBox RemotePortTextBox{*this, "RemotePortTextBox"};
+    CheckBox chkTls{*this, "chkTls", "Encrypt the connection (TLS)"};
+    TextBox FingerprintTextBox{*this, "FingerprintTextBox"};
     TextBox IDTextBox{*this, "IDTextBox"};
     Label AdviceLabel{*this, "AdviceLabel"};  ///< how long a wait lasts; what to check behind it
+    Label lblReason{*this, "lblReason"};  ///< why there is no connection
     Button ConnectTCPButton{*this, "ConnectTCPButton", "Connect"};
     Button QuitTCPButton{*this, "QuitTCPButton", "Close"};
 };
 
 class DevicesChoiceForm : public Form {
   public:
-    DevicesChoiceForm() : Form("DevicesChoiceForm") { Caption = "Communication Device"; }
+    DevicesChoiceForm() : Form("DevicesChoiceForm") {
+        Caption = "Communication Device";
+        addVariables({{"Configuring", &Configuring}});
+    }
+    bool Configuring = false;  ///< a device gets its commands
+    DropDownList AvailableDevicesChoice{*this, "AvailableDevicesChoice"};
+    DropDownList DevicesPortList{*this, "DevicesPortList", true};
+    DropDownList DevicesBaudList{*this, "DevicesBaudList", true};
+    Label DeviceStatusLabel{*this, "DeviceStatusLabel"};
+    Button SetDeviceButton{*this, "SetDeviceButton", "Set"};
+    Button CloseDevicesButton{*this, "CloseDevicesButton", "Close"};
 };
 
 /// The recording's dialog.

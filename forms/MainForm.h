@@ -15,7 +15,8 @@ class MainForm : public Form {
         addVariables({{"IsConnectedToPort", &IsConnectedToPort},
                       {"CommandIsIDN", &CommandIsIDN},
                       {"IsConnecting", &IsConnecting},
-                      {"ModemConnected", &ModemConnected}});
+                      {"ModemConnected", &ModemConnected},
+                      {"Dialling", &Dialling}});
     }
 
     std::vector<std::string> CommPorts;  ///< names of the serial ports
@@ -23,6 +24,7 @@ class MainForm : public Form {
     bool CommandIsIDN = false;
     bool IsConnecting = false;    ///< the handshake runs
     bool ModemConnected = false;  ///< a dialled link is up
+    bool Dialling = false;        ///< a dial is under way
 
     DropDownList COMList{*this, "COMList", true};
     DropDownList BaudList{*this, "BaudList", true};

@@ -54,6 +54,7 @@ void ByteLink::OpenPortFromDialog() {
         events_.pump();
     };
     pointer(11);
+    state_.DialCancelled = false;
     const std::string device = serialDeviceName(dialog_.COMList.Text(), dialog_.CommPorts);
     if (device.empty()) {
         dialog_.MousePointer = 0;

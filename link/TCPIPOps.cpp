@@ -9,10 +9,10 @@ constexpr double kHighestPort = 65535;
 
 }  // namespace
 
-void ListenOnPort(Socket& socket, const std::string& portText) {
+void ListenOnPort(ServerSocket& socket, const std::string& portText, const std::string& address) {
     const double port = leadingNumber(portText);
     if (port < 0 || port > kHighestPort) return;
-    socket.listen(static_cast<int>(port));
+    socket.listen(address, static_cast<int>(port));
 }
 
 void CloseIfOpen(Socket& socket) {
@@ -23,8 +23,8 @@ void CloseIfNotClosed(Socket& socket) {
     if (socket.state() != SocketState::Closed) socket.close();
 }
 
-void AcceptRequest(Socket& socket, int requestId) {
-    CloseIfNotClosed(socket);
+void AcceptRequest(ServerSocket& socket, int requestId) {
+    CloseIfNotClosed(socket.client());
     socket.accept(requestId);
 }
 

@@ -3,16 +3,18 @@
 
 #include <string>
 
+#include "platform/ServerSocket.h"
 #include "platform/Socket.h"
 
 namespace zel {
 
-/// Listens on the local port whose number leads the text.
-void ListenOnPort(Socket& socket, const std::string& portText);
+/// Listens on the local port whose number leads the text, at all addresses or at that one.
+void ListenOnPort(ServerSocket& socket, const std::string& portText,
+                  const std::string& address = {});
 void CloseIfOpen(Socket& socket);
 void CloseIfNotClosed(Socket& socket);
-/// Takes a request over, closing what the socket held before.
-void AcceptRequest(Socket& socket, int requestId);
+/// Makes the request the client, closing the connection of the client before.
+void AcceptRequest(ServerSocket& socket, int requestId);
 /// All that has arrived.
 void TakeSocketData(std::string& result, Socket& socket);
 /// Sends when connected, else drops.

@@ -9,10 +9,16 @@ namespace zel {
 inline constexpr int kFastestBaud = 10'000'000;
 
 struct LinkAddress {
-    enum class Kind { Serial, Tcp };
+    /// The kinds from `TwoModems` on dial first.
+    enum class Kind { Serial, Tcp, Tls, TwoModems, TwoPhones, ModemToPhone, PhoneToModem };
     Kind kind = Kind::Serial;
-    std::string port;  ///< device name, or host
-    int number = 0;    ///< baud rate, or TCP port
+    std::string port;         ///< device name, or host
+    int number = 0;           ///< baud rate, or TCP port
+    std::string phone = {};   ///< the number to dial
+    std::string pinned = {};  ///< fingerprint of the server's certificate; empty: by authority
+
+    bool overNetwork() const { return kind == Kind::Tcp || kind == Kind::Tls; }
+    bool dialled() const { return kind != Kind::Serial && !overNetwork(); }
 };
 
 }  // namespace zel

@@ -6,6 +6,7 @@
 #include "platform/Files.h"
 #include "platform/MessageBox.h"
 #include "platform/SerialPort.h"
+#include "platform/ServerSocket.h"
 #include "platform/Services.h"
 #include "platform/Signals.h"
 #include "platform/Socket.h"
@@ -19,8 +20,9 @@ struct Platform {
     MessageBoxes& boxes;
     SerialPort& serialPort;  ///< the connection's port, `ZELCommC`
     SerialPortList& serialPorts;
-    Socket& tcpSocket;     ///< the client side, `TCPSocket`
-    Socket& serverSocket;  ///< the server's, `TCPSocket` of the server form
+    Socket& tcpSocket;           ///< the client side, `TCPSocket`
+    SerialPort& serverPort;      ///< the server's own port, `SystemCommPort`
+    ServerSocket& serverSocket;  ///< the server's, `TCPSocket` of the server form
     SettingsStore& settings;
     DebugChannel& debug;
     Clipboard& clipboard;

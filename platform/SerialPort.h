@@ -1,6 +1,7 @@
 #pragma once
 // One serial port: opened by name, read and written without waiting.
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -36,6 +37,8 @@ class SerialPort {
     virtual std::string input() = 0;
     virtual void output(std::string_view bytes) = 0;
     virtual std::string problem() const = 0;
+    /// Bytes of `output` that the line has not taken yet.
+    virtual std::size_t bytesToWrite() const { return 0; }
     /// Runs inside the event pump with the CommEvent code.
     Event<int> OnComm;
 };

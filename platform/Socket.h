@@ -1,6 +1,7 @@
 #pragma once
-// One TCP socket, client or server side, that keeps what arrived until it is taken.
+// One TCP connection that keeps what arrived until it is taken.
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 
@@ -22,9 +23,9 @@ class Socket {
   public:
     virtual ~Socket() = default;
     virtual void connectTo(const std::string& host, int port) = 0;
-    virtual void listen(int port) = 0;
-    /// Takes the waiting request of that number over as this socket's connection.
-    virtual void accept(int requestId) = 0;
+    /// The same over TLS. The server's certificate has to have the SHA-256 fingerprint `pinned`
+    /// (64 hex digits in lower case), or where that is empty a known authority.
+    virtual void connectTls(const std::string& host, int port, const std::string& pinned) = 0;
     virtual void close() = 0;
     virtual SocketState state() const = 0;
     /// False when the socket is not connected.
@@ -32,12 +33,12 @@ class Socket {
     /// Copies what waits without taking it.
     virtual std::string peekData() = 0;
     virtual std::string getData() = 0;
-    virtual std::string localIP() const = 0;
-    /// Why the socket is in the state Error, for a user; empty when nothing is known.
-    virtual std::string problem() const { return {}; }
+    /// Bytes that were sent and still wait for the far end to take them.
+    virtual std::size_t bytesToWrite() const = 0;
+    /// Why the connection failed, for a user; empty while nothing has.
+    virtual std::string problem() const = 0;
 
     Event<> DataArrival;
-    Event<int> ConnectionRequest;
     Event<> PeerClosed;
 };
 

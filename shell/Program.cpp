@@ -3,6 +3,8 @@
 #include <utility>
 
 #include "connection/ConnectionDialog.h"
+#include "connection/Devices.h"
+#include "connection/Dialling.h"
 #include "connection/Disconnection.h"
 #include "connection/Handshake.h"
 #include "connection/Profiles.h"
@@ -38,6 +40,8 @@
 #include "panel/Z9SetCommands.h"
 #include "platform/TimerDriver.h"
 #include "script/Scripts.h"
+#include "server/ServerBridge.h"
+#include "server/ServerDialog.h"
 #include "shell/EndingBoxes.h"
 #include "shell/Guards.h"
 #include "shell/Logs.h"
@@ -63,6 +67,30 @@
 #include "waterfall/WaterfallView.h"
 
 namespace zel {
+
+namespace {
+
+std::int16_t connectionKind(LinkAddress::Kind kind) {
+    using Kind = LinkAddress::Kind;
+    switch (kind) {
+        case Kind::TwoModems:
+            return ControllerForm::MODEMCON;
+        case Kind::TwoPhones:
+            return ControllerForm::GSMCON;
+        case Kind::ModemToPhone:
+            return ControllerForm::MODEMGSMCON;
+        case Kind::PhoneToModem:
+            return ControllerForm::GSMMODEMCON;
+        case Kind::Serial:
+            return ControllerForm::DIRECTCON;
+        case Kind::Tcp:
+        case Kind::Tls:
+            break;
+    }
+    return ControllerForm::TCPCON;
+}
+
+}  // namespace
 
 // In the order of the house: a room below stands ahead of those that use it.
 struct Program::Rooms {
@@ -122,10 +150,15 @@ struct Program::Rooms {
           dialog(forms, link, sessionStart, profiles, p.serialPorts, session),
           tcpDialog(forms, instrument, sessionStart, p.tcpSocket, p.settings, session),
           disconnection(forms, instrument, p.tcpSocket, sessionClock, graph, interlock),
+          dialling(forms, instrument, dialog, sessionStart, disconnection, session),
+          devices(forms, p.serialPort, p.serialPorts, p.folder, p.clock, p.events, boxes),
           remote(panel, exchange, interlock),
+          bridge(panel, forms.server, p.serverPort, p.serverSocket, session),
+          serverDialog(forms, bridge, p.serverSocket, {p.serialPorts, p.settings, p.clipboard},
+                       session),
           serverMode(forms, p.startup, p.events),
           startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
-          second(forms, p.serverSocket, sessionClock),
+          second(panel, bridge, sessionClock),
           end(forms, boxes) {
         panel.CommandLine = std::move(commandLine);
         history.describe = [this] {
@@ -225,7 +258,11 @@ struct Program::Rooms {
     ConnectionDialog dialog;
     TcpDialog tcpDialog;
     Disconnection disconnection;
+    Dialling dialling;
+    Devices devices;
     RemoteToggle remote;
+    ServerBridge bridge;
+    ServerDialog serverDialog;
     ServerMode serverMode;
     StartUp startUp;
     SecondTimer second;
@@ -250,6 +287,8 @@ void Program::showFailure() {
 
 Forms& Program::forms() { return rooms_->forms; }
 ZEL3Variables& Program::variables() { return rooms_->mirror; }
+ServerBridge& Program::server() { return rooms_->bridge; }
+ServerDialog& Program::serverDialog() { return rooms_->serverDialog; }
 ZELBas& Program::link() { return rooms_->line; }
 CommandExchange& Program::exchange() { return rooms_->exchange; }
 Sweep& Program::sweep() { return rooms_->onGraph; }
@@ -268,23 +307,30 @@ void Program::start() {
 
 bool Program::connect(const LinkAddress& address, bool readTrace) {
     ControllerForm& panel = rooms_->panel;
-    if (address.kind == LinkAddress::Kind::Tcp) {
+    if (address.overNetwork()) {
         TCPConnectionForm& dialog = rooms_->forms.tcpConnection;
         panel.ConnectionState = ControllerForm::TCPCON;
         dialog.load();
         dialog.IPAdressTextBox.Text = address.port;
         dialog.RemotePortTextBox.Text = std::to_string(address.number);
+        dialog.chkTls.setValue(address.kind == LinkAddress::Kind::Tls);
+        dialog.FingerprintTextBox.Text = address.pinned;
         rooms_->tcpDialog.connect(readTrace);
         return panel.isConnected;
     }
     const bool quick = panel.immConnectState;
     panel.immConnectState = true;
-    rooms_->dialog.SetConnectionKind(ControllerForm::DIRECTCON);
+    rooms_->dialog.SetConnectionKind(connectionKind(address.kind));
     panel.immConnectState = quick;
     MainForm& dialog = rooms_->forms.main;
     dialog.COMList.setText(address.port);
     dialog.BaudList.setText(std::to_string(address.number));
-    rooms_->dialog.connectDirect(readTrace);
+    if (address.dialled()) {
+        dialog.TelNumberBox.Text = address.phone;
+        rooms_->dialling.dial(readTrace);
+    } else {
+        rooms_->dialog.connectDirect(readTrace);
+    }
     rooms_->softPanel.SetButtonsStatus(ControllerForm::Freq);
     return panel.isConnected;
 }
@@ -293,6 +339,20 @@ std::string Program::connectionAdvice() const {
     const bool tcp = rooms_->panel.ConnectionState == ControllerForm::TCPCON;
     return tcp ? rooms_->forms.tcpConnection.AdviceLabel.Caption
                : rooms_->forms.main.AdviceLabel.Caption;
+}
+
+std::vector<std::string> Program::deviceNames() {
+    return rooms_->devices.ReadCommunicationDevices();
+}
+
+bool Program::configureDevice(const std::string& name, const std::string& port, int baud) {
+    DevicesChoiceForm& form = rooms_->forms.devicesChoice;
+    form.load();
+    form.AvailableDevicesChoice.setItems(rooms_->devices.ReadCommunicationDevices());
+    form.AvailableDevicesChoice.setText(name);
+    form.DevicesPortList.setText(port);
+    form.DevicesBaudList.setText(std::to_string(baud));
+    return rooms_->devices.SetCommunicationDevice();
 }
 
 void Program::disconnect() {

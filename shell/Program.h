@@ -3,6 +3,7 @@
 
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "forms/Forms.h"
 #include "link/ZELBas.h"
@@ -17,6 +18,8 @@ struct Guards;
 class CommandExchange;
 class Interlock;
 class Logs;
+class ServerBridge;
+class ServerDialog;
 class SweepHistory;
 class TraceReader;
 struct Scripts;
@@ -42,6 +45,8 @@ class Program {
     Scripts& scripts();
     /// The sweep on the graph, be it read or loaded.
     Sweep& sweep();
+    ServerBridge& server();
+    ServerDialog& serverDialog();
 
     /// Start-up of the panel, to the moment it waits for the user. In server mode it returns when
     /// the server's window is closed; `ended` is then true.
@@ -52,6 +57,10 @@ class Program {
     bool connect(const LinkAddress& address, bool readTrace);
     /// What to check after an attempt that found no instrument; empty when nothing is to be said.
     std::string connectionAdvice() const;
+    /// The communication devices that have commands; "NONE" alone when there are none.
+    std::vector<std::string> deviceNames();
+    /// Sends a device its commands, through the dialog's routines. True when it took them.
+    bool configureDevice(const std::string& name, const std::string& port, int baud);
     /// LOCAL and the close, without the question; nothing when not connected.
     void disconnect();
 

@@ -11,6 +11,7 @@ constexpr const char* kLinkName = "ZELRemote.lnk";
 
 ServerMode::ServerMode(Forms& forms, StartupFolder& startup, Events& events)
     : forms_(forms), panel_(forms.controller), startup_(startup), events_(events) {
+    panel_.UtilityServer.Clicked.connect([this] { UtilityServer_Click(); });
     panel_.UtilityStartup.Clicked.connect([this] { UtilityStartup_Click(); });
 }
 

@@ -68,7 +68,6 @@ void StartUp::hideUnused() {
     dialog.IDText.Locked = true;
     dialog.AirBaudRateText.Locked = true;
     forms_.tcpConnection.IDTextBox.Locked = true;
-    forms_.server.txtDebug.Locked = true;
 }
 
 }  // namespace zel

@@ -124,6 +124,16 @@ std::optional<std::string> IniFile::value(std::string_view section, std::string_
     return std::nullopt;
 }
 
+std::optional<std::string> IniFile::rawValue(std::string_view section, std::string_view key) const {
+    const Section* found = find(section);
+    if (found == nullptr) return std::nullopt;
+    for (const Line& line : found->lines)
+        if (!line.key.empty() && sameName(line.key, key))
+            return std::string(
+                withoutBlanks(std::string_view(line.text).substr(line.text.find('=') + 1)));
+    return std::nullopt;
+}
+
 bool IniFile::setValue(std::string_view section, std::string_view key, std::string_view value) {
     if (!fitsALine(section) || !fitsAKey(key)) return false;
     // A line end in a value would begin a line of its own, and a byte that is no UTF-8 would

@@ -1,6 +1,9 @@
 #include "support/LinkAddressText.h"
 
+#include <algorithm>
+#include <array>
 #include <string>
+#include <string_view>
 
 #include "support/NumberText.h"
 #include "support/Text.h"
@@ -8,34 +11,100 @@
 namespace zel {
 namespace {
 
-constexpr int kDefaultBaud = 57600;
-constexpr int kHighestTcpPort = 65535;
-constexpr std::string_view kSerial = "serial:";
-constexpr std::string_view kTcp = "tcp:";
+using Kind = LinkAddress::Kind;
 
-std::optional<LinkAddress> serialAddress(std::string_view rest) {
-    const auto mark = rest.rfind('@');
-    const std::optional<int> baud = mark == std::string_view::npos
-                                        ? kDefaultBaud
-                                        : wholeNumber(rest.substr(mark + 1), 1, kFastestBaud);
-    const std::string_view device = rest.substr(0, mark);
-    if (!baud || device.empty()) return std::nullopt;
-    return LinkAddress{LinkAddress::Kind::Serial, std::string(device), *baud};
+constexpr int kDefaultBaud = 57600;
+constexpr int kHighestPort = 65535;
+constexpr std::size_t kLongestPhone = 80;
+constexpr std::size_t kFingerprintDigits = 64;
+
+struct KindRow {
+    std::string_view head;
+    Kind kind;
+};
+constexpr std::array<KindRow, 7> kKinds{{{"serial:", Kind::Serial},
+                                         {"tcp:", Kind::Tcp},
+                                         {"tls:", Kind::Tls},
+                                         {"modem:", Kind::TwoModems},
+                                         {"gsm:", Kind::TwoPhones},
+                                         {"modemgsm:", Kind::ModemToPhone},
+                                         {"gsmmodem:", Kind::PhoneToModem}}};
+
+bool printable(std::string_view text) {
+    return std::all_of(text.begin(), text.end(), [](char c) { return c >= ' ' && c <= '~'; });
 }
 
-std::optional<LinkAddress> tcpAddress(std::string_view rest) {
-    const auto mark = rest.rfind(':');
-    if (mark == std::string_view::npos || mark == 0) return std::nullopt;
-    const std::optional<int> port = wholeNumber(rest.substr(mark + 1), 1, kHighestTcpPort);
-    if (!port) return std::nullopt;
-    return LinkAddress{LinkAddress::Kind::Tcp, std::string(rest.substr(0, mark)), *port};
+/// Takes what stands behind the first comma off the text; nothing when there is no comma.
+std::optional<std::string> takeTail(std::string_view& text) {
+    const auto comma = text.find(',');
+    if (comma == std::string_view::npos) return std::nullopt;
+    std::string tail(text.substr(comma + 1));
+    text = text.substr(0, comma);
+    return tail;
+}
+
+bool readFingerprint(const std::string& text, std::string& fingerprint) {
+    for (const char c : text) {
+        if (c == ':') continue;
+        const char low = c >= 'A' && c <= 'F' ? static_cast<char>(c - 'A' + 'a') : c;
+        if ((low < '0' || low > '9') && (low < 'a' || low > 'f')) return false;
+        fingerprint.push_back(low);
+    }
+    return fingerprint.size() == kFingerprintDigits;
+}
+
+bool readHostAndPort(std::string_view text, LinkAddress& address) {
+    const auto colon = text.rfind(':');
+    if (colon == std::string_view::npos || colon == 0) return false;
+    std::string_view host = text.substr(0, colon);
+    // Brackets keep the colons of an IPv6 address apart from the port's.
+    if (host.size() > 2 && host.front() == '[' && host.back() == ']')
+        host = host.substr(1, host.size() - 2);
+    const auto port = wholeNumber(text.substr(colon + 1), 1, kHighestPort);
+    if (!port) return false;
+    address.port = host;
+    address.number = *port;
+    return true;
+}
+
+bool readDeviceAndBaud(std::string_view text, LinkAddress& address) {
+    const auto mark = text.rfind('@');
+    address.number = kDefaultBaud;
+    if (mark != std::string_view::npos) {
+        const auto baud = wholeNumber(text.substr(mark + 1), 1, kFastestBaud);
+        if (!baud) return false;
+        address.number = *baud;
+        text = text.substr(0, mark);
+    }
+    address.port = text;
+    return !text.empty();
+}
+
+bool readRest(std::string_view rest, LinkAddress& address) {
+    if (address.kind == Kind::Tls) {
+        const auto tail = takeTail(rest);
+        if (tail && !readFingerprint(*tail, address.pinned)) return false;
+    }
+    if (address.overNetwork()) return readHostAndPort(rest, address);
+    if (address.dialled()) {
+        const auto tail = takeTail(rest);
+        if (!tail || tail->empty() || tail->size() > kLongestPhone || !printable(*tail))
+            return false;
+        address.phone = *tail;
+    }
+    return readDeviceAndBaud(rest, address);
 }
 
 }  // namespace
 
 std::optional<LinkAddress> parseLinkAddress(std::string_view url) {
-    if (startsWith(url, kSerial)) return serialAddress(url.substr(kSerial.size()));
-    if (startsWith(url, kTcp)) return tcpAddress(url.substr(kTcp.size()));
+    for (const KindRow& row : kKinds) {
+        if (!startsWith(url, row.head)) continue;
+        LinkAddress address;
+        address.kind = row.kind;
+        if (!readRest(url.substr(row.head.size()), address)) return std::nullopt;
+        return address;
+    }
     return std::nullopt;
 }
 

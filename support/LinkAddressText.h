@@ -8,8 +8,11 @@
 
 namespace zel {
 
-/// "serial:DEVICE[@BAUD]" (57600 baud when none is given) or "tcp:HOST:PORT"; nothing for any
-/// other text.
+/// "serial:DEVICE[@BAUD]" (57600 baud when none is given), "tcp:HOST:PORT",
+/// "tls:HOST:PORT[,FINGERPRINT]", or "modem:", "gsm:", "modemgsm:", "gsmmodem:" with
+/// "DEVICE[@BAUD],NUMBER" (two modems, two mobile phones, modem to mobile phone, mobile phone to
+/// modem); nothing for any other text. A fingerprint is 64 hex digits, colons between them or not;
+/// it is kept in lower case without them.
 std::optional<LinkAddress> parseLinkAddress(std::string_view url);
 
 }  // namespace zel

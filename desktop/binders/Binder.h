@@ -47,6 +47,7 @@ class Binder : public QObject {
 
     /// Shows the form again with the next frame.
     void refresh(const Form& form) { markDirty(&form); }
+    void refresh(const Control& control) { markDirty(&control); }
     /// Shows every control and form again: the colours have changed.
     void refreshAll();
     /// Shows all changes now.

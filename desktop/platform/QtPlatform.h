@@ -7,6 +7,7 @@
 #include "desktop/platform/QtDialogs.h"
 #include "desktop/platform/QtEvents.h"
 #include "desktop/platform/QtSerialPort.h"
+#include "desktop/platform/QtServerSocket.h"
 #include "desktop/platform/QtServices.h"
 #include "desktop/platform/QtSignals.h"
 #include "desktop/platform/QtSocket.h"
@@ -28,7 +29,8 @@ struct QtPlatform {
     QtSerialPort serialPort{events};
     QtSerialPortList serialPorts;
     QtSocket tcpSocket{events};
-    QtSocket serverSocket{events};
+    QtSerialPort serverPort{events, false};
+    QtServerSocket serverSocket{events};
     QtApplicationFolder folder;
     QtSettingsStore settings{folder};
     QtDebugChannel debug;
@@ -42,7 +44,7 @@ struct QtPlatform {
     /// With boxes and file dialogs of another front.
     Platform bundle(MessageBoxes& otherBoxes, FileDialogs& otherDialogs) {
         return {clock,        events,       otherBoxes, serialPort, serialPorts, tcpSocket,
-                serverSocket, settings,     debug,      clipboard,  launcher,    startup,
+                serverPort, serverSocket, settings,     debug,      clipboard,  launcher,    startup,
                 folder,       otherDialogs, files,      endSignals};
     }
 };

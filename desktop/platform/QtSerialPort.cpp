@@ -28,7 +28,7 @@ QString deviceOf(const std::string& name) {
 
 }  // namespace
 
-QtSerialPort::QtSerialPort(QtEvents& events) : events_(events) {
+QtSerialPort::QtSerialPort(QtEvents& events, bool quick) : events_(events) {
     port_.setReadBufferSize(kMostBuffered);
     QObject::connect(&port_, &QSerialPort::readyRead, &port_, [this] { OnComm(kDataReceived); });
     QObject::connect(&port_, &QSerialPort::errorOccurred, &port_,
@@ -38,13 +38,14 @@ QtSerialPort::QtSerialPort(QtEvents& events) : events_(events) {
                              error == QSerialPort::ReadError || error == QSerialPort::WriteError)
                              lost();
                      });
+    if (!quick) return;
     source_ = events_.addSource(
         {[this] { return port_.isOpen() ? static_cast<int>(port_.handle()) : -1; },
          [this] { return port_.isOpen() && port_.bytesAvailable() > 0; }});
 }
 
 QtSerialPort::~QtSerialPort() {
-    events_.removeSource(source_);
+    if (source_ != 0) events_.removeSource(source_);
     port_.disconnect();
 }
 

@@ -12,7 +12,8 @@ namespace zel {
 
 class QtSerialPort : public SerialPort {
   public:
-    explicit QtSerialPort(QtEvents& events);
+    /// A `quick` port wakes a wait on the short way, for loops that take the bytes themselves.
+    explicit QtSerialPort(QtEvents& events, bool quick = true);
     ~QtSerialPort() override;
 
     bool open(const SerialSetup& setup) override;
@@ -21,6 +22,9 @@ class QtSerialPort : public SerialPort {
     std::string input() override;
     void output(std::string_view bytes) override;
     std::string problem() const override { return problem_; }
+    std::size_t bytesToWrite() const override {
+        return static_cast<std::size_t>(port_.bytesToWrite());
+    }
 
   private:
     bool hungUp() const;

@@ -41,6 +41,16 @@ void copyExamples(const QString& from, const QString& folder) {
         QFile::copy(source.filePath(name), folder + kScripts + "/" + name);
 }
 
+/// A new folder gets the files that users may change; a file that is there stays.
+void fillFromDefaults(const QString& folder) {
+    const QDir defaults(":/defaults");
+    for (const QString& name : defaults.entryList(QDir::Files)) {
+        QFile file(folder + "/" + name);
+        if (file.exists() || !QFile::copy(defaults.filePath(name), file.fileName())) continue;
+        file.setPermissions(file.permissions() | QFile::WriteOwner);
+    }
+}
+
 }  // namespace
 
 QtApplicationFolder::QtApplicationFolder(const QString& home) {
@@ -53,6 +63,7 @@ QtApplicationFolder::QtApplicationFolder(const QString& home) {
     path_ = QDir(folder).absolutePath().toStdString();
     if (QCoreApplication::instance() != nullptr)
         copyExamples(QString::fromStdString(programPath()), folder);
+    fillFromDefaults(folder);
 }
 
 std::string QtApplicationFolder::programPath() {

@@ -1,29 +1,57 @@
 #include "desktop/platform/QtSocket.h"
 
+#include <netinet/in.h>
+#include <netinet/tcp.h>
 #include <poll.h>
+#include <sys/socket.h>
 
-#include <QHostAddress>
-#include <QNetworkInterface>
+#include <QFile>
+#include <QSslCertificate>
+#include <QSslConfiguration>
+#include <QSslKey>
+#include <QSslSocket>
 
 namespace zel {
 namespace {
 
 constexpr qint64 kMostBuffered = 1 << 20;
-constexpr int kMostRequests = 16;
+
+/// A far end that has vanished without a word is noticed within about two minutes.
+void keepAlive(QTcpSocket& socket) {
+    socket.setSocketOption(QAbstractSocket::LowDelayOption, 1);
+    socket.setSocketOption(QAbstractSocket::KeepAliveOption, 1);
+    const auto descriptor = static_cast<int>(socket.socketDescriptor());
+    const int idle = 60;
+    const int between = 15;
+    const int times = 4;
+    ::setsockopt(descriptor, IPPROTO_TCP, TCP_KEEPIDLE, &idle, sizeof idle);
+    ::setsockopt(descriptor, IPPROTO_TCP, TCP_KEEPINTVL, &between, sizeof between);
+    ::setsockopt(descriptor, IPPROTO_TCP, TCP_KEEPCNT, &times, sizeof times);
+}
+
+/// Authorities and a certificate of one's own come from files that the environment names.
+QSslConfiguration clientConfiguration() {
+    QSslConfiguration configuration = QSslConfiguration::defaultConfiguration();
+    configuration.setProtocol(QSsl::TlsV1_2OrLater);
+    const QString authorities = qEnvironmentVariable("ZELREMOTE_TLS_CA");
+    if (!authorities.isEmpty())
+        configuration.setCaCertificates(QSslCertificate::fromPath(authorities));
+    const QString own = qEnvironmentVariable("ZELREMOTE_TLS_CERTIFICATE");
+    QFile keyFile(qEnvironmentVariable("ZELREMOTE_TLS_KEY"));
+    if (!own.isEmpty() && keyFile.open(QIODevice::ReadOnly)) {
+        const QByteArray bytes = keyFile.readAll();
+        QSslKey key(bytes, QSsl::Rsa);
+        if (key.isNull()) key = QSslKey(bytes, QSsl::Ec);
+        configuration.setLocalCertificateChain(QSslCertificate::fromPath(own));
+        configuration.setPrivateKey(key);
+    }
+    return configuration;
+}
 
 }  // namespace
 
-QtSocket::QtSocket(QtEvents& events) : events_(events) {
-    QObject::connect(&server_, &QTcpServer::newConnection, &server_, [this] {
-        while (QTcpSocket* waiting = server_.nextPendingConnection()) {
-            if (requests_.size() >= kMostRequests) {
-                waiting->deleteLater();
-                continue;
-            }
-            requests_[++lastRequest_] = waiting;
-            ConnectionRequest(lastRequest_);
-        }
-    });
+QtSocket::QtSocket(QtEvents& events, bool quick) : events_(events) {
+    if (!quick) return;
     source_ = events_.addSource(
         {[this] {
              const bool connected = socket_ && socket_->state() == QAbstractSocket::ConnectedState;
@@ -33,26 +61,31 @@ QtSocket::QtSocket(QtEvents& events) : events_(events) {
 }
 
 QtSocket::~QtSocket() {
-    events_.removeSource(source_);
-    server_.disconnect();
+    if (source_ != 0) events_.removeSource(source_);
     if (socket_) socket_->disconnect();
 }
 
 void QtSocket::adopt(QTcpSocket* socket) {
     socket_.reset(socket);
+    secured_ = qobject_cast<QSslSocket*>(socket);
     socket_->setParent(nullptr);
     socket_->setReadBufferSize(kMostBuffered);
     QObject::connect(socket, &QTcpSocket::readyRead, socket, [this] { DataArrival(); });
-    QObject::connect(socket, &QTcpSocket::connected, socket,
-                     [socket] { socket->setSocketOption(QAbstractSocket::LowDelayOption, 1); });
+    QObject::connect(socket, &QTcpSocket::connected, socket, [socket] { keepAlive(*socket); });
     QObject::connect(socket, &QTcpSocket::disconnected, socket, [this] {
         peerClosed_ = true;
         PeerClosed();
     });
     QObject::connect(socket, &QTcpSocket::errorOccurred, socket,
-                     [this](QAbstractSocket::SocketError error) {
+                     [this, socket](QAbstractSocket::SocketError error) {
                          if (error == QAbstractSocket::SocketTimeoutError) return;
-                         if (error == QAbstractSocket::RemoteHostClosedError) {
+                         if (problem_.empty()) problem_ = socket->errorString().toStdString() + ".";
+                         // An end ahead of the connection is a failure of it.
+                         const bool stood =
+                             secured_ != nullptr
+                                 ? secured_->isEncrypted()
+                                 : socket->state() != QAbstractSocket::ConnectingState;
+                         if (error == QAbstractSocket::RemoteHostClosedError && stood) {
                              peerClosed_ = true;
                          } else {
                              failed_ = true;
@@ -61,66 +94,99 @@ void QtSocket::adopt(QTcpSocket* socket) {
                      });
 }
 
+void QtSocket::letIn(QTcpSocket* socket) {
+    close();
+    adopt(socket);
+    keepAlive(*socket);
+}
+
 void QtSocket::connectTo(const std::string& host, int port) {
     close();
     adopt(new QTcpSocket);
     socket_->connectToHost(QString::fromStdString(host), static_cast<quint16>(port));
 }
 
-void QtSocket::listen(int port) {
-    failed_ = false;
-    if (!server_.listen(QHostAddress::Any, static_cast<quint16>(port))) failed_ = true;
+void QtSocket::connectTls(const std::string& host, int port, const std::string& pinned) {
+    close();
+    if (!QSslSocket::supportsSsl()) {
+        problem_ = "This system has no TLS.";
+        failed_ = true;
+        return;
+    }
+    auto* socket = new QSslSocket;
+    adopt(socket);
+    socket->setSslConfiguration(clientConfiguration());
+    // A pinned certificate needs no authority; it is looked at when the connection stands.
+    if (!pinned.empty()) socket->setPeerVerifyMode(QSslSocket::QueryPeer);
+    QObject::connect(socket, &QSslSocket::encrypted, socket,
+                     [this, socket, pinned] { judgeCertificate(*socket, pinned); });
+    socket->connectToHostEncrypted(QString::fromStdString(host), static_cast<quint16>(port));
 }
 
-void QtSocket::accept(int requestId) {
-    const auto found = requests_.find(requestId);
-    if (found == requests_.end()) return;
-    failed_ = peerClosed_ = false;
-    adopt(found->second);
-    socket_->setSocketOption(QAbstractSocket::LowDelayOption, 1);
-    requests_.erase(found);
+void QtSocket::judgeCertificate(QSslSocket& socket, const std::string& pinned) {
+    if (pinned.empty()) return;
+    const QByteArray digest = socket.peerCertificate().digest(QCryptographicHash::Sha256).toHex();
+    if (digest.toStdString() == pinned) return;
+    problem_ =
+        "The server shows another certificate, with the fingerprint " + digest.toStdString() + ".";
+    failed_ = true;
+    socket.abort();
 }
 
 void QtSocket::close() {
     if (socket_) {
         socket_->disconnect();
-        socket_->flush();
-        socket_->disconnectFromHost();
+        // Bytes that nobody takes must not keep the connection.
+        if (socket_->bytesToWrite() > 0) socket_->flush();
+        if (socket_->bytesToWrite() > 0) {
+            socket_->abort();
+        } else {
+            socket_->disconnectFromHost();
+        }
         socket_.release()->deleteLater();
     }
-    server_.close();
+    secured_ = nullptr;
+    problem_.clear();
     failed_ = peerClosed_ = false;
     problem_.clear();
 }
 
 SocketState QtSocket::state() const {
     if (failed_) return SocketState::Error;
-    if (socket_) {
-        switch (socket_->state()) {
-            case QAbstractSocket::ConnectedState:
-                return SocketState::Connected;
-            case QAbstractSocket::HostLookupState:
-            case QAbstractSocket::ConnectingState:
-                return SocketState::Connecting;
-            case QAbstractSocket::ClosingState:
-                return SocketState::PeerClosing;
-            default:
-                return peerClosed_ ? SocketState::PeerClosing : SocketState::Closed;
-        }
+    if (!socket_) return SocketState::Closed;
+    switch (socket_->state()) {
+        case QAbstractSocket::ConnectedState:
+            return usable() ? SocketState::Connected : SocketState::Connecting;
+        case QAbstractSocket::HostLookupState:
+        case QAbstractSocket::ConnectingState:
+            return SocketState::Connecting;
+        case QAbstractSocket::ClosingState:
+            return SocketState::PeerClosing;
+        default:
+            return peerClosed_ ? SocketState::PeerClosing : SocketState::Closed;
     }
-    return server_.isListening() ? SocketState::Listening : SocketState::Closed;
+}
+
+bool QtSocket::usable() const {
+    return socket_ && socket_->state() == QAbstractSocket::ConnectedState &&
+           (secured_ == nullptr || secured_->isEncrypted());
 }
 
 bool QtSocket::sendData(std::string_view bytes) {
-    if (!socket_ || socket_->state() != QAbstractSocket::ConnectedState) return false;
+    if (!usable()) return false;
     socket_->write(bytes.data(), static_cast<qint64>(bytes.size()));
     socket_->flush();
     return true;
 }
 
+std::size_t QtSocket::bytesToWrite() const {
+    if (!socket_) return 0;
+    const qint64 encrypted = secured_ != nullptr ? secured_->encryptedBytesToWrite() : 0;
+    return static_cast<std::size_t>(socket_->bytesToWrite() + encrypted);
+}
+
 void QtSocket::fetch() {
-    if (!socket_ || socket_->bytesAvailable() > 0) return;
-    if (socket_->state() != QAbstractSocket::ConnectedState) return;
+    if (!usable() || socket_->bytesAvailable() > 0) return;
     pollfd descriptor{static_cast<int>(socket_->socketDescriptor()), POLLIN, 0};
     if (::poll(&descriptor, 1, 0) > 0) socket_->waitForReadyRead(1);
 }
@@ -133,13 +199,6 @@ std::string QtSocket::peekData() {
 std::string QtSocket::getData() {
     fetch();
     return socket_ ? socket_->readAll().toStdString() : std::string();
-}
-
-std::string QtSocket::localIP() const {
-    for (const QHostAddress& address : QNetworkInterface::allAddresses())
-        if (!address.isLoopback() && address.protocol() == QAbstractSocket::IPv4Protocol)
-            return address.toString().toStdString();
-    return "127.0.0.1";
 }
 
 }  // namespace zel

@@ -1,41 +1,44 @@
 #pragma once
-// A TCP socket of the computer, client or server side.
+// A TCP connection of the computer, in the clear or over TLS.
 
-#include <QTcpServer>
 #include <QTcpSocket>
-#include <map>
 #include <memory>
+#include <string>
 
 #include "desktop/platform/QtEvents.h"
 #include "platform/Socket.h"
+
+class QSslSocket;
 
 namespace zel {
 
 class QtSocket : public Socket {
   public:
-    explicit QtSocket(QtEvents& events);
+    /// A `quick` socket wakes a wait on the short way, for loops that take the data themselves.
+    explicit QtSocket(QtEvents& events, bool quick = true);
     ~QtSocket() override;
 
     void connectTo(const std::string& host, int port) override;
-    void listen(int port) override;
-    void accept(int requestId) override;
+    void connectTls(const std::string& host, int port, const std::string& pinned) override;
     void close() override;
     SocketState state() const override;
     bool sendData(std::string_view bytes) override;
     std::string peekData() override;
     std::string getData() override;
-    std::string localIP() const override;
+    std::size_t bytesToWrite() const override;
     std::string problem() const override { return problem_; }
+    /// A connection that a server has taken.
+    void letIn(QTcpSocket* socket);
 
   private:
     void adopt(QTcpSocket* socket);
+    void judgeCertificate(QSslSocket& socket, const std::string& pinned);
     void fetch();
+    bool usable() const;
 
     QtEvents& events_;
-    QTcpServer server_;
     std::unique_ptr<QTcpSocket> socket_;
-    std::map<int, QTcpSocket*> requests_;
-    int lastRequest_ = 0;
+    QSslSocket* secured_ = nullptr;  ///< the same, where it is TLS
     bool failed_ = false;
     std::string problem_;  ///< of the failure
     bool peerClosed_ = false;

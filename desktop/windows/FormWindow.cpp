@@ -18,9 +18,9 @@ struct Field {
     const char* unit = "";
 };
 constexpr Field kFields[] = {
-    {"manualSizeMin", "Minimum"},  {"manualSizeMax", "Maximum"}, {"IPAdressTextBox", "Address"},
-    {"RemotePortTextBox", "Port"}, {"IDTextBox", "State"},       {"localPortTextBox", "Local port"},
-    {"txtDebug", "State"},         {"TimeIntervalBox", "", "s"},
+    {"manualSizeMin", "Minimum"},
+    {"manualSizeMax", "Maximum"},
+    {"TimeIntervalBox", "", "s"},
 };
 
 Field fieldOf(const Control& control) {
@@ -30,8 +30,7 @@ Field fieldOf(const Control& control) {
 }
 
 /// Buttons that leave a dialog without doing what it is for.
-constexpr const char* kCancels[] = {"cmdCancel", "CancelTimeButton", "QuitTCPButton",
-                                    "ClosePwrForm"};
+constexpr const char* kCancels[] = {"cmdCancel", "CancelTimeButton", "ClosePwrForm"};
 
 constexpr int kFieldWidth = 260;
 constexpr int kAdviceWidth = 380;
@@ -62,7 +61,8 @@ FormWindow::FormWindow(Form& form, Binder& binder, QWidget* parent)
 void FormWindow::followForm() {
     binder_.bindForm(form_, this, [this] {
         setWindowTitle(QString::fromStdString(form_.Caption));
-        const bool shown = form_.Visible;
+        if (!form_.Visible) putAway_ = false;
+        const bool shown = form_.Visible && !putAway_;
         const bool busy = form_.MousePointer == kHourglass;
         setCursor(busy ? Qt::BusyCursor : Qt::ArrowCursor);
         if (busy_ != nullptr) busy_->setVisible(busy);
@@ -78,6 +78,11 @@ void FormWindow::followForm() {
             hide();
         }
     });
+}
+
+void FormWindow::setPutAway(bool away) {
+    putAway_ = away;
+    binder_.refresh(form_);
 }
 
 void FormWindow::closeEvent(QCloseEvent* event) {

@@ -26,8 +26,12 @@ class FormWindow : public QDialog {
 
     Form& form_;
     Binder& binder_;
+    /// The window is hidden although its form is on show, or comes back.
+    void setPutAway(bool away);
+
     std::vector<const Button*> cancels_;
     QTimer shown_;
+    bool putAway_ = false;
     QProgressBar* busy_ = nullptr;  ///< runs while the form shows the hourglass
 };
 

@@ -16,6 +16,7 @@
 #include "desktop/windows/FileDrop.h"
 #include "desktop/windows/PanelSide.h"
 #include "desktop/windows/PlaybackBar.h"
+#include "desktop/windows/RemoteWindows.h"
 #include "desktop/windows/ScriptEditorWindow.h"
 #include "desktop/windows/ScriptFormWindow.h"
 #include "desktop/windows/Shortcuts.h"
@@ -94,9 +95,11 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     windows_.push_back(std::make_unique<StatisticsWindow>(forms.std, binder_, this));
     windows_.push_back(std::make_unique<ScriptEditorWindow>(forms.scriptEditor, binder_, this));
     for (Form* form : {static_cast<Form*>(&forms.manualScale),
-                       static_cast<Form*>(&forms.powerAndRefl), static_cast<Form*>(&forms.time),
-                       static_cast<Form*>(&forms.tcpConnection), static_cast<Form*>(&forms.server)})
+                       static_cast<Form*>(&forms.powerAndRefl), static_cast<Form*>(&forms.time)})
         windows_.push_back(std::make_unique<PlainFormWindow>(*form, binder_, this));
+    windows_.push_back(std::make_unique<TcpWindow>(forms.tcpConnection, binder_, this));
+    windows_.push_back(std::make_unique<DevicesWindow>(forms.devicesChoice, binder_, this));
+    windows_.push_back(std::make_unique<ServerWindow>(forms.server, binder_, this));
     binder_.bindForm(panel_, this, [this] {
         setWindowTitle(QString::fromStdString(panel_.Caption));
         showState();

@@ -32,6 +32,8 @@ class ScriptedPort : public SerialPort {
     void splitAtByte(long position, int pauseMs = 100);
     /// The next openings fail, `times` of them; `why` is what `problem` says.
     void failOpen(std::string why, int times = 1 << 30);
+    /// What the line has not taken.
+    void setBacklog(std::size_t bytes) { backlog_ = bytes; }
     /// Plugs the device out.
     void die();
     /// Bytes that arrive at once, as if the instrument sent them by itself.
@@ -51,6 +53,7 @@ class ScriptedPort : public SerialPort {
     std::string input() override { return std::exchange(waiting_, {}); }
     void output(std::string_view bytes) override;
     std::string problem() const override { return problem_; }
+    std::size_t bytesToWrite() const override { return backlog_; }
 
   private:
     Dialogue script_;
@@ -59,6 +62,7 @@ class ScriptedPort : public SerialPort {
     std::string problem_;
     std::string openFailure_;
     int openFailures_ = 0;
+    std::size_t backlog_ = 0;
     bool open_ = false;
 };
 

@@ -16,13 +16,6 @@ void ScriptedSocket::connectsTo(SocketState end, int ms) {
     endMs_ = ms;
 }
 
-void ScriptedSocket::knock(int requestId) {
-    events_.cancel(task_);
-    task_ = events_.schedule(0, [this, requestId] {
-        if (state_ == SocketState::Listening) ConnectionRequest(requestId);
-    });
-}
-
 void ScriptedSocket::arrive(const std::string& bytes) {
     if (state_ != SocketState::Connected) return;
     waiting_ += bytes;
@@ -48,21 +41,18 @@ void ScriptedSocket::connectTo(const std::string& host, int port) {
     });
 }
 
-void ScriptedSocket::listen(int port) {
-    close();
-    port_ = port;
-    state_ = SocketState::Listening;
-}
-
-void ScriptedSocket::accept(int) {
-    state_ = SocketState::Connected;
-    begin();
+void ScriptedSocket::connectTls(const std::string& host, int port, const std::string& pinned) {
+    connectTo(host, port);
+    pinned_ = pinned;
+    tls_ = true;
 }
 
 void ScriptedSocket::close() {
     events_.cancel(task_);
     script_.closed();
     waiting_.clear();
+    tls_ = false;
+    backlog_ = 0;
     state_ = SocketState::Closed;
 }
 
@@ -73,6 +63,7 @@ bool ScriptedSocket::sendData(std::string_view bytes) {
 }
 
 void ScriptedSocket::begin() {
+    state_ = SocketState::Connected;
     waiting_.clear();
     script_.opened();
 }

@@ -24,8 +24,6 @@ class ScriptedSocket : public Socket {
 
     /// The next connections end in that state after `ms`; `Connecting` never ends.
     void connectsTo(SocketState end, int ms = 0);
-    /// A client knocks at a listening socket, at the next pump.
-    void knock(int requestId);
     /// The far end sends.
     void arrive(const std::string& bytes);
     /// The far end closes.
@@ -33,28 +31,30 @@ class ScriptedSocket : public Socket {
     /// What the platform says about a connection that ends in Error.
     void setProblem(std::string problem) { problem_ = std::move(problem); }
     void setState(SocketState state) { state_ = state; }
-    void setLocalIP(std::string address) { localIP_ = std::move(address); }
+    /// A server let this connection in.
+    void begin();
+    /// What the far end has not taken.
+    void setBacklog(std::size_t bytes) { backlog_ = bytes; }
 
     const std::string& failure() const { return script_.failure(); }
     std::string leftOver() const { return script_.leftOver(); }
     const std::string& written() const { return script_.written(); }
     const std::string& host() const { return host_; }
-    int port() const { return port_; }  ///< of the last `connectTo` or `listen`
+    int port() const { return port_; }
+    const std::string& pinned() const { return pinned_; }
+    bool tls() const { return tls_; }
 
     void connectTo(const std::string& host, int port) override;
-    void listen(int port) override;
-    void accept(int requestId) override;
+    void connectTls(const std::string& host, int port, const std::string& pinned) override;
     void close() override;
     SocketState state() const override { return state_; }
     bool sendData(std::string_view bytes) override;
     std::string peekData() override { return waiting_; }
     std::string getData() override { return std::exchange(waiting_, {}); }
-    std::string localIP() const override { return localIP_; }
+    std::size_t bytesToWrite() const override { return backlog_; }
     std::string problem() const override { return problem_; }
 
   private:
-    void begin();
-
     Events& events_;
     Dialogue script_;
     SocketState state_ = SocketState::Closed;
@@ -64,8 +64,10 @@ class ScriptedSocket : public Socket {
     std::string waiting_;
     std::string host_;
     int port_ = 0;
+    std::string pinned_;
+    bool tls_ = false;
+    std::size_t backlog_ = 0;
     std::string problem_;
-    std::string localIP_ = "127.0.0.1";
 };
 
 }  // namespace zel

@@ -5,6 +5,7 @@
 #include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/RecordedBoxes.h"
 #include "platform/virtual/ScriptedPort.h"
+#include "platform/virtual/ScriptedServer.h"
 #include "platform/virtual/ScriptedSocket.h"
 #include "platform/virtual/VirtualFiles.h"
 #include "platform/virtual/VirtualTime.h"
@@ -18,7 +19,8 @@ struct VirtualPlatform {
     ScriptedPort port{events};
     FixedPortList ports;
     ScriptedSocket tcpSocket{events};
-    ScriptedSocket serverSocket{events};
+    ScriptedPort serverPort{events};
+    ScriptedServer serverSocket{events};
     MemorySettings settings;
     MemoryDebugChannel debug;
     MemoryClipboard clipboard;
@@ -35,7 +37,7 @@ struct VirtualPlatform {
     Platform bundle(SerialPort& other) { return bundle(other, files); }
     /// The same on another disk.
     Platform bundle(SerialPort& other, FileService& disk) {
-        return {clock, events,    boxes,    other,   ports,  tcpSocket,   serverSocket, settings,
+        return {clock, events,    boxes,    other,   ports,  tcpSocket,   serverPort, serverSocket, settings,
                 debug, clipboard, launcher, startup, folder, fileDialogs, disk,         endSignals};
     }
 };

@@ -236,20 +236,20 @@ struct Dialled : LineRig, ::testing::Test {
     Disconnection disconnection{forms, line, socket, sessionClock, graph, interlock};
 };
 
-TEST_F(Dialled, HangUp_SilentModem_TakesALittleOver10AndAHalfSeconds) {
+TEST_F(Dialled, HangUp_SilentModem_TakesALittleOver11AndAHalfSeconds) {
     port.expect("+++").silence();
     port.expect("ATH0\r").silence();
     const std::int64_t ms = time([this] { disconnection.HangUpModem(); });
     expectPlayed();
-    EXPECT_GE(ms, 10'502);
-    EXPECT_LE(ms, 10'600);
+    EXPECT_GE(ms, 11'502);
+    EXPECT_LE(ms, 11'600);
     EXPECT_EQ(shown(), Texts{});
 }
 
-TEST_F(Dialled, HangUp_ModemThatAnswers_TakesThePauseOnly) {
+TEST_F(Dialled, HangUp_ModemThatAnswers_TakesTheSilencesOnly) {
     port.expect("+++").answer("\r\nOK\r\n");
     port.expect("ATH0\r").answer("\r\nOK\r\n");
-    EXPECT_EQ(time([this] { disconnection.HangUpModem(); }), 500);
+    EXPECT_EQ(time([this] { disconnection.HangUpModem(); }), 2000);
     expectPlayed();
 }
 

@@ -93,9 +93,63 @@ TEST_F(TcpDialogTest, WrongAddress_EndsInTheSocketsError) {
     EXPECT_EQ(socket.written(), "");
 }
 
-TEST_F(TcpDialogTest, ConnectAttempt_HasNoTimeLimitOfItsOwn) {
-    socket.connectsTo(SocketState::Error, 600'000);
-    EXPECT_GE(time([this] { tcp.ConnectTCPButton.Click(); }), 600'000);
+TEST_F(TcpDialogTest, ServerThatNeverAnswers_IsGivenUpAfter30Seconds) {
+    socket.connectsTo(SocketState::Connecting);
+    const std::int64_t ms = time([this] { tcp.ConnectTCPButton.Click(); });
+    EXPECT_GE(ms, 30'000);
+    EXPECT_LE(ms, 30'200);
+    EXPECT_EQ(tcp.IDTextBox.Text.get(), "TCP Socket Error.");
+    EXPECT_EQ(tcp.lblReason.Caption.get(), "The server did not answer within 30 seconds.");
+    EXPECT_EQ(socket.state(), SocketState::Closed);
+}
+
+TEST_F(TcpDialogTest, Failure_IsToldWithItsReason) {
+    socket.connectsTo(SocketState::Error);
+    socket.setProblem("Connection refused.");
+    tcp.ConnectTCPButton.Click();
+    EXPECT_EQ(tcp.IDTextBox.Text.get(), "TCP Socket Error.");
+    EXPECT_EQ(tcp.lblReason.Caption.get(), "Connection refused.");
+}
+
+TEST_F(TcpDialogTest, Close_EndsTheConnectingAndTheProbeWithoutABox) {
+    socket.connectsTo(SocketState::Connecting);
+    later(500, [this] { tcp.QuitTCPButton.Click(); });
+    EXPECT_LE(time([this] { tcp.ConnectTCPButton.Click(); }), 600);
+    socket.connectsTo(SocketState::Connected);
+    socket.expect("\r").silence();
+    later(500, [this] { tcp.QuitTCPButton.Click(); });
+    EXPECT_LE(time([this] { tcp.ConnectTCPButton.Click(); }), 600);
+    EXPECT_EQ(shown(), Texts{});
+    EXPECT_EQ(socket.state(), SocketState::Closed);
+}
+
+TEST_F(TcpDialogTest, ProbeInTwoPackets_IsEmptiedWhole) {
+    socket.expect("\r").answer("stale\r0").answer("\r0\r").after(100);
+    Page(socket).whole();
+    EXPECT_TRUE(connectTcp());
+    EXPECT_EQ(socket.failure(), "");
+}
+
+TEST_F(TcpDialogTest, Servers_AreRememberedNewestFirst) {
+    for (const char* host : {"a", "b", "a"}) {
+        socket.expect("\r").silence();
+        tcp.IPAdressTextBox.Text = host;
+        tcp.ConnectTCPButton.Click();
+    }
+    EXPECT_EQ(tcp.RecentServersList.items(), (Texts{"a:2277", "b:2277"}));
+    tcp.unload(1);
+    tcp.load();
+    EXPECT_EQ(tcp.RecentServersList.items(), (Texts{"a:2277", "b:2277"}));
+    tcp.RecentServersList.pick(1);
+    EXPECT_EQ(tcp.IPAdressTextBox.Text.get(), "b");
+}
+
+TEST_F(TcpDialogTest, Tls_PassesTheFingerprintOn) {
+    socket.connectsTo(SocketState::Error);
+    tcp.chkTls.setValue(true);
+    tcp.FingerprintTextBox.Text = " AB:cd ";
+    tcp.ConnectTCPButton.Click();
+    EXPECT_EQ(socket.pinned(), "abcd");
 }
 
 TEST_F(TcpDialogTest, PeerClosing_IsShownAndTheWaitGoesOn) {

@@ -40,7 +40,7 @@ struct PanelSessionTest : ::testing::Test {
         ConsoleFileDialogs dialogs(answers);
         ServingEvents events(platform.events);
         Program program({platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
-                         platform.serverSocket, platform.settings, platform.debug,
+                         platform.serverPort, platform.serverSocket, platform.settings, platform.debug,
                          platform.clipboard, platform.launcher, platform.startup, platform.folder,
                          dialogs, platform.files, platform.endSignals},
                         words);

@@ -12,6 +12,7 @@ struct PortRoutines : ::testing::Test {
     VirtualPlatform platform;
     ScriptedPort& port = platform.port;
     ScriptedSocket& socket = platform.tcpSocket;
+    ScriptedServer& server = platform.serverSocket;
     RS232Ops ops{platform.events, platform.boxes};
 
     std::string readEvent(int code) {
@@ -99,14 +100,15 @@ TEST_F(PortRoutines, ReadSerialPortNames_ThePlatformsNames_FollowWhatIsThere) {
 }
 
 TEST_F(PortRoutines, ListenOnPort_Text_GivesTheLocalPort) {
-    ListenOnPort(socket, "2277");
-    EXPECT_EQ(socket.state(), SocketState::Listening);
-    EXPECT_EQ(socket.port(), 2277);
+    ListenOnPort(server, "2277", "::1");
+    EXPECT_EQ(server.state(), SocketState::Listening);
+    EXPECT_EQ(server.port(), 2277);
+    EXPECT_EQ(server.address(), "::1");
 }
 
 TEST_F(PortRoutines, ListenOnPort_NumberBeyondAllPorts_DoesNotListen) {
-    ListenOnPort(socket, "65536");
-    EXPECT_EQ(socket.state(), SocketState::Closed);
+    ListenOnPort(server, "65536");
+    EXPECT_EQ(server.state(), SocketState::Closed);
 }
 
 TEST_F(PortRoutines, CloseIfOpen_OtherStates_AreLeftAlone) {
@@ -129,9 +131,12 @@ TEST_F(PortRoutines, CloseIfNotClosed_AnyOtherState_IsClosed) {
 }
 
 TEST_F(PortRoutines, AcceptRequest_SocketInError_IsTakenOver) {
-    socket.setState(SocketState::Error);
-    AcceptRequest(socket, 3);
-    EXPECT_EQ(socket.state(), SocketState::Connected);
+    server.far().setState(SocketState::Error);
+    server.listen("", 2277);
+    server.ConnectionRequest.connect([this](int id) { AcceptRequest(server, id); });
+    server.knock(3);
+    platform.events.runFor(1);
+    EXPECT_EQ(server.client().state(), SocketState::Connected);
 }
 
 TEST_F(PortRoutines, TakeSocketData_WhatWaits_IsTaken) {

@@ -226,7 +226,7 @@ TEST_F(StartUpTest, Second_BringsABrokenServerBackToListening) {
 
 TEST_F(StartUpTest, Second_LeavesAServerThatIsWell) {
     program.start();
-    platform.serverSocket.listen(2277);
+    platform.serverSocket.listen("", 2277);
     platform.events.runFor(3000);
     EXPECT_EQ(forms.server.txtDebug.Text.get(), "");
     EXPECT_EQ(platform.serverSocket.port(), 2277);

@@ -223,20 +223,23 @@ TEST_F(OnQt, ScheduledTasks_RunByTheirTime) {
 }
 
 TEST_F(OnQt, Sockets_CarryBytesBothWaysAndTellTheirState) {
-    QtSocket& server = platform.serverSocket;
+    QtServerSocket& listener = platform.serverSocket;
+    Socket& server = listener.client();
     QtSocket& client = platform.tcpSocket;
-    int port = 40000;
-    do {
-        server.close();
-        server.listen(++port);
-    } while (server.state() == SocketState::Error && port < 40100);
-    ASSERT_EQ(server.state(), SocketState::Listening);
-    server.ConnectionRequest.connect([&server](int id) { server.accept(id); });
+    listener.listen("127.0.0.1", 0);
+    ASSERT_EQ(listener.state(), SocketState::Listening) << listener.problem();
+    const int port = listener.port();
+    std::string from;
+    listener.ConnectionRequest.connect([&](int id) {
+        from = listener.peer(id);
+        listener.accept(id);
+    });
     EXPECT_EQ(client.state(), SocketState::Closed);
     client.connectTo("127.0.0.1", port);
     for (int i = 0; i < 200 && server.state() != SocketState::Connected; ++i)
         platform.events.wait(20);
     ASSERT_EQ(client.state(), SocketState::Connected);
+    EXPECT_EQ(from, "127.0.0.1");
     EXPECT_TRUE(client.sendData("IDN?\r"));
     for (int i = 0; i < 200 && server.peekData().empty(); ++i) platform.events.wait(20);
     EXPECT_EQ(server.peekData(), "IDN?\r");

@@ -1,0 +1,47 @@
+#pragma once
+// A TCP port of the computer that listens, in the clear or over TLS.
+
+#include <QSslConfiguration>
+#include <QTcpServer>
+#include <map>
+#include <memory>
+
+#include "desktop/platform/QtSocket.h"
+#include "platform/ServerSocket.h"
+
+namespace zel {
+
+class QtServerSocket : public ServerSocket {
+  public:
+    explicit QtServerSocket(QtEvents& events);
+    ~QtServerSocket() override;
+
+    void listen(const std::string& address, int port) override;
+    void close() override;
+    SocketState state() const override;
+    int port() const override { return port_; }
+    std::string problem() const override { return problem_; }
+    std::string localIP() const override;
+    std::string useTls(const TlsFiles& files) override;
+    std::string peer(int requestId) const override;
+    void accept(int requestId) override;
+    void refuse(int requestId) override;
+    Socket& client() override { return client_; }
+
+  private:
+    class Listener;
+    void knocked(QTcpSocket* socket);
+    QTcpSocket* take(int requestId);
+
+    std::unique_ptr<Listener> listener_;
+    QtSocket client_;
+    std::map<int, QTcpSocket*> requests_;
+    int lastRequest_ = 0;
+    int port_ = 0;
+    bool failed_ = false;
+    std::string problem_;
+    bool tls_ = false;
+    QSslConfiguration configuration_;
+};
+
+}  // namespace zel

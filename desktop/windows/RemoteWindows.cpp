@@ -1,0 +1,284 @@
+#include "desktop/windows/RemoteWindows.h"
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QFormLayout>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QListWidget>
+#include <QPainter>
+#include <QPointer>
+#include <QProgressBar>
+#include <QPushButton>
+#include <QVBoxLayout>
+
+#include "desktop/binders/Binder.h"
+#include "forms/Forms.h"
+
+namespace zel {
+namespace {
+
+constexpr int kFieldWidth = 220;
+constexpr int kButtonWidth = 100;
+constexpr int kLightSize = 14;  // px
+constexpr int kBridging = 7;
+constexpr int kListening = 2;
+
+PanelLineEdit* box(Binder& binder, TextBox& control) {
+    auto* line = new PanelLineEdit;
+    line->setMinimumWidth(kFieldWidth);
+    binder.bind(control, line);
+    return line;
+}
+
+QComboBox* list(Binder& binder, DropDownList& control) {
+    auto* combo = new QComboBox;
+    combo->setMinimumWidth(kFieldWidth);
+    binder.bind(control, combo);
+    return combo;
+}
+
+QPushButton* button(Binder& binder, Button& control) {
+    auto* key = new QPushButton;
+    key->setAutoDefault(false);
+    key->setMinimumWidth(kButtonWidth);
+    binder.bind(control, key);
+    return key;
+}
+
+QLabel* label(Binder& binder, Label& control) {
+    auto* text = new QLabel;
+    text->setWordWrap(true);
+    binder.bind(control, text);
+    return text;
+}
+
+QCheckBox* check(Binder& binder, CheckBox& control) {
+    auto* tick = new QCheckBox;
+    binder.bind(control, tick);
+    return tick;
+}
+
+QPixmap lightOf(const QColor& color) {
+    constexpr int kScale = 2;
+    QPixmap picture(kLightSize * kScale, kLightSize * kScale);
+    picture.setDevicePixelRatio(kScale);
+    picture.fill(Qt::transparent);
+    QPainter painter(&picture);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(color);
+    painter.drawEllipse(2, 2, kLightSize - 4, kLightSize - 4);
+    return picture;
+}
+
+struct Light {
+    const char* meaning;
+    const char* color;
+};
+constexpr Light kIdle{"Not serving", "#7d8894"};
+constexpr Light kSearching{"Looking for the instrument", "#d8a32a"};
+constexpr Light kWaiting{"Waiting for a client", "#2e9e5b"};
+constexpr Light kServing{"A client is at work", "#2f80d8"};
+constexpr Light kBroken{"The TCP port is in error", "#c0392b"};
+
+Light lightFor(const ServerForm& form) {
+    if (form.ServerConnecting) return kSearching;
+    if (form.ListenState > kListening) return kBroken;
+    if (form.ClientState == kBridging) return kServing;
+    return form.picConnected.Visible ? kWaiting : kIdle;
+}
+
+}  // namespace
+
+TcpWindow::TcpWindow(TCPConnectionForm& form, Binder& binder, QWidget* parent)
+    : FormWindow(form, binder, parent) {
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(12, 12, 12, 12);
+    auto* fields = new QFormLayout;
+    fields->addRow("Recent servers", list(binder, form.RecentServersList));
+    fields->addRow("Address", box(binder, form.IPAdressTextBox));
+    fields->addRow("Port", box(binder, form.RemotePortTextBox));
+    fields->addRow("", check(binder, form.chkTls));
+    PanelLineEdit* pinned = box(binder, form.FingerprintTextBox);
+    pinned->setPlaceholderText("of the server's certificate; empty: by its authority");
+    fields->addRow("Fingerprint", pinned);
+    fields->addRow("State", box(binder, form.IDTextBox));
+    QLabel* reason = label(binder, form.lblReason);
+    reason->setMinimumHeight(2 * reason->fontMetrics().height());
+    reason->setAlignment(Qt::AlignTop | Qt::AlignLeft);
+    fields->addRow("", reason);
+    layout->addLayout(fields);
+    layout->addStretch(1);
+    auto* keys = new QHBoxLayout;
+    keys->addStretch(1);
+    QPushButton* connectKey = button(binder, form.ConnectTCPButton);
+    connectKey->setDefault(true);
+    keys->addWidget(connectKey);
+    keys->addWidget(button(binder, form.QuitTCPButton));
+    layout->addLayout(keys);
+    setCancel(form.QuitTCPButton);
+    setMinimumWidth(440);
+    followForm();
+}
+
+DevicesWindow::DevicesWindow(DevicesChoiceForm& form, Binder& binder, QWidget* parent)
+    : FormWindow(form, binder, parent) {
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(12, 12, 12, 12);
+    auto* fields = new QFormLayout;
+    fields->addRow("Device", list(binder, form.AvailableDevicesChoice));
+    fields->addRow("Port", list(binder, form.DevicesPortList));
+    fields->addRow("Baud rate", list(binder, form.DevicesBaudList));
+    fields->addRow("Command", label(binder, form.DeviceStatusLabel));
+    layout->addLayout(fields);
+    layout->addStretch(1);
+    busy_ = new QProgressBar;
+    busy_->setRange(0, 0);
+    busy_->setTextVisible(false);
+    busy_->setFixedHeight(6);
+    QSizePolicy policy = busy_->sizePolicy();
+    policy.setRetainSizeWhenHidden(true);
+    busy_->setSizePolicy(policy);
+    layout->addWidget(busy_);
+    auto* keys = new QHBoxLayout;
+    keys->addStretch(1);
+    QPushButton* setKey = button(binder, form.SetDeviceButton);
+    setKey->setDefault(true);
+    keys->addWidget(setKey);
+    keys->addWidget(button(binder, form.CloseDevicesButton));
+    layout->addLayout(keys);
+    setCancel(form.CloseDevicesButton);
+    setMinimumWidth(400);
+    followForm();
+}
+
+ServerWindow::ServerWindow(ServerForm& form, Binder& binder, QWidget* parent)
+    : FormWindow(form, binder, parent), server_(form) {
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(12, 12, 12, 12);
+    layout->setSpacing(8);
+    auto* columns = new QHBoxLayout;
+    columns->setSpacing(8);
+    columns->addWidget(settings());
+    columns->addWidget(happenings(), 1);
+    layout->addLayout(columns, 1);
+    busy_ = new QProgressBar;
+    busy_->setRange(0, 0);
+    busy_->setTextVisible(false);
+    busy_->setFixedHeight(6);
+    QSizePolicy policy = busy_->sizePolicy();
+    policy.setRetainSizeWhenHidden(true);
+    busy_->setSizePolicy(policy);
+    layout->addWidget(busy_);
+    auto* keys = new QHBoxLayout;
+    auto* hideKey = new QPushButton("Hide in the tray");
+    hideKey->setAutoDefault(false);
+    keys->addWidget(hideKey);
+    keys->addStretch(1);
+    QPushButton* connectKey = button(binder, form.cmdConnect);
+    connectKey->setDefault(true);
+    keys->addWidget(connectKey);
+    keys->addWidget(button(binder, form.cmdCancel));
+    layout->addLayout(keys);
+    buildTray(hideKey);
+    const auto relight = [self = QPointer<ServerWindow>(this)] {
+        if (self) self->binder_.refresh(self->server_.picConnected);
+    };
+    form.lblState.Changed.connect(relight);
+    form.Changed.connect(relight);
+    // Esc asks the closing question, it does not end a connection.
+    resize(820, 460);
+    followForm();
+}
+
+ServerWindow::~ServerWindow() = default;
+
+QWidget* ServerWindow::settings() {
+    auto* column = new QWidget;
+    auto* layout = new QVBoxLayout(column);
+    layout->setContentsMargins(0, 0, 0, 0);
+    auto* instrument = new QGroupBox("Instrument");
+    auto* instrumentFields = new QFormLayout(instrument);
+    instrumentFields->addRow("Port", list(binder_, server_.COMList));
+    instrumentFields->addRow("", check(binder_, server_.chkBaudRate));
+    instrumentFields->addRow("Baud rate", list(binder_, server_.BaudList));
+    layout->addWidget(instrument);
+    auto* network = new QGroupBox("Network");
+    auto* networkFields = new QFormLayout(network);
+    auto* address = new QHBoxLayout;
+    PanelLineEdit* own = box(binder_, server_.localIPTextBox);
+    own->setMinimumWidth(110);
+    address->addWidget(own, 1);
+    address->addWidget(button(binder_, server_.cmdCopyAddress));
+    networkFields->addRow("This machine", address);
+    networkFields->addRow("TCP port", box(binder_, server_.localPortTextBox));
+    PanelLineEdit* allowed = box(binder_, server_.txtAllowed);
+    allowed->setPlaceholderText("private networks");
+    allowed->setToolTip(
+        "Who may connect: addresses or networks such as 192.168.1.0/24, with "
+        "blanks between them. Empty: this machine and the private networks.");
+    networkFields->addRow("Allowed networks", allowed);
+    QCheckBox* keep = check(binder_, server_.chkKeep);
+    networkFields->addRow(keep);
+    layout->addWidget(network);
+    layout->addStretch(1);
+    return column;
+}
+
+QWidget* ServerWindow::happenings() {
+    auto* group = new QGroupBox("Connection");
+    auto* layout = new QVBoxLayout(group);
+    auto* state = new QHBoxLayout;
+    light_ = new QLabel;
+    light_->setFixedWidth(kLightSize + 4);
+    state->addWidget(light_);
+    state->addWidget(label(binder_, server_.lblState), 1);
+    layout->addLayout(state);
+    binder_.bindShow(server_.picConnected, light_, [this] { showLight(); });
+    auto* fields = new QFormLayout;
+    auto* client = new QHBoxLayout;
+    client->addWidget(box(binder_, server_.txtClientIP), 1);
+    client->addWidget(button(binder_, server_.cmdDisconnectClient));
+    // The row keeps its place while nobody is connected.
+    auto* row = new QWidget;
+    row->setLayout(client);
+    client->setContentsMargins(0, 0, 0, 0);
+    row->setMinimumHeight(row->sizeHint().height());
+    fields->addRow(label(binder_, server_.lblClient), row);
+    fields->addRow("To the instrument", label(binder_, server_.lblToInstrument));
+    fields->addRow("To the client", label(binder_, server_.lblToClient));
+    layout->addLayout(fields);
+    auto* events = new QListWidget;
+    events->setFocusPolicy(Qt::ClickFocus);
+    events->setSelectionMode(QAbstractItemView::NoSelection);
+    layout->addWidget(events, 1);
+    binder_.bindShow(server_.lstEvents, events, [this, events] {
+        events->clear();
+        for (const std::string& text : server_.lstEvents.Items.get())
+            events->addItem(QString::fromStdString(text));
+    });
+    layout->addWidget(box(binder_, server_.txtDebug));
+    return group;
+}
+
+void ServerWindow::showLight() {
+    const Light light = lightFor(server_);
+    light_->setPixmap(lightOf(QColor(light.color)));
+    light_->setToolTip(light.meaning);
+    if (tray_ == nullptr) return;
+    tray_->setIcon(QIcon(lightOf(QColor(light.color))));
+    tray_->setToolTip("ZELRemote Server: " + QString(light.meaning));
+    tray_->setVisible(server_.Visible);
+}
+
+void ServerWindow::buildTray(QPushButton* hide) {
+    hide->setVisible(QSystemTrayIcon::isSystemTrayAvailable());
+    if (!QSystemTrayIcon::isSystemTrayAvailable()) return;
+    tray_ = new QSystemTrayIcon(this);
+    connect(hide, &QPushButton::clicked, this, [this] { setPutAway(true); });
+    connect(tray_, &QSystemTrayIcon::activated, this, [this] { setPutAway(false); });
+}
+
+}  // namespace zel

@@ -1,0 +1,205 @@
+#include "server/ServerBridge.h"
+
+#include "link/TCPIPOps.h"
+#include "support/NumberText.h"
+#include "support/StringOp.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr int kWatchMs = 1000;
+constexpr double kHighestPort = 65535;
+
+}  // namespace
+
+ServerBridge::ServerBridge(ControllerForm& panel, ServerForm& form, SerialPort& SystemCommPort,
+                           ServerSocket& TCPSocket, const Session& services)
+    : panel_(panel),
+      form_(form),
+      port_(SystemCommPort),
+      socket_(TCPSocket),
+      services_(services),
+      relay_(form, SystemCommPort, TCPSocket.client(), services),
+      search_(form, SystemCommPort, services) {
+    handlers_.on(socket_.ConnectionRequest, [this](int id) { knocked(id); });
+    handlers_.on(socket_.client().PeerClosed, [this] { clientGone(); });
+    handlers_.on(relay_.ClientTooSlow, [this] { disconnectClient(); });
+}
+
+ServerBridge::~ServerBridge() { services_.events.cancel(watchTask_); }
+
+void ServerBridge::captions(const std::string& text) {
+    panel_.Caption = text;
+    form_.Caption = text;
+}
+
+std::string ServerBridge::listenText() const {
+    const std::string& at = form_.ListenAddress;
+    const std::string address = at.empty() ? socket_.localIP() : at;
+    const bool newKind = address.find(':') != std::string::npos;
+    return (newKind ? "[" + address + "]" : address) + ":" + std::to_string(socket_.port());
+}
+
+void ServerBridge::StartListening(bool& ok) {
+    ok = false;
+    const std::string portText = trimmed(form_.localPortTextBox.Text.get());
+    const double port = leadingNumber(portText);
+    if (!IsNumericText(portText) || port < 0 || port > kHighestPort) {
+        form_.MousePointer = 0;
+        problem_ = "Please enter a valid TCP port!";
+        services_.boxes.show({BoxIcon::Plain, problem_});
+        return;
+    }
+    ListenOnPort(socket_, portText, form_.ListenAddress);
+    if (socket_.state() != SocketState::Listening) {
+        problem_ = "The TCP port cannot be used!";
+        if (!socket_.problem().empty()) problem_ += kCrLf + socket_.problem();
+        services_.boxes.show({BoxIcon::Warning, problem_});
+        return;
+    }
+    form_.localPortTextBox.Text = std::to_string(socket_.port());
+    const std::string at = form_.ListenAddress.empty() ? socket_.localIP() : form_.ListenAddress;
+    captions("ZELRemote Server TCP/IP: " + at + ": " + std::to_string(socket_.port()));
+    Happened("listening " + listenText());
+    ok = true;
+}
+
+bool ServerBridge::connect(bool quiet) {
+    if (bridging_ || connecting_) return bridging_;
+    problem_.clear();
+    const auto networks = networksOf(form_.txtAllowed.Text.get());
+    if (!networks) {
+        problem_ = "Please enter valid networks, such as 192.168.1.0/24!";
+        if (!quiet) services_.boxes.show({BoxIcon::Plain, problem_});
+        return false;
+    }
+    allowed_ = *networks;
+    connecting_ = true;
+    relay_.restart();
+    bool ok = false;
+    StartListening(ok);
+    showState();
+    if (ok) {
+        search_.setQuiet(quiet);
+        search_.ConnectInstrument(ok);
+        if (!ok) problem_ = search_.problem();
+    }
+    connecting_ = false;
+    if (!ok) {
+        disconnect();
+        return false;
+    }
+    captions(form_.Caption.get() + " | ZEL: " + form_.COMList.Text() + ", " +
+             form_.BaudList.Text());
+    bridging_ = true;
+    Happened("instrument " + form_.COMList.Text() + " " + form_.BaudList.Text());
+    relay_.restart();
+    watchTask_ = services_.events.schedule(kWatchMs, [this] { watchInstrument(); });
+    showState();
+    return true;
+}
+
+void ServerBridge::CloseCommPort() {
+    if (port_.isOpen()) port_.close();
+}
+
+void ServerBridge::disconnect() {
+    search_.stop();
+    services_.events.cancel(watchTask_);
+    watchTask_ = 0;
+    const bool was = bridging_ || socket_.state() != SocketState::Closed;
+    bridging_ = false;
+    relay_.restart();
+    CloseCommPort();
+    socket_.close();
+    disconnectClient();
+    showState();
+    if (was) Happened("closed");
+}
+
+void ServerBridge::disconnectClient() {
+    CloseIfNotClosed(socket_.client());
+    clientGone();
+}
+
+void ServerBridge::clientGone() {
+    relay_.restart();
+    CloseIfNotClosed(socket_.client());
+    if (hasClient_) {
+        hasClient_ = false;
+        clientAddress_.clear();
+        Happened("client gone");
+    }
+    showState();
+}
+
+void ServerBridge::knocked(int requestId) {
+    const std::string address = socket_.peer(requestId);
+    const bool taken = hasClient_ && form_.chkKeep.Value();
+    if (taken || !mayConnect(allowed_, address)) {
+        socket_.refuse(requestId);
+        Happened("refused " + address);
+        return;
+    }
+    if (hasClient_) clientGone();
+    AcceptRequest(socket_, requestId);
+    relay_.restart();
+    hasClient_ = true;
+    clientAddress_ = address;
+    Happened("client " + address);
+    showState();
+}
+
+void ServerBridge::watchInstrument() {
+    watchTask_ = 0;
+    if (port_.isOpen()) {
+        // A client whose connection broke without a word is noticed here.
+        const SocketState state = socket_.client().state();
+        if (hasClient_ && state != SocketState::Connected && state != SocketState::Connecting)
+            clientGone();
+        showState();
+        watchTask_ = services_.events.schedule(kWatchMs, [this] { watchInstrument(); });
+        return;
+    }
+    problem_ = "Could not connect to the specified COM port!";
+    const std::string why = port_.problem();
+    if (!why.empty()) problem_ += kCrLf + why;
+    Happened("error " + (why.empty() ? std::string("the instrument's port has gone") : why));
+    disconnect();
+    Lost();
+}
+
+void ServerBridge::repair() {
+    if (socket_.state() != SocketState::Error) return;
+    socket_.close();
+    ListenOnPort(socket_, form_.localPortTextBox.Text, form_.ListenAddress);
+    form_.txtDebug.Text = "Connection broken";
+    showState();
+}
+
+void ServerBridge::showState() {
+    form_.ListenState = static_cast<std::int16_t>(socket_.state());
+    form_.ClientState = hasClient_ ? static_cast<std::int16_t>(socket_.client().state()) : 0;
+    form_.txtClientIP.Visible = hasClient_;
+    form_.lblClient.Visible = hasClient_;
+    form_.txtClientIP.Text = clientAddress_;
+    form_.cmdDisconnectClient.Enabled = hasClient_;
+    form_.picConnected.Visible = bridging_;
+    const char* state = "Not listening";
+    if (form_.ServerConnecting) {
+        state = "Looking for the instrument";
+    } else if (bridging_ && hasClient_) {
+        state = "A client is connected";
+    } else if (bridging_) {
+        state = "Waiting for a client";
+    } else if (connecting_) {
+        state = "Looking for the instrument";
+    }
+    form_.lblState.Caption = state;
+    const std::string sweeps = std::to_string(relay_.sweeps()) + " sweeps";
+    form_.lblToInstrument.Caption = std::to_string(relay_.bytesToInstrument()) + " bytes";
+    form_.lblToClient.Caption = std::to_string(relay_.bytesToClient()) + " bytes, " + sweeps;
+}
+
+}  // namespace zel

@@ -1,0 +1,196 @@
+#include "server/ServerDialog.h"
+
+#include <utility>
+
+#include "link/RS232Ops.h"
+#include "support/NumberText.h"
+#include "support/Text.h"
+#include "support/TimeText.h"
+
+namespace zel {
+namespace {
+
+constexpr const char* kSection = "ServerForm";
+constexpr const char* kBauds[] = {"9600", "19200", "38400", "57600", "115200"};
+constexpr int kRetryMs = 10'000;
+constexpr std::size_t kMostEvents = 200;
+
+/// A list's entry by the text of its index; the first when nothing is stored, none for a number
+/// outside the list. A name that was typed stands beside the index.
+void selectStored(DropDownList& list, const std::string& index, const std::string& typed) {
+    const double number = leadingNumber(index);
+    const bool inside = number >= 0 && number < list.ListCount();
+    list.setListIndex(index.empty() ? 0 : inside ? static_cast<int>(number) : -1);
+    if (!typed.empty()) list.setText(typed);
+}
+
+std::string typedText(const DropDownList& list) {
+    return list.ListIndex() < 0 ? list.Text() : std::string();
+}
+
+}  // namespace
+
+ServerDialog::ServerDialog(Forms& forms, ServerBridge& bridge, const ServerSocket& TCPSocket,
+                           const Means& means, const Session& services)
+    : panel_(forms.controller),
+      form_(forms.server),
+      bridge_(bridge),
+      socket_(TCPSocket),
+      means_(means),
+      services_(services) {
+    form_.chkBaudRate.setValue(true);
+    form_.localIPTextBox.Locked = true;
+    form_.txtClientIP.Locked = true;
+    form_.txtDebug.Locked = true;
+    bridge_.showState();
+    handlers_.on(form_.Load, [this] { Form_Load(); });
+    handlers_.on(form_.QueryUnload, [this](int& cancel) { Form_QueryUnload(cancel); });
+    handlers_.on(form_.cmdConnect.Clicked, [this] { cmdConnect_Click(); });
+    handlers_.on(form_.cmdCancel.Clicked, [this] { cmdCancel_Click(); });
+    handlers_.on(form_.cmdDisconnectClient.Clicked, [this] { bridge_.disconnectClient(); });
+    handlers_.on(form_.cmdCopyAddress.Clicked, [this] {
+        means_.clipboard.setText(form_.localIPTextBox.Text.get() + ":" +
+                                 form_.localPortTextBox.Text.get());
+    });
+    handlers_.on(bridge_.Happened, [this](const std::string& text) { note(text); });
+    handlers_.on(bridge_.Lost, [this] { lost(); });
+}
+
+ServerDialog::~ServerDialog() { services_.events.cancel(retry_); }
+
+bool ServerDialog::serverWord() const {
+    return upperCase(panel_.CommandLine).find("SERVER") != std::string::npos;
+}
+
+void ServerDialog::note(const std::string& text) {
+    std::vector<std::string> events = form_.lstEvents.Items.get();
+    events.insert(events.begin(), timeOfDayText(services_.clock.date()) + "  " + text);
+    if (events.size() > kMostEvents) events.resize(kMostEvents);
+    form_.lstEvents.Items = std::move(events);
+}
+
+void ServerDialog::fillFields() {
+    form_.cmdConnect.Caption = "connect";
+    form_.cmdCancel.Caption = "cancel";
+    form_.localIPTextBox.Text = socket_.localIP();
+    form_.CommPorts.clear();
+    ReadSerialPortNames(means_.ports, form_.CommPorts);
+    form_.COMList.setItems(form_.CommPorts);
+    if (form_.BaudList.ListCount() == 0)
+        for (const char* baud : kBauds) form_.BaudList.AddItem(baud);
+    loadSettings();
+}
+
+void ServerDialog::Form_Load() {
+    // What was on the panel stays known while the server runs on behind a closed window.
+    form_.SavedCaption = panel_.Caption;
+    fillFields();
+    bridge_.showState();
+    // A server that starts with the machine needs no operator.
+    if (panel_.UtilityStartup.Checked)
+        services_.events.schedule(0, [this] {
+            if (form_.Visible && !bridge_.bridging()) cmdConnect_Click();
+        });
+}
+
+void ServerDialog::loadSettings() {
+    const auto get = [&](const char* key, const char* fallback) {
+        return means_.settings.get(kProgramTitle, kSection, key, fallback);
+    };
+    form_.localPortTextBox.Text = get("LocalTCPPort", "2277");
+    selectStored(form_.COMList, get("COMPort", ""), get("COMPortName", ""));
+    selectStored(form_.BaudList, get("BaudRate", ""), get("BaudRateTyped", ""));
+    form_.chkBaudRate.setValue(get("AutoBaud", "1") != "0");
+    form_.txtAllowed.Text = get("AllowedNetworks", "");
+    form_.chkKeep.setValue(get("KeepClient", "0") == "1");
+}
+
+void ServerDialog::saveSettings() {
+    const auto set = [&](const char* key, const std::string& value) {
+        means_.settings.set(kProgramTitle, kSection, key, value);
+    };
+    set("LocalTCPPort", form_.localPortTextBox.Text);
+    set("COMPort", std::to_string(form_.COMList.ListIndex()));
+    set("COMPortName", typedText(form_.COMList));
+    set("BaudRate", std::to_string(form_.BaudList.ListIndex()));
+    set("BaudRateTyped", typedText(form_.BaudList));
+    set("AutoBaud", form_.chkBaudRate.Value() ? "1" : "0");
+    set("AllowedNetworks", form_.txtAllowed.Text);
+    set("KeepClient", form_.chkKeep.Value() ? "1" : "0");
+}
+
+void ServerDialog::bridgingLook(bool bridging) {
+    form_.cmdCancel.Caption = bridging ? "disconnect" : "cancel";
+    form_.cmdConnect.Enabled = !bridging;
+    for (Control* field :
+         std::initializer_list<Control*>{&form_.localPortTextBox, &form_.COMList, &form_.BaudList,
+                                         &form_.chkBaudRate, &form_.txtAllowed})
+        field->Enabled = !bridging;
+    bridge_.showState();
+}
+
+void ServerDialog::cmdConnect_Click() {
+    services_.events.cancel(retry_);
+    retry_ = 0;
+    form_.cmdConnect.Enabled = false;
+    form_.MousePointer = 11;
+    const bool ok = bridge_.connect();
+    form_.MousePointer = 0;
+    bridgingLook(ok);
+    if (ok) saveSettings();
+}
+
+void ServerDialog::cmdCancel_Click() {
+    services_.events.cancel(retry_);
+    retry_ = 0;
+    if (bridge_.bridging()) {
+        bridge_.disconnect();
+        bridgingLook(false);
+        return;
+    }
+    int cancel = 0;
+    form_.QueryUnload(cancel);
+    if (cancel != 0) return;
+    form_.Hide();
+    form_.unload(1);
+}
+
+void ServerDialog::Form_QueryUnload(int& cancel) {
+    const BoxAnswer answer =
+        services_.boxes.show({BoxIcon::Question,
+                              std::string("Are you sure you want to close ZELRemote Server") +
+                                  kCrLf + "and disconnect client computer?",
+                              kProgramTitle, BoxButtons::YesNo});
+    if (answer == BoxAnswer::No) {
+        cancel = -1;
+        return;
+    }
+    services_.events.cancel(retry_);
+    retry_ = 0;
+    bridge_.disconnect();
+    bridgingLook(false);
+    // With the word the program ends behind its only window.
+    if (!serverWord()) panel_.Caption = form_.SavedCaption;
+}
+
+void ServerDialog::lost() {
+    bridgingLook(false);
+    if (panel_.UtilityStartup.Checked) {
+        retry_ = services_.events.schedule(kRetryMs, [this] { tryAgain(); });
+        form_.txtDebug.Text = bridge_.problem();
+        return;
+    }
+    services_.boxes.show({BoxIcon::Warning, bridge_.problem()});
+}
+
+// Nobody may be there to close a box, so that a failed try is only written down.
+void ServerDialog::tryAgain() {
+    retry_ = 0;
+    if (bridge_.bridging() || bridge_.connecting()) return;
+    const bool ok = bridge_.connect(true);
+    bridgingLook(ok);
+    form_.txtDebug.Text = ok ? std::string() : bridge_.problem();
+    if (!ok) retry_ = services_.events.schedule(kRetryMs, [this] { tryAgain(); });
+}
+
+}  // namespace zel
