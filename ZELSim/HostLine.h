@@ -20,7 +20,7 @@ class HostLine {
     /// Seconds until `take` will have something (more), or the next look is worth while; nothing
     /// when only the host can set things going.
     virtual std::optional<double> nextDue() const = 0;
-    /// The line was cut and made anew: half a line and what was on its way are gone.
+    /// The line was cut and made again: half a line and what was on its way are gone.
     virtual void reset() = 0;
     /// True while so much waits that the sender should pause.
     virtual bool congested() const = 0;

@@ -23,7 +23,7 @@ class InProcessPort : public zel::SerialPort {
     InProcessPort(const InProcessPort&) = delete;
     InProcessPort& operator=(const InProcessPort&) = delete;
 
-    /// The port of this name has a modem with the standard phonebook ahead of the instrument.
+    /// The port of this name has a modem with the standard phonebook before the instrument.
     static constexpr const char* kModemPort = "/dev/modem";
 
     /// Any other name reaches the instrument. On a paced line the baud rate of the setup has to fit

@@ -11,7 +11,7 @@ namespace {
 
 constexpr char kCr = '\r';
 constexpr std::size_t kLongestCommand = 256;
-constexpr double kGuard = 1.0;        // s of silence ahead of "+++" and behind it
+constexpr double kGuard = 1.0;        // s of silence before "+++" and after it
 constexpr double kGuardSlack = 0.02;  // s, what a host's clock may be early
 constexpr double kAnswering = 0.005;  // s that an answer to a command takes
 constexpr int kOk = 0;

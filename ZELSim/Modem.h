@@ -1,5 +1,5 @@
 #pragma once
-// A modem with AT commands between the host and the instrument, with a telephone net behind it.
+// A modem with AT commands between the host and the instrument, with a telephone net beyond it.
 
 #include <cstdint>
 #include <deque>
@@ -12,7 +12,7 @@ namespace zelsim {
 
 /// Understands E, &F, Z, X, Q, V, D, H, O, &W and other &, S and + commands (which it takes and
 /// ignores), several in one line. Online it is transparent until "+++" with a second of silence
-/// ahead of it and behind it. A host that goes hangs up.
+/// before it and after it. A host that goes hangs up.
 class Modem : public HostLine {
   public:
     Modem(HostLine& instrument, Phonebook book);
@@ -39,7 +39,7 @@ class Modem : public HostLine {
 
     void command(char c);
     void obey(const std::string& line);
-    /// One command of a line from `at` on, which then stands behind it. False for an error.
+    /// One command of a line from `at` on, which then stands after it. False for an error.
     bool obeyOne(const std::string& line, std::size_t& at);
     void dial(const std::string& number);
     void say(const std::string& word, int code, double after = 0);

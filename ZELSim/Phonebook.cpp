@@ -134,7 +134,7 @@ PhoneEntry Phonebook::find(std::string_view number) const {
 }
 
 std::string_view phonebookHelp() {
-    return "Telephony (--modem): a modem with AT commands stands ahead of the instrument. Without\n"
+    return "Telephony (--modem): a modem with AT commands stands before the instrument. Without\n"
            "--phonebook 100 is busy, 101 ends in NO CARRIER, 102 in NO DIALTONE, 103 in NO "
            "ANSWER,\n"
            "104 connects at 12000 bits a second, 105 connects in pieces, 106 never answers; any\n"

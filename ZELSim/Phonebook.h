@@ -13,7 +13,7 @@ enum class CallResult { Connect, Busy, NoCarrier, NoDialtone, NoAnswer, Silence 
 struct PhoneEntry {
     std::string number;  ///< "*" stands for any number
     CallResult result = CallResult::Connect;
-    int speed = 19200;      ///< bits a second that CONNECT tells
+    int speed = 19200;      ///< bits a second that CONNECT reports
     double after = 1;       ///< s from the dialling to the result word
     std::size_t chunk = 0;  ///< the result comes in pieces of so many characters; 0: whole
     double gap = 0.05;      ///< s between the pieces

@@ -128,7 +128,7 @@ int main(int argc, char** argv) {
                                 "(--baud, else 57600; BAUD changes it) gets noise")
                        ->needs(pty);
     auto* modem = app.add_flag("--modem", options.modem,
-                               "With --pty: a modem stands ahead of the instrument, see below")
+                               "With --pty: a modem stands before the instrument, see below")
                       ->needs(pty)
                       ->excludes(strict);
     app.add_option("--phonebook", options.phonebook, "What becomes of calls, by number")

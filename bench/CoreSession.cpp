@@ -31,10 +31,11 @@ std::optional<std::string> NoBoxes::prompt(const std::string& text, const std::s
 CoreSession::CoreSession(const std::string& device, int baud) : platform_(home_.path()) {
     const zel::Platform own = platform_.bundle(boxes_, platform_.fileDialogs);
     // The counter takes the serial port's place; all else is the platform as the program has it.
-    const zel::Platform counted{own.clock,       own.events,      own.boxes,        port_,
-                                own.serialPorts, own.tcpSocket,   own.serverPort, own.serverSocket, own.settings,
-                                own.debug,       own.clipboard,   own.launcher,     own.startup,
-                                own.folder,      own.fileDialogs, own.files,        own.endSignals};
+    const zel::Platform counted{own.clock,       own.events,    own.boxes,       port_,
+                                own.serialPorts, own.tcpSocket, own.serverPort,  own.serverSocket,
+                                own.settings,    own.debug,     own.clipboard,   own.launcher,
+                                own.startup,     own.folder,    own.fileDialogs, own.files,
+                                own.endSignals};
     program_ = std::make_unique<zel::Program>(counted, "");
     program_->start();
     if (!program_->connect({zel::LinkAddress::Kind::Serial, device, baud}, false))

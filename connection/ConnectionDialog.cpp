@@ -83,7 +83,7 @@ void ConnectionDialog::SetAllFramesInvisible() {
 
 void ConnectionDialog::SetConnectionKind(std::int16_t kind) {
     panel_.ConnectionState = kind;
-    // Ports come and go: the list is made anew while nothing is connected.
+    // Ports come and go: the list is made again while nothing is connected.
     if (!panel_.isConnected) dialog_.unload(1);
     dialog_.load();
     SetAllFramesInvisible();

@@ -26,7 +26,7 @@ class ConnectionDialog {
     void Direct_Click();
     void ImmConnect_Click();
     void ZELButton_Click();
-    /// Opens the port of the dialog and does the handshake; one sweep behind it with `readTrace`.
+    /// Opens the port of the dialog and does the handshake; one sweep after it with `readTrace`.
     void connectDirect(bool readTrace);
 
   private:

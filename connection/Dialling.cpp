@@ -88,7 +88,7 @@ void Dialling::dial(bool readTrace) {
         return dialOver();
     }
     dialog_.ZELButton_Click();
-    if (!link_.bytes.portOpen()) return dialOver();  // the reason was told
+    if (!link_.bytes.portOpen()) return dialOver();  // the reason was reported
     form_.Dialling = true;
     form_.DialButton.Visible = false;
     form_.CancelButton.Visible = true;
@@ -235,7 +235,7 @@ void Dialling::session(const std::string& answer, bool readTrace) {
     link_.bytes.ReadFromLink(true);
     form_.ModemConnected = true;
     form_.Dialling = false;
-    told_ = true;  // the handshake tells for itself
+    told_ = true;  // the handshake reports for itself
     start_.connect();
     if (!panel_.isConnected) {
         // A call that nobody uses any more costs money.

@@ -16,7 +16,7 @@ namespace zel {
 /// that stands: none of the words was found.
 const char* callProblem(const std::string& answer);
 
-/// What came behind the dial command, without its echo and without the "OK" of the commands ahead
+/// What came after the dial command, without its echo and without the "OK" of the commands ahead
 /// of it, which a slow modem sends late.
 std::string callAnswer(std::string text, const std::string& dialled);
 
@@ -28,11 +28,11 @@ class Dialling {
 
     void DialButton_Click();
     void CancelButton_Click();
-    /// The number of the dialog is dialled; one sweep behind the handshake with `readTrace`.
+    /// The number of the dialog is dialled; one sweep after the handshake with `readTrace`.
     void dial(bool readTrace);
     /// Sends "ATQ0" and looks for "OK".
     void ConfirmModemMode(bool& ok);
-    /// Tells why there is no connection and closes the port; `ok` when there is one.
+    /// Reports why there is no connection and closes the port; `ok` when there is one.
     void CheckAnswer(const std::string& text, bool& ok);
 
   private:

@@ -141,7 +141,7 @@ void Disconnection::notConnectedLook() {
 }
 
 void Disconnection::HangUpModem() {
-    // A modem takes "+++" for a command only with a second of silence ahead of it and behind it.
+    // A modem takes "+++" for a command only with a second of silence before it and after it.
     // The answers make no difference: the hang-up goes on in any case.
     session_.events.sleep(kModemSilenceMs);
     link_.WriteToLink("+++");

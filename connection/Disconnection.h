@@ -21,7 +21,7 @@ class Disconnection {
     /// The same without the question.
     void endSession();
     /// The program ends at once: LOCAL, the hang-up of a dialled line, the close. Nothing is asked
-    /// or told.
+    /// or reported.
     void endAtOnce();
     /// Two silent answers take a little over 10.5 s.
     void HangUpModem();

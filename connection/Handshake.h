@@ -17,14 +17,14 @@ class Handshake {
     Handshake(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& link,
               FrequencyLabels& labels, const MenuRoutines& menus, const Session& session);
 
-    /// The link is up; `isConnected` tells the outcome. Any failure leaves the panel as far as it
+    /// The link is up; `isConnected` shows the outcome. Any failure leaves the panel as far as it
     /// got, and the dialog's `AdviceLabel` says what to check. The dialog's Cancel leaves it.
     void InitConnection();
 
   private:
     void connect();
     bool wakeInstrument();
-    /// False once a silence has taken the connection down, which was told then.
+    /// False once a silence has taken the connection down, which was reported then.
     bool instrumentAnswers() const;
     void acceptRemote();
     bool identify();

@@ -21,7 +21,7 @@ class SessionStart {
 
     /// "start" or "stop" of the clock that shows the session's length.
     void setClock(std::string_view word) { clock_.InitTimer(word); }
-    /// The handshake; `isConnected` tells the outcome.
+    /// The handshake; `isConnected` shows the outcome.
     void connect() { handshake_.InitConnection(); }
     /// One sweep, unless a power sensor measures.
     void readFirstSweep() {

@@ -136,7 +136,7 @@ void TcpDialog::connect(bool readTrace) {
     if (readTrace) start_.readFirstSweep();
 }
 
-/// Connects and looks whether an instrument is behind the server.
+/// Connects and looks whether the server has an instrument.
 bool TcpDialog::open(const std::string& host, const std::string& portText) {
     if (socket_.state() != SocketState::Closed) socket_.close();
     const int port = static_cast<int>(leadingNumber(portText));

@@ -22,7 +22,7 @@ class TcpDialog {
     void TCPConnection_Click();
     void ConnectTCPButton_Click();
     void QuitTCPButton_Click();
-    /// Connects the socket and does the handshake; one sweep behind it with `readTrace`.
+    /// Connects the socket and does the handshake; one sweep after it with `readTrace`.
     void connect(bool readTrace);
 
   private:

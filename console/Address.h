@@ -1,5 +1,5 @@
 #pragma once
-// Where the instrument of a run is, as `--connect` tells it.
+// Where the instrument of a run is, as `--connect` says it.
 
 #include <optional>
 #include <string>
@@ -17,7 +17,7 @@ struct ConnectAddress {
 /// "sim:", or an address as `parseLinkAddress` takes it; nothing for any other text.
 std::optional<ConnectAddress> parseAddress(std::string_view url);
 
-/// The name of the port behind which the built-in simulator is found.
+/// The name of the port that leads to the built-in simulator.
 inline constexpr const char* kSimulatorPort = "SIM";
 
 }  // namespace zel

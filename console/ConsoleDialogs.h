@@ -37,7 +37,7 @@ class ConsoleBoxes : public MessageBoxes {
     /// While it is there, no queued answer is taken.
     std::function<std::optional<std::string>()> reader;
 
-    /// Boxes so far that told of a failure.
+    /// Boxes so far that reported a failure.
     int failures() const { return failures_; }
 
     BoxAnswer show(const Box& box) override;
@@ -56,7 +56,7 @@ class ConsoleFileDialogs : public FileDialogs {
     ConsoleFileDialogs(LineOutput& output, AnswerQueue& answers)
         : output_(output), answers_(answers) {}
 
-    /// Reads a path for each dialog, which is then told as "file[open] TITLE"; an empty one and
+    /// Reads a path for each dialog, which is then reported as "file[open] TITLE"; an empty one and
     /// nothing cancel it. While it is there, no queued answer is taken.
     std::function<std::optional<std::string>()> reader;
 

@@ -8,7 +8,7 @@
 
 namespace zel {
 
-/// Calls `onLine` with each new text of the line, and `onExchange` ahead of each that begins one.
+/// Calls `onLine` with each new text of the line, and `onExchange` before each that begins one.
 class DebugWatch {
   public:
     explicit DebugWatch(ControllerForm& panel) : panel_(panel) {

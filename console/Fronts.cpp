@@ -39,9 +39,9 @@ class SimulatorFront : public Front {
     Events& events() override { return events_; }
     QtSignals& endSignals() override { return signals_; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
-        return {clock_,        served,    boxes,  port_,      ports_,    tcpSocket_,
-                serverPort_, serverSocket_, settings_, debug_, clipboard_, launcher_, startup_,
-                folder_,       dialogs,   files_, signals_};
+        return {clock_,      served,        boxes,     port_,  ports_,     tcpSocket_,
+                serverPort_, serverSocket_, settings_, debug_, clipboard_, launcher_,
+                startup_,    folder_,       dialogs,   files_, signals_};
     }
 
   private:
@@ -70,9 +70,10 @@ class PortFront : public Front {
     Events& events() override { return qt_.events; }
     QtSignals& endSignals() override { return qt_.endSignals; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
-        return {qt_.clock,     served,           boxes,        qt_.serialPort, qt_.serialPorts,
-                qt_.tcpSocket, qt_.serverPort, qt_.serverSocket, qt_.settings, qt_.debug,      clipboard_,
-                qt_.launcher,  qt_.startup,      qt_.folder,   dialogs,        qt_.files,
+        return {qt_.clock,       served,        boxes,          qt_.serialPort,
+                qt_.serialPorts, qt_.tcpSocket, qt_.serverPort, qt_.serverSocket,
+                qt_.settings,    qt_.debug,     clipboard_,     qt_.launcher,
+                qt_.startup,     qt_.folder,    dialogs,        qt_.files,
                 qt_.endSignals};
     }
 

@@ -9,7 +9,7 @@
 
 namespace zel {
 
-/// The toolkit's application object, which must stand ahead of all else. With `windows` pictures
+/// The toolkit's application object, which must stand before all else. With `windows` pictures
 /// can be drawn, on no screen unless QT_QPA_PLATFORM names one.
 class ToolkitSession {
   public:

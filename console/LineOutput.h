@@ -21,7 +21,7 @@ class LineOutput {
     /// Many at once, with one flush.
     void lines(const std::vector<std::string>& texts);
     /// Held until another line, or until `settle`; the same text again raises its count, and
-    /// " (3 times)" then stands behind it.
+    /// " (3 times)" then stands after it.
     void repeatable(const std::string& text);
     /// Writes what is held back.
     void settle();

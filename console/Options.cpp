@@ -118,7 +118,7 @@ struct Parser {
         run->add_option("SCRIPT", options.argument, "The script, a text file")->required();
         outputOption(run, options, "File of the results");
         run->add_flag("--rehearse", options.rehearse,
-                      "Only tells how the run would go; no file is written, no port opened");
+                      "Only reports how the run would go; no file is written, no port opened");
         CLI::App* panel =
             verb(Verb::Panel, "panel", "Works the panel by the names of its controls");
         panel->add_option("FILE", options.argument, "Lines of commands; standard input without it");

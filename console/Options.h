@@ -43,8 +43,8 @@ struct Options {
     ServeOptions serve;
 };
 
-/// Fills the options. An exit status when the run is over with that: 0 behind a help text on
-/// `out`, 2 behind the reason on `errors`.
+/// Fills the options. An exit status when the run is over with that: 0 after a help text on
+/// `out`, 2 after the reason on `errors`.
 std::optional<int> parseOptions(int argc, const char* const* argv, Options& options,
                                 std::ostream& out, std::ostream& errors);
 

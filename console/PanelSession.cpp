@@ -22,7 +22,7 @@ constexpr int kLongestPumpMs = 24 * 3600 * 1000;
 constexpr std::string_view kBlanks = " \t";
 constexpr std::string_view kUtf8Mark = "\xEF\xBB\xBF";
 
-/// The first word of a text, and what stands behind it and one blank.
+/// The first word of a text, and what stands after it and one blank.
 std::pair<std::string_view, std::string_view> firstWord(std::string_view text) {
     const auto end = text.find_first_of(kBlanks);
     if (end == std::string_view::npos) return {text, {}};
@@ -105,7 +105,7 @@ bool PanelSession::whileWaiting(int ms) {
     if (microsLeft() > 0) {
         idle(ms);
     } else if (interlock_.waiting() > 0 || !readAndExecute()) {
-        // A line whose turn has not come holds those behind it.
+        // A line whose turn has not come holds those after it.
         idle(std::min(ms, kLookMs));
     }
     return true;

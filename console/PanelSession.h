@@ -38,10 +38,10 @@ class PanelSession {
     PanelSession(const PanelSession&) = delete;
     PanelSession& operator=(const PanelSession&) = delete;
 
-    /// Starts the program and serves lines to the end. An unknown word or name is told on the
+    /// Starts the program and serves lines to the end. An unknown word or name is reported on the
     /// errors and makes the status 2; a connection that did not come about makes it 1.
     int run();
-    /// Tells of wrong use; the session goes on.
+    /// Reports wrong use; the session goes on.
     void complain(const std::string& what);
 
   private:

@@ -21,7 +21,7 @@ struct Run {
     LineOutput& output() const { return stage.output; }
     ControllerForm& panel() const { return stage.program.forms().controller; }
     int fail(const std::string& what) const {
-        if (!program().endedBy().empty()) return kLinkFailed;  // that is told once, at the end
+        if (!program().endedBy().empty()) return kLinkFailed;  // that is reported once, at the end
         stage.errors.line("zelctl: " + what);
         return kLinkFailed;
     }
@@ -77,7 +77,7 @@ int cmd(const Run& run) {
     return run.fail("the instrument did not carry out " + run.options.argument);
 }
 
-/// Tells each incomplete trace on the error output from now on; the result counts them.
+/// Reports each incomplete trace on the error output from now on; the result counts them.
 std::shared_ptr<int> tellIncompleteTraces(const Run& run) {
     auto count = std::make_shared<int>(0);
     LineOutput& errors = run.stage.errors;
@@ -94,7 +94,7 @@ int sweep(const Run& run) {
     const auto incomplete = tellIncompleteTraces(run);
     for (int i = 0; i < run.options.count && run.output().problem().empty(); ++i) {
         bool success = false;
-        // As passes of one view the sweeps stand behind each other in the waterfall.
+        // As passes of one view the sweeps stand one after the other in the waterfall.
         panel.ContinuosLoopActive = run.wantsRows();
         panel.YVectorVal = i;
         run.program().traces().ReadSingleTrace(success);
@@ -144,7 +144,7 @@ int record(const Run& run) {
         run.stage.events.wait(kWaitMs);
     if (panel.RecordData.Checked) panel.StopButton.Click();
     if (watch->ticks < wanted)
-        return run.fail("the recording ended behind " + std::to_string(watch->ticks) + " traces");
+        return run.fail("the recording ended after " + std::to_string(watch->ticks) + " traces");
     if (dialog.FailedCount > 0)
         return run.fail(generalNumber(dialog.FailedCount) + " of " + std::to_string(wanted) +
                         " traces could not be read");

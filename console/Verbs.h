@@ -25,7 +25,7 @@ struct VerbStage {
     Program& program;
     Events& events;
     AnswerQueue& answers;       ///< of the file dialogs
-    const ConsoleBoxes& boxes;  ///< told what went wrong with a file
+    const ConsoleBoxes& boxes;  ///< reported what went wrong with a file
     LineOutput& output;
     LineOutput& errors;
     ImageWriter image;
@@ -35,8 +35,8 @@ struct VerbStage {
 };
 
 /// Starts the program, connects, does the verb of the options, disconnects; `show` needs no
-/// instrument. The exit status; boxes have told of failures of the link, what the verb misses is
-/// told on `errors`.
+/// instrument. The exit status; boxes have reported failures of the link, what the verb misses is
+/// reported on `errors`.
 int runVerb(const Options& options, const VerbStage& stage);
 
 }  // namespace zel

@@ -71,7 +71,7 @@ int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startInd
     int i = startIndex;
     while (rows < kRows) {
         while (i <= last && lines[i] == kBlank) ++i;
-        // A line end behind the last row makes an entry of its own, which is no row.
+        // A line end after the last row makes an entry of its own, which is no row.
         if (i > last || (i == last && lines[i].empty())) {
             i = last + 1;
             break;

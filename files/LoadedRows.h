@@ -17,7 +17,7 @@ class LoadedRows {
         : panel_(panel), mirror_(mirror) {}
 
     /// Fills `DataXAxisArrayToLoad` and `DataValArrayToLoad` with at most 301 rows from the entry
-    /// `startIndex` on. `nextIndex` is the entry behind the rows, or -1 when the text is used up.
+    /// `startIndex` on. `nextIndex` is the entry after the rows, or -1 when the text is used up.
     /// Returns how many rows were there; the arrays, `RawTraceData` too, hold as many.
     int ReadDataRows(const FieldList& lines, bool autoPeak, int startIndex, int& nextIndex);
     /// A value of the file in the reference unit, as the graph shows it.

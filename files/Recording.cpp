@@ -183,7 +183,7 @@ bool Recording::takeTrace() {
 
 void Recording::X_Timer() {
     if (exchange_.busy()) {
-        // The line is in the middle of a dialogue that lets events run: this tick comes behind it.
+        // The line is in the middle of a dialogue that lets events run: this tick comes after it.
         session_.events.schedule(kRetryMs, [this] {
             if (dialog_.X.Enabled && !inTick_) X_Timer();
         });

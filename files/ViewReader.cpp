@@ -348,7 +348,7 @@ void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
     values.clear();
     const int perRow = pairs ? 2 : 1;
     for (int i = start; xs.size() < LoadedRows::kRows;) {
-        // A blank closes a row; behind the rows stands the end of the log.
+        // A blank closes a row; after the rows stands the end of the log.
         while (i <= lines.last() && trimmed(lines[i]).empty()) ++i;
         if (i + perRow > lines.last() || contains(lines[i], "END OF LOG")) break;
         xs.push_back(leadingNumber(lines[i++]));

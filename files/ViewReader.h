@@ -24,12 +24,12 @@ class ViewReader {
                const Interlock& interlock);
 
     void LoadData_Click();
-    /// Reads and shows a file; what cannot be read is told in a box. Nothing happens while another
-    /// file loads.
+    /// Reads and shows a file; what cannot be read is reported in a box. Nothing happens while
+    /// another file loads.
     void loadFile(const std::string& path);
     /// `text` holds the whole file, its fields apart by CR (a semicolon counts as one); `fileTime`
     /// is day and time of the file, `rowNumber` the waterfall's row to go on with, 0 for a file
-    /// that starts anew.
+    /// that starts again.
     void LoadTheData(const std::string& text, const std::string& fileTime, std::int16_t rowNumber);
     void LoadTheDataForOlderVersions(const std::string& text);
 

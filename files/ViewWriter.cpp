@@ -142,7 +142,7 @@ void ViewWriter::finish(OutputFile& file) {
     const std::string problem = file.close();
     if (problem.empty()) return;
     const bool recording = panel_.RecordDataFlag && !panel_.isSpecMeas;
-    // Ahead of the box, so that no further trace is begun behind it.
+    // Before the box, so that no further trace is begun after it.
     if (recording) panel_.StopButton.Click();
     boxes_.show(
         {BoxIcon::Critical, recording ? problem + kCrLf + "The recording was stopped." : problem});

@@ -36,7 +36,7 @@ class ViewWriter {
     void WriteViewHeader(OutputFile& file, bool withHeader);
     /// A row a point: x and value; a row a pair with the auto peak detector.
     void WriteViewData(OutputFile& file);
-    /// A failure is told in a box and ends a recording.
+    /// A failure is reported in a box and ends a recording.
     void WriteFooterAndCloseFileZELViewFormat(OutputFile& file);
 
     // The older log format, which nothing writes any more.

@@ -14,7 +14,7 @@ namespace zel {
 /// it is what the file says: the mirror stays the instrument's, but for the fields that a file
 /// sets, and its range is then dB a division and no code.
 struct ShownView {
-    std::string xUnit;                ///< "Hz", "s", "m"; empty ahead of the first view
+    std::string xUnit;                ///< "Hz", "s", "m"; empty before the first view
     std::int16_t instrumentMode = 0;  ///< of a sweep; 0 for none
     bool fromFile = false;
     std::string mode;       ///< as the file names it; empty when it does not
@@ -77,21 +77,21 @@ class ControllerForm : public Form {
     double MarkerValue = 0;  ///< x of marker 1, in the unit of the x axis
     double MarkerLevel = 0;  ///< y of marker 1, in the unit of the y axis
     double DeltaValue = 0;   ///< x of the delta marker
-    double LastSpan = 0;     ///< span ahead of the last manual change, Hz
+    double LastSpan = 0;     ///< span before the last manual change, Hz
     bool RecordDataFlag = false;
     std::string DataFileName;           ///< target of a recording or a script
     std::string CommonDialog1FileName;  ///< the name that stands in the file dialog
     std::vector<double> DataXAxisArrayToLoad;
     std::vector<double> DataValArrayToLoad;
     bool ContinuosLoopActive = false;
-    /// A view or a single trace is under way, be it one that was told to stop.
+    /// A view or a single trace is under way, be it one that is to stop.
     bool AcquisitionRunning = false;
     bool SingleSweepModeActive = false;
     std::string mLoadOption;
     bool isConnected = false;  ///< the handshake is done
     bool LinkLost = false;     ///< the line has died: what is shown will not become newer
     double RecordTimeValue = 0;
-    bool ErrorFlag = false;  ///< a link failure was told already
+    bool ErrorFlag = false;  ///< a link failure was reported already
     bool ChoiceBoxActivated = false;
     bool BinaryModeActive = false;  ///< a binary transfer was made: noise is no longer judged
     bool isSpecMeas = false;
@@ -131,11 +131,11 @@ class ControllerForm : public Form {
     /// Loads the file of that path, as `LoadData` does with the one that was chosen.
     Event<const std::string&> OpenFile;
     std::string DebugLogName = "debug.log";  ///< in the application's folder
-    Event<> CloseDebugLog;                   ///< ahead of its deletion
+    Event<> CloseDebugLog;                   ///< before its deletion
     Event<int> ShowHelp;                     ///< opens the help topic of that context number
     /// A row of the spectrogram is to be shown as the trace; 0 is the newest.
     Event<int> SpectrogramRow;
-    Event<> TraceLoaded;  ///< behind each trace of a file that was read and drawn
+    Event<> TraceLoaded;  ///< after each trace of a file that was read and drawn
     /// The front draws the graph into the file of that path, its ending names the kind. The second
     /// text takes what went wrong.
     Event<const std::string&, std::string&> DrawImage;

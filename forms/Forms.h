@@ -27,8 +27,8 @@ class TCPConnectionForm : public Form {
     CheckBox chkTls{*this, "chkTls", "Encrypt the connection (TLS)"};
     TextBox FingerprintTextBox{*this, "FingerprintTextBox"};
     TextBox IDTextBox{*this, "IDTextBox"};
-    Label AdviceLabel{*this, "AdviceLabel"};  ///< how long a wait lasts; what to check behind it
-    Label lblReason{*this, "lblReason"};  ///< why there is no connection
+    Label AdviceLabel{*this, "AdviceLabel"};  ///< how long a wait lasts; what to check after it
+    Label lblReason{*this, "lblReason"};      ///< why there is no connection
     Button ConnectTCPButton{*this, "ConnectTCPButton", "Connect"};
     Button QuitTCPButton{*this, "QuitTCPButton", "Close"};
 };

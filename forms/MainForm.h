@@ -34,7 +34,7 @@ class MainForm : public Form {
     TextBox AirBaudRateText{*this, "AirBaudRateText"};
     TextBox IDText{*this, "IDText"};
     Picture OnPic{*this, "OnPic", "on"};
-    Label AdviceLabel{*this, "AdviceLabel"};  ///< how long a wait lasts; what to check behind it
+    Label AdviceLabel{*this, "AdviceLabel"};  ///< how long a wait lasts; what to check after it
     Button ZELButton{*this, "ZELButton", "Connect"};
     Button DisconnectButton{*this, "DisconnectButton", "Disconnect"};
     Button DialButton{*this, "DialButton", "Dial"};

@@ -24,7 +24,7 @@ class ServerForm : public Form {
     bool doBinaryData = false;           ///< the instrument's next bytes are a binary trace
     bool ServerConnecting = false;       ///< the search runs; the line's bytes are its own
     bool ServerScanStop = false;         ///< silence above the lowest speed: no instrument
-    std::string SavedCaption;            ///< the panel's caption ahead of the server's
+    std::string SavedCaption;            ///< the panel's caption before the server's
     std::string ListenAddress;           ///< empty for all addresses
     std::int16_t ListenState = 0;        ///< 0 closed, 2 listening, 9 error
     std::int16_t ClientState = 0;        ///< 0 none, 7 connected

@@ -21,20 +21,20 @@ class AnswerReader {
     AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const Session& session);
 
     /// One line without its CR, or the empty text. A silence in session sets `ExchangeFailed`
-    /// and tells "No response received!" once; while connecting it takes the connection down.
+    /// and reports "No response received!" once; while connecting it takes the connection down.
     std::string ReadAnswer();
     /// The same with the caller's time-out in seconds, for an exchange that a trigger ends.
     std::string ReadAnswerTriggered(std::int32_t timeoutSeconds);
-    /// Takes a line that the instrument owes, or waits that long; nothing is told.
+    /// Takes a line that the instrument owes, or waits that long; nothing is reported.
     void awaitQuietly(int timeoutMs);
 
-    /// A silence has ended the attempt to connect, which was told as far as it had to be. Who owns
-    /// the connection takes it down.
+    /// A silence has ended the attempt to connect, which was reported as far as it had to be. Who
+    /// owns the connection takes it down.
     Event<> AttemptAbandoned;
 
     /// The last read found a line, be it an empty one.
     bool answered() const { return answered_; }
-    /// The last read told the user that no instrument was found.
+    /// The last read reported the user that no instrument was found.
     bool absenceTold() const { return absenceTold_; }
 
   private:

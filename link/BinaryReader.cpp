@@ -89,7 +89,7 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
     }
     StopwatchB_.Reset();
     if (isBareStatus(chunk) && chunk[0] != '0') {
-        // A refusal has nothing behind it: samples there tell that the digit itself is wrong.
+        // A refusal has nothing after it: samples there show that the digit itself is wrong.
         session_.events.wait(kPollMs);
         const std::string behind = link_.takeBytes();
         if (behind.empty()) {

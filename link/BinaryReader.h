@@ -18,9 +18,9 @@ class BinaryReader {
   public:
     BinaryReader(Forms& forms, ZELBas& state, ByteLink& link, const Session& session);
 
-    /// The checked entry to `ReadBinaryBytes`; tells a closed port.
+    /// The checked entry to `ReadBinaryBytes`; reports a closed port.
     std::string ReadBinaryBuffer(std::int16_t length);
-    /// The bytes behind the status, at most `length`; fewer when the instrument stops. A refusal
+    /// The bytes after the status, at most `length`; fewer when the instrument stops. A refusal
     /// gives its digit and CR, two bytes; a silence of 5 s gives nothing.
     std::string ReadBinaryBytes(std::int16_t length);
     /// One timed read: what has come as soon as something has, else nothing.

@@ -85,7 +85,7 @@ BinaryTrace::Outcome BinaryTrace::readOnce(RawTrace& trace, bool doubleBlock, bo
     panel_.BinaryModeActive = true;
     link_.WriteToLink("TRACEBIN\r");
     delay(DelayPlace::AfterTraceKeyword);
-    const bool open = link_.usable();  // a port closed before is told by the read
+    const bool open = link_.usable();  // a port closed before is reported by the read
     const std::string bytes = bytes_.ReadBinaryBuffer(doubleBlock ? kDoubleBytes : kSingleBytes);
     if (bytes.size() == 2 && bytes[1] == '\r') {
         status = bytes[0] - '0';
@@ -121,7 +121,7 @@ void BinaryTrace::decode(const std::string& bytes, bool doubleBlock, RawTrace& t
         trace.values[output++] =
             int32FromLittleEndian(reinterpret_cast<const unsigned char*>(bytes.data()) + index);
     }
-    // Less than a sample is missing: nobody knows where, and all behind that place is shifted.
+    // Less than a sample is missing: nobody knows where, and all after that place is shifted.
     const bool lostInside = bytes.size() < asked && bytes.size() + kSampleBytes > asked;
     trace.came = lostInside ? 0 : output;
 }

@@ -19,12 +19,12 @@ class ByteLink {
              const Session& session, DebugChannel& debug);
 
     /// Opens the port at 8 data bits, no parity, 1 stop bit, no flow control; `port` is a device
-    /// name. False when it cannot be had; nothing is told.
+    /// name. False when it cannot be had; nothing is reported.
     bool OpenSerialPort(const std::string& port, long baud);
-    /// Takes port and baud rate from the dialog's lists and tells what is wrong with them.
+    /// Takes port and baud rate from the dialog's lists and reports what is wrong with them.
     void OpenPortFromDialog();
     /// Sends the text, a byte a character; dropped silently when the port was not opened, and when
-    /// `wireProblem` names a character of it. An answer that came late, behind a time-out, is
+    /// `wireProblem` names a character of it. An answer that came late, after a time-out, is
     /// thrown away before.
     void WriteToLink(const std::string& text);
     /// What has arrived, possibly nothing. Serial never waits; TCP waits up to 0.1 s with `wait`
@@ -38,9 +38,9 @@ class ByteLink {
     bool isTcp() const;
     bool portOpen() const { return port_.isOpen(); }
     /// Bytes can come or have come: the serial port is open, or the socket is connected or holds
-    /// what came ahead of its end.
+    /// what came before its end.
     bool usable() const;
-    /// Tells once a connection that a socket has ended, and why.
+    /// Reports once a connection that a socket has ended, and why.
     void tellLoss();
     /// Why the port was lost or could not be opened, for a user; empty when nothing is known.
     std::string problem() const { return port_.problem(); }

@@ -16,7 +16,7 @@ namespace zel {
 
 /// A line ends with CR. The mode word goes first ("cmd", "set", "GET"), the instrument answers a
 /// status digit, then the keyword goes, and a second status comes; a query's value follows it.
-/// All results are true on success. Failures are told to the user here, nobody else has to.
+/// All results are true on success. Failures are reported to the user here, nobody else has to.
 class CommandExchange {
   public:
     CommandExchange(ControllerForm& panel, ZELBas& state, ByteLink& link, AnswerReader& reader,
@@ -39,7 +39,7 @@ class CommandExchange {
     /// `graceMs` milliseconds still counts. The next exchange sends a bare CR first.
     void leaveWait(int graceMs);
     /// LOCAL as the last word of a program that ends at once: at most about 1.5 s, and nothing is
-    /// told.
+    /// reported.
     void sayLocal();
     /// For a loop of exchanges, before its next round: what waits for its turn has it now.
     void giveTurn() { state_.TurnGiven(); }

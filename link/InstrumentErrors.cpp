@@ -9,7 +9,7 @@ namespace {
 
 struct StatusText {
     std::string_view head;
-    bool namesCommand;        // " for command <...>" behind the head
+    bool namesCommand;        // " for command <...>" after the head
     std::string_view detail;  // a line of its own
     bool refersToManual;
 };

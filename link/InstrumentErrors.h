@@ -1,5 +1,5 @@
 #pragma once
-// The boxes that tell a user why the instrument refused a line.
+// The boxes that show a user why the instrument refused a line.
 
 #include <string>
 

@@ -16,7 +16,7 @@ class RS232Ops {
 
     /// `portName` as the lists show it ("COM3", "/dev/ttyUSB0"), `baudText` led by the baud rate.
     bool OpenComPort(SerialPort& control, const std::string& portName, const std::string& baudText);
-    /// 8 data bits, no parity, 1 stop bit. An open port is told and left as it is.
+    /// 8 data bits, no parity, 1 stop bit. An open port is reported and left as it is.
     bool OpenComPortNumber(SerialPort& control, const std::string& port, long baud);
     /// The receive side of a data event with that CommEvent code: line errors and changes give
     /// nothing; data received waits 100 ms for its burst to complete.

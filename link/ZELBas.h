@@ -22,7 +22,7 @@ struct ZELBas {
     bool ComplexTraceRequested = false;  ///< a complex transfer had to be asked for again
     std::int16_t BinaryDecodeIndex = 0;
     bool AnswerOverdue = false;  ///< an exchange ended in a time-out: its answer may still come
-    bool LossTold = false;       ///< the end of this connection was told to the user
+    bool LossTold = false;       ///< the end of this connection was reported to the user
     double SweepTimeTold = 0;    ///< s, SWPTIME as the instrument last answered or accepted it
     /// Exchanges, transfers and whole cycles of them that have begun and not ended. What would
     /// begin another one waits until it is 0 again.
@@ -39,7 +39,7 @@ struct ZELBas {
         return Ending || (leaveAt && *leaveAt <= nowMicros);
     }
     std::optional<std::int64_t> leaveAt;
-    bool WaitLeft = false;     ///< a wait of what is under way was left: that is told nobody
+    bool WaitLeft = false;     ///< a wait of what is under way was left: no box reports that
     bool BareCrFirst = false;  ///< an answer is still owed: a bare CR goes before the next word
     bool Ending = false;       ///< the program ends: no wait goes on
 };

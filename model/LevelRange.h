@@ -7,7 +7,7 @@
 
 namespace zel {
 
-/// The instrument tells a RANGE code, a loaded file decibels a division (or the linear code).
+/// The instrument gives a RANGE code, a loaded file decibels a division (or the linear code).
 class LevelRange {
   public:
     static LevelRange ofCode(double code) { return {code, true}; }

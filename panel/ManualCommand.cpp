@@ -22,7 +22,7 @@ constexpr std::string_view kStatusWords[] = {
     "MARKNXTPK", "MARKPK", "MARKMIN", "MARKTOCENT", "MARKTOLVL", "PRESET",
     "PWRTOREF",  "RECALL", "REMOTE",  "SAVE",       "WAIT",      "ZERO"};
 
-// Words that stand at the head of a line with any text behind them.
+// Words that stand at the head of a line with any text after them.
 constexpr std::string_view kStatusHeads[] = {
     "RECALL",       "LVLADJUST",    "MARKNXTPK",    "MARKPK",      "MARKMIN", "MARKTOCENT",
     "LIMDEL",       "MARKTOLVL",    "PRESET",       "PWRTOREF",    "REMOTE",  "RESTART",
@@ -118,7 +118,7 @@ void ManualCommand::showAnswer(std::string text, bool statusOnly) {
     }
     TextBox& answer = panel_.ManualCommandTextAnsw;
     answer.Text = statusOnly || text.empty() ? text : text.substr(1);
-    // Each answer can be told from the last by its colour.
+    // Each answer differs from the last in its colour.
     answer.ForeColor = answer.ForeColor == kAnswerColor ? kOtherAnswerColor : kAnswerColor;
 }
 

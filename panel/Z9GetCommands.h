@@ -24,7 +24,7 @@ class Z9GetCommands {
                   GraphScaling& scaling, MessageBoxes& boxes);
 
     /// Runs the operations of all menus in their order for the key of that index; each clause
-    /// looks at the state as the clauses ahead of it left it.
+    /// looks at the state as the clauses before it left it.
     void press(int index);
     /// Asks the word and shows the answer in the soft box: a number with prefix and unit, but for
     /// LENUNIT, which is a text. False when the instrument gave no answer; the box stays.

@@ -17,8 +17,8 @@
 
 namespace zel {
 
-/// The mirror takes what was asked for, whatever the instrument makes of it; a refusal is told by
-/// the exchange. A text that is no number goes out as 0; a number that its word cannot hold is
+/// The mirror takes what was asked for, whatever the instrument makes of it; a refusal is reported
+/// by the exchange. A text that is no number goes out as 0; a number that its word cannot hold is
 /// refused in a box and nothing is sent.
 class Z9SetCommands {
   public:
@@ -28,7 +28,7 @@ class Z9SetCommands {
                   const Session& session);
 
     /// Runs the operations of all menus in their order for the position of that index; each
-    /// clause looks at the state as the clauses ahead of it left it.
+    /// clause looks at the state as the clauses before it left it.
     void enter(int index);
 
   private:

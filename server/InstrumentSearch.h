@@ -18,7 +18,7 @@ class InstrumentSearch {
     InstrumentSearch(ServerForm& form, SerialPort& SystemCommPort, const Session& services);
 
     /// Takes port and speed from the form; with `chkBaudRate` each speed of the list is tried and
-    /// an instrument at another one is switched to 57600. What fails is told; the port stays as
+    /// an instrument at another one is switched to 57600. What fails is reported; the port stays as
     /// it is then.
     void ConnectInstrument(bool& ok);
     void CheckProbeAnswer(const std::string& text, bool& ok);

@@ -7,7 +7,7 @@ namespace zel {
 namespace {
 
 constexpr std::size_t kMostNetworks = 64;
-constexpr int kOldKindBits = 96;  // ahead of the four bytes of an address of the old kind
+constexpr int kOldKindBits = 96;  // before the four bytes of an address of the old kind
 constexpr std::string_view kPrivate =
     "127.0.0.0/8 10.0.0.0/8 172.16.0.0/12 192.168.0.0/16 169.254.0.0/16 ::1 fc00::/7 fe80::/10";
 constexpr std::string_view kSeparators = " ,;\t\r\n";

@@ -82,7 +82,7 @@ void ServerDialog::fillFields() {
 }
 
 void ServerDialog::Form_Load() {
-    // What was on the panel stays known while the server runs on behind a closed window.
+    // What was on the panel stays known while the server runs on with its window closed.
     form_.SavedCaption = panel_.Caption;
     fillFields();
     bridge_.showState();
@@ -169,7 +169,7 @@ void ServerDialog::Form_QueryUnload(int& cancel) {
     retry_ = 0;
     bridge_.disconnect();
     bridgingLook(false);
-    // With the word the program ends behind its only window.
+    // With the word the program ends with its only window.
     if (!serverWord()) panel_.Caption = form_.SavedCaption;
 }
 

@@ -92,7 +92,7 @@ std::int16_t connectionKind(LinkAddress::Kind kind) {
 
 }  // namespace
 
-// In the order of the house: a room below stands ahead of those that use it.
+// In the order of the house: a room below stands before those that use it.
 struct Program::Rooms {
     Rooms(const Platform& p, std::string commandLine)
         : platform(p),
@@ -300,7 +300,7 @@ Scripts& Program::scripts() { return rooms_->scripts; }
 
 void Program::start() {
     rooms_->recent.load();
-    // Ahead of the first row: loading sets its axes.
+    // Before the first row: loading sets its axes.
     rooms_->forms.waterfall.load();
     if (!rooms_->startUp.Form_Load(kVersion)) rooms_->end.end();
 }

@@ -19,7 +19,7 @@ class IniFile {
     static IniFile parse(std::string_view text);
 
     std::optional<std::string> value(std::string_view section, std::string_view key) const;
-    /// The value as it stands behind the first "=", quotes and all, without the blanks around it.
+    /// The value as it stands after the first "=", quotes and all, without the blanks around it.
     std::optional<std::string> rawValue(std::string_view section, std::string_view key) const;
     /// Line ends in the value become blanks. False for a name that no line can hold: empty, with
     /// blanks at its ends, with a line end, or a key with "=" or that begins with ";" or "[".

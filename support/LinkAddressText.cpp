@@ -34,7 +34,7 @@ bool printable(std::string_view text) {
     return std::all_of(text.begin(), text.end(), [](char c) { return c >= ' ' && c <= '~'; });
 }
 
-/// Takes what stands behind the first comma off the text; nothing when there is no comma.
+/// Takes what stands after the first comma off the text; nothing when there is no comma.
 std::optional<std::string> takeTail(std::string_view& text) {
     const auto comma = text.find(',');
     if (comma == std::string_view::npos) return std::nullopt;

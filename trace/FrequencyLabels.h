@@ -25,7 +25,7 @@ class FrequencyLabels {
                     CommandExchange& exchange, Events& events)
         : panel_(panel), dialog_(dialog), mirror_(mirror), exchange_(exchange), events_(events) {}
 
-    /// Asks FREQ into the mirror and the label; `ok` tells whether the instrument answered.
+    /// Asks FREQ into the mirror and the label; `ok` says whether the instrument answered.
     void GetFreqForLabel(bool& ok);
     /// Asks SPAN into the mirror and the label.
     void GetSpanForLabel(bool& ok);

@@ -77,7 +77,7 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
     handlers_.on(state_.LineFree, [this] { scheduleWaiting(); });
     handlers_.on(state_.TurnGiven, [this] { runWaiting(); });
     handlers_.on(p.StopButton.Clicked, [this] { waiting_.clear(); });
-    // A form that is closed and shown again begins anew.
+    // A form that is closed and shown again begins again.
     for (Form* form : forms_.all()) {
         handlers_.on(form->Changed, [this, form] {
             if (form->Modal && form->Visible) return;

@@ -1,5 +1,5 @@
 #pragma once
-// Tells the truth about the picture: how old it is, how many sweeps come, and what sets the pace.
+// Shows the truth about the picture: how old it is, how many sweeps come, and what sets the pace.
 
 #include <cstdint>
 #include <deque>
@@ -21,7 +21,7 @@ class PaceMonitor {
     void drawn();
     /// Date at which the last wait for a sweep ended, days.
     double sweepDate() const { return sweepDate_; }
-    /// Writes the line and the mark anew.
+    /// Writes the line and the mark again.
     void show();
 
     /// Traces drawn a second, over the last few; 0 before the second one.

@@ -55,8 +55,8 @@ struct Sweep {
     }
 };
 
-/// Takes over what queries have told about the instrument since the reading, as long as no setting
-/// was sent. What the read cycle itself asks stays.
+/// Takes over what queries have learned about the instrument since the reading, as long as no
+/// setting was sent. What the read cycle itself asks stays.
 void followMirror(Sweep& sweep, const ZEL3Variables& mirror);
 /// The same for the last time: a setting goes out.
 void keepSettings(Sweep& sweep, const ZEL3Variables& mirror);

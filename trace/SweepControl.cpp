@@ -154,7 +154,7 @@ void SweepControl::showLoss() {
 void SweepControl::StopButton_Click() {
     exchange_.leaveWait(kStopGraceMs);
     SetStopFlag(false);
-    // Behind a dead line no loop is left to enable them.
+    // After a dead line no loop is left to enable them.
     panel_.Connection.Enabled = true;
     panel_.Utility.Enabled = true;
     panel_.ContinuosLoopActive = false;

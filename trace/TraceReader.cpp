@@ -175,7 +175,7 @@ bool TraceReader::ReadTraceData(double xFirst, double xLast) {
     }
     RawTrace trace;
     const bool done = binary_.GetTraceBinary(trace, last_.autoPeak());
-    if (trace.wanted == 0) return done;  // refused, or silent ahead of the transfer
+    if (trace.wanted == 0) return done;  // refused, or silent before the transfer
     takeSamples(trace);
     last_.axis = viewRange();
     placePoints(last_);
@@ -226,7 +226,7 @@ void TraceReader::waterfallRow() {
 
 void TraceReader::abortView(bool& success) {
     panel_.PlaySingleButton.Enabled = true;
-    // In the continuous view the silence itself was told, and one box is enough.
+    // In the continuous view the silence itself was reported, and one box is enough.
     const bool known = state_.WaitLeft || state_.Ending || silenceToldHere_;
     if (!state_.DialCancelled && !known) boxes_.show({BoxIcon::Information, "Unsuccessful View"});
     pointer(0);
@@ -288,7 +288,7 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     }
     begin();
     if (recordsTraces() && !exchange_.CmdInstrument("INIT")) return close();
-    // A loaded file has set fields of the mirror: they are the instrument's again behind this.
+    // A loaded file has set fields of the mirror: they are the instrument's again after this.
     Step step = panel_.Shown.fromFile ? askSettings() : askAgain(again);
     if (step == Step::Ok) step = wait();
     if (step == Step::LinkFailed) return abortView(success);

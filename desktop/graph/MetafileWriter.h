@@ -56,7 +56,8 @@ class MetafileWriter {
     void selectBrush(std::optional<MetafileColor> color);
     void selectFont(const MetafileFont& font);
     void setTextColor(MetafileColor color);
-    /// What follows is seen inside of the rectangle only, from the last clip on again; none ends it.
+    /// What follows is seen inside of the rectangle only, from the last clip on again; none ends
+    /// it.
     void setClip(const std::optional<MetafileRect>& clip);
 
     /// A long line becomes several records, which share the points where they meet.

@@ -84,8 +84,7 @@ std::string QtSettingsStore::get(const std::string& application, const std::stri
 bool QtSettingsStore::set(const std::string& application, const std::string& section,
                           const std::string& key, const std::string& value) {
     IniFile settings = IniFile::load(file_);
-    return settings.setValue(application, settingsKey(section, key), value) &&
-           settings.save(file_);
+    return settings.setValue(application, settingsKey(section, key), value) && settings.save(file_);
 }
 
 void QtDebugChannel::output(const std::string& text) {

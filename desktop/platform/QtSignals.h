@@ -11,8 +11,8 @@
 namespace zel {
 
 /// SIGINT, SIGTERM and SIGHUP become an event of the loop for as long as it lives. A closed pipe
-/// and a file at its size limit end no program any more: the write fails, and whoever writes tells
-/// it. There is one such object at a time.
+/// and a file at its size limit end no program any more: the write fails, and whoever writes
+/// reports it. There is one such object at a time.
 class QtSignals : public Signals {
   public:
     QtSignals();
@@ -22,7 +22,7 @@ class QtSignals : public Signals {
 
     /// Readable from the arrival of a signal until it was delivered; -1 when there is none.
     int descriptor() const { return readEnd_; }
-    /// Tells of the signals that have come. The event loop does it as well.
+    /// Reports the signals that have come. The event loop does it as well.
     void deliver();
 
   private:

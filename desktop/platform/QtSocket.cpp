@@ -80,7 +80,7 @@ void QtSocket::adopt(QTcpSocket* socket) {
                      [this, socket](QAbstractSocket::SocketError error) {
                          if (error == QAbstractSocket::SocketTimeoutError) return;
                          if (problem_.empty()) problem_ = socket->errorString().toStdString() + ".";
-                         // An end ahead of the connection is a failure of it.
+                         // An end before the connection is a failure of it.
                          const bool stood =
                              secured_ != nullptr
                                  ? secured_->isEncrypted()

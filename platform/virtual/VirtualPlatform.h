@@ -37,8 +37,9 @@ struct VirtualPlatform {
     Platform bundle(SerialPort& other) { return bundle(other, files); }
     /// The same on another disk.
     Platform bundle(SerialPort& other, FileService& disk) {
-        return {clock, events,    boxes,    other,   ports,  tcpSocket,   serverPort, serverSocket, settings,
-                debug, clipboard, launcher, startup, folder, fileDialogs, disk,         endSignals};
+        return {clock,      events,       boxes,       other, ports,     tcpSocket,
+                serverPort, serverSocket, settings,    debug, clipboard, launcher,
+                startup,    folder,       fileDialogs, disk,  endSignals};
     }
 };
 

@@ -110,7 +110,7 @@ TEST_F(ModemTest, PlusesWithoutSilence_AreData) {
     EXPECT_TRUE(modem.called());
     listen(1);
     say("+++", 0.5);
-    EXPECT_EQ(say("x", 2), "");  // no silence behind them
+    EXPECT_EQ(say("x", 2), "");  // no silence after them
 }
 
 TEST_F(ModemTest, ReturnToTheCall_GoesOn) {

@@ -1,5 +1,5 @@
 #pragma once
-// The program ahead of its session, and the page of protocol that a handshake is.
+// The program before its session, and the page of protocol that a handshake is.
 
 #include <map>
 #include <string>
@@ -76,7 +76,7 @@ struct Bench : TestSession {
     ScriptedSocket& socket = platform.tcpSocket;
 
     Page<ScriptedPort> page(Others others = {}) { return Page(port, std::move(others)); }
-    /// Opens the port and does the handshake without a trace behind it.
+    /// Opens the port and does the handshake without a trace after it.
     bool connect() { return program.connect({LinkAddress::Kind::Serial, "COM3", 57600}, false); }
     bool connectTcp() { return program.connect({LinkAddress::Kind::Tcp, "host", 2277}, false); }
     Texts shown() const { return told(platform.boxes); }

@@ -106,7 +106,7 @@ struct FaultRig {
         work();
         return faulty.received();
     }
-    /// The session after a line that died: ended by the user and begun anew.
+    /// The session after a line that died: ended by the user and begun again.
     bool reconnect() {
         program.disconnect();
         return connect();

@@ -27,7 +27,7 @@ void sweep(long count, const Body& body) {
     }
 }
 
-/// An exchange on the good line behind a fault. A fault in the answer to the mode word leaves the
+/// An exchange on the good line after a fault. A fault in the answer to the mode word leaves the
 /// instrument waiting for a keyword: it refuses the next mode word once, and is in step then.
 void expectNextExchangeWorks(FaultRig& rig, Fault fault, bool inModeWordAnswer) {
     rig.goodLine();
@@ -121,7 +121,7 @@ void begin(FaultRig& rig, const std::string& detector) {
 void sweepTrace(const std::string& detector, long blockBytes, std::size_t samples) {
     FaultRig rig;
     begin(rig, detector);
-    const long wait = 2 * kStatusBytes;  // WAIT goes ahead of the transfer
+    const long wait = 2 * kStatusBytes;  // WAIT goes before the transfer
     const long count = rig.bytesOf([&] { ASSERT_TRUE(rig.readTrace()); });
     EXPECT_EQ(count, wait + 2 * kStatusBytes + blockBytes);
     sweep(count, [&](Fault fault, long byte) {

@@ -86,7 +86,7 @@ constexpr Said kBeginning[] = {{"\r", "0\r"},
                                {"SPAN\r", "0\r10\r"}};
 constexpr std::size_t kBeginnings = sizeof kBeginning / sizeof kBeginning[0];
 
-/// The beginning of the handshake, with silence behind the request of that index.
+/// The beginning of the handshake, with silence after the request of that index.
 template <class Far>
 void fallSilent(Far& far, std::size_t silent) {
     for (std::size_t i = 0; i < silent; ++i)

@@ -40,9 +40,9 @@ struct PanelSessionTest : ::testing::Test {
         ConsoleFileDialogs dialogs(answers);
         ServingEvents events(platform.events);
         Program program({platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
-                         platform.serverPort, platform.serverSocket, platform.settings, platform.debug,
-                         platform.clipboard, platform.launcher, platform.startup, platform.folder,
-                         dialogs, platform.files, platform.endSignals},
+                         platform.serverPort, platform.serverSocket, platform.settings,
+                         platform.debug, platform.clipboard, platform.launcher, platform.startup,
+                         platform.folder, dialogs, platform.files, platform.endSignals},
                         words);
         if (prepare) prepare(program);
         PanelSession session(program,
@@ -244,7 +244,7 @@ TEST_F(PanelSessionTest, LineInATickOfTheRecording_WaitsForItsEnd) {
         "show TimeForm.RecordedCount\n"
         "show MarkerOn\n"
         "click StopButton\n");
-    // The tick was under way, the click came after it, and the line behind waited as well.
+    // The tick was under way, the click came after it, and the line after waited as well.
     EXPECT_EQ(printed, "false\n1\ntrue\n");
 }
 

@@ -29,7 +29,7 @@ struct ExternalTriggerTest : FileSession, ::testing::Test {
         get("TRACEDET", "3");
         get("SWPTIME", "0.02");
     }
-    /// The sweep of a cycle behind the trigger, which waits once more.
+    /// The sweep of a cycle after the trigger, which waits once more.
     void sweep() {
         cmd("WAIT");
         trace(levelBlock(-35000));
@@ -142,7 +142,7 @@ TEST_F(ExternalTriggerTest, FileThatCannotBeWritten_EndsIt) {
     cmd("WAIT");
     settings();
     sweep();
-    // The chosen file vanishes with its folder behind the choice.
+    // The chosen file vanishes with its folder after the choice.
     platform.files.putFolder(folder.file("sub"));
     platform.fileDialogs = {};
     platform.fileDialogs.answer(folder.file("sub/trace.csv"));

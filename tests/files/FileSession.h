@@ -47,7 +47,7 @@ struct FileSession : TestSession {
         mirror.VideoBandwidth = 9;
     }
 
-    /// A trace of these raw samples is on the graph, as behind a read cycle.
+    /// A trace of these raw samples is on the graph, as after a read cycle.
     void sweepOf(const std::vector<double>& samples) {
         Sweep& sweep = program.sweep();
         sweep = {};

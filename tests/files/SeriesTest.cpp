@@ -66,7 +66,7 @@ TEST_F(SeriesTest, EachTraceIsStyledAndStamped) {
     forms.waterfall.styleLastRow.connect([&] { ++styled; });
     forms.waterfall.stampRow.connect([&](const std::string&) { ++stamped; });
     load(record(3));
-    EXPECT_EQ(styled, 4);  // ahead of each, and the last one at the end
+    EXPECT_EQ(styled, 4);  // before each, and the last one at the end
     EXPECT_EQ(stamped, 3);
 }
 
@@ -96,7 +96,7 @@ TEST_F(SeriesTest, SingleTraceWithALongHeader_IsOneTrace) {
 
 TEST_F(SeriesTest, LastTraceCutShort_ShowsWhatIsThere) {
     const std::string text = record(3);
-    // The last trace ends behind its hundredth row.
+    // The last trace ends after its hundredth row.
     std::size_t end = text.rfind("Reference Unit");
     end = text.find("\r\n1499500000.000;", end) + 2;
     for (int row = 0; row < 100; ++row) end = text.find("\r\n", end) + 2;

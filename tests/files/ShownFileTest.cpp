@@ -1,4 +1,4 @@
-// What stands around the graph, and what the next sweep asks, behind a loaded file.
+// What stands around the graph, and what the next sweep asks, after a loaded file.
 
 #include <gtest/gtest.h>
 

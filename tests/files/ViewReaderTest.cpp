@@ -322,7 +322,7 @@ TEST_F(ViewReaderTest, TruncatedFile_ShowsTheWholeRows) {
     const std::string text = kHead + rowsText(10);
     load(text.substr(0, text.size() - 3));
     EXPECT_EQ(shown(), std::vector<double>(10, -35));
-    load(text.substr(0, text.size() - 8));  // behind the last row's x
+    load(text.substr(0, text.size() - 8));  // after the last row's x
     EXPECT_EQ(shown().size(), 9U);
 }
 

@@ -145,7 +145,7 @@ TEST(Delays, ReRequest_TwoModems_100BehindGetAnd1900BehindTheKeyword) {
     const Times moments = reRequests(CF::MODEMCON);
     ASSERT_GE(moments.size(), 4U);
     EXPECT_EQ(moments[1] - moments[0], 100);
-    // 1.9 s behind the keyword, then 10 s of polling.
+    // 1.9 s after the keyword, then 10 s of polling.
     EXPECT_GE(moments[2] - moments[1], 11'900);
     EXPECT_LE(moments[2] - moments[1], 11'950);
 }

@@ -98,7 +98,7 @@ struct DeadLineRig {
     }
 };
 
-/// A handler of the panel, and what stands ahead of it on a good line.
+/// A handler of the panel, and what stands before it on a good line.
 struct Handler {
     std::string name;
     std::function<void(ControllerForm&)> ready;

@@ -1,5 +1,5 @@
-// An instrument that falls silent or dies in any handler, at any of its lines: the user is told,
-// nothing stays stuck, and on a good line the panel goes on.
+// An instrument that falls silent or dies in any handler, at any of its lines: the user hears of
+// it, nothing stays stuck, and on a good line the panel goes on.
 
 #include <algorithm>
 #include <array>

@@ -95,7 +95,7 @@ TEST_F(ManualCommandTest, DataLine_ReadsTwoAnswersAndDropsTheStatus) {
 }
 
 TEST_F(ManualCommandTest, DataLine_WhoseAnswerIsASingleZero_IsShownAsAnAcknowledgement) {
-    port.expect("FREQ\r").answer("0\r");  // no value comes behind the status
+    port.expect("FREQ\r").answer("0\r");  // no value comes after the status
     send("FREQ");
     EXPECT_EQ(shown(), "Ack>: 0");  // the first character goes, as of any data
     EXPECT_EQ(panel.MousePointer.get(), 0);

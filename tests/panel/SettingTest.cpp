@@ -93,7 +93,7 @@ const SettingRow kSettings[] = {
     {"Tdma2", kTdma, 2, "3.9", 0, "MEASTIME,3", "TDMAMeasTime", 3},
     {"Dtf0", kDtf, 0, " RG58 ", 0, "CABLEMOD,RG58"},
     {"Dtf1", kDtf, 1, "12.5", 0, "CABLELEN,12.5", "CableLength", 12.5},
-    // The text form of the locale, with its zero ahead of the point.
+    // The text form of the locale, with its zero before the point.
     {"Dtf1Small", kDtf, 1, "0.5", 0, "CABLELEN,0.5", "CableLength", 0.5},
     {"Dtf2", kDtf, 2, nullptr, 2, "DTFMODE,2", "DTFMode", 2},
     {"Dtf3", kDtf, 3, " METER ", 0, "LENUNIT,METER"},

@@ -62,7 +62,7 @@ TEST_F(Server, Search_SilenceAboveTheFirstSpeed_EndsIt) {
     EXPECT_FALSE(line.isOpen());
     EXPECT_EQ(server.state(), SocketState::Closed);
     EXPECT_TRUE(form.cmdConnect.Enabled);
-    // The next search starts afresh.
+    // The next search starts again.
     line.expect("\r\n").silence();
     noise();
     noise();

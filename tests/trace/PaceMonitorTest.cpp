@@ -23,7 +23,7 @@ class Pace : public testing::Test {
     }
     ControllerForm& panel() { return program->forms().controller; }
     std::string line() { return panel().PaceLabel.Caption; }
-    /// The continuous view for so long; `look` runs just ahead of its stop.
+    /// The continuous view for so long; `look` runs just before its stop.
     void view(double ms, const std::function<void()>& look) {
         platform.events.schedule(ms, [this, look] {
             look();

@@ -136,7 +136,7 @@ TEST_F(FullCycleTest, SilentWait_TellsAnUnsuccessfulView) {
 
 TEST_F(FullCycleTest, CancelledDial_KeepsTheFailureSilent) {
     program.link().DialCancelled = true;
-    program.link().ExchangeFailed = true;  // told already
+    program.link().ExchangeFailed = true;  // reported already
     getSilent();
     EXPECT_FALSE(readFull());
     EXPECT_EQ(boxes.texts(), Texts{});

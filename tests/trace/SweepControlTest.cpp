@@ -143,7 +143,7 @@ TEST_F(SweepControlTest, LaterPass_StylesTheNewestPlotAndTheLastRow) {
     selectiveCycle();
     stopAtPlot(2);
     panel.PlayContinuousButton.Click();
-    EXPECT_EQ(styled, 2);  // ahead of the later pass, and at the end of the view
+    EXPECT_EQ(styled, 2);  // before the later pass, and at the end of the view
     EXPECT_FALSE(forms.waterfall.Graph3D.plots().front().lineVisible);
     EXPECT_EQ(forms.waterfall.Graph3D.plots().front().fillStyle, 2);
 }

@@ -101,7 +101,7 @@ TEST_F(ViewLatency, Stop_IsServedWithinATenthOfASecondAndEndsTheViewWithItsPass)
     }
     EXPECT_LE(longest, kServedMicros);
     EXPECT_LE(longestEnd,
-              2 * kPassMs * 1000);  // the first pass asks all settings ahead of its trace
+              2 * kPassMs * 1000);  // the first pass asks all settings before its trace
 }
 
 }  // namespace
