@@ -27,10 +27,12 @@ bool ReportedSettings::set(const std::string& application, const std::string& se
 Guards::Guards(const Platform& front)
     : boxes(front.boxes),
       settings(front.settings, boxes),
-      platform{
-          front.clock,     front.events,       boxes,        front.serialPort,  front.serialPorts,
-          front.tcpSocket, front.serverSocket, settings,     front.debug,       front.clipboard,
-          front.launcher,  front.startup,      front.folder, front.fileDialogs, front.files} {}
+      platform{front.clock,      front.events,       boxes,
+               front.serialPort, front.serialPorts,  front.tcpSocket,
+               front.serverPort, front.serverSocket, settings,
+               front.debug,      front.clipboard,    front.launcher,
+               front.startup,    front.folder,       front.fileDialogs,
+               front.files,      front.endSignals} {}
 
 Box failureBox() {
     try {

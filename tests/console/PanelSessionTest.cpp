@@ -37,7 +37,7 @@ struct PanelSessionTest : ::testing::Test {
         LineOutput errorOutput(errors);
         AnswerQueue answers;
         ConsoleBoxes boxes(output, answers);
-        ConsoleFileDialogs dialogs(answers);
+        ConsoleFileDialogs dialogs(output, answers);
         ServingEvents events(platform.events);
         Program program({platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
                          platform.serverPort, platform.serverSocket, platform.settings,

@@ -4,6 +4,7 @@
 
 #include "platform/virtual/FaultyPort.h"
 #include "platform/virtual/ScriptedPort.h"
+#include "platform/virtual/ScriptedServer.h"
 #include "platform/virtual/ScriptedSocket.h"
 #include "platform/virtual/VirtualTime.h"
 
@@ -272,18 +273,19 @@ TEST_F(ScriptedSocketTest, SendData_ScriptedRequest_BringsDataWithItsEvent) {
 }
 
 TEST_F(ScriptedSocketTest, Listen_AClientKnocks_IsTakenOver) {
+    ScriptedServer server(events);
     int request = 0;
-    socket.ConnectionRequest.connect([&](int id) {
+    server.ConnectionRequest.connect([&](int id) {
         request = id;
-        socket.accept(id);
+        server.accept(id);
     });
-    socket.listen(2277);
-    socket.knock(5);
+    server.listen("", 2277);
+    server.knock(5);
     events.pump();
     EXPECT_EQ(request, 5);
-    EXPECT_EQ(socket.state(), SocketState::Connected);
-    socket.arrive("hello");
-    EXPECT_EQ(socket.getData(), "hello");
+    EXPECT_EQ(server.client().state(), SocketState::Connected);
+    server.far().arrive("hello");
+    EXPECT_EQ(server.client().getData(), "hello");
 }
 
 TEST_F(ScriptedSocketTest, PeerCloses_WhileConnected_TellsAndKeepsWhatCame) {
