@@ -170,7 +170,9 @@ void PanelSession::runCommand(const std::function<void()>& command) {
 /// Works a control now, or in its turn when it would begin an exchange inside another.
 void PanelSession::act(const Control& control, const std::string& name,
                        const std::function<Done()>& work) {
-    if (interlock_.turnOf(control) != Interlock::Turn::Later) return tell(work(), name);
+    const bool later = interlock_.turnOf(control) == Interlock::Turn::Later &&
+                       refusal(control, false) == Done::Yes;
+    if (!later) return tell(work(), name);
     interlock_.perform(control, [this, name, work] { runCommand([&] { tell(work(), name); }); });
 }
 

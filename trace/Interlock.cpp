@@ -47,6 +47,13 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
     rule({&p.AnalyzerButton, &p.TrackButton, &p.TrackButton1, &p.PwrButton, &p.ChnPwrButton,
           &p.OccBWButton, &p.TDMAButton, &p.DistFaultButton, &p.ResetButton},
          {Rule::NoContinuousView});
+    // Their handlers refuse by the step at hand; here it only counts that they do.
+    for (int i = 0; i < p.SoftTextBox.count(); ++i)
+        rule({&p.SoftTextBox(i), &p.ChoiceBox(i)}, {Rule::Connected, Rule::NoContinuousView});
+    rule({&p.MarkerCheckBox, &p.DeltaCheckBox, &p.ManualCommandText, &p.AnalyzerCheck,
+          &p.TrackingGenCheck, &p.PowerSensorCheck, &p.ChannelPowerCheck, &p.OccBWCheck,
+          &p.TDMAPowerCheck, &p.DistFaultCheck},
+         {Rule::NoContinuousView});
     rule({&p.LoadData}, {Rule::NoViewForFile, Rule::NoRecordingForFile});
     for (int i = 0; i < p.RecentFile.count(); ++i)
         rule({&p.RecentFile(i)}, {Rule::NoViewForFile, Rule::NoRecordingForFile});
@@ -62,6 +69,8 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
                &forms.specialMeas.chkStep, &forms.specialMeas.chkSave,
                &forms.specialMeas.chkWaterfall, &forms.specialMeas.chkGetSweep,
                &forms.specialMeas.cmdSave, &forms.std.cmdStop};
+    quietInView_ = {&p.FrequencyButton, &p.SpanButton,  &p.AmplitudeButton, &p.BWButton,
+                    &p.SweepButton,     &p.TraceButton, &p.MeasButton};
     silent_ = {&p.GetOption,
                &p.SetOption,
                &p.HelpHelp,
@@ -76,7 +85,6 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
                &forms.time.CancelTimeButton};
     handlers_.on(state_.LineFree, [this] { scheduleWaiting(); });
     handlers_.on(state_.TurnGiven, [this] { runWaiting(); });
-    handlers_.on(p.StopButton.Clicked, [this] { waiting_.clear(); });
     // A form that is closed and shown again begins again.
     for (Form* form : forms_.all()) {
         handlers_.on(form->Changed, [this, form] {
@@ -147,6 +155,8 @@ Interlock::Turn Interlock::turnOf(const Control& control) const {
     if (state_.Ending) return Turn::Never;
     if (anyUnmet(control)) return Turn::Now;  // it refuses by itself, in words
     if (std::find(running_.begin(), running_.end(), &control) != running_.end()) return Turn::Never;
+    // While the view runs, a hard key lays out its menu and asks nothing.
+    if (panel_.ContinuosLoopActive && quietInView_.count(&control) > 0) return Turn::Now;
     if (state_.DialoguesUnderWay > 0) return talks(control) ? Turn::Later : Turn::Now;
     if (panel_.ContinuosLoopActive) return Turn::Now;
     const bool busy = panel_.MousePointer == kHourglass || panel_.AcquisitionRunning ||

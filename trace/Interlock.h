@@ -87,8 +87,9 @@ class Interlock {
     ZELBas& state_;
     Session session_;
     std::map<const Control*, std::vector<Rule>> rules_;
-    std::set<const Control*> always_;  ///< stop, end or adjust what runs
-    std::set<const Control*> silent_;  ///< begin no exchange
+    std::set<const Control*> always_;       ///< stop, end or adjust what runs
+    std::set<const Control*> silent_;       ///< begin no exchange
+    std::set<const Control*> quietInView_;  ///< begin none while the continuous view runs
     std::deque<Act> waiting_;
     std::vector<const Control*> running_;
     std::vector<States> known_;

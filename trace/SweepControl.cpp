@@ -93,9 +93,10 @@ void SweepControl::RunContinuousView() {
         forms_.waterfall.styleLastRow();
         if (exchange_.ExchangeFailed()) return showLoss();  // no clean-up: Stop is the way back
         panel_.ContinuosLoopActive = true;
+        exchange_.giveTurn();
+        if (!panel_.STOPFlag) break;
         good = laterPass();
         if (good) panel_.ContinuosLoopActive = false;
-        exchange_.giveTurn();
     }
     if (!good && exchange_.ExchangeFailed()) showLoss();
     if (good || !panel_.STOPFlag) {  // a wait that Stop has left is a stop as well

@@ -168,7 +168,8 @@ TEST_F(OnQt, Burst_ArrivesWhole) {
     std::string got;
     for (std::size_t at = 0; at < sent.size(); at += 3000) {
         line.send(sent.substr(at, 3000));
-        platform.events.wait(1);
+        platform.events.sleep(3);
+        platform.events.pump();
         if (at % 9000 == 0) got += platform.serialPort.input();
     }
     for (int i = 0; i < 100 && got.size() < sent.size(); ++i) {
