@@ -46,6 +46,7 @@ void WaitNotice::clear() {
 
 void showLinkLost(ControllerForm& panel, bool lost) {
     panel.LinkLost = lost;
+    if (lost) panel.CWGraph1.Old = true;  // until the next trace is drawn
     panel.ConnectedPic.Image = lost ? "lost" : "connected";
 }
 

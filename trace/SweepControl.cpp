@@ -148,7 +148,6 @@ void SweepControl::countRow() {
 
 void SweepControl::showLoss() {
     showLinkLost(panel_, true);
-    panel_.CWGraph1.Old = true;
     panel_.TimeLabel.Caption = std::string(kLost) + " " + panel_.TimeLabel.Caption.get();
 }
 

@@ -49,7 +49,7 @@ struct RecordingWithoutHeader : RecordingTest {
 
 TEST_F(RecordingWithoutHeader, Traces_AreRowsAlone) {
     begin("1");
-    platform.events.sleep(2500);
+    platform.events.runFor(2500);
     panel.StopButton.Click();
     const std::string text = folder.read("trace.csv");
     EXPECT_EQ(text.find("Reference Unit"), std::string::npos);

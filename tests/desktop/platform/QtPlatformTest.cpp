@@ -52,13 +52,13 @@ class Terminal {
 
 class OnQt : public testing::Test {
   protected:
-    OnQt() { testApplication(); }
     bool openPort(const std::string& name) {
         SerialSetup setup;
         setup.CommPort = name;
         setup.Settings = "57600,N,8,1";
         return platform.serialPort.open(setup);
     }
+    QApplication& application = testApplication();  // before all that needs its event loop
     QTemporaryDir home;
     QtPlatform platform{home.path()};
 };
