@@ -164,7 +164,7 @@ TEST_F(GraphDesk, LongTextsAroundTheGraph_AreNotCutInTheSmallestWindow) {
 TEST_F(GraphDesk, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
     ZEL3Variables& mirror = program->variables();
     mirror.ReferenceLevel = -20;
-    show();
+    window->binder().flush();
     const auto struck = [this] {
         QList<QCPTextElement*> texts;
         collectTexts(*window->graph().plotLayout(), texts);
@@ -175,17 +175,18 @@ TEST_F(GraphDesk, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
     };
     EXPECT_EQ(struck(), "");
     mirror.Unsure.sent("REFLVL", false);
-    QApplication::processEvents();
+    window->binder().flush();
     EXPECT_EQ(struck(), "Ref -20 dBm");
     EXPECT_TRUE(window->graph().yAxis->tickLabelFont().strikeOut());
     EXPECT_FALSE(window->graph().xAxis->tickLabelFont().strikeOut());
     mirror.Unsure.sent("SPAN", false);
-    QApplication::processEvents();
+    window->binder().flush();
     EXPECT_TRUE(window->graph().xAxis->tickLabelFont().strikeOut());
     EXPECT_TRUE(widgetOf<QLabel>(panel().SpanLabel)->styleSheet().contains("line-through"));
+    window->graph().drawNow();
     EXPECT_TRUE(savePicture(*window, "unsure"));
     mirror.Unsure.clear();
-    QApplication::processEvents();
+    window->binder().flush();
     EXPECT_EQ(struck(), "");
     EXPECT_FALSE(window->graph().yAxis->tickLabelFont().strikeOut());
     EXPECT_EQ(widgetOf<QLabel>(panel().SpanLabel)->styleSheet(), "");
