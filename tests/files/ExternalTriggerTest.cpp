@@ -111,7 +111,7 @@ TEST_F(ExternalTriggerTest, FailedLaterTrace_EndsIt) {
     EXPECT_FALSE(forms.time.ContinuousRecording);
 }
 
-TEST_F(ExternalTriggerTest, Script_GetsOneTraceACall) {
+TEST_F(ExternalTriggerTest, Script_ReadsOneTraceACallAndSavesItItself) {
     panel.isSpecMeas = true;
     cmd("INIT");
     cmd("WAIT");
@@ -119,7 +119,8 @@ TEST_F(ExternalTriggerTest, Script_GetsOneTraceACall) {
     sweep();
     submit();
     expectPlayed();
-    EXPECT_EQ(traces(), 1);
+    EXPECT_EQ(forms.time.RecordedCount, 1);
+    EXPECT_EQ(traces(), 0);
     EXPECT_FALSE(forms.time.ContinuousRecording);
 }
 

@@ -1,4 +1,5 @@
 #include "tests/script/ScriptBench.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {
@@ -131,11 +132,13 @@ TEST_F(TraceStatementsTest, SaveSweep_FindsTheFileInAnyCase) {
 
 TEST_F(TraceStatementsTest, LoadTrace_ShowsTheSavedViewOfThePass) {
     knownView();
-    panel.TraceData.assign(301, -40);
-    panel.RawTraceData.assign(301, -40);
-    panel.ViewStart = 1;
-    panel.ViewStop = 2;
-    panel.ViewSpan = 1;
+    Sweep& shown = program.sweep();
+    mirror.Span = 1;
+    shown.settings = mirror;
+    shown.wanted = shown.came = 301;
+    shown.physical.assign(301, -40);
+    shown.axis.start = 1;
+    shown.axis.stop = 2;
     run({"SAVERESULTS VIEW*.CSV", "DO", "SAVESWEEP", "LOOP 2"});
     int loaded = 0;
     panel.TraceLoaded.connect([&] { ++loaded; });

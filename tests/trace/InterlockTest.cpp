@@ -142,7 +142,7 @@ TEST_F(InterlockTest, Stop_NeverWaits_AndLosesNoOtherClick) {
         click(panel.StopButton);
         EXPECT_EQ(interlock.waiting(), 1U);
     });
-    port.expect("\r").answer("0\r");  // behind the wait that was left
+    port.expect("\r").answer("0\r");  // after the wait that was left
     marker("MARKPK");
     std::string value;
     EXPECT_FALSE(program.exchange().GetInstrument("FREQ", value));
