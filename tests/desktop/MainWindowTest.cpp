@@ -55,10 +55,14 @@ TEST_F(Desk, StopKey_IsHiddenUntilAViewRuns) {
     EXPECT_TRUE(widgetOf<QWidget>(panel().StopButton)->isVisible());
 }
 
-TEST_F(Desk, KeyWithoutAHandler_IsDisabled) {
+TEST_F(Desk, EntryWithoutAHandler_IsDisabled) {
     show();
-    ASSERT_FALSE(panel().cmdSpecial.Clicked.connected());
-    EXPECT_FALSE(widgetOf<QWidget>(panel().cmdSpecial)->isEnabled());
+    const auto enabled = [this](const MenuItem& item) {
+        return qobject_cast<QAction*>(window->binder().widgetOf(item))->isEnabled();
+    };
+    ASSERT_FALSE(panel().HelpAbout.Clicked.connected());
+    EXPECT_FALSE(enabled(panel().HelpAbout));
+    EXPECT_TRUE(enabled(panel().LoadData));
     EXPECT_TRUE(widgetOf<QWidget>(panel().FrequencyButton)->isEnabled());
 }
 
