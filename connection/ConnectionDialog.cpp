@@ -18,8 +18,7 @@ constexpr int kFallbackPorts = 10;
 ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, SessionStart& start,
                                    Profiles& profiles, SerialPortList& ports,
                                    const Session& session)
-    : forms_(forms),
-      panel_(forms.controller),
+    : panel_(forms.controller),
       dialog_(forms.main),
       link_(link),
       start_(start),

@@ -32,7 +32,6 @@ class ConnectionDialog {
   private:
     void showModal();
 
-    Forms& forms_;
     ControllerForm& panel_;
     MainForm& dialog_;
     ByteLink& link_;

@@ -60,8 +60,7 @@ std::string callAnswer(std::string text, const std::string& dialled) {
 
 Dialling::Dialling(Forms& forms, const InstrumentLink& link, ConnectionDialog& dialog,
                    SessionStart& start, Disconnection& disconnection, const Session& session)
-    : forms_(forms),
-      panel_(forms.controller),
+    : panel_(forms.controller),
       form_(forms.main),
       link_(link),
       dialog_(dialog),

@@ -50,7 +50,6 @@ class Dialling {
     void dialOver();
     double seconds() const;
 
-    Forms& forms_;
     ControllerForm& panel_;
     MainForm& form_;
     InstrumentLink link_;

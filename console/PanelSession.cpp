@@ -148,7 +148,7 @@ void PanelSession::execute(std::string_view line) {
     }
     for (const CommandRow& row : kCommands) {
         if (row.word != word) continue;
-        runCommand([&] { (this->*row.command)(rest); });
+        runCommand([&, text = rest] { (this->*row.command)(text); });
         return;
     }
     complain("there is no command \"" + std::string(word) + "\"");

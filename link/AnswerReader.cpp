@@ -33,7 +33,7 @@ AnswerReader::AnswerReader(Forms& forms, ZELBas& state, ByteLink& link, const Se
       state_(state),
       link_(link),
       session_(session),
-      notice_(forms, session),
+      notice_(forms),
       StopwatchA_(session.clock),
       sinceGrowth_(session.clock) {}
 

@@ -13,8 +13,7 @@ std::string lengthText(std::int64_t seconds) {
 
 }  // namespace
 
-WaitNotice::WaitNotice(Forms& forms, const Session& session)
-    : forms_(forms), panel_(forms.controller), session_(session) {}
+WaitNotice::WaitNotice(Forms& forms) : forms_(forms), panel_(forms.controller) {}
 
 Label& WaitNotice::dialogLabel() const {
     const bool tcp = panel_.ConnectionState == ControllerForm::TCPCON;

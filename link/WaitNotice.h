@@ -4,7 +4,6 @@
 #include <cstdint>
 
 #include "forms/Forms.h"
-#include "platform/Session.h"
 
 namespace zel {
 
@@ -12,7 +11,7 @@ namespace zel {
 /// on show for the length of the wait. A wait that ends within a second shows nothing.
 class WaitNotice {
   public:
-    WaitNotice(Forms& forms, const Session& session);
+    explicit WaitNotice(Forms& forms);
 
     /// `elapsedMs` of at most `timeoutMs` milliseconds have passed.
     void tell(std::int64_t elapsedMs, std::int64_t timeoutMs);
@@ -35,7 +34,6 @@ class WaitNotice {
 
     Forms& forms_;
     ControllerForm& panel_;
-    Session session_;
     std::int64_t shownSeconds_ = -1;  ///< that the text names; -1 while nothing is shown
     bool lentStop_ = false;           ///< the Stop key is on show for this wait alone
 };

@@ -27,8 +27,7 @@ Z9SetCommands::Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchang
                              SoftPanel& softPanel, Z9GetCommands& queries, MarkerReadout& markers,
                              FrequencyLabels& labels, TraceReader& traces, GraphScaling& scaling,
                              const Session& session)
-    : forms_(forms),
-      panel_(forms.controller),
+    : panel_(forms.controller),
       mirror_(mirror),
       exchange_(exchange),
       softPanel_(softPanel),

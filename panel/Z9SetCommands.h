@@ -61,7 +61,6 @@ class Z9SetCommands {
     void readTrace();
     void pointer(int shape);
 
-    Forms& forms_;
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
     CommandExchange& exchange_;

@@ -13,8 +13,7 @@ class ComplexMeasurement {
   public:
     ComplexMeasurement(Forms& forms, const InstrumentLine& line, ResultOutput& results,
                        PhaseDisplay& display)
-        : forms_(forms),
-          form_(forms.specialMeas),
+        : form_(forms.specialMeas),
           statistics_(forms.std),
           line_(line),
           results_(results),
@@ -38,7 +37,6 @@ class ComplexMeasurement {
     };
     bool takeTrace(bool first, std::size_t element, Result& result);
 
-    Forms& forms_;
     SpecialMeasForm& form_;
     STDForm& statistics_;
     InstrumentLine line_;
