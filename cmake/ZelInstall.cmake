@@ -11,7 +11,7 @@ file(RELATIVE_PATH ZEL_COMPANIONS
 #
 # Adds the rules, once the programs are known.
 function(zel_install)
-    foreach(program zelremote zelctl ZELSim)
+    foreach(program zelremote zelctl zeldraw ZELSim)
         if(TARGET ${program})
             install(TARGETS ${program} RUNTIME DESTINATION "${CMAKE_INSTALL_BINDIR}")
         endif()

@@ -1,23 +1,15 @@
 #include "console/Fronts.h"
 
-#include <QApplication>
 #include <QCoreApplication>
-#include <QLoggingCategory>
-#include <algorithm>
 
 #include "ZELSim/InProcessPort.h"
 #include "console/Address.h"
-#include "desktop/graph/GraphImage.h"
-#include "desktop/graph/SpectrogramPicture.h"
-#include "desktop/graph/WaterfallImage.h"
 #include "desktop/platform/Language.h"
-#include "desktop/platform/QtPlatform.h"
+#include "desktop/platform/QtSystem.h"
 #include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/ScriptedServer.h"
 #include "platform/virtual/ScriptedSocket.h"
 #include "platform/virtual/VirtualTime.h"
-#include "trace/ViewAnnotations.h"
-#include "waterfall/PictureOptions.h"
 
 namespace zel {
 namespace {
@@ -72,34 +64,27 @@ class PortFront : public Front {
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
         return {qt_.clock,       served,        boxes,          qt_.serialPort,
                 qt_.serialPorts, qt_.tcpSocket, qt_.serverPort, qt_.serverSocket,
-                qt_.settings,    qt_.debug,     clipboard_,     qt_.launcher,
+                qt_.settings,    qt_.debug,     clipboard_,     launcher_,
                 qt_.startup,     qt_.folder,    dialogs,        qt_.files,
                 qt_.endSignals};
     }
 
   private:
-    QtPlatform qt_;
+    QtSystem qt_;
     MemoryClipboard clipboard_;  // the system's needs a window
+    QtLauncher launcher_;
 };
 
 }  // namespace
 
 struct ToolkitSession::Application {
-    std::unique_ptr<QCoreApplication> object;
+    Application(int& argc, char** argv) : object(argc, argv) {}
+    QCoreApplication object;
 };
 
-ToolkitSession::ToolkitSession(int& argc, char** argv, bool windows)
-    : application_(std::make_unique<Application>()) {
+ToolkitSession::ToolkitSession(int& argc, char** argv)
+    : application_(std::make_unique<Application>(argc, argv)) {
     QCoreApplication::setApplicationName("ZELRemote");
-    if (windows) {
-        if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
-        // A start without a session of the desktop has warnings that mean nothing here.
-        QLoggingCategory::setFilterRules("default.warning=false");
-        application_->object = std::make_unique<QApplication>(argc, argv);
-        QLoggingCategory::setFilterRules({});
-    } else {
-        application_->object = std::make_unique<QCoreApplication>(argc, argv);
-    }
     useEnglishMessages();
 }
 
@@ -111,45 +96,6 @@ std::unique_ptr<Front> makeSimulatorFront(const std::string& home) {
 
 std::unique_ptr<Front> makePortFront(const std::string& home) {
     return std::make_unique<PortFront>(home);
-}
-
-std::string drawGraphImage(Program& program, const std::string& file) {
-    const ControllerForm& panel = program.forms().controller;
-    QString problem;
-    saveGraphImage(panel.CWGraph1, annotateView(panel, program.variables()),
-                   QString::fromStdString(file), &problem);
-    return problem.toStdString();
-}
-
-std::string writeGraphImage(Program& program, const std::string& file) {
-    const std::string problem = drawGraphImage(program, file);
-    return problem.empty() ? std::string() : "the image could not be written: " + problem;
-}
-
-std::string drawWaterfallImage(Program& program, const std::string& file) {
-    QString problem;
-    const WaterfallForm& form = program.forms().waterfall;
-    saveWaterfallImage(form, pictureStyle(form), QString::fromStdString(file), &problem);
-    return problem.toStdString();
-}
-
-std::string writeRowsImage(Program& program, const std::string& file, bool spectrogram) {
-    WaterfallForm& form = program.forms().waterfall;
-    QString problem;
-    if (spectrogram) {
-        saveSpectrogramImage(form, program.history(), QString::fromStdString(file), &problem);
-    } else {
-        // The design's view, whatever the user's own was, with the rows that there are.
-        form.ViewWaterfall.Click();
-        PictureStyle style;
-        style.view = GraphView3D();
-        int rows = 0;
-        for (const GraphCurve3D& plot : form.Graph3D.plots()) rows += plot.level.empty() ? 0 : 1;
-        style.depthRows = std::max(rows, 1);
-        saveWaterfallImage(form, style, QString::fromStdString(file), &problem);
-    }
-    return problem.isEmpty() ? std::string()
-                             : "the image could not be written: " + problem.toStdString();
 }
 
 }  // namespace zel

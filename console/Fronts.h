@@ -9,11 +9,10 @@
 
 namespace zel {
 
-/// The toolkit's application object, which must stand before all else. With `windows` pictures
-/// can be drawn, on no screen unless QT_QPA_PLATFORM names one.
+/// The toolkit's application object, which must stand before all else.
 class ToolkitSession {
   public:
-    ToolkitSession(int& argc, char** argv, bool windows);
+    ToolkitSession(int& argc, char** argv);
     ~ToolkitSession();
     ToolkitSession(const ToolkitSession&) = delete;
     ToolkitSession& operator=(const ToolkitSession&) = delete;
@@ -39,14 +38,5 @@ class Front {
 /// `home` is the application's folder; empty for the user's own.
 std::unique_ptr<Front> makeSimulatorFront(const std::string& home);
 std::unique_ptr<Front> makePortFront(const std::string& home);
-
-/// Draws the panel's graph; what went wrong, else an empty text. Needs a session with `windows`.
-std::string drawGraphImage(Program& program, const std::string& file);
-/// The same, in words that stand alone.
-std::string writeGraphImage(Program& program, const std::string& file);
-/// Draws the waterfall as its window shows it; what went wrong, else an empty text.
-std::string drawWaterfallImage(Program& program, const std::string& file);
-/// Draws all its rows, in depth or from above, in words that stand alone.
-std::string writeRowsImage(Program& program, const std::string& file, bool spectrogram);
 
 }  // namespace zel

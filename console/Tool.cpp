@@ -12,6 +12,7 @@
 #include "console/LineInput.h"
 #include "console/LineOutput.h"
 #include "console/PanelSession.h"
+#include "console/Pictures.h"
 #include "console/RunScript.h"
 #include "console/ServeVerb.h"
 #include "console/ServingEvents.h"
@@ -108,8 +109,19 @@ int runPanel(const Options& options, Front& front, LineOutput& output, LineOutpu
     return session.run();
 }
 
+/// Nothing is measured for a picture that cannot be drawn.
+bool missesDrawing(const Options& options) {
+    const bool wanted =
+        !options.image.empty() || !options.waterfall.empty() || !options.spectrogram.empty();
+    return wanted && findDrawingProgram().empty();
+}
+
 int runOneVerb(const Options& options, Front& front, const Streams& streams, LineOutput& output,
                LineOutput& errors) {
+    if (missesDrawing(options)) {
+        errors.line(std::string("zelctl: ") + kNoDrawingProgram);
+        return kLinkFailed;
+    }
     Stage stage(options, front, errors, errors);
     if (options.verb == Verb::Run && options.rehearse)
         return rehearseScript(options, stage.files, output, errors);

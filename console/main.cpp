@@ -8,8 +8,8 @@
 
 #include "console/Fronts.h"
 #include "console/Options.h"
-#include "console/PanelSession.h"
 #include "console/Tool.h"
+#include "support/ExitStatus.h"
 
 int main(int argc, char** argv) {
     zel::Options options;
@@ -18,11 +18,7 @@ int main(int argc, char** argv) {
     if (const auto status = zel::parseOptions(argc, argv, options, std::cout, std::cerr))
         return std::cout.flush() ? *status : zel::kLinkFailed;
     try {
-        // In a session each menu can be used, that of the picture too; so it is with a script.
-        const bool pictures = !options.image.empty() || !options.waterfall.empty() ||
-                              !options.spectrogram.empty() || options.verb == zel::Verb::Panel ||
-                              (options.verb == zel::Verb::Run && !options.rehearse);
-        const zel::ToolkitSession toolkit(argc, argv, pictures);
+        const zel::ToolkitSession toolkit(argc, argv);
         const bool simulated = options.address && options.address->simulated;
         const auto front =
             simulated ? zel::makeSimulatorFront(options.home) : zel::makePortFront(options.home);

@@ -46,6 +46,9 @@ HistoryRow::HistoryRow(const std::vector<double>& shown, double low, double high
                                                std::min(raw.size(), SweepHistory::kLongestRow)));
 }
 
+HistoryRow::HistoryRow(std::vector<std::uint16_t> codes, double low, double step)
+    : shown_(std::move(codes)), low_(low), step_(step) {}
+
 double HistoryRow::level(std::size_t index) const { return low_ + step_ * shown_[index]; }
 
 std::vector<double> HistoryRow::levels() const {
@@ -83,6 +86,10 @@ void SweepHistory::take() {
                          ? rows_.back().header
                          : std::make_shared<const SweepHeader>(std::move(header));
     }
+    add(std::move(row));
+}
+
+void SweepHistory::add(HistoryRow row) {
     rows_.push_back(std::move(row));
     if (rows_.size() > kRows) rows_.pop_front();
     ++added_;

@@ -24,6 +24,8 @@ class HistoryRow {
   public:
     HistoryRow(const std::vector<double>& shown, double low, double high,
                const std::vector<double>& raw);
+    /// Of levels that are steps already: level i is `low` + `step` * `codes`[i].
+    HistoryRow(std::vector<std::uint16_t> codes, double low, double step);
 
     std::string time;
     double firstX = 0;  ///< in the unit of the x axis
@@ -33,6 +35,9 @@ class HistoryRow {
     /// In the unit of the level axis, to a 65,000th of its height.
     double level(std::size_t index) const;
     std::vector<double> levels() const;
+    double low() const { return low_; }
+    double step() const { return step_; }
+    const std::vector<std::uint16_t>& codes() const { return shown_; }
     /// As read, in the reference unit.
     const std::vector<float>& raw() const { return raw_; }
     /// Null for a row of a loaded file.
@@ -63,6 +68,8 @@ class SweepHistory {
     }
     /// Rows that ever came.
     unsigned long added() const { return added_; }
+    /// Takes a row in as the newest.
+    void add(HistoryRow row);
     void clear();
 
     Event<> Added;

@@ -6,8 +6,12 @@
 
 namespace zel {
 
-void addCommonOptions(CLI::App& app, CommonOptions& options, const std::string& addresses) {
+void addVersionOption(CLI::App& app) {
     app.set_version_flag("-v,--version", app.get_name() + " " + versionText(kVersion));
+}
+
+void addCommonOptions(CLI::App& app, CommonOptions& options, const std::string& addresses) {
+    addVersionOption(app);
     app.add_option("--connect", options.connect, "The instrument: " + addresses)->type_name("URL");
     app.add_option("--home", options.home, "Folder of the program's files and settings")
         ->type_name("DIR");

@@ -16,6 +16,9 @@ struct CommonOptions {
     std::string words;    ///< the program's command line
 };
 
+/// Adds --version.
+void addVersionOption(CLI::App& app);
+
 /// Adds --connect, --home, --words and --version; `addresses` says what --connect takes.
 void addCommonOptions(CLI::App& app, CommonOptions& options, const std::string& addresses);
 

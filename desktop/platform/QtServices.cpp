@@ -1,16 +1,13 @@
 #include "desktop/platform/QtServices.h"
 
 #include <QCoreApplication>
-#include <QDesktopServices>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
-#include <QGuiApplication>
 #include <QLoggingCategory>
 #include <QProcess>
 #include <QSaveFile>
 #include <QStandardPaths>
-#include <QUrl>
 
 #include "support/IniFile.h"
 
@@ -95,11 +92,7 @@ void QtDebugChannel::output(const std::string& text) {
 bool QtLauncher::start(const std::string& path, const std::vector<std::string>& arguments) {
     QStringList list;
     for (const std::string& argument : arguments) list << QString::fromStdString(argument);
-    const QFileInfo file(QString::fromStdString(path));
-    const bool document = file.isFile() && !file.isExecutable();
-    if (document && qobject_cast<QGuiApplication*>(QCoreApplication::instance()) != nullptr)
-        return QDesktopServices::openUrl(QUrl::fromLocalFile(file.absoluteFilePath()));
-    return QProcess::startDetached(file.filePath(), list);
+    return QProcess::startDetached(QString::fromStdString(path), list);
 }
 
 bool QtStartupFolder::createLink(const std::string& linkName, const std::string& argument) {

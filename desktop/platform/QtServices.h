@@ -40,6 +40,7 @@ class QtDebugChannel : public DebugChannel {
     void output(const std::string& text) override;
 };
 
+/// Starts programs; a document is opened by nothing.
 class QtLauncher : public Launcher {
   public:
     bool start(const std::string& path, const std::vector<std::string>& arguments) override;

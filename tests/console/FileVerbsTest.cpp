@@ -140,7 +140,10 @@ struct RowsPictureTest : FileVerbsTest {
         static int count = 1;
         static char name[] = "test_console";
         static char* arguments[] = {name, nullptr};
-        static const auto* toolkit = new ToolkitSession(count, arguments, true);
+        // The programs of this build come first.
+        const char* path = getenv("PATH");
+        setenv("PATH", (std::string(ZEL_PROGRAMS ":") + (path ? path : "")).c_str(), 1);
+        static const auto* toolkit = new ToolkitSession(count, arguments);
         EXPECT_NE(toolkit, nullptr);
     }
 };

@@ -1,0 +1,38 @@
+#pragma once
+// The part of the platform on Qt that needs no window, in one bundle.
+
+#include <QString>
+
+#include "desktop/platform/QtClock.h"
+#include "desktop/platform/QtEvents.h"
+#include "desktop/platform/QtSerialPort.h"
+#include "desktop/platform/QtServerSocket.h"
+#include "desktop/platform/QtServices.h"
+#include "desktop/platform/QtSignals.h"
+#include "desktop/platform/QtSocket.h"
+#include "desktop/platform/SystemFiles.h"
+
+namespace zel {
+
+/// Needs a QCoreApplication.
+struct QtSystem {
+    explicit QtSystem(const QString& home = {}) : folder(home) {
+        events.setWakeDescriptor(endSignals.descriptor());
+    }
+
+    QtSignals endSignals;
+    QtClock clock;
+    QtEvents events{clock};
+    QtSerialPort serialPort{events};
+    QtSerialPortList serialPorts;
+    QtSocket tcpSocket{events};
+    QtSerialPort serverPort{events, false};
+    QtServerSocket serverSocket{events};
+    QtApplicationFolder folder;
+    QtSettingsStore settings{folder};
+    QtDebugChannel debug;
+    QtStartupFolder startup;
+    SystemFiles files;
+};
+
+}  // namespace zel
