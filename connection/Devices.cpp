@@ -5,7 +5,7 @@
 #include "link/ByteLink.h"
 #include "link/RS232Ops.h"
 #include "platform/ModalForm.h"
-#include "support/IniFile.h"
+#include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
@@ -15,6 +15,7 @@ namespace {
 
 constexpr const char* kFile = "/settings.ini";
 constexpr const char* kListSection = "DEVICES";
+constexpr std::uint64_t kLongestFile = 1U << 20;  // bytes
 constexpr int kMostEntries = 10'000;
 constexpr int kBuffer = 1024;  // bytes
 constexpr int kBothKinds = 3;  // RTS and XON/XOFF
@@ -35,27 +36,38 @@ std::string entry(const IniFile& file, const std::string& section, int number) {
 
 }  // namespace
 
-Devices::Devices(Forms& forms, SerialPort& ZELCommC, SerialPortList& ports,
-                 ApplicationFolder& folder, const Clock& clock, Events& events, MessageBoxes& boxes)
+Devices::Devices(Forms& forms, SerialPort& ZELCommC, SerialPortList& ports, const Store& store,
+                 const Session& session)
     : panel_(forms.controller),
       form_(forms.devicesChoice),
       port_(ZELCommC),
       ports_(ports),
-      folder_(folder),
-      clock_(clock),
-      events_(events),
-      boxes_(boxes) {
-    form_.Load.connect([this] { Form_Load(); });
-    panel_.SetDevice.Clicked.connect([this] { SetDevice_Click(); });
-    form_.SetDeviceButton.Clicked.connect([this] { SetCommunicationDevice(); });
-    form_.CloseDevicesButton.Clicked.connect([this] { close(); });
-    form_.QueryUnload.connect([this](int&) { cancelled_ = true; });
+      store_(store),
+      clock_(session.clock),
+      events_(session.events),
+      boxes_(session.boxes) {
+    handlers_.on(form_.Load, [this] { Form_Load(); });
+    handlers_.on(panel_.SetDevice.Clicked, [this] { SetDevice_Click(); });
+    handlers_.on(form_.SetDeviceButton.Clicked, [this] { SetCommunicationDevice(); });
+    handlers_.on(form_.CloseDevicesButton.Clicked, [this] { close(); });
+    handlers_.on(form_.QueryUnload, [this](int&) { cancelled_ = true; });
+}
+
+/// Empty where there is no file; one that cannot be read is reported and counts as empty.
+IniFile Devices::settings() const {
+    const std::string path = store_.folder.path() + kFile;
+    if (!store_.files.stat(path).exists()) return {};
+    FileProblem problem;
+    const auto bytes = readFile(store_.files, path, kLongestFile, problem);
+    if (bytes) return IniFile::parse(bytesToUtf8(*bytes));
+    boxes_.show({BoxIcon::Warning, readProblem(path, problem)});
+    return {};
 }
 
 std::vector<std::string> Devices::ReadCommunicationDevices() {
     panel_.MousePointer = 11;
     std::vector<std::string> names;
-    const IniFile file = IniFile::load(folder_.path() + kFile);
+    const IniFile file = settings();
     for (int n = 1; n <= kMostEntries; ++n) {
         const std::string name = entry(file, kListSection, n);
         if (leadingNumber(name) == 1) break;
@@ -148,7 +160,7 @@ void Devices::ConfigureDevice(bool& ok) {
     const Stopwatch settling(clock_);
     while (settling.Elapsed() < kSettleMs && !cancelled_)
         events_.wait(kSettleMs - settling.Elapsed());
-    const IniFile file = IniFile::load(folder_.path() + kFile);
+    const IniFile file = settings();
     for (int n = 1; n <= kMostEntries && !cancelled_; ++n) {
         const std::string command = entry(file, form_.AvailableDevicesChoice.Text(), n);
         if (leadingNumber(command) == 1) {

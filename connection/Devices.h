@@ -5,19 +5,24 @@
 #include <vector>
 
 #include "forms/Forms.h"
-#include "platform/Clock.h"
-#include "platform/Events.h"
-#include "platform/MessageBox.h"
+#include "platform/Files.h"
 #include "platform/SerialPort.h"
 #include "platform/Services.h"
+#include "platform/Session.h"
+#include "support/IniFile.h"
 
 namespace zel {
 
 class Devices {
   public:
+    /// Where the commands of the devices stand.
+    struct Store {
+        ApplicationFolder& folder;
+        FileService& files;
+    };
     /// Connects the menu entry and the dialog's buttons.
-    Devices(Forms& forms, SerialPort& ZELCommC, SerialPortList& ports, ApplicationFolder& folder,
-            const Clock& clock, Events& events, MessageBoxes& boxes);
+    Devices(Forms& forms, SerialPort& ZELCommC, SerialPortList& ports, const Store& store,
+            const Session& session);
 
     /// The names of the file, in its order; "NONE" alone when it yields nothing.
     std::vector<std::string> ReadCommunicationDevices();
@@ -27,6 +32,7 @@ class Devices {
 
   private:
     void Form_Load();
+    IniFile settings() const;
     bool openPort();
     void ConfigureDevice(bool& ok);
     bool sendCommand(const std::string& command);
@@ -36,11 +42,12 @@ class Devices {
     DevicesChoiceForm& form_;
     SerialPort& port_;
     SerialPortList& ports_;
-    ApplicationFolder& folder_;
+    Store store_;
     const Clock& clock_;
     Events& events_;
     MessageBoxes& boxes_;
     bool cancelled_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -157,11 +157,27 @@ bool TcpDialog::open(const std::string& host, const std::string& portText) {
         giveUp();
         return false;
     }
-    dialog_.AdviceLabel.Caption = connectionAdvice(forms_);
+    dialog_.AdviceLabel.Caption =
+        socket_.state() == SocketState::Connected ? connectionAdvice(forms_) : endOfServer();
     session_.boxes.show(
         {BoxIcon::Information, "No M&T ZEL3 found at the specified adress!", "No ZEL3 found"});
     start_.setClock("stop");
     return false;
+}
+
+/// The reason stands in the dialog; where that is not on show a box says it.
+void TcpDialog::failed(const std::string& where, const std::string& reason) {
+    dialog_.lblReason.Caption = reason;
+    if (dialog_.Visible || reason.empty()) return;
+    session_.boxes.show({BoxIcon::Critical, "The connection to " + where + " failed: " + reason});
+}
+
+/// Why a server has closed the connection that it had taken.
+std::string TcpDialog::endOfServer() const {
+    if (socket_.state() == SocketState::Error && !socket_.problem().empty())
+        return socket_.problem();
+    return "The server closed the connection. It may be at work for another client, or not let "
+           "this computer in.";
 }
 
 bool TcpDialog::left() const { return link_.state.mustLeave(session_.clock.micros()); }
@@ -185,10 +201,7 @@ bool TcpDialog::awaitConnection(const std::string& where) {
                 if (row.state == state) dialog_.IDTextBox.Text = row.text;
         if (state == SocketState::Connected) return true;
         if (state == SocketState::Error) {
-            dialog_.lblReason.Caption = socket_.problem();
-            if (!socket_.problem().empty())
-                session_.boxes.show({BoxIcon::Critical, "The connection to " + where +
-                                                            " failed: " + socket_.problem()});
+            failed(where, socket_.problem());
             return false;
         }
         // A socket that the user closed meanwhile will not connect any more.
@@ -196,7 +209,7 @@ bool TcpDialog::awaitConnection(const std::string& where) {
         if (StopwatchA_.Elapsed() > kConnectMs) {
             socket_.close();
             dialog_.IDTextBox.Text = "TCP Socket Error.";
-            dialog_.lblReason.Caption = "The server did not answer within 30 seconds.";
+            failed(where, "The server did not answer within 30 seconds.");
             return false;
         }
         session_.events.wait(kPollMs);

@@ -27,6 +27,8 @@ class TcpDialog {
 
   private:
     bool awaitConnection(const std::string& where);
+    void failed(const std::string& where, const std::string& reason);
+    std::string endOfServer() const;
     bool left() const;
     void giveUp();
     bool open(const std::string& host, const std::string& portText);

@@ -1,8 +1,6 @@
 #include "console/ServeVerb.h"
 
 #include <algorithm>
-#include <atomic>
-#include <csignal>
 
 #include "server/ServerBridge.h"
 #include "server/ServerDialog.h"
@@ -12,11 +10,7 @@
 namespace zel {
 namespace {
 
-constexpr int kLookMs = 250;  // between two looks for a signal
-
-std::atomic<bool> endAsked{false};
-
-void askEnd(int) { endAsked = true; }
+constexpr int kLookMs = 250;
 
 /// "ADDRESS:PORT", "[ADDRESS]:PORT" or "PORT".
 void splitListen(const std::string& text, std::string& address, std::string& port) {
@@ -44,8 +38,6 @@ void fillForm(const ServeOptions& wanted, ServerForm& form) {
 }  // namespace
 
 int runServer(const Options& options, const VerbStage& stage) {
-    endAsked = false;
-    for (const int ending : {SIGINT, SIGTERM, SIGHUP}) std::signal(ending, askEnd);
     stage.program.start();
     ServerForm& form = stage.program.forms().server;
     ServerBridge& server = stage.program.server();
@@ -64,21 +56,14 @@ int runServer(const Options& options, const VerbStage& stage) {
     bool lost = false;
     server.Happened.connect([&](const std::string& text) { stage.output.line(text); });
     server.Lost.connect([&] { lost = true; });
-    // A search takes seconds, and may be ended as well.
-    const auto watch = [&](const auto& self) -> void {
-        if (endAsked) return server.disconnect();
-        if (server.connecting()) stage.events.schedule(kLookMs, [&self] { self(self); });
-    };
-    stage.events.schedule(kLookMs, [&] { watch(watch); });
     const bool up = server.connect();
     stage.errors.settle();
     if (!up) {
-        if (endAsked) return kDone;
+        if (stage.program.ended()) return kDone;
         stage.errors.line("zelctl: " + replaceAll(server.problem(), kCrLf, " "));
         return kLinkFailed;
     }
-    while (!endAsked && !lost) stage.events.wait(kLookMs);
-    if (!lost) server.disconnect();
+    while (!stage.program.ended() && !lost) stage.events.wait(kLookMs);
     stage.errors.settle();
     return lost ? kLinkFailed : kDone;
 }

@@ -41,7 +41,14 @@ class ServerSocket {
     virtual void refuse(int requestId) = 0;
     virtual Socket& client() = 0;
 
+    /// What the request must prove before it is let in, such as its part of TLS, begins here: true,
+    /// and `ConnectionRequest` comes once more when it is proved. False when there is nothing to
+    /// prove, or it has been proved.
+    virtual bool prove(int /*requestId*/) { return false; }
+
     Event<int> ConnectionRequest;
+    /// The proof has failed, for that reason; the request is closed after this event.
+    Event<int, const std::string&> ProofFailed;
 };
 
 }  // namespace zel

@@ -8,6 +8,9 @@
 namespace zel {
 namespace {
 
+constexpr const char* kComponent = "ServerForm";
+constexpr const char* kClass = "InstrumentSearch";
+constexpr int kFailedPort = 4;  // a level of the log
 constexpr int kFirstProbeMs = 4000;
 constexpr int kAnswerMs = 2000;
 constexpr int kBurstMs = 100;
@@ -19,26 +22,30 @@ constexpr std::size_t kLongestAnswer = 4096;
 }  // namespace
 
 InstrumentSearch::InstrumentSearch(ServerForm& form, SerialPort& SystemCommPort,
-                                   const Session& services)
+                                   const Session& services, RootDebug& log)
     : form_(form),
       port_(SystemCommPort),
       services_(services),
+      log_(log),
       ports_(services.events, services.boxes) {}
 
-void InstrumentSearch::tell(const std::string& text, bool warning) {
+void InstrumentSearch::report(const std::string& text, bool warning) {
+    const CallScope call(log_, kComponent, kClass, "report");
     problem_ = text;
+    if (!stopped_) log_.LogMessage(kFailedPort, "report", replaceAll(text, kCrLf, " "));
     if (!quiet_ && !stopped_)
         services_.boxes.show({warning ? BoxIcon::Warning : BoxIcon::Plain, text});
 }
 
 void InstrumentSearch::ConnectInstrument(bool& ok) {
+    const CallScope call(log_, kComponent, kClass, "ConnectInstrument");
     ok = stopped_ = false;
     problem_.clear();
     form_.ServerScanStop = false;
     if (serialDeviceName(form_.COMList.Text(), form_.COMList.items()).empty())
-        return tell("Please enter a valid COM port!", false);
+        return report("Please enter a valid COM port!", false);
     if (!IsNumericText(form_.BaudList.Text()))
-        return tell("Please enter a valid baud rate!", false);
+        return report("Please enter a valid baud rate!", false);
     form_.ServerConnecting = true;
     ok = form_.chkBaudRate.Value() ? search() : openPort();
     if (ok)
@@ -47,14 +54,16 @@ void InstrumentSearch::ConnectInstrument(bool& ok) {
 }
 
 bool InstrumentSearch::openPort() {
+    const CallScope call(log_, kComponent, kClass, "openPort");
     if (ports_.OpenComPort(port_, form_.COMList.Text(), form_.BaudList.Text())) return true;
     std::string text = "Could not connect to the specified COM port!";
     if (!port_.problem().empty()) text += kCrLf + port_.problem();
-    tell(text, true);
+    report(text, true);
     return false;
 }
 
 bool InstrumentSearch::search() {
+    const CallScope call(log_, kComponent, kClass, "search");
     form_.BaudList.setListIndex(0);
     bool switched = false;
     for (;;) {
@@ -75,11 +84,12 @@ bool InstrumentSearch::search() {
             break;
         }
     }
-    tell("No instrument found at the specified COM port!", true);
+    report("No instrument found at the specified COM port!", true);
     return false;
 }
 
 InstrumentSearch::Probe InstrumentSearch::probe() {
+    const CallScope call(log_, kComponent, kClass, "probe");
     bool good = false;
     CheckProbeAnswer(ask("\r\n", kFirstProbeMs), good);
     if (good) CheckProbeAnswer(ask("GET\r", kAnswerMs), good);
@@ -94,6 +104,7 @@ InstrumentSearch::Probe InstrumentSearch::probe() {
 
 /// False when the instrument does not want to be set.
 bool InstrumentSearch::switchSpeed() {
+    const CallScope call(log_, kComponent, kClass, "switchSpeed");
     bool good = false;
     CheckProbeAnswer(ask("SET\r", kAnswerMs), good);
     if (!good) return false;
@@ -102,6 +113,7 @@ bool InstrumentSearch::switchSpeed() {
 }
 
 bool InstrumentSearch::nextEntry() {
+    const CallScope call(log_, kComponent, kClass, "nextEntry");
     const int next = form_.BaudList.ListIndex() + 1;
     if (next >= form_.BaudList.ListCount()) return false;
     form_.BaudList.setListIndex(next);
@@ -109,6 +121,7 @@ bool InstrumentSearch::nextEntry() {
 }
 
 std::string InstrumentSearch::ask(const std::string& line, int patienceMs) {
+    const CallScope call(log_, kComponent, kClass, "ask");
     if (stopped_) return {};
     std::string answer;
     const Stopwatch watch(services_.clock);
@@ -127,6 +140,7 @@ std::string InstrumentSearch::ask(const std::string& line, int patienceMs) {
 }
 
 void InstrumentSearch::CheckProbeAnswer(const std::string& text, bool& ok) {
+    const CallScope call(log_, kComponent, kClass, "CheckProbeAnswer");
     ok = !text.empty() && IsPrintableAnswer(text);
     // A live instrument at a wrong speed answers with noise, so that silence means that none is
     // there; at the first speed a silence is forgiven.

@@ -7,6 +7,7 @@
 #include "link/RS232Ops.h"
 #include "platform/SerialPort.h"
 #include "platform/Session.h"
+#include "support/RootDebug.h"
 
 namespace zel {
 
@@ -15,7 +16,8 @@ class InstrumentSearch {
     /// The index of 57600 in `BaudList`.
     static constexpr int kLineSpeed = 3;
 
-    InstrumentSearch(ServerForm& form, SerialPort& SystemCommPort, const Session& services);
+    InstrumentSearch(ServerForm& form, SerialPort& SystemCommPort, const Session& services,
+                     RootDebug& log);
 
     /// Takes port and speed from the form; with `chkBaudRate` each speed of the list is tried and
     /// an instrument at another one is switched to 57600. What fails is reported; the port stays as
@@ -38,11 +40,12 @@ class InstrumentSearch {
     bool switchSpeed();
     bool nextEntry();
     std::string ask(const std::string& line, int patienceMs);
-    void tell(const std::string& text, bool warning);
+    void report(const std::string& text, bool warning);
 
     ServerForm& form_;
     SerialPort& port_;
     Session services_;
+    RootDebug& log_;
     RS232Ops ports_;
     bool stopped_ = false;
     bool quiet_ = false;

@@ -9,6 +9,8 @@
 namespace zel {
 namespace {
 
+constexpr const char* kComponent = "ServerForm";
+constexpr const char* kClass = "Relay";
 constexpr int kDataReceived = 2;
 constexpr std::string_view kTraceWord = "TRACEBIN";
 constexpr std::size_t kPiece = 4096;  // handed to the port at a time
@@ -31,8 +33,9 @@ void TraceWatch::reset() {
     trace_ = false;
 }
 
-Relay::Relay(ServerForm& form, SerialPort& SystemCommPort, Socket& client, const Session& services)
-    : form_(form), port_(SystemCommPort), client_(client), services_(services) {
+Relay::Relay(ServerForm& form, SerialPort& SystemCommPort, Socket& client, const Session& services,
+             RootDebug& log)
+    : form_(form), port_(SystemCommPort), client_(client), services_(services), log_(log) {
     handlers_.on(client_.DataArrival, [this] { dataFromClient(); });
     handlers_.on(port_.OnComm, [this](int event) { dataFromInstrument(event); });
 }
@@ -45,6 +48,7 @@ Relay::~Relay() {
 void Relay::setQuiet(int ms) { quietMs_ = std::clamp(ms, 0, kLongestGroupMs); }
 
 void Relay::restart() {
+    const CallScope call(log_, kComponent, kClass, "restart");
     services_.events.cancel(groupTask_);
     services_.events.cancel(feedTask_);
     groupTask_ = feedTask_ = 0;
@@ -55,6 +59,7 @@ void Relay::restart() {
 }
 
 void Relay::dataFromClient() {
+    const CallScope call(log_, kComponent, kClass, "dataFromClient");
     if (form_.ServerConnecting || !port_.isOpen()) {
         client_.getData();  // the line is not the client's yet
         return;
@@ -66,6 +71,7 @@ void Relay::dataFromClient() {
 }
 
 void Relay::RelayToInstrument(const std::string& text) {
+    const CallScope call(log_, kComponent, kClass, "RelayToInstrument");
     const bool before = form_.doBinaryData;
     form_.doBinaryData = watch_.take(text);
     if (form_.doBinaryData && !before) ++sweeps_;
@@ -76,6 +82,7 @@ void Relay::RelayToInstrument(const std::string& text) {
 
 // The port gets no more than it takes, so that what waits can still be dropped.
 void Relay::feedLine() {
+    const CallScope call(log_, kComponent, kClass, "feedLine");
     services_.events.cancel(feedTask_);
     feedTask_ = 0;
     std::size_t sent = 0;
@@ -93,6 +100,7 @@ void Relay::feedLine() {
 }
 
 void Relay::dataFromInstrument(int commEvent) {
+    const CallScope call(log_, kComponent, kClass, "dataFromInstrument");
     if (form_.ServerConnecting || commEvent != kDataReceived) return;
     std::string bytes = port_.input();
     // Nobody is there to get them.
@@ -110,11 +118,13 @@ void Relay::dataFromInstrument(int commEvent) {
 }
 
 void Relay::sendGroup() {
+    const CallScope call(log_, kComponent, kClass, "sendGroup");
     groupTask_ = 0;
     sendToClient(std::exchange(group_, {}));
 }
 
 void Relay::sendToClient(const std::string& bytes) {
+    const CallScope call(log_, kComponent, kClass, "sendToClient");
     if (client_.state() != SocketState::Connected) return;
     if (client_.bytesToWrite() + bytes.size() > kMostForClient) return ClientTooSlow();
     toClient_ += bytes.size();

@@ -8,6 +8,7 @@
 #include "platform/SerialPort.h"
 #include "platform/Session.h"
 #include "platform/Socket.h"
+#include "support/RootDebug.h"
 
 namespace zel {
 
@@ -34,7 +35,8 @@ class Relay {
     static constexpr int kLongestGroupMs = 100;
 
     /// Connects the events of the port and of the client.
-    Relay(ServerForm& form, SerialPort& SystemCommPort, Socket& client, const Session& services);
+    Relay(ServerForm& form, SerialPort& SystemCommPort, Socket& client, const Session& services,
+          RootDebug& log);
     ~Relay();
     Relay(const Relay&) = delete;
     Relay& operator=(const Relay&) = delete;
@@ -66,6 +68,7 @@ class Relay {
     SerialPort& port_;
     Socket& client_;
     Session services_;
+    RootDebug& log_;
     TraceWatch watch_;
     int quietMs_ = kQuietMs;
     std::string forLine_;

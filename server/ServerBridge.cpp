@@ -8,26 +8,41 @@
 namespace zel {
 namespace {
 
+constexpr const char* kComponent = "ServerForm";
+constexpr const char* kClass = "ServerBridge";
+// Levels of the log.
+constexpr int kInfo = 1;
+constexpr int kRefused = 4;
+constexpr std::int64_t kRefusedPauseMicros = 60'000'000;  // of one address
 constexpr int kWatchMs = 1000;
 constexpr double kHighestPort = 65535;
 
 }  // namespace
 
 ServerBridge::ServerBridge(ControllerForm& panel, ServerForm& form, SerialPort& SystemCommPort,
-                           ServerSocket& TCPSocket, const Session& services)
+                           ServerSocket& TCPSocket, const Session& services, RootDebug& log)
     : panel_(panel),
       form_(form),
       port_(SystemCommPort),
       socket_(TCPSocket),
       services_(services),
-      relay_(form, SystemCommPort, TCPSocket.client(), services),
-      search_(form, SystemCommPort, services) {
+      log_(log),
+      relay_(form, SystemCommPort, TCPSocket.client(), services, log),
+      search_(form, SystemCommPort, services, log) {
     handlers_.on(socket_.ConnectionRequest, [this](int id) { knocked(id); });
+    handlers_.on(socket_.ProofFailed,
+                 [this](int id, const std::string& reason) { refused(socket_.peer(id), reason); });
     handlers_.on(socket_.client().PeerClosed, [this] { clientGone(); });
     handlers_.on(relay_.ClientTooSlow, [this] { disconnectClient(); });
 }
 
 ServerBridge::~ServerBridge() { services_.events.cancel(watchTask_); }
+
+/// An event for the user and the log.
+void ServerBridge::report(int level, const char* routine, const std::string& text) {
+    log_.LogMessage(level, routine, text);
+    Happened(text);
+}
 
 void ServerBridge::captions(const std::string& text) {
     panel_.Caption = text;
@@ -42,6 +57,7 @@ std::string ServerBridge::listenText() const {
 }
 
 void ServerBridge::StartListening(bool& ok) {
+    const CallScope call(log_, kComponent, kClass, "StartListening");
     ok = false;
     const std::string portText = trimmed(form_.localPortTextBox.Text.get());
     const double port = leadingNumber(portText);
@@ -55,17 +71,19 @@ void ServerBridge::StartListening(bool& ok) {
     if (socket_.state() != SocketState::Listening) {
         problem_ = "The TCP port cannot be used!";
         if (!socket_.problem().empty()) problem_ += kCrLf + socket_.problem();
+        log_.LogMessage(kRefused, "StartListening", replaceAll(problem_, kCrLf, " "));
         services_.boxes.show({BoxIcon::Warning, problem_});
         return;
     }
     form_.localPortTextBox.Text = std::to_string(socket_.port());
     const std::string at = form_.ListenAddress.empty() ? socket_.localIP() : form_.ListenAddress;
     captions("ZELRemote Server TCP/IP: " + at + ": " + std::to_string(socket_.port()));
-    Happened("listening " + listenText());
+    report(kInfo, "StartListening", "listening " + listenText());
     ok = true;
 }
 
 bool ServerBridge::connect(bool quiet) {
+    const CallScope call(log_, kComponent, kClass, "connect");
     if (bridging_ || connecting_) return bridging_;
     problem_.clear();
     const auto networks = networksOf(form_.txtAllowed.Text.get());
@@ -93,7 +111,7 @@ bool ServerBridge::connect(bool quiet) {
     captions(form_.Caption.get() + " | ZEL: " + form_.COMList.Text() + ", " +
              form_.BaudList.Text());
     bridging_ = true;
-    Happened("instrument " + form_.COMList.Text() + " " + form_.BaudList.Text());
+    report(kInfo, "connect", "instrument " + form_.COMList.Text() + " " + form_.BaudList.Text());
     relay_.restart();
     watchTask_ = services_.events.schedule(kWatchMs, [this] { watchInstrument(); });
     showState();
@@ -101,10 +119,12 @@ bool ServerBridge::connect(bool quiet) {
 }
 
 void ServerBridge::CloseCommPort() {
+    const CallScope call(log_, kComponent, kClass, "CloseCommPort");
     if (port_.isOpen()) port_.close();
 }
 
 void ServerBridge::disconnect() {
+    const CallScope call(log_, kComponent, kClass, "disconnect");
     search_.stop();
     services_.events.cancel(watchTask_);
     watchTask_ = 0;
@@ -115,43 +135,60 @@ void ServerBridge::disconnect() {
     socket_.close();
     disconnectClient();
     showState();
-    if (was) Happened("closed");
+    if (was) report(kInfo, "disconnect", "closed");
 }
 
 void ServerBridge::disconnectClient() {
+    const CallScope call(log_, kComponent, kClass, "disconnectClient");
     CloseIfNotClosed(socket_.client());
     clientGone();
 }
 
 void ServerBridge::clientGone() {
+    const CallScope call(log_, kComponent, kClass, "clientGone");
     relay_.restart();
     CloseIfNotClosed(socket_.client());
     if (hasClient_) {
         hasClient_ = false;
         clientAddress_.clear();
-        Happened("client gone");
+        report(kInfo, "clientGone", "client gone");
     }
     showState();
 }
 
 void ServerBridge::knocked(int requestId) {
+    const CallScope call(log_, kComponent, kClass, "knocked");
     const std::string address = socket_.peer(requestId);
     const bool taken = hasClient_ && form_.chkKeep.Value();
     if (taken || !mayConnect(allowed_, address)) {
         socket_.refuse(requestId);
-        Happened("refused " + address);
-        return;
+        return refused(address, taken ? "A client is at work." : "Not on the list.");
     }
+    // The client at work stays until a newcomer has proved who he is.
+    if (socket_.prove(requestId)) return;
     if (hasClient_) clientGone();
     AcceptRequest(socket_, requestId);
     relay_.restart();
     hasClient_ = true;
     clientAddress_ = address;
-    Happened("client " + address);
+    report(kInfo, "knocked", "client " + address);
     showState();
 }
 
+// Somebody who knocks without end must not fill the log.
+void ServerBridge::refused(const std::string& address, const std::string& reason) {
+    const CallScope call(log_, kComponent, kClass, "refused");
+    const std::int64_t now = services_.clock.micros();
+    if (address != refusedAddress_ || now > refusedAt_ + kRefusedPauseMicros) {
+        log_.LogMessage(kRefused, "refused", "refused " + address + ": " + reason);
+        refusedAddress_ = address;
+        refusedAt_ = now;
+    }
+    Happened("refused " + address);
+}
+
 void ServerBridge::watchInstrument() {
+    const CallScope call(log_, kComponent, kClass, "watchInstrument");
     watchTask_ = 0;
     if (port_.isOpen()) {
         // A client whose connection broke without a word is noticed here.
@@ -165,20 +202,24 @@ void ServerBridge::watchInstrument() {
     problem_ = "Could not connect to the specified COM port!";
     const std::string why = port_.problem();
     if (!why.empty()) problem_ += kCrLf + why;
-    Happened("error " + (why.empty() ? std::string("the instrument's port has gone") : why));
+    report(kRefused, "watchInstrument",
+           "error " + (why.empty() ? std::string("the instrument's port has gone") : why));
     disconnect();
     Lost();
 }
 
 void ServerBridge::repair() {
+    const CallScope call(log_, kComponent, kClass, "repair");
     if (socket_.state() != SocketState::Error) return;
     socket_.close();
     ListenOnPort(socket_, form_.localPortTextBox.Text, form_.ListenAddress);
+    log_.LogMessage(kRefused, "repair", "Connection broken");
     form_.txtDebug.Text = "Connection broken";
     showState();
 }
 
 void ServerBridge::showState() {
+    const CallScope call(log_, kComponent, kClass, "showState");
     form_.ListenState = static_cast<std::int16_t>(socket_.state());
     form_.ClientState = hasClient_ ? static_cast<std::int16_t>(socket_.client().state()) : 0;
     form_.txtClientIP.Visible = hasClient_;

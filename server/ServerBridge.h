@@ -21,7 +21,7 @@ namespace zel {
 class ServerBridge {
   public:
     ServerBridge(ControllerForm& panel, ServerForm& form, SerialPort& SystemCommPort,
-                 ServerSocket& TCPSocket, const Session& services);
+                 ServerSocket& TCPSocket, const Session& services, RootDebug& log);
     ~ServerBridge();
     ServerBridge(const ServerBridge&) = delete;
     ServerBridge& operator=(const ServerBridge&) = delete;
@@ -56,6 +56,8 @@ class ServerBridge {
     void knocked(int requestId);
     void clientGone();
     void watchInstrument();
+    void report(int level, const char* routine, const std::string& text);
+    void refused(const std::string& address, const std::string& reason);
     void captions(const std::string& text);
     std::string listenText() const;
 
@@ -64,6 +66,7 @@ class ServerBridge {
     SerialPort& port_;
     ServerSocket& socket_;
     Session services_;
+    RootDebug& log_;
     Relay relay_;
     InstrumentSearch search_;
     std::vector<Network> allowed_;
@@ -71,6 +74,8 @@ class ServerBridge {
     bool connecting_ = false;
     bool hasClient_ = false;
     std::string clientAddress_;
+    std::string refusedAddress_;  ///< the last in the log
+    std::int64_t refusedAt_ = 0;
     std::string problem_;
     TaskId watchTask_ = 0;
     Handlers handlers_;

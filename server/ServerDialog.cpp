@@ -10,6 +10,8 @@
 namespace zel {
 namespace {
 
+constexpr const char* kComponent = "ServerForm";
+constexpr const char* kClass = "ServerDialog";
 constexpr const char* kSection = "ServerForm";
 constexpr const char* kBauds[] = {"9600", "19200", "38400", "57600", "115200"};
 constexpr int kRetryMs = 10'000;
@@ -31,13 +33,14 @@ std::string typedText(const DropDownList& list) {
 }  // namespace
 
 ServerDialog::ServerDialog(Forms& forms, ServerBridge& bridge, const ServerSocket& TCPSocket,
-                           const Means& means, const Session& services)
+                           const Means& means, const Session& services, RootDebug& log)
     : panel_(forms.controller),
       form_(forms.server),
       bridge_(bridge),
       socket_(TCPSocket),
       means_(means),
-      services_(services) {
+      services_(services),
+      log_(log) {
     form_.chkBaudRate.setValue(true);
     form_.localIPTextBox.Locked = true;
     form_.txtClientIP.Locked = true;
@@ -63,6 +66,7 @@ bool ServerDialog::serverWord() const {
 }
 
 void ServerDialog::note(const std::string& text) {
+    const CallScope call(log_, kComponent, kClass, "note");
     std::vector<std::string> events = form_.lstEvents.Items.get();
     events.insert(events.begin(), timeOfDayText(services_.clock.date()) + "  " + text);
     if (events.size() > kMostEvents) events.resize(kMostEvents);
@@ -70,6 +74,9 @@ void ServerDialog::note(const std::string& text) {
 }
 
 void ServerDialog::fillFields() {
+    const CallScope call(log_, kComponent, kClass, "fillFields");
+    // Server mode writes its log, with the times.
+    log_.FileLogEnabled = log_.FileTimeStamping = true;
     form_.cmdConnect.Caption = "connect";
     form_.cmdCancel.Caption = "cancel";
     form_.localIPTextBox.Text = socket_.localIP();
@@ -82,6 +89,7 @@ void ServerDialog::fillFields() {
 }
 
 void ServerDialog::Form_Load() {
+    const CallScope call(log_, kComponent, kClass, "Form_Load");
     // What was on the panel stays known while the server runs on with its window closed.
     form_.SavedCaption = panel_.Caption;
     fillFields();
@@ -94,6 +102,7 @@ void ServerDialog::Form_Load() {
 }
 
 void ServerDialog::loadSettings() {
+    const CallScope call(log_, kComponent, kClass, "loadSettings");
     const auto get = [&](const char* key, const char* fallback) {
         return means_.settings.get(kProgramTitle, kSection, key, fallback);
     };
@@ -106,6 +115,7 @@ void ServerDialog::loadSettings() {
 }
 
 void ServerDialog::saveSettings() {
+    const CallScope call(log_, kComponent, kClass, "saveSettings");
     const auto set = [&](const char* key, const std::string& value) {
         means_.settings.set(kProgramTitle, kSection, key, value);
     };
@@ -120,6 +130,7 @@ void ServerDialog::saveSettings() {
 }
 
 void ServerDialog::bridgingLook(bool bridging) {
+    const CallScope call(log_, kComponent, kClass, "bridgingLook");
     form_.cmdCancel.Caption = bridging ? "disconnect" : "cancel";
     form_.cmdConnect.Enabled = !bridging;
     for (Control* field :
@@ -130,6 +141,7 @@ void ServerDialog::bridgingLook(bool bridging) {
 }
 
 void ServerDialog::cmdConnect_Click() {
+    const CallScope call(log_, kComponent, kClass, "cmdConnect_Click");
     services_.events.cancel(retry_);
     retry_ = 0;
     form_.cmdConnect.Enabled = false;
@@ -141,6 +153,7 @@ void ServerDialog::cmdConnect_Click() {
 }
 
 void ServerDialog::cmdCancel_Click() {
+    const CallScope call(log_, kComponent, kClass, "cmdCancel_Click");
     services_.events.cancel(retry_);
     retry_ = 0;
     if (bridge_.bridging()) {
@@ -156,6 +169,7 @@ void ServerDialog::cmdCancel_Click() {
 }
 
 void ServerDialog::Form_QueryUnload(int& cancel) {
+    const CallScope call(log_, kComponent, kClass, "Form_QueryUnload");
     const BoxAnswer answer =
         services_.boxes.show({BoxIcon::Question,
                               std::string("Are you sure you want to close ZELRemote Server") +
@@ -174,6 +188,7 @@ void ServerDialog::Form_QueryUnload(int& cancel) {
 }
 
 void ServerDialog::lost() {
+    const CallScope call(log_, kComponent, kClass, "lost");
     bridgingLook(false);
     if (panel_.UtilityStartup.Checked) {
         retry_ = services_.events.schedule(kRetryMs, [this] { tryAgain(); });
@@ -185,6 +200,7 @@ void ServerDialog::lost() {
 
 // Nobody may be there to close a box, so that a failed try is only written down.
 void ServerDialog::tryAgain() {
+    const CallScope call(log_, kComponent, kClass, "tryAgain");
     retry_ = 0;
     if (bridge_.bridging() || bridge_.connecting()) return;
     const bool ok = bridge_.connect(true);

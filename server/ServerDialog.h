@@ -23,7 +23,7 @@ class ServerDialog {
     };
     /// Connects the form's events and buttons.
     ServerDialog(Forms& forms, ServerBridge& bridge, const ServerSocket& TCPSocket,
-                 const Means& means, const Session& services);
+                 const Means& means, const Session& services, RootDebug& log);
     ~ServerDialog();
     ServerDialog(const ServerDialog&) = delete;
     ServerDialog& operator=(const ServerDialog&) = delete;
@@ -50,6 +50,7 @@ class ServerDialog {
     const ServerSocket& socket_;
     Means means_;
     Session services_;
+    RootDebug& log_;
     TaskId retry_ = 0;
     Handlers handlers_;
 };

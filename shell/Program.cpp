@@ -151,11 +151,11 @@ struct Program::Rooms {
           tcpDialog(forms, instrument, sessionStart, p.tcpSocket, p.settings, session),
           disconnection(forms, instrument, p.tcpSocket, sessionClock, graph, interlock),
           dialling(forms, instrument, dialog, sessionStart, disconnection, session),
-          devices(forms, p.serialPort, p.serialPorts, p.folder, p.clock, p.events, boxes),
+          devices(forms, p.serialPort, p.serialPorts, {p.folder, p.files}, session),
           remote(panel, exchange, interlock),
-          bridge(panel, forms.server, p.serverPort, p.serverSocket, session),
+          bridge(panel, forms.server, p.serverPort, p.serverSocket, session, logs.rootDebug),
           serverDialog(forms, bridge, p.serverSocket, {p.serialPorts, p.settings, p.clipboard},
-                       session),
+                       session, logs.rootDebug),
           serverMode(forms, p.startup, p.events),
           startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
           second(panel, bridge, sessionClock),
@@ -195,6 +195,7 @@ struct Program::Rooms {
         endedBy = signal;
         line.Ending = true;
         disconnection.endAtOnce();
+        bridge.disconnect();
         end.end();
     }
 

@@ -1,6 +1,8 @@
 #include "desktop/platform/QtSerialPort.h"
 
 #include <poll.h>
+#include <sys/ioctl.h>
+#include <termios.h>
 #include <unistd.h>
 
 #include <QFileInfo>
@@ -12,6 +14,17 @@ namespace {
 
 constexpr qint64 kMostBuffered = 1 << 20;  // bytes that nobody takes
 constexpr int kDataReceived = 2;
+constexpr int kWriteMs = 10'000;
+constexpr int kDrainMs = 250;
+constexpr int kDrainStepMs = 5;
+
+/// Adds XON/XOFF to the lines RTS and CTS; a port that cannot do both stays at these.
+void addSoftwareControl(int descriptor) {
+    termios settings{};
+    if (::tcgetattr(descriptor, &settings) != 0) return;
+    settings.c_iflag |= IXON | IXOFF;
+    ::tcsetattr(descriptor, TCSANOW, &settings);
+}
 
 /// "COM3" is the third port of the mainboard here; any other name stands for itself.
 QString deviceOf(const std::string& name) {
@@ -38,6 +51,13 @@ QtSerialPort::QtSerialPort(QtEvents& events, bool quick) : events_(events) {
                              error == QSerialPort::ReadError || error == QSerialPort::WriteError)
                              lost();
                      });
+    writing_.setSingleShot(true);
+    writing_.setInterval(kWriteMs);
+    QObject::connect(&port_, &QSerialPort::bytesWritten, &writing_,
+                     [this] { port_.bytesToWrite() > 0 ? writing_.start() : writing_.stop(); });
+    QObject::connect(&writing_, &QTimer::timeout, &writing_, [this] {
+        if (port_.isOpen()) port_.clear(QSerialPort::Output);
+    });
     if (!quick) return;
     source_ = events_.addSource(
         {[this] { return port_.isOpen() ? static_cast<int>(port_.handle()) : -1; },
@@ -79,6 +99,7 @@ bool QtSerialPort::open(const SerialSetup& setup) {
     port_.setStopBits(QSerialPort::OneStop);
     port_.setFlowControl(setup.Handshaking == 0 ? QSerialPort::NoFlowControl
                                                 : QSerialPort::HardwareControl);
+    if (setup.Handshaking != 0) addSoftwareControl(static_cast<int>(port_.handle()));
     if (!isNumber || !port_.setBaudRate(baud)) {
         port_.close();
         problem_ = name_ + " does not take the baud rate " + setup.Settings.substr(0, 20) + ".";
@@ -92,7 +113,21 @@ bool QtSerialPort::open(const SerialSetup& setup) {
 
 void QtSerialPort::close() {
     problem_.clear();
-    if (port_.isOpen()) port_.close();
+    writing_.stop();
+    if (!port_.isOpen()) return;
+    letDrain();
+    port_.close();
+}
+
+// A line that is held up would keep the system in the close for half a minute.
+void QtSerialPort::letDrain() const {
+    const auto descriptor = static_cast<int>(port_.handle());
+    int waiting = 0;
+    for (int ms = 0; ms < kDrainMs; ms += kDrainStepMs) {
+        if (::ioctl(descriptor, TIOCOUTQ, &waiting) != 0 || waiting == 0) return;
+        ::usleep(kDrainStepMs * 1000);
+    }
+    ::tcflush(descriptor, TCOFLUSH);
 }
 
 void QtSerialPort::lost() {
@@ -138,6 +173,7 @@ void QtSerialPort::output(std::string_view bytes) {
     if (bytes.empty()) return;
     port_.write(bytes.data(), static_cast<qint64>(bytes.size()));
     port_.flush();
+    if (port_.bytesToWrite() > 0 && !writing_.isActive()) writing_.start();
 }
 
 std::vector<std::string> QtSerialPortList::names() {

@@ -3,6 +3,7 @@
 
 #include <QByteArray>
 #include <QSerialPort>
+#include <QTimer>
 #include <string>
 
 #include "desktop/platform/QtEvents.h"
@@ -22,17 +23,22 @@ class QtSerialPort : public SerialPort {
     std::string input() override;
     void output(std::string_view bytes) override;
     std::string problem() const override { return problem_; }
+    /// What the line does not take within this time is dropped: a far end that holds the line up
+    /// must not hold up the program. 10 s at first.
+    void setWriteTimeout(int ms) { writing_.setInterval(ms); }
     std::size_t bytesToWrite() const override {
         return static_cast<std::size_t>(port_.bytesToWrite());
     }
 
   private:
     bool hungUp() const;
+    void letDrain() const;
     void lost();
     std::string openProblem() const;
 
     QtEvents& events_;
     QSerialPort port_;
+    QTimer writing_;  ///< runs while bytes wait for the line
     std::string name_;
     std::string problem_;
     int source_ = 0;

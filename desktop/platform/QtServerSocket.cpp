@@ -1,16 +1,18 @@
 #include "desktop/platform/QtServerSocket.h"
 
-#include <QFile>
 #include <QHostAddress>
 #include <QNetworkInterface>
-#include <QSslCertificate>
-#include <QSslKey>
 #include <QSslSocket>
+#include <QTimer>
+
+#include "desktop/platform/Tls.h"
 
 namespace zel {
 namespace {
 
 constexpr int kMostRequests = 16;
+constexpr int kProofMs = 10'000;
+constexpr qint64 kMostOfProof = 64 * 1024;  // bytes of TLS before a client is let in
 
 QString plainAddress(QHostAddress address) {
     // An address of the old kind at a port that takes both comes as "::ffff:A.B.C.D".
@@ -49,21 +51,58 @@ QtServerSocket::~QtServerSocket() { close(); }
 void QtServerSocket::knocked(QTcpSocket* socket) {
     // Nothing is read of who has not been let in.
     socket->setReadBufferSize(1);
-    if (requests_.size() >= kMostRequests) {
-        socket->abort();
-        socket->deleteLater();
-        return;
-    }
-    requests_[++lastRequest_] = socket;
-    const int request = lastRequest_;
+    // Who is slow to prove himself does not keep others out.
+    if (requests_.size() >= kMostRequests)
+        proofFailed(requests_.begin()->first, "Too many wait to be let in.");
+    const int request = ++lastRequest_;
+    requests_[request] = {socket, plainAddress(socket->peerAddress()).toStdString()};
     ConnectionRequest(request);
-    refuse(request);  // whom nobody has let in by now
+    const auto left = requests_.find(request);
+    // Whom nobody has let in by now.
+    if (left != requests_.end() && left->second.proof == Proof::None) refuse(request);
+}
+
+bool QtServerSocket::prove(int requestId) {
+    const auto found = requests_.find(requestId);
+    if (!tls_ || found == requests_.end() || found->second.proof != Proof::None) return false;
+    auto* secured = qobject_cast<QSslSocket*>(found->second.socket);
+    if (secured == nullptr) return false;
+    found->second.proof = Proof::Running;
+    secured->setReadBufferSize(kMostOfProof);
+    secured->setSslConfiguration(configuration_);
+    QObject::connect(secured, &QSslSocket::encrypted, secured,
+                     [this, requestId] { proved(requestId); });
+    QObject::connect(secured, &QSslSocket::errorOccurred, secured, [this, requestId, secured] {
+        proofFailed(requestId, secured->errorString().toStdString() + ".");
+    });
+    QTimer::singleShot(kProofMs, secured, [this, requestId] {
+        proofFailed(requestId, "The TLS handshake took too long.");
+    });
+    secured->startServerEncryption();
+    return true;
+}
+
+void QtServerSocket::proved(int requestId) {
+    const auto found = requests_.find(requestId);
+    if (found == requests_.end() || found->second.proof != Proof::Running) return;
+    found->second.proof = Proof::Given;
+    found->second.socket->disconnect();
+    ConnectionRequest(requestId);
+    refuse(requestId);
+}
+
+void QtServerSocket::proofFailed(int requestId, const std::string& reason) {
+    const auto found = requests_.find(requestId);
+    if (found == requests_.end() || found->second.proof != Proof::Running) return;
+    found->second.socket->disconnect();
+    ProofFailed(requestId, reason);
+    refuse(requestId);
 }
 
 QTcpSocket* QtServerSocket::take(int requestId) {
     const auto found = requests_.find(requestId);
     if (found == requests_.end()) return nullptr;
-    QTcpSocket* socket = found->second;
+    QTcpSocket* socket = found->second.socket;
     requests_.erase(found);
     return socket;
 }
@@ -109,45 +148,21 @@ std::string QtServerSocket::localIP() const {
 }
 
 std::string QtServerSocket::useTls(const TlsFiles& files) {
-    const auto path = [](const std::string& name) { return QString::fromStdString(name); };
-    if (!QSslSocket::supportsSsl()) return "This system has no TLS.";
-    const QList<QSslCertificate> chain = QSslCertificate::fromPath(path(files.certificate));
-    if (chain.isEmpty()) return files.certificate + " holds no certificate in PEM form.";
-    QFile keyFile(path(files.key));
-    if (!keyFile.open(QIODevice::ReadOnly)) return files.key + " cannot be read.";
-    const QByteArray bytes = keyFile.readAll();
-    QSslKey key(bytes, QSsl::Rsa);
-    if (key.isNull()) key = QSslKey(bytes, QSsl::Ec);
-    if (key.isNull()) return files.key + " holds no private key in PEM form.";
-    configuration_ = QSslConfiguration::defaultConfiguration();
-    configuration_.setLocalCertificateChain(chain);
-    configuration_.setPrivateKey(key);
-    configuration_.setProtocol(QSsl::TlsV1_2OrLater);
-    configuration_.setPeerVerifyMode(QSslSocket::VerifyNone);
-    if (!files.clients.empty()) {
-        const QList<QSslCertificate> known = QSslCertificate::fromPath(path(files.clients));
-        if (known.isEmpty()) return files.clients + " holds no certificate in PEM form.";
-        configuration_.setCaCertificates(known);
-        configuration_.setPeerVerifyMode(QSslSocket::VerifyPeer);
-    }
+    std::string problem = serverTls(files, configuration_);
+    if (!problem.empty()) return problem;
     tls_ = true;
     return {};
 }
 
 std::string QtServerSocket::peer(int requestId) const {
     const auto found = requests_.find(requestId);
-    if (found == requests_.end()) return {};
-    return plainAddress(found->second->peerAddress()).toStdString();
+    return found == requests_.end() ? std::string() : found->second.peer;
 }
 
 void QtServerSocket::accept(int requestId) {
     QTcpSocket* socket = take(requestId);
     if (socket == nullptr) return;
     client_.letIn(socket);
-    if (auto* secured = qobject_cast<QSslSocket*>(socket); secured != nullptr) {
-        secured->setSslConfiguration(configuration_);
-        secured->startServerEncryption();
-    }
 }
 
 void QtServerSocket::refuse(int requestId) {

@@ -27,15 +27,24 @@ class QtServerSocket : public ServerSocket {
     void accept(int requestId) override;
     void refuse(int requestId) override;
     Socket& client() override { return client_; }
+    bool prove(int requestId) override;
 
   private:
     class Listener;
+    enum class Proof { None, Running, Given };
+    struct Request {
+        QTcpSocket* socket;
+        std::string peer;
+        Proof proof = Proof::None;
+    };
     void knocked(QTcpSocket* socket);
     QTcpSocket* take(int requestId);
+    void proved(int requestId);
+    void proofFailed(int requestId, const std::string& reason);
 
     std::unique_ptr<Listener> listener_;
     QtSocket client_;
-    std::map<int, QTcpSocket*> requests_;
+    std::map<int, Request> requests_;
     int lastRequest_ = 0;
     int port_ = 0;
     bool failed_ = false;

@@ -5,11 +5,11 @@
 #include <poll.h>
 #include <sys/socket.h>
 
-#include <QFile>
 #include <QSslCertificate>
 #include <QSslConfiguration>
-#include <QSslKey>
 #include <QSslSocket>
+
+#include "desktop/platform/Tls.h"
 
 namespace zel {
 namespace {
@@ -27,25 +27,6 @@ void keepAlive(QTcpSocket& socket) {
     ::setsockopt(descriptor, IPPROTO_TCP, TCP_KEEPIDLE, &idle, sizeof idle);
     ::setsockopt(descriptor, IPPROTO_TCP, TCP_KEEPINTVL, &between, sizeof between);
     ::setsockopt(descriptor, IPPROTO_TCP, TCP_KEEPCNT, &times, sizeof times);
-}
-
-/// Authorities and a certificate of one's own come from files that the environment names.
-QSslConfiguration clientConfiguration() {
-    QSslConfiguration configuration = QSslConfiguration::defaultConfiguration();
-    configuration.setProtocol(QSsl::TlsV1_2OrLater);
-    const QString authorities = qEnvironmentVariable("ZELREMOTE_TLS_CA");
-    if (!authorities.isEmpty())
-        configuration.setCaCertificates(QSslCertificate::fromPath(authorities));
-    const QString own = qEnvironmentVariable("ZELREMOTE_TLS_CERTIFICATE");
-    QFile keyFile(qEnvironmentVariable("ZELREMOTE_TLS_KEY"));
-    if (!own.isEmpty() && keyFile.open(QIODevice::ReadOnly)) {
-        const QByteArray bytes = keyFile.readAll();
-        QSslKey key(bytes, QSsl::Rsa);
-        if (key.isNull()) key = QSslKey(bytes, QSsl::Ec);
-        configuration.setLocalCertificateChain(QSslCertificate::fromPath(own));
-        configuration.setPrivateKey(key);
-    }
-    return configuration;
 }
 
 }  // namespace
@@ -70,34 +51,48 @@ void QtSocket::adopt(QTcpSocket* socket) {
     secured_ = qobject_cast<QSslSocket*>(socket);
     socket_->setParent(nullptr);
     socket_->setReadBufferSize(kMostBuffered);
-    QObject::connect(socket, &QTcpSocket::readyRead, socket, [this] { DataArrival(); });
+    QObject::connect(socket, &QTcpSocket::readyRead, socket, [this] {
+        received_ = true;
+        DataArrival();
+    });
     QObject::connect(socket, &QTcpSocket::connected, socket, [socket] { keepAlive(*socket); });
     QObject::connect(socket, &QTcpSocket::disconnected, socket, [this] {
         peerClosed_ = true;
         PeerClosed();
     });
-    QObject::connect(socket, &QTcpSocket::errorOccurred, socket,
-                     [this, socket](QAbstractSocket::SocketError error) {
-                         if (error == QAbstractSocket::SocketTimeoutError) return;
-                         if (problem_.empty()) problem_ = socket->errorString().toStdString() + ".";
-                         // An end before the connection is a failure of it.
-                         const bool stood =
-                             secured_ != nullptr
-                                 ? secured_->isEncrypted()
-                                 : socket->state() != QAbstractSocket::ConnectingState;
-                         if (error == QAbstractSocket::RemoteHostClosedError && stood) {
-                             peerClosed_ = true;
-                         } else {
-                             failed_ = true;
-                             problem_ = socket_->errorString().toStdString();
-                         }
-                     });
+    QObject::connect(
+        socket, &QTcpSocket::errorOccurred, socket,
+        [this, socket](QAbstractSocket::SocketError error) { brokeBy(error, *socket); });
+}
+
+void QtSocket::brokeBy(QAbstractSocket::SocketError error, const QTcpSocket& socket) {
+    if (error == QAbstractSocket::SocketTimeoutError || failed_) return;
+    const bool stood = secured_ != nullptr ? secured_->isEncrypted()
+                                           : socket.state() != QAbstractSocket::ConnectingState;
+    const bool peerClosed = error == QAbstractSocket::RemoteHostClosedError;
+    // The server looks at the certificate of a client when that takes the connection to stand.
+    if (secured_ != nullptr && stood && !received_ && clientEnd_) {
+        failed_ = true;
+        problem_ =
+            "The server closed the connection after the TLS handshake. It may let in only "
+            "clients that show a certificate of its authority.";
+        return;
+    }
+    problem_ = secured_ != nullptr && !peerClosed ? tlsProblem(*secured_, secured_->peerName())
+                                                  : socket.errorString().toStdString() + ".";
+    // An end before the connection is a failure of it.
+    failed_ = !(peerClosed && stood);
+    peerClosed_ = !failed_;
 }
 
 void QtSocket::letIn(QTcpSocket* socket) {
     close();
     adopt(socket);
     keepAlive(*socket);
+    // What came with the end of the handshake has no event of its own any more.
+    if (socket->bytesAvailable() > 0)
+        QMetaObject::invokeMethod(
+            socket, [this] { DataArrival(); }, Qt::QueuedConnection);
 }
 
 void QtSocket::connectTo(const std::string& host, int port) {
@@ -108,14 +103,16 @@ void QtSocket::connectTo(const std::string& host, int port) {
 
 void QtSocket::connectTls(const std::string& host, int port, const std::string& pinned) {
     close();
-    if (!QSslSocket::supportsSsl()) {
-        problem_ = "This system has no TLS.";
+    QSslConfiguration configuration;
+    problem_ = clientTls(configuration);
+    if (!problem_.empty()) {
         failed_ = true;
         return;
     }
     auto* socket = new QSslSocket;
     adopt(socket);
-    socket->setSslConfiguration(clientConfiguration());
+    clientEnd_ = true;
+    socket->setSslConfiguration(configuration);
     // A pinned certificate needs no authority; it is looked at when the connection stands.
     if (!pinned.empty()) socket->setPeerVerifyMode(QSslSocket::QueryPeer);
     QObject::connect(socket, &QSslSocket::encrypted, socket,
@@ -146,8 +143,7 @@ void QtSocket::close() {
         socket_.release()->deleteLater();
     }
     secured_ = nullptr;
-    problem_.clear();
-    failed_ = peerClosed_ = false;
+    failed_ = peerClosed_ = received_ = clientEnd_ = false;
     problem_.clear();
 }
 

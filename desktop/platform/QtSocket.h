@@ -33,6 +33,7 @@ class QtSocket : public Socket {
   private:
     void adopt(QTcpSocket* socket);
     void judgeCertificate(QSslSocket& socket, const std::string& pinned);
+    void brokeBy(QAbstractSocket::SocketError error, const QTcpSocket& socket);
     void fetch();
     bool usable() const;
 
@@ -42,6 +43,8 @@ class QtSocket : public Socket {
     bool failed_ = false;
     std::string problem_;  ///< of the failure
     bool peerClosed_ = false;
+    bool received_ = false;   ///< anything since the connection stands
+    bool clientEnd_ = false;  ///< of a TLS connection
     int source_ = 0;
 };
 

@@ -31,6 +31,16 @@ class ScriptedServer : public ServerSocket {
     }
     /// The next listens fail, with that reason.
     void failListen(std::string why) { failure_ = std::move(why); }
+    /// Who knocks from now on has something to prove first.
+    void wantProof() { wantsProof_ = true; }
+    void givesProof(int requestId) {
+        proved_.insert(requestId);
+        ConnectionRequest(requestId);
+    }
+    void failsProof(int requestId, const std::string& reason) {
+        ProofFailed(requestId, reason);
+        refuse(requestId);
+    }
     void setState(SocketState state) { state_ = state; }
     void setLocalIP(std::string address) { localIP_ = std::move(address); }
     /// The requests that were turned away.
@@ -56,6 +66,7 @@ class ScriptedServer : public ServerSocket {
         const auto found = waiting_.find(requestId);
         return found == waiting_.end() ? std::string() : found->second;
     }
+    bool prove(int requestId) override { return wantsProof_ && !proved_.contains(requestId); }
     void accept(int requestId) override {
         if (waiting_.erase(requestId) == 0) return;
         client_.close();
@@ -72,6 +83,8 @@ class ScriptedServer : public ServerSocket {
     SocketState state_ = SocketState::Closed;
     std::map<int, std::string> waiting_;
     std::set<int> refused_;
+    std::set<int> proved_;
+    bool wantsProof_ = false;
     std::set<TaskId> tasks_;
     std::string address_;
     int port_ = 0;

@@ -1,8 +1,5 @@
 #include <gtest/gtest.h>
 
-#include <filesystem>
-#include <fstream>
-
 #include "connection/Devices.h"
 #include "tests/connection/Bench.h"
 
@@ -13,25 +10,15 @@ struct DevicesTest : Connection {
     DevicesChoiceForm& form = forms.devicesChoice;
 
     DevicesTest() {
-        folder_ = std::filesystem::temp_directory_path() /
-                  ("devices-" +
-                   std::string(::testing::UnitTest::GetInstance()->current_test_info()->name()));
-        std::filesystem::create_directories(folder_);
-        platform.folder.folder = folder_.string();
+        platform.folder.folder = "/app";
         settings(
             "[devices]\nINIT1 = Modem, \"old\"\ninit2=Phone\nINIT3=1\nINIT4=never\n"
             "[Modem, \"old\"]\nINIT1=AT&F\nINIT2 = ATS0=0;E0\nINIT3=AT&W\n"
             "[Phone]\nINIT1=AT+CGATT=1\nINIT2=AT&W0\n");
     }
-    ~DevicesTest() override { std::filesystem::remove_all(folder_); }
 
-    void settings(const std::string& text) {
-        std::ofstream(folder_ / "settings.ini", std::ios::binary) << text;
-    }
+    void settings(const std::string& text) { platform.files.put("/app/settings.ini", text); }
     bool configure(const std::string& name) { return program.configureDevice(name, "COM3", 9600); }
-
-  private:
-    std::filesystem::path folder_;
 };
 
 TEST_F(DevicesTest, Names_AreReadToTheFirstNumber1) {
@@ -41,6 +28,13 @@ TEST_F(DevicesTest, Names_AreReadToTheFirstNumber1) {
 TEST_F(DevicesTest, FileWithoutTheSection_GivesNone) {
     settings("[Other]\nINIT1=x\n");
     EXPECT_EQ(program.deviceNames(), Texts{"NONE"});
+}
+
+TEST_F(DevicesTest, FileThatCannotBeRead_IsToldAndGivesNone) {
+    platform.files.refuse("/app/settings.ini", "Permission denied");
+    EXPECT_EQ(program.deviceNames(), Texts{"NONE"});
+    EXPECT_EQ(shown(), Texts{"warning | ZELRemote | The file /app/settings.ini cannot be read: "
+                             "Permission denied"});
 }
 
 TEST_F(DevicesTest, MenuEntry_FillsTheDialog) {

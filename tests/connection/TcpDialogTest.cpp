@@ -111,6 +111,28 @@ TEST_F(TcpDialogTest, Failure_IsToldWithItsReason) {
     EXPECT_EQ(tcp.lblReason.Caption.get(), "Connection refused.");
 }
 
+TEST_F(TcpDialogTest, Failure_IsToldInTheDialogOrByABoxAndNeverTwice) {
+    socket.connectsTo(SocketState::Error);
+    socket.setProblem("Connection refused.");
+    tcp.Show();
+    tcp.ConnectTCPButton.Click();
+    EXPECT_EQ(shown(), Texts{});
+    EXPECT_EQ(tcp.lblReason.Caption.get(), "Connection refused.");
+    tcp.Hide();
+    tcp.ConnectTCPButton.Click();
+    ASSERT_EQ(shown().size(), 1U);
+    EXPECT_NE(shown().front().find(" failed: Connection refused."), std::string::npos);
+}
+
+TEST_F(TcpDialogTest, ServerThatClosesAtOnce_IsToldWithWhatItMayMean) {
+    socket.expect("\r").silence();
+    later(100, [this] { socket.peerCloses(); });
+    EXPECT_LE(time([this] { tcp.ConnectTCPButton.Click(); }), 300);
+    EXPECT_EQ(shown(), Texts{"information | No ZEL3 found | No M&T ZEL3 found at the specified "
+                             "adress!"});
+    EXPECT_EQ(tcp.AdviceLabel.Caption.get().find("The server closed the connection."), 0U);
+}
+
 TEST_F(TcpDialogTest, Close_EndsTheConnectingAndTheProbeWithoutABox) {
     socket.connectsTo(SocketState::Connecting);
     later(500, [this] { tcp.QuitTCPButton.Click(); });

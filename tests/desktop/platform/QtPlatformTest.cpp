@@ -118,6 +118,33 @@ TEST_F(OnQt, FarEndThatCloses_ClosesThePortAndSaysSo) {
     platform.serialPort.output("nothing happens");
 }
 
+TEST_F(OnQt, LineThatTakesNothing_IsGivenUpAndClosedAtOnce) {
+    const Terminal line;
+    ASSERT_TRUE(openPort(line.path));
+    platform.serialPort.setWriteTimeout(50);
+    platform.serialPort.output(std::string(200'000, 'x'));
+    EXPECT_GT(platform.serialPort.bytesToWrite(), 0U);
+    for (int i = 0; i < 50 && platform.serialPort.bytesToWrite() > 0; ++i) platform.events.wait(20);
+    EXPECT_EQ(platform.serialPort.bytesToWrite(), 0U);
+    EXPECT_TRUE(platform.serialPort.isOpen());
+    const std::int64_t before = platform.clock.micros();
+    platform.serialPort.close();
+    EXPECT_LT(platform.clock.micros() - before, 2'000'000);
+}
+
+TEST_F(OnQt, BothHandshakes_AreAskedOfThePort) {
+    const Terminal line;
+    SerialSetup setup;
+    setup.CommPort = line.path;
+    setup.Settings = "57600,N,8,1";
+    setup.Handshaking = 3;
+    ASSERT_TRUE(platform.serialPort.open(setup)) << platform.serialPort.problem();
+    termios settings{};
+    ASSERT_EQ(tcgetattr(line.master, &settings), 0);
+    EXPECT_EQ(settings.c_iflag & (IXON | IXOFF), static_cast<tcflag_t>(IXON | IXOFF));
+    EXPECT_EQ(settings.c_cflag & CRTSCTS, static_cast<tcflag_t>(CRTSCTS));
+}
+
 TEST_F(OnQt, PortThatIsNotThere_IsNamed) {
     EXPECT_FALSE(openPort("/dev/zel3-is-not-here"));
     EXPECT_EQ(platform.serialPort.problem(),
