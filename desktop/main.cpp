@@ -20,6 +20,7 @@ namespace {
 
 bool saveWindow(zel::MainWindow& window, const std::string& file) {
     window.showNow();
+    QApplication::processEvents();
     if (window.grab().save(QString::fromStdString(file))) return true;
     std::cerr << "zelremote: cannot write " << file << '\n';
     return false;
@@ -53,6 +54,9 @@ int main(int argc, char** argv) {
         QApplication::exit(result);
     });
     zel::MainWindow window(program);
+    window.useSettings(platform.settings);
+    platform.launcher.ready = [&] { window.simulatorReady(platform.launcher.link()); };
+    platform.launcher.ended = [&](const QString& why) { window.simulatorEnded(why); };
     window.addThemeMenu(theme, [&](zel::ThemeChoice choice) {
         zel::applyTheme(application, choice);
         platform.settings.set("ZELRemote", "Desktop", "Theme",

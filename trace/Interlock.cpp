@@ -136,6 +136,17 @@ bool Interlock::refuses(const Control& control) const {
                                                 [this](Rule rule) { return refuses(rule); });
 }
 
+std::string Interlock::reasonAgainst(const Control& control) const {
+    const auto found = rules_.find(&control);
+    if (found == rules_.end()) return {};
+    for (const Rule rule : found->second) {
+        if (met(rule)) continue;
+        for (const Words& words : kWords)
+            if (words.rule == rule) return words.text;
+    }
+    return {};
+}
+
 bool Interlock::anyUnmet(const Control& control) const {
     const auto found = rules_.find(&control);
     return found != rules_.end() && std::any_of(found->second.begin(), found->second.end(),

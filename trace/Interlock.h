@@ -46,6 +46,9 @@ class Interlock {
     /// The same for all rules of a control, in their order: one box.
     bool refuses(const Control& control) const;
 
+    /// The words in which a control would refuse at this moment; empty while it would act.
+    std::string reasonAgainst(const Control& control) const;
+
     /// For what a user does to a control at this moment.
     Turn turnOf(const Control& control) const;
     /// Runs the act of a user now or when its turn comes; then a control that is hidden or

@@ -74,6 +74,10 @@ QObject* Binder::widgetOf(const Control& control) const {
     return found == entries_.end() ? nullptr : found->second.widget;
 }
 
+QString Binder::reasonFor(const Control& control) const {
+    return reasonAgainst ? text(reasonAgainst(control)).replace("\r\n", "\n") : QString();
+}
+
 void Binder::markDirty(const void* key) {
     dirty_.insert(key);
     if (!frame_.isActive()) frame_.start(kFrameMs);
@@ -119,7 +123,8 @@ void Binder::describe(const Control& control, QWidget* widget) {
     const std::string& own = control.ToolTip;
     const QString words = own.empty() ? toolTipOf(control) : text(own);
     const QString keys = shortcutOf(control);
-    const QString tip = keys.isEmpty() ? words : words + " (" + keys + ")";
+    QString tip = keys.isEmpty() ? words : words + " (" + keys + ")";
+    if (const QString reason = reasonFor(control); !reason.isEmpty()) tip += "\n" + reason;
     if (widget->toolTip() == tip && !widget->accessibleName().isEmpty()) return;
     widget->setToolTip(tip);
     widget->setAccessibleName(words.isEmpty() ? text(control.name()) : words);
@@ -129,9 +134,9 @@ void Binder::bind(Button& control, QPushButton* widget) {
     widget->installEventFilter(new KeyTeller(control, widget));
     connect(widget, &QPushButton::clicked, this,
             [this, &control] { act(control, [&control] { control.Click(); }); });
-    follow(control, widget, [&control, widget] {
+    follow(control, widget, [this, &control, widget] {
         widget->setText(caption(control.Caption));
-        widget->setEnabled(control.Enabled && hasHandler(control));
+        widget->setEnabled(control.Enabled && hasHandler(control) && usable(control));
         widget->setVisible(control.Visible);
         QString face = faceOf(control.BackColor);
         const std::string& picture = control.Picture;
@@ -156,14 +161,14 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
         // A paste does not come by the keys; it edits the text, which then is to stay.
         if (!widget->typing()) control.KeyDown(kKeyRight, 0);
     });
-    follow(control, widget, [&control, widget] {
+    follow(control, widget, [this, &control, widget] {
         const QString shown = text(control.Text);
         if (widget->text() != shown) {
             const QSignalBlocker quiet(widget);
             widget->setText(shown);
         }
         widget->setReadOnly(control.Locked);
-        widget->setEnabled(control.Enabled);
+        widget->setEnabled(control.Enabled && usable(control));
         widget->setVisible(control.Visible);
         setFace(widget, control.Locked ? "locked" : "entry");
         const Color ink = control.ForeColor;
@@ -190,10 +195,10 @@ void Binder::bind(CheckBox& control, QCheckBox* widget) {
         widget->setChecked(control.Value());
         markDirty(&control);
     });
-    follow(control, widget, [&control, widget] {
+    follow(control, widget, [this, &control, widget] {
         widget->setText(caption(control.Caption));
         widget->setChecked(control.Value());
-        widget->setEnabled(control.Enabled && hasHandler(control));
+        widget->setEnabled(control.Enabled && hasHandler(control) && usable(control));
         widget->setVisible(control.Visible);
     });
 }
@@ -206,10 +211,10 @@ void Binder::bind(OptionButton& control, QRadioButton* widget) {
         widget->setChecked(control.Value());
         markDirty(&control);
     });
-    follow(control, widget, [&control, widget] {
+    follow(control, widget, [this, &control, widget] {
         widget->setText(caption(control.Caption));
         widget->setChecked(control.Value());
-        widget->setEnabled(control.Enabled);
+        widget->setEnabled(control.Enabled && usable(control));
         widget->setVisible(control.Visible);
     });
 }
@@ -230,7 +235,7 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
             control.setText(typed.toStdString());
         });
     }
-    follow(control, widget, [&control, widget] {
+    follow(control, widget, [this, &control, widget] {
         const QSignalBlocker quiet(widget);
         QStringList items;
         for (const std::string& item : control.items()) items << text(item);
@@ -243,7 +248,7 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
         widget->setCurrentIndex(control.ListIndex());
         if (control.editable() && widget->currentText() != text(control.Text()))
             widget->setEditText(text(control.Text()));
-        widget->setEnabled(control.Enabled);
+        widget->setEnabled(control.Enabled && usable(control));
         widget->setVisible(control.Visible);
         setFace(widget, control.Locked ? "locked" : "entry");
     });
@@ -295,6 +300,36 @@ void Binder::bind(MenuItem& control, QAction* action) {
         action->setCheckable(control.Checked);
         action->setChecked(control.Checked);
     });
+}
+
+template <class T>
+void Binder::addTwin(T& control, QAction* action, std::function<void()> show) {
+    connect(action, &QAction::triggered, this, [this, &control] {
+        act(control, [&control] { control.Click(); });
+        markDirty(&control);
+    });
+    const auto found = entries_.find(&control);
+    if (found == entries_.end()) return;
+    found->second.show = [this, &control, action, first = std::move(found->second.show),
+                          then = std::move(show)] {
+        first();
+        const QString reason = reasonFor(control);
+        QString tip = toolTipOf(control);
+        if (tip.isEmpty()) tip = text(control.Caption);
+        if (const QString keys = shortcutOf(control); !keys.isEmpty()) tip += " (" + keys + ")";
+        action->setToolTip(reason.isEmpty() ? tip : tip + "\n" + reason);
+        action->setEnabled(control.Enabled && hasHandler(control) && reason.isEmpty());
+        if (then) then();
+    };
+    markDirty(&control);
+}
+
+void Binder::twin(Button& control, QAction* action, std::function<void()> show) {
+    addTwin(control, action, std::move(show));
+}
+
+void Binder::twin(MenuItem& control, QAction* action, std::function<void()> show) {
+    addTwin(control, action, std::move(show));
 }
 
 void Binder::bindShow(Control& control, QWidget* widget, std::function<void()> show) {

@@ -40,6 +40,10 @@ class Binder : public QObject {
     void bind(Slider& control, QSlider* widget);
     void bind(Frame& control, QWidget* widget, QLabel* caption);
     void bind(MenuItem& control, QAction* action);
+    /// A second way to a control that has its widget: the action clicks the same control. `show`
+    /// runs after the action has taken over whether it can be used.
+    void twin(Button& control, QAction* action, std::function<void()> show = {});
+    void twin(MenuItem& control, QAction* action, std::function<void()> show = {});
     /// For controls that need a drawing of their own: `show` runs with the next frame after a
     /// change.
     void bindShow(Control& control, QWidget* widget, std::function<void()> show);
@@ -57,6 +61,9 @@ class Binder : public QObject {
     std::function<bool(const Control&)> refuses;
     /// Whether what a user does to a control waits for the end of what is under way.
     std::function<bool(const Control&)> defers;
+    /// Why a control would only show a box that refuses; empty while it works. Its widget is grey
+    /// meanwhile and has the reason in its tool tip.
+    std::function<std::string(const Control&)> reasonAgainst;
     /// Runs what a user does to a control, now or in its turn; at once where it is empty.
     std::function<void(const Control&, std::function<void()>)> perform;
     /// Whether the control was bound, for the tests.
@@ -65,6 +72,10 @@ class Binder : public QObject {
   private:
     void follow(Control& control, QObject* widget, std::function<void()> show);
     void markDirty(const void* key);
+    QString reasonFor(const Control& control) const;
+    bool usable(const Control& control) const { return reasonFor(control).isEmpty(); }
+    template <class T>
+    void addTwin(T& control, QAction* action, std::function<void()> show);
     void describe(const Control& control, QWidget* widget);
     bool refused(const Control& control) const;
     void act(const Control& control, std::function<void()> work) const;

@@ -20,6 +20,8 @@ class GraphWidget : public QCustomPlot {
     void refresh();
     /// Draws at once.
     void drawNow();
+    /// Both axes as they were before the user looked closer.
+    void wholeView() {}
     /// Where the trace is drawn, in pixels of the widget.
     QRect plotArea() const { return picture_->axisRect().rect(); }
 

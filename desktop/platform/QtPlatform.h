@@ -1,9 +1,9 @@
 #pragma once
 // The whole platform on Qt, in one bundle.
 
-#include "desktop/platform/DesktopLauncher.h"
 #include "desktop/platform/QtDialogs.h"
 #include "desktop/platform/QtSystem.h"
+#include "desktop/platform/SimulatorChild.h"
 #include "platform/Platform.h"
 
 namespace zel {
@@ -14,7 +14,7 @@ struct QtPlatform : QtSystem {
 
     QtMessageBoxes boxes;
     QtClipboard clipboard;
-    DesktopLauncher launcher;
+    SimulatorChild launcher;
     QtFileDialogs fileDialogs;
 
     Platform bundle() { return bundle(boxes, fileDialogs); }

@@ -1,16 +1,21 @@
 #pragma once
-// The panel's window: the graph and its readouts, the keys, the menus, the state of things.
+// The panel's window: the graph and its readouts, the keys, the tools, the menus, the state.
 
 #include <QMainWindow>
-#include <QProgressBar>
 #include <memory>
 #include <vector>
 
 #include "desktop/binders/Binder.h"
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/windows/FormWindow.h"
+#include "desktop/windows/GraphSide.h"
+#include "desktop/windows/PanelSide.h"
+#include "desktop/windows/RecentConnections.h"
+#include "desktop/windows/StatusLine.h"
 #include "desktop/windows/Terminators.h"
 #include "desktop/windows/Theme.h"
+#include "desktop/windows/ToolStrip.h"
+#include "desktop/windows/WindowMemory.h"
 #include "shell/Program.h"
 
 namespace zel {
@@ -20,35 +25,51 @@ class MainWindow : public QMainWindow {
     explicit MainWindow(Program& program);
     ~MainWindow() override;
 
-    GraphWidget& graph() { return *graph_; }
+    GraphWidget& graph() { return graphSide_->graph(); }
     Binder& binder() { return binder_; }
+    PanelSide& side() { return *side_; }
+    StatusLine& status() { return *status_; }
     /// A menu of the themes; `choose` hears each choice, after which all is drawn again.
     void addThemeMenu(ThemeChoice now, const std::function<void(ThemeChoice)>& choose);
+    /// Takes place, size, folded groups and the last connections from the settings, and keeps them.
+    void useSettings(SettingsStore& settings);
+    /// The simulated instrument is there, or is not: offers to connect, or says why not.
+    void simulatorReady(const QString& device);
+    void simulatorEnded(const QString& why);
     /// Shows everything as the forms have it, at once.
     void showNow();
+    void copyPicture();
 
   protected:
     void closeEvent(QCloseEvent* event) override;
     /// Digits that nobody took begin an entry.
     void keyPressEvent(QKeyEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
   private:
-    QWidget* graphSide();
-    void buildMenus();
-    void buildStatusLine();
+    void buildCentre();
+    void buildWindows();
+    void buildViewKeys();
+    void followState();
     void showState();
+    void greyWhatRefuses();
+    QString titleText() const;
+    void connectTo(const LinkAddress& address);
     void drawImage(const std::string& path, std::string& problem);
 
     Program& program_;
     ControllerForm& panel_;
     Binder binder_;
-    GraphWidget* graph_ = nullptr;
+    GraphSide* graphSide_ = nullptr;
+    PanelSide* side_ = nullptr;
     TerminatorRow* terminators_ = nullptr;
-    QLabel* state_ = nullptr;
-    QLabel* activity_ = nullptr;
-    QProgressBar* busy_ = nullptr;
+    StatusLine* status_ = nullptr;
+    ToolStrip* tools_ = nullptr;
     std::vector<std::unique_ptr<FormWindow>> windows_;
-    QTimer activityOff_;
+    std::unique_ptr<WindowMemory> memory_;
+    std::unique_ptr<RecentConnections> recent_;
+    int lockState_ = -1;
+    bool connectToSimulator_ = false;
 };
 
 }  // namespace zel

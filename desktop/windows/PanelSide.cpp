@@ -1,6 +1,5 @@
 #include "desktop/windows/PanelSide.h"
 
-#include <QFrame>
 #include <QGridLayout>
 #include <QHBoxLayout>
 #include <QVBoxLayout>
@@ -10,22 +9,21 @@
 namespace zel {
 namespace {
 
-constexpr int kSpacing = 5;
-constexpr int kTallest = 112;
-constexpr int kFieldWidth = 120;
+constexpr int kWithin = 4;  // pixels, between the parts of a group
+constexpr int kBetween = 5;
+constexpr int kTallestKey = 56;
+constexpr int kSoftKeyWidth = 116;
+constexpr int kOptionWidth = 16;  // without a text
+constexpr int kShortestSoftKey = 34;
+constexpr int kTallestSoftKey = 54;
+constexpr int kModesInARow = 3;
 constexpr int kLongestList = 16;  // no list of the panel is longer
-
-QFrame* group() {
-    auto* frame = new QFrame;
-    frame->setObjectName("group");
-    return frame;
-}
 
 template <class Layout>
 Layout* layoutOf(QWidget* widget) {
     auto* layout = new Layout(widget);
-    layout->setSpacing(kSpacing);
-    layout->setContentsMargins(kSpacing, kSpacing, kSpacing, kSpacing);
+    layout->setSpacing(kWithin);
+    layout->setContentsMargins(0, 0, 0, 0);
     return layout;
 }
 
@@ -39,25 +37,64 @@ QLabel* smallCaption(const QString& text = {}) {
 
 PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder& binder,
                      QWidget* parent)
-    : QWidget(parent),
+    : QScrollArea(parent),
       panel_(panel),
       binder_(binder),
-      terminators_(new TerminatorRow(panel, mirror, binder)) {
-    auto* layout = new QVBoxLayout(this);
-    layout->setSpacing(kSpacing);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(playKeys());
-    auto* middle = new QHBoxLayout;
-    middle->setSpacing(kSpacing);
-    middle->addWidget(softPositions(), 5);
-    auto* right = new QVBoxLayout;
-    right->setSpacing(kSpacing);
-    right->addWidget(hardKeys(), 5);
-    right->addWidget(modeKeys(), 6);
-    middle->addLayout(right, 5);
-    layout->addLayout(middle, 1);
-    layout->addWidget(markerKeys());
-    layout->addWidget(instrumentKeys());
+      terminators_(new TerminatorRow(panel, mirror, binder)),
+      column_(new QWidget),
+      layout_(new QVBoxLayout(column_)) {
+    setObjectName("panel");
+    setAccessibleName("Panel");
+    setFixedWidth(kWidth);
+    setWidgetResizable(true);
+    setFrameShape(QFrame::NoFrame);
+    setFocusPolicy(Qt::NoFocus);
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    column_->setObjectName("column");
+    layout_->setSpacing(kBetween);
+    layout_->setContentsMargins(8, 6, 8, 6);
+    layout_->addWidget(runKeys());
+    layout_->addWidget(softPositions(), 5);
+    layout_->addWidget(hardKeys(), 3);
+    FoldGroup* modes = addGroup("Modes", "Mode", modeKeys());
+    FoldGroup* markers = addGroup("Markers", "Marker", markerKeys());
+    FoldGroup* command = addGroup("Command", "Command line", commandLine());
+    for (Button* control : {&panel_.ResetButton, &panel_.LocalButton, &panel_.OnOffButton})
+        command->headingRow().addWidget(key(*control));
+    groups_ = {markers, modes, command};
+    layout_->addStretch(1);
+    setWidget(column_);
+}
+
+FoldGroup* PanelSide::addGroup(const QString& name, const QString& caption, QWidget* content) {
+    auto* group = new FoldGroup(name, caption, content);
+    layout_->addWidget(group);
+    connect(group, &FoldGroup::chosen, this, [this, group] {
+        foldByRoom();
+        emit folded();
+        if (group->isOpen()) ensureWidgetVisible(group);
+    });
+    return group;
+}
+
+void PanelSide::resizeEvent(QResizeEvent* event) {
+    QScrollArea::resizeEvent(event);
+    foldByRoom();
+}
+
+void PanelSide::foldByRoom() {
+    int needed = layout_->minimumSize().height();
+    for (const FoldGroup* group : groups_)
+        if (group->isOpen()) needed -= group->contentHeight();
+    for (const FoldGroup* group : groups_)
+        if (group->choice() == FoldGroup::Choice::Open) needed += group->contentHeight();
+    bool room = true;
+    for (FoldGroup* group : groups_) {
+        if (group->choice() != FoldGroup::Choice::ByRoom) continue;
+        needed += group->contentHeight();
+        room = room && needed <= viewport()->height();
+        group->setOpen(room);
+    }
 }
 
 QPushButton* PanelSide::key(Button& control, bool tall) {
@@ -68,81 +105,82 @@ QPushButton* PanelSide::fitted(QPushButton* button, Button& control, bool tall) 
     button->setMinimumWidth(30);
     button->setSizePolicy(QSizePolicy::Preferred,
                           tall ? QSizePolicy::Expanding : QSizePolicy::Fixed);
-    if (tall) button->setMaximumHeight(kTallest);
+    if (tall) button->setMaximumHeight(kTallestKey);
     binder_.bind(control, button);
     return button;
 }
 
-QWidget* PanelSide::playKeys() {
-    QFrame* frame = group();
-    auto* layout = layoutOf<QHBoxLayout>(frame);
+QWidget* PanelSide::runKeys() {
+    auto* row = new QWidget;
+    auto* layout = layoutOf<QHBoxLayout>(row);
     for (Button* control :
-         {&panel_.PlaySingleButton, &panel_.PlayContinuousButton, &panel_.StopButton,
-          &panel_.cmdZoom, &panel_.cmd3D, &panel_.cmdSpecial}) {
+         {&panel_.PlaySingleButton, &panel_.PlayContinuousButton, &panel_.StopButton}) {
         QPushButton* button = key(*control);
-        // Where the row is tight each key still shows its whole caption.
-        button->setMinimumWidth(0);
-        button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Fixed);
-        layout->addWidget(button);
+        // Those that come and go leave the others where they are.
+        QSizePolicy policy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+        policy.setRetainSizeWhenHidden(true);
+        button->setSizePolicy(policy);
+        layout->addWidget(button, 1);
     }
-    return frame;
+    return row;
+}
+
+QWidget* PanelSide::softPosition(int index) {
+    auto* place = new QWidget;
+    auto* row = layoutOf<QHBoxLayout>(place);
+    auto* button = key(panel_.SoftKey(index), true);
+    button->setFixedWidth(kSoftKeyWidth);
+    button->setMinimumHeight(kShortestSoftKey);
+    button->setMaximumHeight(kTallestSoftKey);
+    QSizePolicy policy = button->sizePolicy();
+    policy.setRetainSizeWhenHidden(true);
+    button->setSizePolicy(policy);
+    row->addWidget(button);
+    auto* beside = new QVBoxLayout;
+    beside->setSpacing(1);
+    QLabel* caption = smallCaption();
+    beside->addStretch(1);
+    beside->addWidget(caption);
+    auto* fields = new QWidget;
+    auto* places = layoutOf<QHBoxLayout>(fields);
+    auto* box = new PanelLineEdit;
+    auto* list = new QComboBox;
+    list->setMaxVisibleItems(kLongestList);
+    // What a menu shows here does not move the keys: the place is the same for all.
+    for (QWidget* field : {static_cast<QWidget*>(box), static_cast<QWidget*>(list)}) {
+        field->setMinimumWidth(40);
+        field->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+        places->addWidget(field, 1);
+    }
+    binder_.bind(panel_.SoftTextBox(index), box);
+    binder_.bind(panel_.ChoiceBox(index), list);
+    binder_.bind(panel_.SoftFrame(index), fields, caption);
+    beside->addWidget(fields);
+    beside->addStretch(1);
+    row->addLayout(beside, 1);
+    return place;
 }
 
 QWidget* PanelSide::softPositions() {
-    QFrame* frame = group();
-    auto* layout = layoutOf<QVBoxLayout>(frame);
+    auto* group = new QWidget;
+    auto* layout = layoutOf<QVBoxLayout>(group);
     auto* options = new QHBoxLayout;
     options->addWidget(smallCaption("Soft key"));
+    options->addStretch(1);
     for (OptionButton* control : {&panel_.GetOption, &panel_.SetOption}) {
         auto* option = new QRadioButton;
         binder_.bind(*control, option);
         options->addWidget(option);
     }
-    options->addStretch(1);
     layout->addLayout(options);
-    for (int i = 0; i < panel_.SoftKey.count(); ++i) {
-        auto* row = new QGridLayout;
-        row->setSpacing(3);
-        auto* button = key(panel_.SoftKey(i), true);
-        button->setMinimumSize(78, 40);
-        QSizePolicy policy = button->sizePolicy();
-        policy.setHorizontalPolicy(QSizePolicy::Ignored);
-        policy.setRetainSizeWhenHidden(true);
-        button->setSizePolicy(policy);
-        row->addWidget(button, 0, 0, 2, 1);
-        QLabel* caption = smallCaption();
-        caption->setMinimumWidth(kFieldWidth);
-        row->addWidget(caption, 0, 1, 1, 2, Qt::AlignBottom);
-        auto* fields = new QWidget;
-        auto* places = new QHBoxLayout(fields);
-        places->setContentsMargins(0, 0, 0, 0);
-        places->setSpacing(3);
-        auto* box = new PanelLineEdit;
-        auto* list = new QComboBox;
-        list->setMaxVisibleItems(kLongestList);
-        // What a menu shows here does not move the keys: the place is the same for all.
-        for (QWidget* field : {static_cast<QWidget*>(box), static_cast<QWidget*>(list)}) {
-            field->setMinimumWidth(40);
-            field->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
-        }
-        places->addWidget(box, 1);
-        places->addWidget(list, 1);
-        binder_.bind(panel_.SoftTextBox(i), box);
-        binder_.bind(panel_.ChoiceBox(i), list);
-        binder_.bind(panel_.SoftFrame(i), fields, caption);
-        row->addWidget(fields, 1, 1, 1, 2, Qt::AlignTop);
-        row->setColumnStretch(0, 2);
-        row->setColumnStretch(1, 3);
-        row->setColumnMinimumWidth(1, kFieldWidth);
-        layout->addLayout(row, 1);
-    }
+    for (int i = 0; i < panel_.SoftKey.count(); ++i) layout->addWidget(softPosition(i), 1);
     layout->addWidget(terminators_);
-    return frame;
+    return group;
 }
 
 QWidget* PanelSide::hardKeys() {
-    QFrame* frame = group();
-    auto* layout = layoutOf<QGridLayout>(frame);
+    auto* group = new QWidget;
+    auto* layout = layoutOf<QGridLayout>(group);
     Button* keys[] = {&panel_.FrequencyButton, &panel_.SpanButton,   &panel_.AmplitudeButton,
                       &panel_.BWButton,        &panel_.SweepButton,  &panel_.TraceButton,
                       &panel_.MeasButton,      &panel_.TrackButton1, &panel_.MarkerButton};
@@ -151,13 +189,12 @@ QWidget* PanelSide::hardKeys() {
         layout->addWidget(fitted(new PictureKey, *control, true), place / 3, place % 3);
         ++place;
     }
-    return frame;
+    return group;
 }
 
 QWidget* PanelSide::modeKeys() {
-    QFrame* frame = group();
-    auto* layout = layoutOf<QGridLayout>(frame);
-    layout->setVerticalSpacing(2);
+    auto* group = new QWidget;
+    auto* layout = layoutOf<QGridLayout>(group);
     const std::pair<Button*, OptionButton*> modes[] = {
         {&panel_.AnalyzerButton, &panel_.AnalyzerCheck},
         {&panel_.TrackButton, &panel_.TrackingGenCheck},
@@ -167,52 +204,56 @@ QWidget* PanelSide::modeKeys() {
         {&panel_.TDMAButton, &panel_.TDMAPowerCheck},
         {&panel_.DistFaultButton, &panel_.DistFaultCheck},
     };
-    int row = 0;
+    int place = 0;
     for (const auto& [button, option] : modes) {
+        auto* pair = new QWidget;
+        auto* row = layoutOf<QHBoxLayout>(pair);
+        row->setSpacing(2);
         auto* check = new QRadioButton;
         binder_.bind(*option, check);
-        layout->addWidget(check, row, 0);
-        layout->addWidget(key(*button, true), row, 1);
-        ++row;
+        check->setFixedWidth(kOptionWidth);
+        row->addWidget(check);
+        QPushButton* mode = key(*button);
+        mode->setProperty("narrow", true);
+        row->addWidget(mode, 1);
+        layout->addWidget(pair, place / kModesInARow, place % kModesInARow);
+        ++place;
     }
-    layout->setColumnStretch(1, 1);
-    return frame;
+    for (int i = 0; i < kModesInARow; ++i) layout->setColumnStretch(i, 1);
+    return group;
 }
 
 QWidget* PanelSide::markerKeys() {
-    QFrame* frame = group();
-    auto* layout = layoutOf<QGridLayout>(frame);
-    int column = 0;
+    auto* group = new QWidget;
+    auto* layout = layoutOf<QGridLayout>(group);
+    int row = 0;
     for (CheckBox* control : {&panel_.MarkerCheckBox, &panel_.DeltaCheckBox}) {
         auto* check = new QCheckBox;
         binder_.bind(*control, check);
-        layout->addWidget(check, column++, 0);
+        layout->addWidget(check, row++, 0);
     }
-    layout->addWidget(key(panel_.MarkPkButton), 0, 1);
-    layout->addWidget(key(panel_.NextPeakButton), 0, 2);
-    layout->addWidget(key(panel_.MinPeakButton), 0, 3);
-    layout->addWidget(key(panel_.MarkToCentButton), 1, 1, 1, 2);
-    layout->addWidget(key(panel_.MarkToRefButton), 1, 3);
-    for (int i = 1; i <= 3; ++i) layout->setColumnStretch(i, 1);
-    return frame;
+    layout->addWidget(key(panel_.MarkPkButton), 0, 1, 1, 2);
+    layout->addWidget(key(panel_.NextPeakButton), 0, 3, 1, 2);
+    layout->addWidget(key(panel_.MinPeakButton), 0, 5, 1, 2);
+    layout->addWidget(key(panel_.MarkToCentButton), 1, 1, 1, 3);
+    layout->addWidget(key(panel_.MarkToRefButton), 1, 4, 1, 3);
+    for (int i = 1; i <= 6; ++i) layout->setColumnStretch(i, 1);
+    return group;
 }
 
-QWidget* PanelSide::instrumentKeys() {
-    QFrame* frame = group();
-    auto* layout = layoutOf<QGridLayout>(frame);
-    layout->addWidget(key(panel_.ResetButton), 0, 0);
-    layout->addWidget(key(panel_.LocalButton), 0, 1);
-    layout->addWidget(key(panel_.OnOffButton), 0, 2);
+QWidget* PanelSide::commandLine() {
+    auto* group = new QWidget;
+    auto* layout = layoutOf<QGridLayout>(group);
     auto* line = new PanelLineEdit;
     binder_.bind(panel_.ManualCommandText, line);
-    layout->addWidget(line, 0, 3);
-    layout->addWidget(key(panel_.SendButton), 0, 4);
+    layout->addWidget(line, 0, 0);
+    layout->addWidget(key(panel_.SendButton), 0, 1);
     auto* answer = new PanelLineEdit;
     answer->setPlaceholderText("Answer");
     binder_.bind(panel_.ManualCommandTextAnsw, answer);
-    layout->addWidget(answer, 1, 0, 1, 5);
-    layout->setColumnStretch(3, 1);
-    return frame;
+    layout->addWidget(answer, 1, 0, 1, 2);
+    layout->setColumnStretch(0, 1);
+    return group;
 }
 
 }  // namespace zel

@@ -1,38 +1,58 @@
 #pragma once
-// The keys at the right of the graph, as on the instrument's front.
+// The keys at the right of the graph, as on the instrument's front: one column of fixed width.
 
-#include <QWidget>
+#include <QScrollArea>
+#include <vector>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/windows/FoldGroup.h"
 #include "desktop/windows/Terminators.h"
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
 
-class QGridLayout;
-class QHBoxLayout;
 class QVBoxLayout;
 
 namespace zel {
 
-class PanelSide : public QWidget {
+class PanelSide : public QScrollArea {
+    Q_OBJECT
+
   public:
+    /// Pixels, whatever the width of the window.
+    static constexpr int kWidth = 336;
+
     PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder& binder,
               QWidget* parent = nullptr);
     TerminatorRow& terminators() { return *terminators_; }
+    const std::vector<FoldGroup*>& groups() const { return groups_; }
+    /// Opens and folds the groups that the user has not chosen for, so that the rest fits.
+    void foldByRoom();
+
+  signals:
+    /// The user has folded or opened a group.
+    void folded();
+
+  protected:
+    void resizeEvent(QResizeEvent* event) override;
 
   private:
-    QWidget* playKeys();
+    QWidget* runKeys();
     QWidget* softPositions();
+    QWidget* softPosition(int index);
     QWidget* hardKeys();
     QWidget* modeKeys();
     QWidget* markerKeys();
-    QWidget* instrumentKeys();
+    QWidget* commandLine();
+    FoldGroup* addGroup(const QString& name, const QString& caption, QWidget* content);
     QPushButton* key(Button& control, bool tall = false);
     QPushButton* fitted(QPushButton* button, Button& control, bool tall);
 
     ControllerForm& panel_;
     Binder& binder_;
     TerminatorRow* terminators_;
+    QWidget* column_;
+    QVBoxLayout* layout_;
+    std::vector<FoldGroup*> groups_;  ///< the first one folds last
 };
 
 }  // namespace zel

@@ -4,6 +4,7 @@
 #include <map>
 
 #include "desktop/binders/ShortcutTable.h"
+#include "desktop/windows/FoldGroup.h"
 
 namespace zel {
 namespace {
@@ -15,6 +16,7 @@ void act(Control& control, QWidget& widget, const Binder& binder) {
         button->click();
         return;
     }
+    FoldGroup::reveal(widget);
     widget.setFocus(Qt::ShortcutFocusReason);
     if (auto* line = qobject_cast<QLineEdit*>(&widget); line != nullptr) line->selectAll();
 }
@@ -36,7 +38,7 @@ void buildShortcuts(QWidget& window, ControllerForm& panel, Binder& binder) {
             binder.flush();
             for (Control* control : controls) {
                 auto* widget = qobject_cast<QWidget*>(binder.widgetOf(*control));
-                if (widget == nullptr || !widget->isVisible() || !widget->isEnabled()) continue;
+                if (widget == nullptr || !FoldGroup::offers(*widget) || !widget->isEnabled()) continue;
                 return act(*control, *widget, binder);
             }
         });

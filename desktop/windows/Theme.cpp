@@ -19,6 +19,8 @@ struct ThemeColors {
     const char* button;
     const char* buttonHover;
     const char* border;
+    const char* panel;     ///< frames, one step from the window
+    const char* hairline;  ///< edges of frames
     const char* accent;
     const char* accentText;
     const char* yellow;
@@ -27,16 +29,18 @@ struct ThemeColors {
     const char* red;
     const char* green;
 };
-constexpr ThemeColors kDark = {"#1b2027", "#11151a", "#e6ebf0", "#7d8894", "#aab4bf",
-                               "#2c343e", "#38424e", "#46525f", "#2873c6", "#ffffff",
+constexpr ThemeColors kDark = {"#12171e", "#0b0f14", "#e6ebf0", "#7d8894", "#aab4bf",
+                               "#232b34", "#2f3a46", "#3a4653", "#19202a", "#2b3541",
+                               "#2873c6", "#ffffff",
                                "#35321f", "#ffd966", "#8f7a30", "#c0392b", "#1e8449"};
 constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#48525c",
-                                "#ffffff", "#e3e9f0", "#9aa5b1", "#1d6fc4", "#ffffff",
+                                "#ffffff", "#e3e9f0", "#9aa5b1", "#f7f9fb", "#cbd3db",
+                                "#1d6fc4", "#ffffff",
                                 "#fdf1bf", "#574600", "#c9a93f", "#c0392b", "#1e8449"};
 
 constexpr const char* kStyleSheet = R"(
-QWidget { font-size: 9pt; }
-QPushButton { background: @button; color: @text; border: 1px solid @border; border-radius: 4px;
+QWidget { font-size: 12px; }
+QPushButton { background: @button; color: @text; border: 1px solid @border; border-radius: 6px;
     padding: 2px 6px; min-height: 20px; }
 QPushButton:hover { background: @buttonHover; }
 QPushButton:pressed { background: @accent; color: @accentText; }
@@ -56,7 +60,7 @@ QPushButton[face]:disabled { color: @dim; background: @window; font-weight: norm
 QPushButton[face]:focus { border: 2px solid @text; }
 QPushButton#StopButton { background: @red; color: #ffffff; font-weight: bold; }
 QLineEdit, QComboBox { background: @base; color: @text; border: 1px solid @border;
-    border-radius: 3px; padding: 1px 4px; min-height: 20px; }
+    border-radius: 4px; padding: 1px 4px; min-height: 18px; }
 QLineEdit:focus, QComboBox:focus { border: 2px solid @accent; padding: 0px 3px; }
 QComboBox QAbstractItemView { background: @base; color: @text; border: 1px solid @border;
     selection-background-color: @accent; selection-color: @accentText; }
@@ -69,13 +73,43 @@ QLineEdit[face="locked"] { background: transparent; border: 1px dashed @border; 
 QComboBox[face="locked"] { background: transparent; border: 1px dashed @border; }
 QComboBox[face="locked"]::down-arrow { border: none; }
 QLineEdit[face="locked"]:focus, QComboBox[face="locked"]:focus { border: 2px dashed @accent; }
-QPushButton[face="terminator"] { background: @base; padding: 1px 2px; font-size: 8pt; }
+QPushButton[face="terminator"] { background: @base; padding: 1px 2px; font-size: 11px; }
 QPushButton[face="terminator"]:hover { background: @buttonHover; }
 QPushButton[face="terminator"]:pressed { background: @accent; color: @accentText; }
 QLineEdit:disabled, QComboBox:disabled { color: @dim; background: @window; }
-QLabel#caption { color: @caption; font-size: 8pt; }
-QLabel#readout, QLabel[readout="true"] { font-size: 10pt; font-weight: bold; }
-QFrame#group { border: 1px solid @border; border-radius: 5px; }
+QLabel#caption { color: @caption; font-size: 11px; }
+QLabel[readout="true"] { font-size: 13px; font-weight: 600; }
+QFrame#group, QScrollArea#panel { background: @panel; border: 1px solid @hairline;
+    border-radius: 6px; }
+QWidget#column { background: transparent; }
+QFrame#card { background: @panel; border: 1px solid @border; border-radius: 6px; }
+QPushButton[way="true"] { text-align: left; padding: 4px 10px; min-height: 24px; }
+QPushButton[narrow="true"] { padding: 2px 0px; font-size: 11px; min-height: 20px; }
+QPushButton[tool="true"] { padding: 2px 8px; min-height: 24px; }
+QLineEdit[flat="true"], QLineEdit[flat="true"]:read-only { background: transparent; border: none;
+    color: @caption; }
+QToolBar { background: @window; border: none; border-bottom: 1px solid @hairline; spacing: 4px;
+    padding: 4px 6px; }
+QToolBar::separator { background: transparent; width: 8px; }
+QToolBar QToolButton { background: @button; color: @text; border: 1px solid @border;
+    border-radius: 6px; padding: 2px 6px; min-height: 22px; }
+QToolBar QToolButton:hover { background: @buttonHover; }
+QToolBar QToolButton:focus { border: 2px solid @accent; padding: 1px 5px; }
+QToolBar QToolButton:pressed, QToolBar QToolButton:checked { background: @accent;
+    color: @accentText; }
+QToolBar QToolButton:disabled { color: @dim; background: @window; }
+QToolBar QToolButton[popupMode="1"] { padding-right: 18px; }
+QToolBar QToolButton::menu-button { border: none; width: 16px; }
+QToolBar QToolButton#StopTool:enabled { background: @red; color: #ffffff; }
+QToolButton#heading { background: transparent; color: @caption; border: none; font-size: 11px;
+    font-weight: 600; text-align: left; padding: 1px 0px; min-height: 14px; }
+QToolButton#heading:hover { color: @text; }
+QToolButton#heading:focus { border: 1px solid @accent; border-radius: 3px; }
+QMenuBar, QStatusBar { background: @window; }
+QStatusBar::item { border: none; }
+QScrollBar:vertical { background: transparent; width: 8px; margin: 0; }
+QScrollBar::handle:vertical { background: @border; border-radius: 4px; min-height: 24px; }
+QScrollBar::add-line:vertical, QScrollBar::sub-line:vertical { height: 0; }
 QToolTip { background: @base; color: @text; border: 1px solid @border; }
 QStatusBar QLabel { padding: 0 6px; }
 QMenuBar::item:disabled, QMenu::item:disabled { color: @dim; }
@@ -96,6 +130,8 @@ QString styled(const ThemeColors& c) {
         {"@accentText", c.accentText},
         {"@accent", c.accent},
         {"@border", c.border},
+        {"@panel", c.panel},
+        {"@hairline", c.hairline},
         {"@yellowText", c.yellowText},
         {"@yellowEdge", c.yellowEdge},
         {"@yellow", c.yellow},

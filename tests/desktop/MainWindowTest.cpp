@@ -5,6 +5,7 @@
 #include <QSet>
 #include <QTest>
 
+#include "desktop/windows/FoldGroup.h"
 #include "tests/desktop/Desk.h"
 
 namespace zel {
@@ -42,7 +43,7 @@ TEST_F(Desk, Widgets_AreVisibleWhereTheFormSaysSo) {
         if (widget == nullptr || control->kind() == ControlKind::Picture ||
             control->kind() == ControlKind::Frame)
             continue;
-        EXPECT_EQ(widget->isVisible(), control->Visible.get()) << control->name();
+        EXPECT_EQ(FoldGroup::offers(*widget), control->Visible.get()) << control->name();
         ++looked;
     }
     EXPECT_GT(looked, 50);
@@ -215,11 +216,11 @@ TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
 
 TEST_F(Desk, ToolTipOfTheForm_TakesTheWidgetsPlace) {
     auto* key = widgetOf<QPushButton>(panel().SpanButton);
-    EXPECT_EQ(key->toolTip(), "Span menu (Ctrl+S)");
+    EXPECT_EQ(key->toolTip(), "Span menu (Ctrl+Shift+F)");
     EXPECT_EQ(key->accessibleName(), "Span menu");
     panel().SpanButton.ToolTip = "not now";
     window->binder().flush();
-    EXPECT_EQ(key->toolTip(), "not now (Ctrl+S)");
+    EXPECT_EQ(key->toolTip(), "not now (Ctrl+Shift+F)");
     EXPECT_EQ(key->accessibleName(), "not now");
 }
 

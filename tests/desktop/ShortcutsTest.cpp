@@ -62,7 +62,7 @@ TEST_F(Desk, EveryKeyOfThePanel_HasAShortcutInItsToolTip) {
         if (!key) continue;
         const QString keys = shortcutOf(*control);
         EXPECT_FALSE(keys.isEmpty()) << control->name();
-        EXPECT_TRUE(widgetOf<QWidget>(*control)->toolTip().endsWith("(" + keys + ")"))
+        EXPECT_TRUE(widgetOf<QWidget>(*control)->toolTip().contains("(" + keys + ")"))
             << control->name();
     }
 }
@@ -77,7 +77,7 @@ TEST_F(Desk, ShortcutsOfTheKeys_PressThem) {
     using CF = ControllerForm;
     const Press presses[] = {
         {"Ctrl+F", &CF::FrequencyButton},
-        {"Ctrl+S", &CF::SpanButton},
+        {"Ctrl+Shift+F", &CF::SpanButton},
         {"Ctrl+A", &CF::AmplitudeButton},
         {"Ctrl+B", &CF::BWButton},
         {"Ctrl+W", &CF::SweepButton},
@@ -130,10 +130,10 @@ TEST_F(Desk, ShortcutWhileWorkIsUnderWay_DoesNothing) {
     connect();
     show();
     panel().MousePointer = 11;
-    QTest::keySequence(window.get(), QKeySequence("Ctrl+S"));
+    QTest::keySequence(window.get(), QKeySequence("Ctrl+Shift+F"));
     EXPECT_EQ(panel().State, ControllerForm::Freq);
     panel().MousePointer = 0;
-    QTest::keySequence(window.get(), QKeySequence("Ctrl+S"));
+    QTest::keySequence(window.get(), QKeySequence("Ctrl+Shift+F"));
     EXPECT_EQ(panel().State, ControllerForm::SPAN);
 }
 
@@ -173,7 +173,7 @@ TEST_F(Desk, MenusOfTheMenuBar_OpenByTheirLetters) {
         ASSERT_GE(at, 0) << action->text().toStdString();
         letters << action->text().mid(at + 1, 1).toUpper();
     }
-    EXPECT_EQ(letters, QStringList({"F", "N", "I", "V", "H"}));
+    EXPECT_EQ(letters, QStringList({"F", "N", "V", "I", "H"}));
 }
 
 TEST_F(Desk, MenuEntryWithAShortcut_ShowsIt) {

@@ -1,0 +1,99 @@
+#include "desktop/windows/Readouts.h"
+
+#include <QFrame>
+#include <QGridLayout>
+#include <QHBoxLayout>
+
+namespace zel {
+namespace {
+
+constexpr int kPaceWidth = 150;
+constexpr int kPointerWidth = 104;
+
+QLabel* value() {
+    auto* label = new QLabel;
+    label->setProperty("readout", true);
+    label->setTextFormat(Qt::PlainText);
+    return label;
+}
+
+QLabel* small(const QString& name = {}) {
+    auto* label = new QLabel;
+    label->setObjectName("caption");
+    label->setTextFormat(Qt::PlainText);
+    if (!name.isEmpty()) label->setAccessibleName(name);
+    return label;
+}
+
+/// A frame with its grid of two rows.
+QGridLayout* card(QHBoxLayout& row, int stretch) {
+    auto* frame = new QFrame;
+    frame->setObjectName("group");
+    auto* grid = new QGridLayout(frame);
+    grid->setContentsMargins(8, 4, 8, 4);
+    grid->setHorizontalSpacing(8);
+    grid->setVerticalSpacing(0);
+    row.addWidget(frame, stretch);
+    return grid;
+}
+
+/// The last part of a text whose parts stand apart goes to a line of its own.
+QString inTwoLines(const std::string& parts) {
+    QString text = QString::fromStdString(parts);
+    if (const qsizetype gap = text.lastIndexOf("   "); gap > 0) text.replace(gap, 3, "\n");
+    return text;
+}
+
+}  // namespace
+
+Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
+    : QWidget(parent),
+      pointer_(value()),
+      pointerLevel_(small("Level of the trace under the pointer")),
+      atMarker_(small("Trace at the marker")),
+      atDelta_(small("Trace at the delta marker")) {
+    auto* row = new QHBoxLayout(this);
+    row->setContentsMargins(0, 0, 0, 0);
+    row->setSpacing(6);
+    const auto bound = [&binder](Label& control) {
+        QLabel* label = value();
+        binder.bind(control, label);
+        return label;
+    };
+    QGridLayout* range = card(*row, 2);
+    range->addWidget(bound(panel.CFLabel), 0, 0);
+    range->addWidget(bound(panel.SpanLabel), 1, 0);
+    QGridLayout* markers = card(*row, 5);
+    markers->addWidget(bound(panel.MarkerLabel), 0, 0);
+    markers->addWidget(atMarker_, 0, 1, Qt::AlignRight);
+    markers->addWidget(bound(panel.DeltaLabel), 1, 0);
+    markers->addWidget(atDelta_, 1, 1, Qt::AlignRight);
+    markers->setColumnStretch(0, 1);
+    QGridLayout* pointer = card(*row, 0);
+    pointer_->setMinimumWidth(kPointerWidth);
+    pointer_->setAccessibleName("Position of the pointer");
+    pointer->addWidget(pointer_, 0, 0);
+    pointer->addWidget(pointerLevel_, 1, 0);
+    showPointer({}, {});
+    QGridLayout* pace = card(*row, 0);
+    QLabel* line = small();
+    line->setMinimumWidth(kPaceWidth);
+    binder.bindShow(panel.PaceLabel, line, [&panel, line] {
+        line->setText(inTwoLines(panel.PaceLabel.Caption));
+        line->setVisible(panel.PaceLabel.Visible);
+    });
+    pace->addWidget(line, 0, 0, 2, 1);
+}
+
+void Readouts::showPointer(const QString& position, const QString& level) {
+    const bool there = !position.isEmpty();
+    pointer_->setText(there ? position : QString::fromUtf8("\u2013"));
+    pointerLevel_->setText(there ? level : QString("Pointer"));
+}
+
+void Readouts::showTrace(const QString& atMarker, const QString& atDelta) {
+    atMarker_->setText(atMarker.isEmpty() ? QString() : "trace " + atMarker);
+    atDelta_->setText(atDelta.isEmpty() ? QString() : "trace " + atDelta);
+}
+
+}  // namespace zel

@@ -1,0 +1,130 @@
+#include "desktop/windows/StatusLine.h"
+
+#include <QHBoxLayout>
+#include <QMenuBar>
+#include <QPointer>
+#include <QStatusBar>
+
+namespace zel {
+namespace {
+
+constexpr int kActivityMs = 150;
+constexpr int kSaidMs = 12000;
+constexpr int kCornerWidth = 400;
+constexpr int kHourglass = 11;
+constexpr const char* kDot = "<span style='color:%1'>●</span>";
+constexpr const char* kQuiet = "#77818b";
+constexpr const char* kThere = "#27ae60";
+constexpr const char* kLost = "#e0483a";
+
+}  // namespace
+
+QString shortIdentity(const QString& identity) {
+    const QStringList parts = identity.split(',');
+    if (parts.size() < 3) return identity.trimmed();
+    return parts[1].trimmed() + " #" + parts[2].trimmed();
+}
+
+StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
+    : QObject(&window),
+      window_(window),
+      forms_(forms),
+      panel_(forms.controller),
+      state_(new QLabel),
+      activity_(new QLabel),
+      busy_(new QProgressBar) {
+    QStatusBar* bar = window.statusBar();
+    bar->setSizeGripEnabled(false);
+    auto* line = new PanelLineEdit;
+    line->setFrame(false);
+    line->setProperty("flat", true);
+    binder.bind(panel_.DebugTextBox, line);
+    line->setFocusPolicy(Qt::ClickFocus);
+    bar->addWidget(line, 1);
+    busy_->setRange(0, 0);
+    busy_->setFixedSize(90, 8);
+    busy_->setTextVisible(false);
+    busy_->setAccessibleName("Work is under way");
+    auto* progress = new QLabel;
+    auto* wait = new QLabel;
+    for (QWidget* widget : {static_cast<QWidget*>(wait), static_cast<QWidget*>(progress),
+                            static_cast<QWidget*>(busy_)})
+        bar->addPermanentWidget(widget);
+    binder.bind(panel_.FileLabel, progress);
+    binder.bind(panel_.WaitLabel, wait);
+
+    auto* corner = new QWidget;
+    auto* layout = new QHBoxLayout(corner);
+    layout->setContentsMargins(8, 0, 10, 0);
+    layout->setSpacing(6);
+    activity_->setTextFormat(Qt::RichText);
+    activity_->setToolTip("Traffic on the link");
+    activity_->setAccessibleName("Traffic on the link");
+    state_->setTextFormat(Qt::PlainText);
+    state_->setAccessibleName("State of the connection");
+    auto* clock = new QLabel;
+    clock->setObjectName("caption");
+    layout->addStretch(1);
+    layout->addWidget(activity_);
+    layout->addWidget(state_);
+    layout->addSpacing(8);
+    layout->addWidget(clock);
+    // The menu bar does not follow a corner that grows.
+    corner->setMinimumWidth(kCornerWidth);
+    clock->setMinimumWidth(clock->fontMetrics().horizontalAdvance("00:00:00") + 4);
+    window.menuBar()->setCornerWidget(corner);
+    binder.bind(panel_.TimeLabel, clock);
+    for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
+        binder.bindShow(*picture, state_, [this] { showState(); });
+    activityOff_.setSingleShot(true);
+    connect(&activityOff_, &QTimer::timeout, this, [this] { showActivity(false); });
+    panel_.DebugTextBox.Changed.connect([self = QPointer<StatusLine>(this)] {
+        if (!self || self->activityOff_.isActive() || self->panel_.LinkLost) return;
+        self->showActivity(true);
+        self->activityOff_.start(kActivityMs);
+    });
+    showState();
+}
+
+void StatusLine::showActivity(bool active) {
+    const char* color = kQuiet;
+    if (panel_.LinkLost) color = kLost;
+    if (!panel_.LinkLost && (active || panel_.isConnected)) color = active ? "#5fe08d" : kThere;
+    activity_->setText(QString(kDot).arg(color));
+}
+
+QString StatusLine::stateText() const {
+    if (!panel_.isConnected) {
+        const bool connecting = forms_.main.IsConnecting && forms_.main.MousePointer == kHourglass;
+        return connecting ? "Connecting..." : "Not connected";
+    }
+    const bool tcp = panel_.ConnectionState == ControllerForm::TCPCON;
+    const QString id = QString::fromStdString(tcp ? forms_.tcpConnection.IDTextBox.Text
+                                                  : forms_.main.IDText.Text);
+    const QString where =
+        tcp ? QString::fromStdString(forms_.tcpConnection.IPAdressTextBox.Text.get() + ":" +
+                                     forms_.tcpConnection.RemotePortTextBox.Text.get())
+            : QString::fromStdString(forms_.main.COMList.Text() + ", " +
+                                     forms_.main.BaudList.Text() + " baud");
+    state_->setToolTip(id + "\n" + where);
+    return (panel_.LinkLost ? "Connection lost: " : "") + shortIdentity(id) +
+           QString::fromUtf8(" · ") + where.section('/', -1);
+}
+
+void StatusLine::showState() {
+    if (!panel_.isConnected) state_->setToolTip({});
+    state_->setText(stateText());
+    if (panel_.LinkLost) activityOff_.stop();
+    showActivity(activityOff_.isActive());
+    const bool shown = busy() && !panel_.ContinuosLoopActive;
+    busy_->setVisible(shown);
+    window_.setCursor(shown ? Qt::BusyCursor : Qt::ArrowCursor);
+}
+
+bool StatusLine::busy() const {
+    return panel_.MousePointer == kHourglass || forms_.main.MousePointer == kHourglass;
+}
+
+void StatusLine::say(const QString& text) { window_.statusBar()->showMessage(text, kSaidMs); }
+
+}  // namespace zel
