@@ -49,8 +49,7 @@ bool SimulatorChild::runs() const {
 }
 
 bool SimulatorChild::startChild(const QString& path) {
-    link_ = runtimeFolder() + "/" + kLinkName +
-            QString::number(QCoreApplication::applicationPid());
+    link_ = runtimeFolder() + "/" + kLinkName + QString::number(QCoreApplication::applicationPid());
     child_ = std::make_unique<QProcess>();
     // Should this program be killed, the child ends as well.
     child_->setChildProcessModifier([] { prctl(PR_SET_PDEATHSIG, SIGTERM); });

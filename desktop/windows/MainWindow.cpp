@@ -51,9 +51,8 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     buildMainMenus(*this, panel_, binder_);
     buildCentre();
     status_ = new StatusLine(*this, program_.forms(), binder_);
-    tools_ = new ToolStrip(
-        program_.forms(), binder_,
-        {[this] { copyPicture(); }, [this] { graph().wholeView(); }}, this);
+    tools_ = new ToolStrip(program_.forms(), binder_,
+                           {[this] { copyPicture(); }, [this] { graph().wholeView(); }}, this);
     addToolBar(tools_);
     buildShortcuts(*this, panel_, binder_);
     terminators_->buildShortcuts(*this);
@@ -79,18 +78,18 @@ void MainWindow::buildCentre() {
     auto* layout = new QHBoxLayout(centre);
     layout->setSpacing(kSpacing);
     layout->setContentsMargins(kSpacing, kSpacing, kSpacing, kSpacing);
-    graphSide_ = new GraphSide(program_, binder_,
-                               {[this] { panel_.Direct.Click(); },
-                                [this](int place) {
-                                    if (!recent_) return;
-                                    connectTo(recent_->addresses().at(
-                                        static_cast<std::size_t>(place)));
-                                },
-                                [this] {
-                                    connectToSimulator_ = true;
-                                    panel_.UtilityTrouble.Click();
-                                },
-                                [this] { panel_.LoadData.Click(); }});
+    graphSide_ =
+        new GraphSide(program_, binder_,
+                      {[this] { panel_.Direct.Click(); },
+                       [this](int place) {
+                           if (!recent_) return;
+                           connectTo(recent_->addresses().at(static_cast<std::size_t>(place)));
+                       },
+                       [this] {
+                           connectToSimulator_ = true;
+                           panel_.UtilityTrouble.Click();
+                       },
+                       [this] { panel_.LoadData.Click(); }});
     layout->addWidget(graphSide_, 1);
     side_ = new PanelSide(panel_, program_.variables(), binder_);
     terminators_ = &side_->terminators();

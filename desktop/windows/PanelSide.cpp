@@ -14,7 +14,7 @@ constexpr int kBetween = 5;
 constexpr int kTallestKey = 56;
 constexpr int kSoftKeyWidth = 116;
 constexpr int kOptionWidth = 16;  // without a text
-constexpr int kShortestSoftKey = 34;
+constexpr int kShortestPosition = 36;
 constexpr int kTallestSoftKey = 54;
 constexpr int kModesInARow = 3;
 constexpr int kLongestList = 16;  // no list of the panel is longer
@@ -127,10 +127,11 @@ QWidget* PanelSide::runKeys() {
 
 QWidget* PanelSide::softPosition(int index) {
     auto* place = new QWidget;
+    place->setMinimumHeight(kShortestPosition);
     auto* row = layoutOf<QHBoxLayout>(place);
     auto* button = key(panel_.SoftKey(index), true);
     button->setFixedWidth(kSoftKeyWidth);
-    button->setMinimumHeight(kShortestSoftKey);
+    button->setProperty("soft", true);  // two lines high at least
     button->setMaximumHeight(kTallestSoftKey);
     QSizePolicy policy = button->sizePolicy();
     policy.setRetainSizeWhenHidden(true);

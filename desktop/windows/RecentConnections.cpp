@@ -94,8 +94,11 @@ bool addressOf(const Forms& forms, LinkAddress& address) {
     const TCPConnectionForm& tcp = forms.tcpConnection;
     const auto port = wholeNumber(tcp.RemotePortTextBox.Text.get(), 1, kHighestPort);
     const bool tls = tcp.chkTls.Value();
-    address = {tls ? LinkAddress::Kind::Tls : LinkAddress::Kind::Tcp, tcp.IPAdressTextBox.Text,
-               port.value_or(0), {}, tls ? tcp.FingerprintTextBox.Text.get() : std::string()};
+    address = {tls ? LinkAddress::Kind::Tls : LinkAddress::Kind::Tcp,
+               tcp.IPAdressTextBox.Text,
+               port.value_or(0),
+               {},
+               tls ? tcp.FingerprintTextBox.Text.get() : std::string()};
     return port && !address.port.empty();
 }
 

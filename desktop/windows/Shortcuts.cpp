@@ -38,7 +38,8 @@ void buildShortcuts(QWidget& window, ControllerForm& panel, Binder& binder) {
             binder.flush();
             for (Control* control : controls) {
                 auto* widget = qobject_cast<QWidget*>(binder.widgetOf(*control));
-                if (widget == nullptr || !FoldGroup::offers(*widget) || !widget->isEnabled()) continue;
+                if (widget == nullptr || !FoldGroup::offers(*widget) || !widget->isEnabled())
+                    continue;
                 return act(*control, *widget, binder);
             }
         });

@@ -10,7 +10,8 @@ namespace {
 
 constexpr int kActivityMs = 150;
 constexpr int kSaidMs = 12000;
-constexpr int kCornerWidth = 400;
+constexpr int kCornerWidth = 440;  // pixels
+constexpr int kClockWidth = 64;
 constexpr int kHourglass = 11;
 constexpr const char* kDot = "<span style='color:%1'>●</span>";
 constexpr const char* kQuiet = "#77818b";
@@ -70,8 +71,9 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     layout->addSpacing(8);
     layout->addWidget(clock);
     // The menu bar does not follow a corner that grows.
-    corner->setMinimumWidth(kCornerWidth);
-    clock->setMinimumWidth(clock->fontMetrics().horizontalAdvance("00:00:00") + 4);
+    corner->setFixedWidth(kCornerWidth);
+    clock->setFixedWidth(kClockWidth);
+    state_->setMaximumWidth(kCornerWidth - kClockWidth - 60);
     window.menuBar()->setCornerWidget(corner);
     binder.bind(panel_.TimeLabel, clock);
     for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
@@ -99,8 +101,8 @@ QString StatusLine::stateText() const {
         return connecting ? "Connecting..." : "Not connected";
     }
     const bool tcp = panel_.ConnectionState == ControllerForm::TCPCON;
-    const QString id = QString::fromStdString(tcp ? forms_.tcpConnection.IDTextBox.Text
-                                                  : forms_.main.IDText.Text);
+    const QString id =
+        QString::fromStdString(tcp ? forms_.tcpConnection.IDTextBox.Text : forms_.main.IDText.Text);
     const QString where =
         tcp ? QString::fromStdString(forms_.tcpConnection.IPAdressTextBox.Text.get() + ":" +
                                      forms_.tcpConnection.RemotePortTextBox.Text.get())

@@ -29,13 +29,11 @@ struct ThemeColors {
     const char* red;
     const char* green;
 };
-constexpr ThemeColors kDark = {"#12171e", "#0b0f14", "#e6ebf0", "#7d8894", "#aab4bf",
-                               "#232b34", "#2f3a46", "#3a4653", "#19202a", "#2b3541",
-                               "#2873c6", "#ffffff",
+constexpr ThemeColors kDark = {"#12171e", "#0b0f14", "#e6ebf0", "#7d8894", "#aab4bf", "#232b34",
+                               "#2f3a46", "#3a4653", "#19202a", "#2b3541", "#2873c6", "#ffffff",
                                "#35321f", "#ffd966", "#8f7a30", "#c0392b", "#1e8449"};
-constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#48525c",
-                                "#ffffff", "#e3e9f0", "#9aa5b1", "#f7f9fb", "#cbd3db",
-                                "#1d6fc4", "#ffffff",
+constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#48525c", "#ffffff",
+                                "#e3e9f0", "#9aa5b1", "#f7f9fb", "#cbd3db", "#1d6fc4", "#ffffff",
                                 "#fdf1bf", "#574600", "#c9a93f", "#c0392b", "#1e8449"};
 
 constexpr const char* kStyleSheet = R"(
@@ -83,6 +81,7 @@ QFrame#group, QScrollArea#panel { background: @panel; border: 1px solid @hairlin
     border-radius: 6px; }
 QWidget#column { background: transparent; }
 QFrame#card { background: @panel; border: 1px solid @border; border-radius: 6px; }
+QPushButton[soft="true"] { min-height: 28px; }
 QPushButton[way="true"] { text-align: left; padding: 4px 10px; min-height: 24px; }
 QPushButton[narrow="true"] { padding: 2px 0px; font-size: 11px; min-height: 20px; }
 QPushButton[tool="true"] { padding: 2px 8px; min-height: 24px; }

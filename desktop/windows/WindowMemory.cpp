@@ -25,8 +25,8 @@ void fitToScreen(QMainWindow& window) {
     const QScreen* screen = QGuiApplication::primaryScreen();
     if (screen == nullptr) return;
     const QRect room = screen->availableGeometry();
-    window.resize(kFirstSize.boundedTo(room.size() * kShareOfScreen)
-                      .expandedTo(window.minimumSize()));
+    window.resize(
+        kFirstSize.boundedTo(room.size() * kShareOfScreen).expandedTo(window.minimumSize()));
     QRect frame(QPoint(), window.size());
     frame.moveCenter(room.center());
     window.move(frame.topLeft());
@@ -48,8 +48,7 @@ void WindowMemory::restore(QMainWindow& window, PanelSide& side) {
 }
 
 void WindowMemory::keep(const QMainWindow& window) {
-    settings_.set(kApplication, kSection, "Window",
-                  window.saveGeometry().toBase64().toStdString());
+    settings_.set(kApplication, kSection, "Window", window.saveGeometry().toBase64().toStdString());
 }
 
 void WindowMemory::keepFolded(const PanelSide& side) {
