@@ -1,7 +1,5 @@
 #include "desktop/windows/StatusLine.h"
 
-#include <QHBoxLayout>
-#include <QMenuBar>
 #include <QPointer>
 #include <QStatusBar>
 
@@ -10,8 +8,6 @@ namespace {
 
 constexpr int kActivityMs = 150;
 constexpr int kSaidMs = 12000;
-constexpr int kCornerWidth = 440;  // pixels
-constexpr int kClockWidth = 64;
 constexpr int kHourglass = 11;
 constexpr const char* kDot = "<span style='color:%1'>●</span>";
 constexpr const char* kQuiet = "#77818b";
@@ -54,10 +50,6 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     binder.bind(panel_.FileLabel, progress);
     binder.bind(panel_.WaitLabel, wait);
 
-    auto* corner = new QWidget;
-    auto* layout = new QHBoxLayout(corner);
-    layout->setContentsMargins(8, 0, 10, 0);
-    layout->setSpacing(6);
     activity_->setTextFormat(Qt::RichText);
     activity_->setToolTip("Traffic on the link");
     activity_->setAccessibleName("Traffic on the link");
@@ -65,16 +57,7 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     state_->setAccessibleName("State of the connection");
     auto* clock = new QLabel;
     clock->setObjectName("caption");
-    layout->addStretch(1);
-    layout->addWidget(activity_);
-    layout->addWidget(state_);
-    layout->addSpacing(8);
-    layout->addWidget(clock);
-    // The menu bar does not follow a corner that grows.
-    corner->setFixedWidth(kCornerWidth);
-    clock->setFixedWidth(kClockWidth);
-    state_->setMaximumWidth(kCornerWidth - kClockWidth - 60);
-    window.menuBar()->setCornerWidget(corner);
+    for (QLabel* label : {activity_, state_, clock}) bar->addPermanentWidget(label);
     binder.bind(panel_.TimeLabel, clock);
     for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
         binder.bindShow(*picture, state_, [this] { showState(); });

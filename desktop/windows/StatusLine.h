@@ -1,5 +1,5 @@
 #pragma once
-// The status line at the foot of the window, and the state of the connection beside the menus.
+// The status line at the foot of the window, with the state of the connection.
 
 #include <QLabel>
 #include <QMainWindow>
