@@ -198,7 +198,8 @@ void Binder::bind(CheckBox& control, QCheckBox* widget) {
     follow(control, widget, [this, &control, widget] {
         widget->setText(caption(control.Caption));
         widget->setChecked(control.Value());
-        widget->setEnabled(control.Enabled && hasHandler(control) && usable(control));
+        // Its value counts, with a handler or without.
+        widget->setEnabled(control.Enabled && usable(control));
         widget->setVisible(control.Visible);
     });
 }

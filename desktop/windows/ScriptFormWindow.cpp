@@ -6,6 +6,7 @@
 #include <QScrollBar>
 #include <QSignalBlocker>
 #include <QTextCursor>
+#include <QTextOption>
 #include <QVBoxLayout>
 
 namespace zel {
@@ -200,15 +201,21 @@ QWidget* StatisticsWindow::figures(STDForm& form) {
 }
 
 QTextEdit* StatisticsWindow::textBox(RichText& control) {
-    constexpr double kTabPixels = 60;
+    // Each name has two tabs after it: the first goes beyond the longest name, the second a step
+    // on, so that the values stand in one column.
+    constexpr double kStep = 8;
     auto* view = new QTextEdit;
     view->setReadOnly(true);
-    view->setTabStopDistance(kTabPixels);
-    binder_.bindShow(control, view, [&control, view] {
+    const double column = view->fontMetrics().horizontalAdvance("Phase Std Dev(rad):  ") + kStep;
+    QTextBlockFormat columns;
+    columns.setTabPositions(
+        {{column, QTextOption::LeftTab}, {column + kStep, QTextOption::LeftTab}});
+    binder_.bindShow(control, view, [&control, view, columns] {
         const QString text = QString::fromStdString(control.Text()).replace("\r\n", "\n");
         if (view->toPlainText() == text) return;
         view->clear();
         QTextCursor cursor(view->document());
+        cursor.setBlockFormat(columns);
         for (const TextRun& run : control.runs()) {
             QTextCharFormat format;
             format.setFontWeight(run.bold ? QFont::Bold : QFont::Normal);

@@ -1,3 +1,4 @@
+#include <QCheckBox>
 #include <QLabel>
 #include <QListWidget>
 #include <QTextEdit>
@@ -71,6 +72,27 @@ TEST_F(ScriptWindowsTest, List_ShowsTheScriptAndTheLineThatRuns) {
     window->binder().flush();
     EXPECT_FALSE(widgetOf<QPushButton>(form.cmdStop)->isVisible());
     EXPECT_TRUE(widgetOf<QPushButton>(form.cmdExecute)->isEnabled());
+}
+
+TEST_F(ScriptWindowsTest, EachBox_CanBeTickedBeforeARunAndInIt) {
+    const auto tickEach = [&] {
+        for (CheckBox* control : {&form.chkStep, &form.chkWaterfall, &form.chkGetSweep}) {
+            const bool before = control->Value();
+            widgetOf<QCheckBox>(*control)->click();
+            EXPECT_NE(control->Value(), before) << control->name();
+        }
+    };
+    open({"NOSAVE", "PAUSE 1"});
+    tickEach();
+    tickEach();
+    bool ran = false;
+    platform.events.schedule(500, [&] {
+        tickEach();
+        tickEach();
+        ran = true;
+    });
+    form.cmdExecute.Click();
+    EXPECT_TRUE(ran);
 }
 
 TEST_F(ScriptWindowsTest, StepMode_ShowsNextInPlaceOfExecute) {

@@ -106,6 +106,29 @@ TEST_F(WaterfallWindowTest, Pictures) {
     EXPECT_TRUE(savePicture(*window, "spectrogram-small"));
 }
 
+TEST_F(WaterfallWindowTest, PicturesOfSmallAndLargeScreens) {
+    open(100);
+    panel().SpectrogramShow.Click();
+    const QSize sizes[] = {{1024, 600}, {1920, 1080}};
+    for (const ThemeChoice theme : {ThemeChoice::Light, ThemeChoice::Dark}) {
+        applyTheme(testApplication(), theme);
+        window->binder().refreshAll();
+        for (const QSize& size : sizes) {
+            waterfall().resize(size);
+            window->resize(size);
+            flush();
+            flush();
+            EXPECT_EQ(waterfall().size(), size);
+            EXPECT_EQ(window->size(), size);
+            const QString name = QString("%1_%2")
+                                     .arg(size.width())
+                                     .arg(theme == ThemeChoice::Light ? "light" : "dark");
+            EXPECT_TRUE(savePicture(waterfall(), "waterfall_" + name));
+            EXPECT_TRUE(savePicture(*window, "spectrogram_" + name));
+        }
+    }
+}
+
 TEST_F(WaterfallWindowTest, Drag_RotatesAndTellsTheEnd) {
     open(5);
     const GraphView3D before = form().Graph3D.view();
