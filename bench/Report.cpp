@@ -84,6 +84,7 @@ int main(int argc, char** argv) {
         {'t', "scan", [&] { return zelbench::scanCost(simulator); }},
         {'u', "statistics", [] { return zelbench::traceStatistics(); }},
         {'v', "slow road", [] { return zelbench::slowRoad(); }},
+        {'w', "rehearsal", [] { return zelbench::rehearsalOfANight(); }},
     };
     zelbench::Figures figures;
     bool allMet = true;

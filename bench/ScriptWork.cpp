@@ -10,6 +10,8 @@
 #include "bench/Process.h"
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/MainWindow.h"
+#include "platform/virtual/VirtualPlatform.h"
+#include "rehearsal/Rehearsal.h"
 #include "script/ScriptFile.h"
 #include "script/Scripts.h"
 #include "script/Statistics.h"
@@ -31,6 +33,9 @@ constexpr double kStatisticsAllowed = 0.2e-3;
 constexpr std::size_t kCharacters = 200000;
 constexpr double kRoadAllowed = 1;
 constexpr int kRounds = 9;
+constexpr double kRehearsalAllowed = 1;
+constexpr double kNightSeconds = 8 * 3600.0;
+constexpr int kRehearsals = 3;
 
 }  // namespace
 
@@ -150,6 +155,33 @@ Figure slowRoad() {
             timeText(seconds),
             timeText(kRoadAllowed),
             seconds / kRoadAllowed,
+            1,
+            false,
+            ""};
+}
+
+Figure rehearsalOfANight() {
+    const std::string name = "/night.txt";
+    zel::VirtualPlatform platform;
+    platform.files.put(name,
+                       "SAVERESULTS NIGHT*.TXT\r\nDO\r\nGET LEVEL\r\nGETSWEEP\r\nSAVESWEEP\r\n"
+                       "COMMENT PASS I IS DONE\r\nPAUSE 60\r\nLOOP 480\r\n");
+    zel::RehearsalSetup setup;
+    setup.script = name;
+    setup.folder = "/";
+    setup.baud = kBaud;
+    std::vector<double> times;
+    for (int round = 0; round < kRehearsals; ++round) {
+        zel::RehearsalReport report;
+        times.push_back(timeOf([&] { report = zel::rehearse(setup, platform.files); }));
+        if (report.wrong() || report.seconds < kNightSeconds)
+            throw std::runtime_error("the night was not run to its end");
+    }
+    const double seconds = median(times);
+    return {"(w) the check of a night's script, 480 sweeps in 8 hours",
+            timeText(seconds),
+            timeText(kRehearsalAllowed),
+            seconds / kRehearsalAllowed,
             1,
             false,
             ""};

@@ -15,5 +15,7 @@ Figure scanCost(const std::string& simulator);
 Figure traceStatistics();
 /// 200,000 characters by the slow road.
 Figure slowRoad();
+/// What the check of a night's script takes.
+Figure rehearsalOfANight();
 
 }  // namespace zelbench
