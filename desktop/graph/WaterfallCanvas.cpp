@@ -19,7 +19,7 @@ constexpr double kNearestZoom = 0.1;
 constexpr double kFarthestZoom = 100;
 constexpr int kPointerMs = 40;
 constexpr int kWheelEndMs = 250;
-constexpr int kRestMs = 40;
+constexpr int kRestMs = 80;
 constexpr double kHighestLatitude = 180;
 
 /// The graph's own angles may be any; those that the mouse makes stay within a turn.
