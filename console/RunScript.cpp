@@ -1,7 +1,6 @@
 #include "console/RunScript.h"
 
 #include <algorithm>
-#include <csignal>
 #include <filesystem>
 #include <optional>
 
@@ -13,34 +12,19 @@ namespace zel {
 namespace {
 
 constexpr int kLookMs = 20;
-volatile std::sig_atomic_t interrupted = 0;
-
-void noteInterrupt(int) { interrupted = 1; }
-
-/// While it lives, the interrupt key is a press of Stop.
-class InterruptKey {
-  public:
-    InterruptKey() {
-        interrupted = 0;
-        before_ = std::signal(SIGINT, noteInterrupt);
-    }
-    ~InterruptKey() { std::signal(SIGINT, before_); }
-    InterruptKey(const InterruptKey&) = delete;
-    InterruptKey& operator=(const InterruptKey&) = delete;
-
-  private:
-    void (*before_)(int) = SIG_DFL;
-};
 
 struct ScriptRunner {
     const ScriptStage& stage;
     SpecialMeasForm& form = stage.program.forms().specialMeas;
     bool inputEnded = false;
+    bool interrupted = false;  ///< stopped by SIGINT
 
     /// The next line of the input; nothing at its end.
     std::optional<std::string> nextLine() {
         std::string line;
         while (!inputEnded) {
+            if (stage.events.always) stage.events.always();
+            if (interrupted) return std::nullopt;
             switch (stage.input.next(line, stage.virtualTime)) {
                 case LineInput::Got::Line:
                     if (!line.empty() && line.back() == '\r') line.pop_back();
@@ -52,16 +36,15 @@ struct ScriptRunner {
                     return std::string();
                 case LineInput::Got::Nothing:
                     stage.events.inner().wait(kLookMs);
-                    if (stopIfInterrupted()) return std::nullopt;
                     break;
             }
         }
         return std::nullopt;
     }
 
-    bool stopIfInterrupted() {
-        if (interrupted == 0) return false;
-        interrupted = 0;
+    bool take(const std::string& signal) {
+        if (signal != "SIGINT") return false;
+        interrupted = true;
         form.cmdStop.Click();
         form.ReleaseWait();
         return true;
@@ -69,7 +52,7 @@ struct ScriptRunner {
 
     /// The hook of the event loop: a line of the input is a press of Next.
     bool whileWaiting(int ms) {
-        if (stopIfInterrupted() || !form.WaitsForNext) return false;
+        if (interrupted || !form.WaitsForNext) return false;
         std::string line;
         switch (inputEnded ? LineInput::Got::End : stage.input.next(line, stage.virtualTime)) {
             case LineInput::Got::End:
@@ -86,7 +69,7 @@ struct ScriptRunner {
     }
 
     void execute() {
-        const InterruptKey key;
+        stage.signals.takes = [this](const std::string& signal) { return take(signal); };
         stage.boxes.reader = [this] { return nextLine(); };
         stage.dialogs.reader = [this] { return nextLine(); };
         stage.events.whileWaiting = [this](int ms) { return whileWaiting(ms); };
@@ -94,6 +77,7 @@ struct ScriptRunner {
         stage.events.whileWaiting = nullptr;
         stage.boxes.reader = nullptr;
         stage.dialogs.reader = nullptr;
+        stage.signals.takes = nullptr;
     }
 };
 

@@ -9,6 +9,7 @@
 #include "console/Options.h"
 #include "console/ServingEvents.h"
 #include "platform/Files.h"
+#include "platform/Signals.h"
 #include "shell/Program.h"
 
 namespace zel {
@@ -23,6 +24,7 @@ struct ScriptStage {
     ConsoleFileDialogs& dialogs;
     AnswerQueue& answers;
     LineOutput& errors;
+    Signals& signals;  ///< SIGINT is the Stop button while the script runs
     std::function<void(const std::string&)> progress;  ///< a line that is overwritten; may be empty
 };
 

@@ -128,14 +128,15 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
     ProgressBar progress;
     if (streams.errorsAreTerminal)
         progress = [&streams](int done, int wanted) { drawBar(streams.errors, done, wanted); };
-    DescriptorLines input(STDIN_FILENO);
+    DescriptorLines input(STDIN_FILENO, front.endSignals().descriptor());
     std::function<void(const std::string&)> progressLine;
     if (streams.errorsAreTerminal)
         progressLine = [&streams](const std::string& text) { drawLine(streams.errors, text); };
     const bool virtualTime = options.address && options.address->simulated;
     const auto script = [&](const Options& given) {
-        return runScript(given, {stage.program, stage.files, stage.events, input, virtualTime,
-                                 stage.boxes, stage.dialogs, stage.answers, errors, progressLine});
+        return runScript(given,
+                         {stage.program, stage.files, stage.events, input, virtualTime, stage.boxes,
+                          stage.dialogs, stage.answers, errors, front.endSignals(), progressLine});
     };
     const VerbStage verbs{stage.program, stage.events,    stage.answers,  stage.boxes, output,
                           errors,        writeGraphImage, writeRowsImage, progress,    script};

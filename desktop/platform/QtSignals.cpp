@@ -61,7 +61,7 @@ void QtSignals::deliver() {
     unsigned char number = 0;
     while (readEnd_ >= 0 && ::read(readEnd_, &number, 1) == 1)
         for (const SignalName& row : kEnding)
-            if (row.number == number) EndRequested(row.name);
+            if (row.number == number) request(row.name);
 }
 
 }  // namespace zel

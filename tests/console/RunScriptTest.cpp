@@ -48,9 +48,19 @@ struct RunScriptTest : ::testing::Test {
             return -1;
         const auto before = std::filesystem::current_path();
         std::filesystem::current_path(folder.file(""));
-        const int result = runScript(
-            options,
-            {program, files, events, source, true, boxes, dialogs, answers, errorLines, {}});
+        if (!interruptedBy.empty())
+            front->events().schedule(1000, [this] { signals.request(interruptedBy); });
+        const int result = runScript(options, {program,
+                                               files,
+                                               events,
+                                               source,
+                                               true,
+                                               boxes,
+                                               dialogs,
+                                               answers,
+                                               errorLines,
+                                               signals,
+                                               {}});
         EXPECT_EQ(std::filesystem::current_path(),
                   std::filesystem::path(folder.file("")).parent_path());
         std::filesystem::current_path(before);
@@ -62,6 +72,8 @@ struct RunScriptTest : ::testing::Test {
     SystemFiles files;
     std::ostringstream errors;
     bool connected = true;
+    Signals signals;
+    std::string interruptedBy;  ///< a signal that comes after a second
 };
 
 TEST_F(RunScriptTest, Run_WritesBesideTheCommandAndEndsWithZero) {
@@ -102,6 +114,21 @@ TEST_F(RunScriptTest, StepMode_TakesALineAPressAndGoesOnAtTheEnd) {
     EXPECT_EQ(run({"STEPMODE", "SAVERESULTS OUT.TXT", "# x", "COMMENT A", "COMMENT B"}, "\n"), 0);
     EXPECT_EQ(linesOf(folder.read("OUT.TXT")).size(), 2U);
     EXPECT_EQ(errors.str(), "");
+}
+
+TEST_F(RunScriptTest, Sigint_IsTheStopButtonAndOtherSignalsAreNot) {
+    int ends = 0;
+    signals.EndRequested.connect([&](const std::string&) { ++ends; });
+    interruptedBy = "SIGINT";
+    EXPECT_EQ(run({"SAVERESULTS OUT.TXT", "COMMENT A", "PAUSE 3600", "COMMENT B"}, ""), 1);
+    EXPECT_EQ(linesOf(folder.read("OUT.TXT")).size(), 1U);
+    EXPECT_EQ(ends, 0);
+    interruptedBy = "SIGTERM";
+    EXPECT_EQ(run({"SAVERESULTS OUT.TXT", "PAUSE 2", "COMMENT B"}, ""), 0);
+    EXPECT_EQ(ends, 1);
+    // Behind the run the signal asks for the end again.
+    signals.request("SIGINT");
+    EXPECT_EQ(ends, 2);
 }
 
 TEST_F(RunScriptTest, Failures_EndWithOne) {

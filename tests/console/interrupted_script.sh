@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# Interrupts a script that pauses, and kills one that writes: the first ends at once with status 1,
-# the second leaves whole lines.
+# Interrupts scripts that pause, wait for a press or show a box: they end at once with status 1. Kills
+# one that writes: it leaves whole lines.
 #
 #   interrupted_script.sh ZELCTL
 set -euo pipefail
@@ -19,22 +19,38 @@ wait_for() {
     exit 1
 }
 
-# A shell's background commands ignore the interrupt key; python's do not.
 printf 'SAVERESULTS OUT.TXT\nCOMMENT A\nPAUSE 600\nCOMMENT B\n' > pause.txt
-status=0
-python3 - "$zelctl" <<'EOF' || status=$?
+printf 'SAVERESULTS OUT.TXT\nCOMMENT A\nSTEPMODE\nCOMMENT B\n' > step.txt
+printf 'SAVERESULTS OUT.TXT\nCOMMENT A\nSHOWDIALOG X\nCOMMENT B\n' > box.txt
+
+# A shell's background commands ignore the interrupt key; python's do not. The input stays open.
+interrupted() { # SCRIPT [CONNECTION...]
+    rm -f OUT.TXT
+    python3 - "$zelctl" "$@" <<'EOF'
 import os, signal, subprocess, sys, time
-run = subprocess.Popen([sys.argv[1], "--home", "home", "run", "pause.txt"], stdin=subprocess.DEVNULL,
+zelctl, script, *connection = sys.argv[1:]
+run = subprocess.Popen([zelctl, *connection, "--home", "home", "run", script], stdin=subprocess.PIPE,
                        preexec_fn=lambda: signal.signal(signal.SIGINT, signal.SIG_DFL))
 for _ in range(400):
     if os.path.exists("OUT.TXT") and os.path.getsize("OUT.TXT") > 0:
         break
     time.sleep(0.05)
+time.sleep(0.2)
 run.send_signal(signal.SIGINT)
-sys.exit(run.wait(timeout=20))
+try:
+    sys.exit(run.wait(timeout=20))
+except subprocess.TimeoutExpired:
+    run.kill()
+    sys.exit(99)
 EOF
-[ "$status" = 1 ] || { echo "status $status behind the interrupt key"; exit 1; }
-[ "$(wc -l < OUT.TXT)" = 1 ] || { echo "the run went on"; cat OUT.TXT; exit 1; }
+}
+for case in pause.txt step.txt box.txt "step.txt --connect sim:" "box.txt --connect sim:"; do
+    status=0
+    # shellcheck disable=SC2086
+    interrupted $case || status=$?
+    [ "$status" = 1 ] || { echo "$case: status $status after the interrupt key"; exit 1; }
+    [ "$(wc -l < OUT.TXT)" = 1 ] || { echo "$case: the run went on"; cat OUT.TXT; exit 1; }
+done
 
 printf 'SAVERESULTS LOG.TXT\nDO\nCOMMENT PASS I OF MANY\nLOOP -1\n' > endless.txt
 "$zelctl" --home home run endless.txt < /dev/null &
