@@ -1,6 +1,7 @@
 #include "desktop/StartOptions.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <string_view>
 #include <vector>
 
@@ -28,6 +29,13 @@ std::string sizeProblem(const std::string& text) {
     return sizeOf(text).isValid() ? "" : "takes a size such as 1024x600, not " + text;
 }
 
+/// A word of the program has neither; a desktop hands on the whole path.
+bool isFile(const std::string& word) {
+    std::error_code ignored;
+    return word.find_first_of("./") != std::string::npos &&
+           std::filesystem::is_regular_file(word, ignored);
+}
+
 }  // namespace
 
 std::optional<int> parseStartOptions(int argc, const char* const* argv, StartOptions& options,
@@ -47,13 +55,18 @@ std::optional<int> parseStartOptions(int argc, const char* const* argv, StartOpt
     app.add_option("--screenshot", options.screenshot,
                    "Read one sweep, save a picture of the window, end")
         ->type_name("FILE");
-    app.add_option("WORDS", words, "Words of the program's command line");
+    app.add_option("WORDS", words,
+                   "Words of the program's command line; a saved view or recording to show");
     if (const auto status = readCommandLine(app, argc, argv, out, errors)) return status;
 
     options.home = common.home;
     options.words = common.words;
-    for (const std::string& word : words)
-        options.words += (options.words.empty() ? "" : " ") + word;
+    for (const std::string& word : words) {
+        if (isFile(word))
+            options.file = word;
+        else
+            options.words += (options.words.empty() ? "" : " ") + word;
+    }
     if (!size.empty()) options.size = sizeOf(size);
     if (!theme.empty()) options.theme = themeFromText(QString::fromStdString(theme));
     if (common.connect.empty()) return std::nullopt;

@@ -15,6 +15,7 @@ struct StartOptions {
     std::optional<LinkAddress> address;
     std::string home;                  ///< the application's folder; empty for the user's own
     std::string words;                 ///< the program's command line
+    std::string file;                  ///< saved view or recording to show; empty for none
     std::string screenshot;            ///< file of a picture of the window; empty for none
     QSize size;                        ///< of the window; none where it is not valid
     std::optional<ThemeChoice> theme;  ///< none: as it was chosen last

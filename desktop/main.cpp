@@ -36,6 +36,7 @@ int main(int argc, char** argv) {
     zel::GuardedApplication application(argc, argv);  // takes the toolkit's own options away
     zel::useEnglishMessages();
     QApplication::setApplicationName("ZELRemote");
+    QGuiApplication::setDesktopFileName("example.zelremote.ZELRemote");
     QApplication::setApplicationVersion(QString::fromStdString(zel::versionText(zel::kVersion)));
     if (const auto status = zel::parseStartOptions(argc, argv, options, std::cout, std::cerr))
         return *status;
@@ -67,6 +68,7 @@ int main(int argc, char** argv) {
         program.start();
         if (program.ended()) return;
         window.show();
+        if (!options.file.empty()) program.forms().controller.OpenFile(options.file);
         if (options.address) program.connect(*options.address, true);
         if (program.ended()) return;
         if (options.screenshot.empty()) {

@@ -3,6 +3,7 @@
 
 #include <QByteArray>
 #include <QSerialPort>
+#include <QString>
 #include <QTimer>
 #include <string>
 
@@ -46,7 +47,12 @@ class QtSerialPort : public SerialPort {
 
 class QtSerialPortList : public SerialPortList {
   public:
+    /// `folder` is where the kernel lists its terminals.
+    explicit QtSerialPortList(QString folder = "/sys/class/tty") : folder_(std::move(folder)) {}
     std::vector<std::string> names() override;
+
+  private:
+    QString folder_;
 };
 
 }  // namespace zel

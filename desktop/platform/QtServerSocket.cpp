@@ -31,7 +31,7 @@ class QtServerSocket::Listener : public QTcpServer {
 
   protected:
     void incomingConnection(qintptr descriptor) override {
-        auto* socket = owner_.tls_ ? new QSslSocket : new QTcpSocket;
+        auto* socket = owner_.configuration_ ? new QSslSocket : new QTcpSocket;
         if (!socket->setSocketDescriptor(descriptor)) {
             delete socket;
             return;
@@ -64,12 +64,12 @@ void QtServerSocket::knocked(QTcpSocket* socket) {
 
 bool QtServerSocket::prove(int requestId) {
     const auto found = requests_.find(requestId);
-    if (!tls_ || found == requests_.end() || found->second.proof != Proof::None) return false;
+    if (!configuration_ || found == requests_.end() || found->second.proof != Proof::None) return false;
     auto* secured = qobject_cast<QSslSocket*>(found->second.socket);
     if (secured == nullptr) return false;
     found->second.proof = Proof::Running;
     secured->setReadBufferSize(kMostOfProof);
-    secured->setSslConfiguration(configuration_);
+    secured->setSslConfiguration(*configuration_);
     QObject::connect(secured, &QSslSocket::encrypted, secured,
                      [this, requestId] { proved(requestId); });
     QObject::connect(secured, &QSslSocket::errorOccurred, secured, [this, requestId, secured] {
@@ -148,9 +148,10 @@ std::string QtServerSocket::localIP() const {
 }
 
 std::string QtServerSocket::useTls(const TlsFiles& files) {
-    std::string problem = serverTls(files, configuration_);
+    QSslConfiguration configuration;
+    std::string problem = serverTls(files, configuration);
     if (!problem.empty()) return problem;
-    tls_ = true;
+    configuration_ = configuration;
     return {};
 }
 

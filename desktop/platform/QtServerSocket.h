@@ -5,6 +5,7 @@
 #include <QTcpServer>
 #include <map>
 #include <memory>
+#include <optional>
 
 #include "desktop/platform/QtSocket.h"
 #include "platform/ServerSocket.h"
@@ -49,8 +50,8 @@ class QtServerSocket : public ServerSocket {
     int port_ = 0;
     bool failed_ = false;
     std::string problem_;
-    bool tls_ = false;
-    QSslConfiguration configuration_;
+    /// There with TLS only: making one loads the libraries of TLS.
+    std::optional<QSslConfiguration> configuration_;
 };
 
 }  // namespace zel

@@ -11,6 +11,9 @@
 
 #include "support/IniFile.h"
 
+/// The linker takes the resources of a library only when they are asked for.
+static void takeDefaults() { Q_INIT_RESOURCE(defaults); }
+
 namespace zel {
 namespace {
 
@@ -40,6 +43,7 @@ void copyExamples(const QString& from, const QString& folder) {
 
 /// A new folder gets the files that users may change; a file that is there stays.
 void fillFromDefaults(const QString& folder) {
+    takeDefaults();
     const QDir defaults(":/defaults");
     for (const QString& name : defaults.entryList(QDir::Files)) {
         QFile file(folder + "/" + name);

@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <cstdio>
+#include <fstream>
 #include <sstream>
 #include <vector>
 
@@ -68,6 +70,15 @@ INSTANTIATE_TEST_SUITE_P(Options, WrongStart,
                                            std::vector<const char*>{"--size", "0x600"},
                                            std::vector<const char*>{"--size", "1e3x600"},
                                            std::vector<const char*>{"--fly"}));
+
+TEST_F(StartOptionsTest, AWordThatIsAFile_IsShownAndNoWordOfTheProgram) {
+    const std::string file = testing::TempDir() + "start options view.csv";
+    std::ofstream(file) << "Trace Name;Analyzer\n";
+    EXPECT_FALSE(parse({"BUTTON", file.c_str(), "/no/such/file.csv"}));
+    EXPECT_EQ(options.file, file);
+    EXPECT_EQ(options.words, "BUTTON /no/such/file.csv");
+    std::remove(file.c_str());
+}
 
 }  // namespace
 }  // namespace zel

@@ -6,6 +6,7 @@
 #include <termios.h>
 #include <unistd.h>
 
+#include <QDir>
 #include <QFile>
 #include <QTemporaryDir>
 #include <array>
@@ -311,6 +312,27 @@ TEST_F(OnQt, Settings_SurviveTheProgram) {
     QtPlatform later(home.path());
     EXPECT_EQ(later.settings.get("ZELRemote", "DIRECTCON", "CommPort", "0"), "3");
     EXPECT_EQ(platform.settings.get("ZELRemote", "DIRECTCON", "absent", "R"), "R");
+}
+
+TEST(QtSerialPortList, NamesThePortsOfTheKernelsList) {
+    QTemporaryDir folder;
+    const auto add = [&](const QString& name, const char* type) {
+        QDir().mkpath(folder.filePath(name));
+        if (!name.startsWith("tty0") && !name.startsWith("rf"))
+            QDir().mkpath(folder.filePath(name + "/device"));
+        QFile file(folder.filePath(name + "/type"));
+        if (type == nullptr || !file.open(QIODevice::WriteOnly)) return;
+        file.write(type);
+    };
+    add("tty0", nullptr);  // a console
+    add("ttyS0", "4\n");   // with a chip
+    add("ttyS1", "0\n");   // without
+    add("ttyUSB10", nullptr);
+    add("ttyUSB2", nullptr);
+    add("rfcomm0", nullptr);  // a radio link has no device
+    EXPECT_EQ(
+        QtSerialPortList(folder.path()).names(),
+        (std::vector<std::string>{"/dev/rfcomm0", "/dev/ttyUSB2", "/dev/ttyUSB10", "/dev/ttyS0"}));
 }
 
 }  // namespace

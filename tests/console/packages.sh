@@ -1,0 +1,112 @@
+#!/usr/bin/env bash
+# Packs the build into Debian packages, unpacks them into a fresh root and runs the programs from
+# there, with no display.
+#
+#   packages.sh CPACK BUILD_FOLDER
+set -euo pipefail
+cpack=$1
+build=$2
+scratch=$(mktemp -d)
+simulator=
+finish() {
+    [ -z "$simulator" ] || kill "$simulator" 2> /dev/null || true
+    rm -rf "$scratch"
+}
+trap finish EXIT
+unset DESTDIR DISPLAY WAYLAND_DISPLAY
+fail() {
+    echo "$1"
+    exit 1
+}
+
+(cd "$build" && "$cpack" -G DEB -B "$scratch/packages" > "$scratch/log" 2>&1) ||
+    { cat "$scratch/log"; exit 1; }
+
+for name in zelremote zelremote-cli zelremote-draw zelremote-server; do
+    package=$(echo "$scratch/packages/${name}_"*.deb)
+    [ -f "$package" ] || fail "there is no package $name"
+    dpkg-deb -f "$package" Package Version Depends Description > "$scratch/$name.control"
+    mkdir -p "$scratch/$name"
+    dpkg -x "$package" "$scratch/$name"
+    dpkg -x "$package" "$scratch/root"
+    for document in copyright changelog.gz; do
+        [ -s "$scratch/$name/usr/share/doc/$name/$document" ] || fail "$name has no $document"
+    done
+done
+if grep -qiE 'widgets|gui|svg|qcustomplot|qscintilla' \
+    <(grep '^Depends' "$scratch/zelremote-cli.control"); then
+    fail "the console depends on a library of windows"
+fi
+grep -q '^Depends:.*libqt6core6' "$scratch/zelremote-cli.control" || fail "libraries are not named"
+grep -q '^Depends:.*zelremote-cli' "$scratch/zelremote.control" || fail "the desktop lacks the console"
+grep -q '^Depends:.*zelremote-cli' "$scratch/zelremote-server.control" || fail "the server lacks it"
+
+root=$scratch/root/usr
+for program in zelremote zelctl zeldraw ZELSim; do
+    "$root/bin/$program" --version | grep -q "^$program [0-9]" || fail "$program names no version"
+    "$root/bin/$program" --help > "$scratch/help"
+    zcat "$root/share/man/man1/$program.1.gz" | sed 's/\\-/-/g' > "$scratch/page"
+    while read -r option; do
+        grep -q -e "$option" "$scratch/page" || fail "$program(1) does not name $option"
+    done < <(grep -oE -- '(^|[ ,])--[a-z-]+' "$scratch/help" | tr -d ' ,' | sort -u)
+    [ -s "$root/share/bash-completion/completions/$program" ] || fail "$program has no completion"
+done
+# Each verb stands in its manual page.
+zcat "$root/share/man/man1/zelctl.1.gz" | sed 's/\\-/-/g' > "$scratch/page"
+"$root/bin/zelctl" --help | sed -n '/^Subcommands:/,$s/^  \([a-z][a-z]*\).*/\1/p' > "$scratch/verbs"
+[ "$(wc -l < "$scratch/verbs")" -ge 11 ] || fail "the verbs cannot be read"
+while read -r verb; do
+    grep -qE "(^|[ \"])(\.B[RI]* \"?)?$verb( |\"|$)" "$scratch/page" || fail "zelctl(1) does not name $verb"
+done < "$scratch/verbs"
+
+# What bash completes is what the program has.
+completed=$(bash -c "
+    PATH=$root/bin:\$PATH
+    . '$root/share/bash-completion/completions/zelctl'
+    COMP_WORDS=(zelctl --connect sim: swe) COMP_CWORD=3
+    _zelremote zelctl
+    echo \"\${COMPREPLY[*]}\"
+    COMP_WORDS=(zelctl sweep --im) COMP_CWORD=2
+    _zelremote zelctl
+    echo \"\${COMPREPLY[*]}\"")
+[ "$completed" = $'sweep\n--image' ] || fail "bash completes: $completed"
+
+# A measurement with a picture; the example scripts are there on the first start.
+"$root/bin/zelctl" --connect sim: --home "$scratch/home" sweep --image "$scratch/graph.svg" \
+    > "$scratch/rows"
+[ "$(wc -l < "$scratch/rows")" = 302 ] || fail "the sweep has not 302 lines"
+grep -q '<svg' "$scratch/graph.svg" || fail "the picture is missing"
+[ -s "$scratch/home/settings.ini" ] || fail "the settings are missing"
+ls "$scratch/home/specialMeas/"*.txt > /dev/null || fail "the example scripts are missing"
+
+companion=$(find "$root/" -path '*/zelremote/ZELSim/ZELSim')
+[ -x "$companion" ] || fail "the panel finds no simulator"
+"$companion" --pty --link "$scratch/port" > "$scratch/simulator.log" &
+simulator=$!
+for _ in $(seq 100); do
+    [ ! -e "$scratch/port" ] || break
+    sleep 0.1
+done
+QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --connect "serial:$scratch/port@57600" \
+    --home "$scratch/home2" --screenshot "$scratch/window.png"
+[ -s "$scratch/window.png" ] || fail "the window cannot be drawn"
+
+for file in lib/systemd/system/zelremote-server@.service lib/udev/rules.d/70-zelremote.rules \
+    share/applications/example.zelremote.ZELRemote.desktop share/mime/packages/zelremote.xml \
+    share/metainfo/example.zelremote.ZELRemote.metainfo.xml \
+    share/icons/hicolor/scalable/apps/zelremote.svg share/doc/zelremote/README.md; do
+    [ -s "$root/$file" ] || fail "$file is missing"
+done
+documentation=$(sed -n 's|^Documentation=file:///usr/||p' "$root/lib/systemd/system/zelremote-server@.service")
+[ -s "$root/$documentation" ] || fail "the unit names a document that is not there: $documentation"
+
+if command -v desktop-file-validate > /dev/null; then
+    desktop-file-validate "$root/share/applications/"*.desktop
+fi
+if command -v appstreamcli > /dev/null; then
+    appstreamcli validate --no-net "$root/share/metainfo/"*.xml > "$scratch/log" ||
+        { cat "$scratch/log"; exit 1; }
+fi
+if command -v lintian > /dev/null; then
+    lintian --fail-on error "$scratch/packages/"*.deb 2> /dev/null
+fi
