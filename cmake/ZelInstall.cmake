@@ -57,8 +57,10 @@ function(zel_install_desktop)
         DESTINATION "${CMAKE_INSTALL_DATAROOTDIR}/metainfo" COMPONENT desktop)
     install(FILES "${source}/desktop/zelremote.xml"
         DESTINATION "${CMAKE_INSTALL_DATAROOTDIR}/mime/packages" COMPONENT desktop)
-    install(FILES "${source}/icons/zelremote.svg"
-        DESTINATION "${CMAKE_INSTALL_DATAROOTDIR}/icons/hicolor/scalable/apps" COMPONENT desktop)
+    # The icon is that of the window; the small ones are drawn from it.
+    install(FILES "${PROJECT_SOURCE_DIR}/desktop/pictures/application.svg"
+        DESTINATION "${CMAKE_INSTALL_DATAROOTDIR}/icons/hicolor/scalable/apps"
+        RENAME zelremote.svg COMPONENT desktop)
     foreach(size 48 128)
         install(FILES "${source}/icons/zelremote-${size}.png"
             DESTINATION "${CMAKE_INSTALL_DATAROOTDIR}/icons/hicolor/${size}x${size}/apps"
