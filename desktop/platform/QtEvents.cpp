@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <utility>
 
 namespace zel {
 namespace {
@@ -26,32 +27,43 @@ QtEvents::QtEvents(const Clock& clock) : clock_(clock), waitTimer_(std::make_uni
 QtEvents::~QtEvents() = default;
 
 int QtEvents::addSource(Source source) {
-    sources_[++lastSource_] = std::move(source);
+    sources_[++lastSource_] = {std::move(source)};
     return lastSource_;
 }
 
 void QtEvents::removeSource(int id) { sources_.erase(id); }
 
-bool QtEvents::bytesWait() const {
-    return std::any_of(sources_.begin(), sources_.end(),
-                       [](const auto& entry) { return entry.second.bytesWait(); });
+void QtEvents::bytesArrived(int id) {
+    if (const auto found = sources_.find(id); found != sources_.end()) found->second.arrived = true;
 }
 
-bool QtEvents::pollSources(int ms) {
+/// Whether a buffer holds bytes that no wait has ended for.
+bool QtEvents::takeArrivals() {
+    bool any = false;
+    for (auto& [id, watched] : sources_)
+        any |= std::exchange(watched.arrived, false) && watched.source.bytesWait();
+    return any;
+}
+
+QtEvents::Poll QtEvents::pollSources(int ms) {
     std::array<pollfd, kMostSources> descriptors{};
     nfds_t count = 0;
-    for (const auto& [id, source] : sources_) {
-        const int fd = source.descriptor();
+    for (const auto& [id, watched] : sources_) {
+        // Who leaves bytes in the buffer waits for none: the loop goes on to fetch them, and a
+        // full buffer would leave the descriptor readable for ever.
+        if (watched.source.bytesWait()) continue;
+        const int fd = watched.source.descriptor();
         if (fd >= 0 && count < descriptors.size())
             descriptors.at(count++) = {fd, POLLIN | POLLRDHUP, 0};
     }
-    if (count == 0 || ::poll(descriptors.data(), count, ms) <= 0) return false;
+    if (count == 0) return Poll::NothingToPoll;
+    if (::poll(descriptors.data(), count, ms) <= 0) return Poll::Silent;
     const bool ended = std::any_of(descriptors.begin(), descriptors.end(), [](const pollfd& d) {
         return (d.revents & (POLLHUP | POLLRDHUP | POLLERR | POLLNVAL)) != 0;
     });
     // The loop has to notice the end of a line: it would be readable for ever.
     if (ended) processEvents();
-    return true;
+    return Poll::Ready;
 }
 
 bool QtEvents::processEvents() {
@@ -72,12 +84,17 @@ void QtEvents::pump() {
 }
 
 void QtEvents::wait(int ms) {
-    if (bytesWait()) return pump();
+    if (takeArrivals()) return pump();
+    // What nobody takes goes from the line into the buffer, where it ends one wait at most.
+    const bool left = std::exchange(offered_, false);
     const bool overdue = clock_.micros() - lastProcessed_ >= kPumpEveryMicros;
-    if (overdue && processEvents()) return;
-    if (bytesWait()) return;
+    if ((left || overdue) && processEvents()) return;
+    if (takeArrivals()) return;
     const int shortWay = std::min(ms, kShortWayMs);
-    if (pollSources(shortWay)) return;
+    const Poll polled = pollSources(shortWay);
+    offered_ = polled == Poll::Ready;
+    if (offered_) return;
+    if (polled == Poll::NothingToPoll) return processAndWait(ms);
     if (ms > shortWay) {
         processAndWait(ms - shortWay);
     } else {
@@ -86,7 +103,7 @@ void QtEvents::wait(int ms) {
 }
 
 void QtEvents::processAndWait(int ms) {
-    if (processEvents() || bytesWait()) return;
+    if (processEvents() || takeArrivals() || ms <= 0) return;
     waitTimer_->start(ms);
     if (QAbstractEventDispatcher* dispatcher = QAbstractEventDispatcher::instance())
         dispatcher->processEvents(QEventLoop::AllEvents | QEventLoop::WaitForMoreEvents);

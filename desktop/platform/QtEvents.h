@@ -30,23 +30,35 @@ class QtEvents : public Events {
     };
     int addSource(Source source);
     void removeSource(int id);
+    /// New bytes have come into the buffer of a source: the wait under way, or else the next one,
+    /// ends at once. Bytes that nobody takes end no further wait.
+    void bytesArrived(int id);
+    /// Somebody has read from a source what a wait ended for.
+    void bytesTaken() { offered_ = false; }
     /// A descriptor that ends a delay as soon as it can be read; -1 for none.
     void setWakeDescriptor(int descriptor) { wakeDescriptor_ = descriptor; }
 
   private:
-    bool bytesWait() const;
-    bool pollSources(int ms);
+    struct Watched {
+        Source source;
+        bool arrived = false;  ///< since the last wait that ended for it
+    };
+    enum class Poll { Ready, Silent, NothingToPoll };
+
+    bool takeArrivals();
+    Poll pollSources(int ms);
     bool processEvents();
     void processAndWait(int ms);
 
     const Clock& clock_;
-    std::map<int, Source> sources_;
+    std::map<int, Watched> sources_;
     int lastSource_ = 0;
     std::map<TaskId, std::unique_ptr<QTimer>> tasks_;
     TaskId lastTask_ = 0;
     std::unique_ptr<QTimer> waitTimer_;
     int wakeDescriptor_ = -1;
     std::int64_t lastProcessed_ = 0;  // microseconds
+    bool offered_ = false;            ///< a wait ended for bytes that were not taken yet
 };
 
 }  // namespace zel

@@ -73,7 +73,10 @@ bool portsOfSystem(const QString& folder, std::vector<std::string>& ports) {
 
 QtSerialPort::QtSerialPort(QtEvents& events, bool quick) : events_(events) {
     port_.setReadBufferSize(kMostBuffered);
-    QObject::connect(&port_, &QSerialPort::readyRead, &port_, [this] { OnComm(kDataReceived); });
+    QObject::connect(&port_, &QSerialPort::readyRead, &port_, [this] {
+        events_.bytesArrived(source_);
+        OnComm(kDataReceived);
+    });
     QObject::connect(&port_, &QSerialPort::errorOccurred, &port_,
                      [this](QSerialPort::SerialPortError error) {
                          // A time-out is none, and pseudo terminals have no control lines.
@@ -180,6 +183,7 @@ bool QtSerialPort::hungUp() const {
 
 std::string QtSerialPort::input() {
     if (!port_.isOpen()) return {};
+    events_.bytesTaken();
     // What the event loop has fetched comes first; what the line has now, without the detour
     // through the loop, after it.
     std::string bytes;

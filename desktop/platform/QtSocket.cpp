@@ -53,6 +53,7 @@ void QtSocket::adopt(QTcpSocket* socket) {
     socket_->setReadBufferSize(kMostBuffered);
     QObject::connect(socket, &QTcpSocket::readyRead, socket, [this] {
         received_ = true;
+        events_.bytesArrived(source_);
         DataArrival();
     });
     QObject::connect(socket, &QTcpSocket::connected, socket, [socket] { keepAlive(*socket); });
@@ -193,6 +194,7 @@ std::string QtSocket::peekData() {
 }
 
 std::string QtSocket::getData() {
+    events_.bytesTaken();
     fetch();
     return socket_ ? socket_->readAll().toStdString() : std::string();
 }

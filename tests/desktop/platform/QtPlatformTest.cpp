@@ -8,6 +8,8 @@
 
 #include <QDir>
 #include <QFile>
+#include <QTcpServer>
+#include <QTcpSocket>
 #include <QTemporaryDir>
 #include <array>
 #include <csignal>
@@ -88,6 +90,44 @@ TEST_F(OnQt, Wait_EndsWithTheFirstByteOfTheLine) {
     }
     EXPECT_EQ(got, "0\r");
     EXPECT_LT(waits, 20);
+}
+
+/// How often a loop turns that waits `ms` milliseconds in all, 10 at a time.
+int turnsIn(QtPlatform& platform, int ms) {
+    const std::int64_t end = platform.clock.micros() + std::int64_t{ms} * 1000;
+    int turns = 0;
+    for (; platform.clock.micros() < end; ++turns) platform.events.wait(10);
+    return turns;
+}
+
+TEST_F(OnQt, BytesThatNobodyTakes_EndNoFurtherWait) {
+    const Terminal line;
+    ASSERT_TRUE(openPort(line.path));
+    line.send("0\r");
+    turnsIn(platform, 20);
+    EXPECT_LE(turnsIn(platform, 200), 30);
+    // What comes then does, and finds its reader.
+    platform.events.schedule(5, [&line] { line.send("1\r"); });
+    const std::int64_t before = platform.clock.micros();
+    platform.events.wait(60000);  // the task
+    platform.events.wait(60000);  // the bytes
+    EXPECT_LT(platform.clock.micros() - before, 30'000'000);
+    EXPECT_EQ(platform.serialPort.input(), "0\r1\r");
+}
+
+TEST_F(OnQt, BytesThatNobodyTakesFromASocket_EndNoFurtherWait) {
+    QTcpServer server;
+    ASSERT_TRUE(server.listen(QHostAddress::LocalHost));
+    platform.tcpSocket.connectTo("127.0.0.1", server.serverPort());
+    for (int i = 0; i < 100 && platform.tcpSocket.state() != SocketState::Connected; ++i)
+        platform.events.wait(50);
+    QTcpSocket* const far = server.nextPendingConnection();
+    ASSERT_NE(far, nullptr);
+    // More than the buffer takes: the rest keeps the descriptor readable.
+    far->write(QByteArray(3 << 20, '0'));
+    turnsIn(platform, 300);
+    EXPECT_LE(turnsIn(platform, 200), 30);
+    EXPECT_GE(platform.tcpSocket.getData().size(), std::size_t{1} << 20);
 }
 
 TEST_F(OnQt, BytesThatTheLoopFetched_ComeAheadOfThoseOnTheLine) {
