@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 #include "support/Text.h"
 #include "support/Windows1252.h"
@@ -13,6 +14,9 @@ constexpr double kDirectTimeoutS = 9;
 constexpr double kOtherTimeoutS = 16;
 constexpr double kLongestTimeoutS = 86400;  // a sweep time that makes no sense ends as well
 constexpr int kPollMs = 20;
+// The answer that is due follows a late one at once; the line is silent this long after it.
+constexpr int kSilenceMs = 250;
+constexpr int kLongestWaitForSilenceMs = 2500;
 constexpr int kSettledMs = 20;  // a text that grew later than this is not judged yet
 // An answer line is far shorter; noise without a CR must not grow for ever.
 constexpr std::size_t kLongestAnswer = 65536;
@@ -86,6 +90,7 @@ std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
             session_.events.pump();
             std::string answer = state_.InputBuffer.substr(0, end);
             state_.InputBuffer.erase(0, end + 1);
+            if (std::exchange(state_.LateAnswerFirst, false)) answer = lastOfAll(answer);
             state_.ExchangeFailed = false;
             answered_ = true;
             showLinkLost(panel_, false);
@@ -105,6 +110,26 @@ std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
         giveUpConnecting();
     }
     return "";
+}
+
+/// What came late belongs to the question before: the answer to this one is the last status.
+std::string AnswerReader::lastOfAll(std::string answer) {
+    const Stopwatch whole(session_.clock);
+    Stopwatch silence(session_.clock);
+    while (silence.Elapsed() < kSilenceMs && whole.Elapsed() < kLongestWaitForSilenceMs &&
+           link_.usable() && !state_.mustLeave(session_.clock.micros())) {
+        session_.events.wait(kPollMs);
+        const std::string arrived = link_.takeBytes();
+        if (arrived.empty()) continue;
+        silence.Reset();
+        state_.InputBuffer += arrived;
+        if (state_.InputBuffer.size() > kLongestAnswer) state_.InputBuffer.clear();
+    }
+    // The samples of a late transfer have no line end: only the digit before the last one counts.
+    const auto end = state_.InputBuffer.rfind('\r');
+    if (end != std::string::npos && end > 0) answer = state_.InputBuffer.substr(end - 1, 1);
+    state_.InputBuffer.clear();
+    return answer;
 }
 
 void AnswerReader::leave() {

@@ -42,6 +42,7 @@ class AnswerReader {
     void judgeNoise();
     void giveUpConnecting();
     void leave();
+    std::string lastOfAll(std::string answer);
     void takeConnectionDown();
 
     ControllerForm& panel_;

@@ -1,6 +1,7 @@
 #include "link/ByteLink.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "link/WaitNotice.h"
 #include "platform/LinkAddress.h"
@@ -103,8 +104,8 @@ void ByteLink::tellLoss() {
 void ByteLink::WriteToLink(const std::string& text) {
     const std::optional<std::string> bytes = toWindows1252(text);
     if (!bytes) return;
-    if (state_.AnswerOverdue) takeBytes();
-    state_.AnswerOverdue = false;
+    state_.LateAnswerFirst = std::exchange(state_.AnswerOverdue, false);
+    if (state_.LateAnswerFirst) takeBytes();
     if (isTcp()) {
         if (socket_.sendData(*bytes)) state_.LossTold = false;
     } else if (dialog_.IsConnectedToPort) {

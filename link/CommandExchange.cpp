@@ -63,6 +63,7 @@ void CommandExchange::settleOwedAnswer() {
     // The answer that was owed may come with the one to the CR.
     session_.events.sleep(kAfterOwedMs);
     link_.takeBytes();
+    state_.AnswerOverdue = true;  // of a long sweep, or over a slow line
 }
 
 void CommandExchange::leaveWait(int graceMs) {

@@ -22,8 +22,10 @@ struct ZELBas {
     bool ComplexTraceRequested = false;  ///< a complex transfer had to be asked for again
     std::int16_t BinaryDecodeIndex = 0;
     bool AnswerOverdue = false;  ///< an exchange ended in a time-out: its answer may still come
-    bool LossTold = false;       ///< the end of this connection was reported to the user
-    double SweepTimeTold = 0;    ///< s, SWPTIME as the instrument last answered or accepted it
+    /// The line that was just sent follows such an exchange: what comes first may be its answer.
+    bool LateAnswerFirst = false;
+    bool LossTold = false;     ///< the end of this connection was reported to the user
+    double SweepTimeTold = 0;  ///< s, SWPTIME as the instrument last answered or accepted it
     /// Exchanges, transfers and whole cycles of them that have begun and not ended. What would
     /// begin another one waits until it is 0 again.
     int DialoguesUnderWay = 0;

@@ -288,5 +288,15 @@ TEST_F(TcpDialogTest, PeerGoneInSession_EveryExchangeEndsAtOnceAndTheReasonIsTol
     EXPECT_FALSE(success);
 }
 
+TEST_F(TcpDialogTest, ProbeAnsweredWithoutALineEnd_IsTakenAfterAQuarterOfASecond) {
+    socket.expect("\r").answer("0");
+    Page(socket).whole();
+    std::string sentBefore;
+    later(240, [&] { sentBefore = socket.written(); });
+    EXPECT_TRUE(connectTcp());
+    EXPECT_EQ(sentBefore, "\r");
+    EXPECT_EQ(socket.failure(), "");
+}
+
 }  // namespace
 }  // namespace zel

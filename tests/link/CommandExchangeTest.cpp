@@ -147,7 +147,7 @@ TEST_F(Line, Cmd_Wait_LengthensEveryLaterReadUntilTheNextCommand) {
     port.expect("INIT\r").silence();
     ASSERT_TRUE(exchange.CmdInstrument("WAIT"));
     EXPECT_GE(time([&] { exchange.SetInstrument("RBW,1"); }), 13000);
-    EXPECT_LE(time([&] { exchange.CmdInstrument("INIT"); }), 9200);
+    EXPECT_LE(time([&] { exchange.CmdInstrument("INIT"); }), 9500);
     expectPlayed();
 }
 

@@ -1,0 +1,88 @@
+// An answer that comes after its time-out belongs to no later question.
+
+#include "tests/link/Line.h"
+
+namespace zel {
+namespace {
+
+TEST_F(Line, LateAnswer_InsideTheNextQuery_IsNotTakenForIts) {
+    port.expect("cmd\r").answer("0\r");
+    port.expect("WAIT\r").answer("0\r").after(9300);
+    port.expect("GET\r").answer("0\r").after(300);
+    port.expect("FREQ\r").answer("0\r1500000000\r");
+    EXPECT_FALSE(exchange.CmdInstrument("WAIT"));
+    std::string value;
+    EXPECT_TRUE(exchange.GetInstrument("FREQ", value));
+    EXPECT_EQ(value, "1500000000");
+    expectPlayed();
+}
+
+TEST_F(Line, LateAnswer_InsideTheNextSetting_DoesNotAcceptIt) {
+    port.expect("set\r").answer("0\r").after(9300);
+    port.expect("set\r").answer("0\r").after(300);
+    port.expect("SPAN,9e9\r").answer("5\r");
+    EXPECT_FALSE(exchange.SetInstrument("FREQ,1000000000"));
+    boxes.clear();
+    EXPECT_FALSE(exchange.SetInstrument("SPAN,9e9"));
+    EXPECT_EQ(shown().size(), 1U);
+    expectPlayed();
+}
+
+TEST_F(Line, LateAnswer_OverTcp_IsNotTakenForTheNext) {
+    overTcp();
+    socket.expect("cmd\r").answer("0\r");
+    socket.expect("WAIT\r").answer("0\r").after(16300);
+    socket.expect("GET\r").answer("0\r").after(300);
+    socket.expect("FREQ\r").answer("0\r1500000000\r");
+    EXPECT_FALSE(exchange.CmdInstrument("WAIT"));
+    std::string value;
+    EXPECT_TRUE(exchange.GetInstrument("FREQ", value));
+    EXPECT_EQ(value, "1500000000");
+    expectPlayed();
+}
+
+TEST_F(Line, LateAnswer_BetweenTwoExchangesOverTcp_IsEmptiedOnce) {
+    overTcp();
+    socket.expect("GET\r").answer("0\r");
+    socket.expect("SPAN\r").answer("0\r").answer("7\r").after(2000);
+    socket.expect("GET\r").answer("0\r");
+    socket.expect("FREQ\r").answer("0\r1500000000\r");
+    std::string value = "old";
+    EXPECT_FALSE(exchange.GetInstrument("SPAN", value));
+    EXPECT_EQ(value, "old");
+    events.runFor(3000);
+    EXPECT_EQ(socket.peekData(), "7\r");
+    EXPECT_TRUE(exchange.GetInstrument("FREQ", value));
+    EXPECT_EQ(value, "1500000000");
+    expectPlayed();
+}
+
+TEST_F(Line, RestOfATransfer_InsideTheNextQuery_IsNotTakenForIts) {
+    // Samples that look like ends of lines and refusals.
+    std::string rest;
+    for (int i = 0; i < 200; ++i) rest += std::string("5\r\0\0", 4);
+    port.expect("GET\r").answer("0\r");
+    port.expect("TRACEBIN\r").answer("0\r" + rest).answer(rest + rest.substr(0, 5)).after(5300);
+    port.expect("GET\r").answer("0\r").after(400);
+    port.expect("FREQ\r").answer("0\r1500000000\r");
+    RawTrace trace;
+    EXPECT_TRUE(binary.GetTraceBinary(trace, false));
+    EXPECT_EQ(trace.came, 200U);
+    std::string value;
+    EXPECT_TRUE(exchange.GetInstrument("FREQ", value));
+    EXPECT_EQ(value, "1500000000");
+    expectPlayed();
+}
+
+TEST_F(Line, AfterATimeOut_OneExchangeLooksForTheLateAnswerAndNoOther) {
+    port.expect("set\r").silence();
+    exchangeOf("set", "RBW,1", "0\r");
+    exchangeOf("set", "RBW,2", "0\r");
+    EXPECT_FALSE(exchange.SetInstrument("FREQ,1000000000"));
+    EXPECT_LE(time([&] { EXPECT_TRUE(exchange.SetInstrument("RBW,1")); }), 300);
+    EXPECT_LE(time([&] { EXPECT_TRUE(exchange.SetInstrument("RBW,2")); }), 50);
+    expectPlayed();
+}
+
+}  // namespace
+}  // namespace zel
