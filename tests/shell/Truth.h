@@ -1,6 +1,6 @@
 #pragma once
-// The program with the simulated instrument behind a line that fails where it is the test says, and
-// a check that whatever is shown as a whole trace is what the instrument sent.
+// The program with the simulated instrument behind a line that fails where the test says, and a
+// check that whatever is shown as a whole trace is what the instrument sent.
 
 #include <cstdint>
 #include <set>
