@@ -143,11 +143,11 @@ class Cutter {
             for (std::size_t i = 0; i < trace.x.size(); ++i)
                 trace.x[i] = static_cast<double>(i) * whole / kIntervals;
         for (double& level : trace.level) {
-            if (header_.unit == UNITV) level = VoltsToDbm(level);
-            if (header_.unit == UNITW) level = WattsToDbm(level);
-            if (!std::isfinite(level))
-                throw std::runtime_error("a level of " + unitName() +
-                                         " below 0 has no value in dBm");
+            if (!linear) break;
+            if (level <= 0)
+                throw std::runtime_error("a level of 0 " + unitName() +
+                                         " or below has no value in dBm");
+            level = header_.unit == UNITV ? VoltsToDbm(level) : WattsToDbm(level);
         }
         headerBegun_ = false;
         ++traces_;

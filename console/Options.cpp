@@ -75,6 +75,8 @@ struct Parser {
                  "zelctl"};
     CommonOptions common;
     std::map<const CLI::App*, Verb> verbs;
+    AnalysisOptions analysis;  ///< of the verb analyse
+    std::string analysisProblem;
 
     explicit Parser(Options& options) {
         addCommonOptions(app, common, kAddresses);
@@ -102,6 +104,15 @@ struct Parser {
         outputOption(sweep, options, "Saves the view as the panel does");
         imageOption(sweep, options);
         rowsOptions(sweep, options);
+        sweep
+            ->add_option_function<std::string>(
+                "--analyse",
+                [this, &options](const std::string& text) {
+                    options.analysis.emplace();
+                    analysisProblem = parseAnalysisText(text, *options.analysis);
+                },
+                "Prints results in place of the rows; \"OPTIONS\" are those of analyse")
+            ->type_name("\"OPTIONS\"");
         CLI::App* record = verb(Verb::Record, "record", "Records traces by a timer");
         numberOption(*record, "--interval", options.interval, kShortestInterval, kLongestInterval,
                      "Seconds from trace to trace")
@@ -123,6 +134,10 @@ struct Parser {
             verb(Verb::Panel, "panel", "Works the panel by the names of its controls");
         panel->add_option("FILE", options.argument, "Lines of commands; standard input without it");
         addRemoteVerbs(options);
+        CLI::App* analyse =
+            verb(Verb::Analyse, "analyse", "Measures the traces of saved views and recordings");
+        analyse->add_option("FILE", options.traceFiles, "Saved views and recordings")->required();
+        addAnalysisOptions(*analyse, analysis);
     }
 
     void addRemoteVerbs(Options& options) {
@@ -205,7 +220,7 @@ struct Parser {
 
 std::string missing(const Options& options) {
     if (options.verb == Verb::Panel || options.verb == Verb::Show || options.verb == Verb::Serve ||
-        options.verb == Verb::Devices)
+        options.verb == Verb::Devices || options.verb == Verb::Analyse)
         return {};
     if (options.verb == Verb::Run && !options.address) return {};
     if (!options.address) return "this verb needs an instrument: --connect URL";
@@ -234,7 +249,13 @@ std::optional<int> parseOptions(int argc, const char* const* argv, Options& opti
         options.address = parseAddress(url);
         if (!options.address) return refuseAddress(parser.app, kAddresses, url, errors);
     }
-    if (const std::string problem = missing(options); !problem.empty()) {
+    if (options.verb == Verb::Analyse) {
+        options.analysis = parser.analysis;
+        parser.analysisProblem = analysisProblem(parser.analysis);
+    }
+    const std::string problem =
+        parser.analysisProblem.empty() ? missing(options) : parser.analysisProblem;
+    if (!problem.empty()) {
         errors << "zelctl: " << problem << '\n';
         return kWrongUse;
     }

@@ -7,10 +7,11 @@
 #include <vector>
 
 #include "console/Address.h"
+#include "console/AnalysisOptions.h"
 
 namespace zel {
 
-enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Run, Panel, Serve, Devices };
+enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Run, Panel, Serve, Devices, Analyse };
 
 /// What the server and the devices take.
 struct ServeOptions {
@@ -41,6 +42,8 @@ struct Options {
     std::string waterfall;    ///< file of the rows in depth; empty for none
     std::string spectrogram;  ///< file of the rows from above; empty for none
     ServeOptions serve;
+    std::vector<std::string> traceFiles;      ///< of analyse
+    std::optional<AnalysisOptions> analysis;  ///< of analyse and sweep --analyse
 };
 
 /// Fills the options. An exit status when the run is over with that: 0 after a help text on

@@ -7,6 +7,7 @@
 #include <locale>
 #include <memory>
 
+#include "console/AnalysisVerb.h"
 #include "console/ConsoleDialogs.h"
 #include "console/DebugWatch.h"
 #include "console/LineInput.h"
@@ -123,6 +124,17 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
         return kLinkFailed;
     }
     Stage stage(options, front, errors, errors);
+    if (options.verb == Verb::Analyse)
+        return analyseFiles(options.traceFiles, *options.analysis, stage.files, front.clock(),
+                            output, errors);
+    std::optional<AnalysisPrinter> analysis;
+    if (options.analysis) {
+        analysis.emplace(*options.analysis, output, errors);
+        if (const std::string problem = analysis->readMaskFile(stage.files); !problem.empty()) {
+            errors.line("zelctl: " + problem);
+            return kWrongUse;
+        }
+    }
     if (options.verb == Verb::Run && options.rehearse)
         return rehearseScript(options, stage.files, output, errors);
     ProgressBar progress;
@@ -138,8 +150,17 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
                          {stage.program, stage.files, stage.events, input, virtualTime, stage.boxes,
                           stage.dialogs, stage.answers, errors, front.endSignals(), progressLine});
     };
-    const VerbStage verbs{stage.program, stage.events,    stage.answers,  stage.boxes, output,
-                          errors,        writeGraphImage, writeRowsImage, progress,    script};
+    const VerbStage verbs{stage.program,
+                          stage.events,
+                          stage.answers,
+                          stage.boxes,
+                          output,
+                          errors,
+                          writeGraphImage,
+                          writeRowsImage,
+                          progress,
+                          script,
+                          analysis ? &*analysis : nullptr};
     if (options.verb == Verb::Serve) return runServer(options, verbs);
     if (options.verb == Verb::Devices) return runDevices(options, verbs);
     return runVerb(options, verbs);

@@ -1,9 +1,12 @@
 #include "console/Verbs.h"
 
+#include <cstdint>
 #include <memory>
+#include <stdexcept>
 #include <utility>
 #include <vector>
 
+#include "analysis/LiveTrace.h"
 #include "console/GraphText.h"
 #include "console/PanelSession.h"
 #include "link/CommandExchange.h"
@@ -88,6 +91,19 @@ std::shared_ptr<int> tellIncompleteTraces(const Run& run) {
     return count;
 }
 
+/// Hands a sweep to the analysis. False, with the reason on the error output, where it cannot be
+/// analysed; an incomplete one was reported before.
+bool analyse(const Run& run, const Sweep& sweep, std::uint64_t number) {
+    if (!sweep.whole()) return true;
+    try {
+        run.stage.analysis->add(spectrumOf(sweep), {}, number);
+    } catch (const std::runtime_error& wrong) {
+        run.fail(wrong.what());
+        return false;
+    }
+    return true;
+}
+
 int sweep(const Run& run) {
     ControllerForm& panel = run.panel();
     WaterfallForm& waterfall = run.program().forms().waterfall;
@@ -101,7 +117,9 @@ int sweep(const Run& run) {
         panel.ContinuosLoopActive = false;
         if (run.wantsRows()) waterfall.styleLastRow();
         const Sweep& sweep = run.program().traces().lastSweep();
-        if (sweep.wanted > 0) {
+        if (run.stage.analysis != nullptr) {
+            if (!analyse(run, sweep, static_cast<std::uint64_t>(i) + 1)) return kLinkFailed;
+        } else if (sweep.wanted > 0) {
             run.output().line(i == 0 ? sweepHeader(sweep.autoPeak()) : std::string());
             run.output().lines(sweepRows(sweep));
         }
@@ -112,8 +130,10 @@ int sweep(const Run& run) {
         run.panel().SaveCurrentView.Click();
         if (run.stage.boxes.failures() > 0) return kLinkFailed;
     }
+    const int verdict = run.stage.analysis != nullptr ? run.stage.analysis->finish() : kDone;
     const int drawn = run.drawImage();
-    return *incomplete > 0 ? kLinkFailed : drawn;
+    if (*incomplete > 0 || drawn != kDone) return kLinkFailed;
+    return verdict;
 }
 
 /// How far a recording is; its tick handler outlives the verb.

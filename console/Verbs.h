@@ -4,6 +4,7 @@
 #include <functional>
 #include <string>
 
+#include "console/AnalysisVerb.h"
 #include "console/ConsoleDialogs.h"
 #include "console/LineOutput.h"
 #include "console/Options.h"
@@ -32,6 +33,7 @@ struct VerbStage {
     RowsWriter rows;
     ProgressBar progress;                       ///< may be empty
     std::function<int(const Options&)> script;  ///< runs a script; gives the exit status
+    AnalysisPrinter* analysis = nullptr;        ///< prints results in place of a sweep's rows
 };
 
 /// Starts the program, connects, does the verb of the options, disconnects; `show` needs no

@@ -96,7 +96,8 @@ TEST(ReadTraces, LinearUnits_BecomeDbm) {
     ASSERT_EQ(traces.size(), 1u);
     EXPECT_EQ(traces[0].unit, "dBm");
     EXPECT_NEAR(traces[0].level[0], 0, 1e-9);
-    EXPECT_EQ(complaint(volts + "1.000;-1; \r\n"), "a level of V below 0 has no value in dBm");
+    EXPECT_EQ(complaint(volts + "1.000;-1; \r\n"), "a level of 0 V or below has no value in dBm");
+    EXPECT_EQ(complaint(volts + "1.000;0; \r\n"), "a level of 0 V or below has no value in dBm");
 }
 
 TEST(ReadTraces, RowCutShort_IsLeftOut) {
