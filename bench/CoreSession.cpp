@@ -28,7 +28,10 @@ std::optional<std::string> NoBoxes::prompt(const std::string& text, const std::s
     throw std::runtime_error(text);
 }
 
-CoreSession::CoreSession(const std::string& device, int baud) : platform_(home_.path()) {
+CoreSession::CoreSession(const std::string& device, int baud)
+    : CoreSession({zel::LinkAddress::Kind::Serial, device, baud}) {}
+
+CoreSession::CoreSession(const zel::LinkAddress& address) : platform_(home_.path()) {
     const zel::Platform own = platform_.bundle(boxes_, platform_.fileDialogs);
     // The counter takes the serial port's place; all else is the platform as the program has it.
     const zel::Platform counted{own.clock,       own.events,    own.boxes,       port_,
@@ -38,8 +41,8 @@ CoreSession::CoreSession(const std::string& device, int baud) : platform_(home_.
                                 own.endSignals};
     program_ = std::make_unique<zel::Program>(counted, "");
     program_->start();
-    if (!program_->connect({zel::LinkAddress::Kind::Serial, device, baud}, false))
-        throw std::runtime_error("the program does not connect to " + device);
+    if (!program_->connect(address, false))
+        throw std::runtime_error("the program does not connect to " + address.port);
 }
 
 CoreSession::~CoreSession() { program_->disconnect(); }

@@ -42,6 +42,8 @@ class CoreSession {
   public:
     /// Connects over the serial device. Throws std::runtime_error when that fails.
     CoreSession(const std::string& device, int baud);
+    /// The same over any link; `bytes` counts those of a serial device only.
+    explicit CoreSession(const zel::LinkAddress& address);
     ~CoreSession();
 
     /// One full read cycle. Throws std::runtime_error when it fails.

@@ -19,6 +19,7 @@ class Process {
     /// The next line of the standard output. Throws std::runtime_error when none comes within
     /// `seconds`.
     std::string line(int seconds);
+    pid_t id() const { return process_; }
 
   private:
     std::string name_;

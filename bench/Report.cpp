@@ -14,6 +14,7 @@
 #include "bench/PanelWork.h"
 #include "bench/Redraw.h"
 #include "bench/ScriptWork.h"
+#include "bench/ServedLine.h"
 #include "bench/SweepRate.h"
 #include "bench/Waterfall.h"
 #include "bench/Windows.h"
@@ -53,6 +54,7 @@ int main(int argc, char** argv) {
     const QString only = words.size() == 3 ? words[2] : QString();
     const std::string build = (QApplication::applicationDirPath() + "/..").toStdString();
     const std::string simulator = build + "/ZELSim/ZELSim";
+    const std::string console = build + "/zelctl";
     const std::string panel = build + "/bench/bench_panel_window";
     const std::string empty = build + "/bench/bench_empty_window";
 
@@ -83,6 +85,11 @@ int main(int argc, char** argv) {
         {'s', "statements", [] { return zelbench::statementRate(); }},
         {'t', "scan", [&] { return zelbench::scanCost(simulator); }},
         {'u', "statistics", [] { return zelbench::traceStatistics(); }},
+        {'w', "served", [&] { return zelbench::servedPaced(simulator, console); }},
+        {'w', "served", [&] { return zelbench::servedUnpaced(simulator, console); }},
+        {'w', "served", [&] { return zelbench::servedRoundTrip(simulator, console); }},
+        {'w', "served", [&] { return zelbench::servedIdle(simulator, console); }},
+        {'w', "served", [&] { return zelbench::servedMemory(simulator, console); }},
         {'v', "slow road", [] { return zelbench::slowRoad(); }},
         {'w', "rehearsal", [] { return zelbench::rehearsalOfANight(); }},
     };

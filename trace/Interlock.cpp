@@ -233,6 +233,9 @@ void Interlock::endLiveStates() {
         forms_.specialMeas.cmdStop.Click();
         forms_.specialMeas.ReleaseWait();
     }
+    if (forms_.main.Dialling) forms_.main.CancelButton.Click();
+    if (forms_.tcpConnection.Connecting) forms_.tcpConnection.QuitTCPButton.Click();
+    if (forms_.devicesChoice.Configuring) forms_.devicesChoice.CloseDevicesButton.Click();
     for (Form* form : forms_.all())
         if (form->Modal && form->Visible) form->Hide();
     if (panel_.STOPFlag || panel_.ContinuosLoopActive || forms_.time.ContinuousRecording)
@@ -243,6 +246,11 @@ Interlock::States Interlock::liveStates() const {
     States states;
     for (const Form* form : forms_.all())
         if (form->Modal && form->Visible) states.insert(form);
+    // What is dialled, connected or looked for can be left.
+    for (const bool* attempt :
+         {&forms_.main.Dialling, &forms_.tcpConnection.Connecting, &forms_.server.ServerConnecting,
+          &forms_.devicesChoice.Configuring})
+        if (*attempt) states.insert(attempt);
     if (panel_.STOPFlag || panel_.ContinuosLoopActive) states.insert(&panel_.STOPFlag);
     if (forms_.specialMeas.RunsActive > 0) states.insert(&forms_.specialMeas.RunsActive);
     if (forms_.time.ContinuousRecording) states.insert(&forms_.time.ContinuousRecording);
