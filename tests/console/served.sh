@@ -1,0 +1,157 @@
+#!/usr/bin/env bash
+# The server as a process: search, scanners, a flood, networks, addresses of both kinds, signals.
+#
+#   served.sh ZELCTL ZELSIM [MEGABYTES]
+set -euo pipefail
+
+zelctl=$1
+zelsim=$2
+megabytes=${3:-4}
+scratch=$(mktemp -d)
+simulator=
+silent=
+server=
+cleanup() {
+    for pid in $server $simulator $silent; do kill -9 "$pid" 2> /dev/null || true; done
+    rm -rf "$scratch"
+}
+trap cleanup EXIT
+fail() {
+    echo "FAILED: $*"
+    for log in "$scratch"/*.log; do echo "--- $log"; head -40 "$log"; done
+    exit 1
+}
+cd "$scratch"
+
+"$zelsim" --pty --link "$scratch/instrument" --strict-baud > simulator.log 2>&1 &
+simulator=$!
+until [ -s simulator.log ]; do sleep 0.05; done
+
+wait_for() { # FILE PATTERN
+    local turns=600
+    until grep -q "$2" "$1"; do
+        kill -0 "$server" 2> /dev/null || fail "the server ended before \"$2\""
+        ((turns-- > 0)) || fail "no \"$2\" came"
+        sleep 0.05
+    done
+}
+start_server() { # OPTIONS...
+    : > server.log
+    "$zelctl" --home home serve --serial "$scratch/instrument" "$@" > server.log \
+        2> server.errors.log &
+    server=$!
+    wait_for server.log '^instrument'
+    port=$(sed -n 's/^listening .*://p' server.log)
+}
+stop_server() { # SIGNAL
+    kill "-${1:-TERM}" "$server"
+    status=0
+    wait "$server" || status=$?
+    server=
+    [ "$status" -eq 0 ] || fail "the server ended with status $status"
+    [ "$(tail -1 server.log)" = closed ] || fail "the server did not say closed"
+}
+works() { # ADDRESS
+    timeout 60 "$zelctl" --home client --connect "tcp:$1:$port" info > client.log \
+        2> client.errors.log || fail "the next client: status $?"
+    grep -q '^Identity: Marlow' client.log || fail "the next client got no identity"
+    [ ! -s client.errors.log ] || fail "the next client had something to report"
+}
+# Bytes of another program; the connection ends after them.
+scan() { # TEXT
+    exec 5<> "/dev/tcp/127.0.0.1/$port"
+    printf "$1" >&5
+    sleep 0.3
+    exec 5>&-
+}
+
+start_server --listen 127.0.0.1:0
+grep -q "^instrument $scratch/instrument 57600" server.log || fail "another speed was found"
+works 127.0.0.1
+scan 'GET / HTTP/1.1\r\nHost: here\r\n\r\n'
+works 127.0.0.1
+scan '\x16\x03\x01\x00\xf1\x01\x00\x00\xed\x03\x03\xa5\xa5\xa5\xa5\xa5'
+works 127.0.0.1
+scan 'SSH-2.0-scanner\r\n'
+works 127.0.0.1
+echo "scanners hold up nobody"
+
+exec 5<> "/dev/tcp/127.0.0.1/$port"
+(head -c "${megabytes}M" /dev/zero >&5) 2> /dev/null &
+flood=$!
+most=0
+for _ in $(seq 40); do
+    kill -0 "$flood" 2> /dev/null || break
+    now=$(awk '/^VmRSS/ {print $2}' "/proc/$server/status")
+    [ "$now" -le "$most" ] || most=$now
+    sleep 0.1
+done
+kill "$flood" 2> /dev/null || true
+wait "$flood" 2> /dev/null || true
+exec 5>&-
+[ "$most" -lt 100000 ] || fail "a flood took $most kB of memory"
+works 127.0.0.1
+echo "flood: at most $most kB of memory"
+stop_server TERM
+log=$(ls home/ELOG_*.log | head -1)
+grep -q 'listening 127.0.0.1' "$log" && grep -q 'client gone' "$log" || fail "no log of the server"
+
+start_server --listen 127.0.0.1:0 --allow 10.0.0.0/8 --baud 57600
+status=0
+timeout 60 "$zelctl" --home client --connect "tcp:127.0.0.1:$port" info > client.log \
+    2> client.errors.log || status=$?
+[ "$status" -eq 1 ] || fail "a client that is not on the list: status $status"
+grep -q 'The server closed the connection' client.errors.log || fail "it is not told why"
+[ ! -s client.log ] || fail "something was shown"
+grep -q '^refused 127.0.0.1' server.log || fail "no word of the refused client"
+stop_server INT
+echo "who is not on the list is refused"
+
+if [ -e /proc/net/if_inet6 ] && grep -q ' lo$' /proc/net/if_inet6; then
+    start_server --listen '[::1]:0' --baud 57600
+    grep -q '^listening \[::1\]:' server.log || fail "the address is not shown"
+    works '[::1]'
+    grep -q '^client ::1' server.log || fail "the client's address is not shown"
+    stop_server HUP
+    echo "IPv6"
+else
+    echo "SKIPPED: this machine has no IPv6"
+fi
+start_server --listen '*:0' --baud 57600
+works 127.0.0.1
+grep -q '^client 127.0.0.1' server.log || fail "the client's address is not the plain one"
+stop_server
+
+# A signal ends the search as well.
+"$zelsim" --pty --link "$scratch/silent" --fault silence:byte=1 > silent.log 2>&1 &
+silent=$!
+until [ -s silent.log ]; do sleep 0.05; done
+"$zelctl" --home home serve --serial "$scratch/silent" --listen 127.0.0.1:0 > server.log \
+    2> server.errors.log &
+server=$!
+wait_for server.log '^listening'
+stop_server
+! grep -q '^instrument' server.log || fail "an instrument was found where none answers"
+kill "$silent"
+echo "signals"
+
+status=0
+"$zelctl" --home home serve --serial "$scratch/none" --listen 127.0.0.1:0 > server.log \
+    2> server.errors.log || status=$?
+[ "$status" -eq 1 ] || fail "a port that is not there: status $status"
+grep -q 'Could not connect to the specified COM port!' server.errors.log || fail "no words"
+start_server --listen 127.0.0.1:0 --baud 57600
+status=0
+"$zelctl" --home home serve --serial "$scratch/none" --listen "127.0.0.1:$port" \
+    > second.log 2> second.errors.log || status=$?
+[ "$status" -eq 1 ] || fail "a TCP port in use: status $status"
+grep -q 'The TCP port cannot be used' second.errors.log || fail "no words for a TCP port in use"
+kill "$simulator"
+wait "$simulator" 2> /dev/null || true
+simulator=
+status=0
+wait "$server" || status=$?
+server=
+[ "$status" -eq 1 ] || fail "an instrument that goes: status $status"
+grep -q '^error ' server.log || fail "an instrument that goes is not told"
+echo "ports that fail"
