@@ -10,7 +10,13 @@
 namespace zel {
 
 std::string drawPicture(QIODevice& input, const std::string& file) {
-    const QByteArray bytes = input.read(kMostPictureBytes + 1);
+    // A pipe gives what has come, not all that will come.
+    QByteArray bytes;
+    while (bytes.size() <= kMostPictureBytes) {
+        const QByteArray part = input.read(kMostPictureBytes + 1 - bytes.size());
+        if (part.isEmpty()) break;
+        bytes += part;
+    }
     if (bytes.size() > kMostPictureBytes) return "the data is longer than 256 MB";
     const auto picture = std::make_unique<DrawnPicture>();
     QString problem = readPicture(bytes, *picture);

@@ -1,6 +1,7 @@
 #include "trace/Interlock.h"
 
 #include <algorithm>
+#include <array>
 #include <utility>
 
 namespace zel {
@@ -8,6 +9,8 @@ namespace {
 
 constexpr int kHourglass = 11;
 constexpr std::size_t kMostWaiting = 64;
+/// Places that stand for runs of scripts, one inside the wait of another.
+constexpr std::array<char, 64> kRuns{};
 
 struct Words {
     Interlock::Rule rule;
@@ -252,7 +255,9 @@ Interlock::States Interlock::liveStates() const {
           &forms_.devicesChoice.Configuring})
         if (*attempt) states.insert(attempt);
     if (panel_.STOPFlag || panel_.ContinuosLoopActive) states.insert(&panel_.STOPFlag);
-    if (forms_.specialMeas.RunsActive > 0) states.insert(&forms_.specialMeas.RunsActive);
+    // A run may begin inside the wait of one that was stopped, and is a state of its own.
+    const auto runs = static_cast<std::size_t>(std::max<int>(forms_.specialMeas.RunsActive, 0));
+    for (std::size_t i = 0; i < std::min(runs, kRuns.size()); ++i) states.insert(&kRuns.at(i));
     if (forms_.time.ContinuousRecording) states.insert(&forms_.time.ContinuousRecording);
     return states;
 }

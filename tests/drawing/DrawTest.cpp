@@ -4,8 +4,10 @@
 
 #include <QApplication>
 #include <QBuffer>
+#include <algorithm>
 #include <cmath>
 #include <limits>
+#include <utility>
 
 #include "desktop/graph/GraphImage.h"
 #include "desktop/graph/SpectrogramPicture.h"
@@ -17,6 +19,26 @@
 
 namespace zel {
 namespace {
+
+/// Gives a few bytes at a time, as a pipe does.
+class Pipe : public QIODevice {
+  public:
+    explicit Pipe(QByteArray bytes) : bytes_(std::move(bytes)) { open(ReadOnly | Unbuffered); }
+    bool isSequential() const override { return true; }
+
+  protected:
+    qint64 readData(char* data, qint64 most) override {
+        constexpr qint64 kAtOnce = 100;
+        const qint64 count = std::min({most, kAtOnce, qint64{bytes_.size()}});
+        std::copy_n(bytes_.begin(), count, data);
+        bytes_.remove(0, count);
+        return count;
+    }
+    qint64 writeData(const char*, qint64) override { return -1; }
+
+  private:
+    QByteArray bytes_;
+};
 
 struct Draw : ::testing::Test {
     static void SetUpTestSuite() {
@@ -63,6 +85,12 @@ ViewAnnotations someTexts() {
     view.rangeUnsure = true;
     view.yUnsure = true;
     return view;
+}
+
+TEST_F(Draw, DataThatComesInPieces_IsReadWhole) {
+    const std::string json = graphJson(forms.controller.CWGraph1, someTexts());
+    Pipe pipe(QByteArray(json.data(), static_cast<int>(json.size())));
+    EXPECT_EQ(drawPicture(pipe, folder.file("pieces.png")), "");
 }
 
 TEST_F(Draw, Graph_IsTheDesktopsInEachKind) {
@@ -178,8 +206,9 @@ INSTANTIATE_TEST_SUITE_P(
     ::testing::Values(
         BadPicture{"", "the data is not the JSON of a picture: illegal value at byte 0"},
         BadPicture{"[]", "the data is not the JSON of a picture: it is no object"},
-        BadPicture{R"({"zeldraw":1,"kind":"graph","values":[1)",
-                   "the data is not the JSON of a picture: invalid termination by number at byte 39"},
+        BadPicture{
+            R"({"zeldraw":1,"kind":"graph","values":[1)",
+            "the data is not the JSON of a picture: invalid termination by number at byte 39"},
         BadPicture{R"({"kind":"graph"})", "the data is of version 0, this program knows version 1"},
         BadPicture{R"({"zeldraw":2,"kind":"graph"})",
                    "the data is of version 2, this program knows version 1"},
