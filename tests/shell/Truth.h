@@ -124,6 +124,8 @@ class TruthRun {
     TruthRun(bool tcp, std::uint64_t seed = 1);
 
     bool connect();
+    /// The line of the session has not ended.
+    bool lineIsUp() const { return !tap.closed(); }
     void disconnect() { program.disconnect(); }
     /// A full or a selective read cycle, with its checks.
     void readTrace(bool full);

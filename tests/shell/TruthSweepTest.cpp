@@ -13,8 +13,9 @@ namespace {
 constexpr int kLateMs = 12'000;
 constexpr int kLateOverTcpMs = 20'000;
 
-/// Every `stride`-th byte of the session, at every fault, over one kind of link; 1 is exhaustive.
-void sweepSession(bool tcp, long stride) {
+/// Every `stride`-th byte of the session from `first` on, at every fault, over one kind of link; a
+/// stride of 1 is exhaustive.
+void sweepSession(bool tcp, long first, long stride) {
     TruthRun good(tcp);
     good.wholeSession();
     ASSERT_EQ(good.findings, std::vector<std::string>{});
@@ -25,7 +26,7 @@ void sweepSession(bool tcp, long stride) {
     long incomplete = 0;
     long whole = 0;
     for (const LineFault fault : kLineFaults) {
-        for (long byte = 0; byte < bytes; byte += stride) {
+        for (long byte = first; byte < bytes; byte += stride) {
             TruthRun run(tcp);
             run.tap.arm(fault, byte, tcp ? kLateOverTcpMs : kLateMs);
             run.wholeSession();
@@ -42,16 +43,22 @@ void sweepSession(bool tcp, long stride) {
     EXPECT_GT(whole, runs);
 }
 
-/// A prime that meets every part of a session; ZEL_TRUTH_STRIDE=1 takes every byte.
-long stride() {
-    constexpr long kSample = 151;
-    const char* text = std::getenv("ZEL_TRUTH_STRIDE");
-    return text == nullptr ? kSample : std::max(1L, std::strtol(text, nullptr, 10));
+long fromEnvironment(const char* name, long otherwise) {
+    const char* text = std::getenv(name);
+    return text == nullptr ? otherwise : std::strtol(text, nullptr, 10);
 }
 
-TEST(TruthSweep, Serial_WholeTracesAreWhatTheInstrumentSent) { sweepSession(false, stride()); }
+/// A prime that meets every part of a session; ZEL_TRUTH_STRIDE=1 takes every byte, ZEL_TRUTH_FIRST
+/// begins later.
+void sweepSession(bool tcp) {
+    constexpr long kSample = 151;
+    sweepSession(tcp, fromEnvironment("ZEL_TRUTH_FIRST", 0),
+                 std::max(1L, fromEnvironment("ZEL_TRUTH_STRIDE", kSample)));
+}
 
-TEST(TruthSweep, Tcp_WholeTracesAreWhatTheInstrumentSent) { sweepSession(true, stride()); }
+TEST(TruthSweep, Serial_WholeTracesAreWhatTheInstrumentSent) { sweepSession(false); }
+
+TEST(TruthSweep, Tcp_WholeTracesAreWhatTheInstrumentSent) { sweepSession(true); }
 
 }  // namespace
 }  // namespace zel
