@@ -1,10 +1,12 @@
 #include "support/IniFile.h"
 
 #include <algorithm>
+#include <cstdio>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <locale>
+#include <string>
 #include <utility>
 
 #include "support/Text.h"
@@ -13,6 +15,7 @@ namespace zel {
 namespace {
 
 constexpr std::size_t kLargestFile = 1U << 20;
+constexpr int kMostNames = 100;  // of temporary files that were left behind
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 constexpr std::string_view kBlanks = " \t";
 
@@ -62,6 +65,21 @@ std::optional<std::string> bytesOf(const std::string& fileName) {
     if (stream.bad() || !stream.eof()) return std::nullopt;
     bytes.resize(static_cast<std::size_t>(stream.gcount()));
     return bytes;
+}
+
+/// Puts the bytes into a new file beside the other and gives its name; empty where that failed. A
+/// name that is taken, be it by a link, is left alone.
+std::string createBeside(const std::string& fileName, const std::string& bytes) {
+    for (int i = 0; i < kMostNames; ++i) {
+        std::string name = fileName + ".new" + (i == 0 ? "" : std::to_string(i));
+        std::FILE* const file = std::fopen(name.c_str(), "wbx");
+        if (file == nullptr) continue;
+        const bool written = std::fwrite(bytes.data(), 1, bytes.size(), file) == bytes.size();
+        if (std::fclose(file) == 0 && written) return name;
+        std::remove(name.c_str());
+        return {};
+    }
+    return {};
 }
 
 }  // namespace
@@ -211,18 +229,16 @@ std::string IniFile::text() const {
 bool IniFile::save(const std::string& fileName) const {
     const std::string bytes = text();
     if (!readable_ || bytes.size() > kLargestFile) return false;
-    const std::string beside = fileName + ".new";
-    std::ofstream stream(beside, std::ios::binary | std::ios::trunc);
-    stream.imbue(std::locale::classic());
-    stream << bytes;
-    stream.close();
     std::error_code error;
-    const auto rights = std::filesystem::status(fileName, error).permissions();
+    // Where the name is a link, the file that it points to is replaced.
+    const std::filesystem::path found = std::filesystem::weakly_canonical(fileName, error);
+    const std::string target = error || found.empty() ? fileName : found.string();
+    const std::string beside = createBeside(target, bytes);
+    if (beside.empty()) return false;
+    const auto rights = std::filesystem::status(target, error).permissions();
     if (!error) std::filesystem::permissions(beside, rights, error);
-    if (stream) {
-        std::filesystem::rename(beside, fileName, error);
-        if (!error) return true;
-    }
+    std::filesystem::rename(beside, target, error);
+    if (!error) return true;
     std::error_code ignored;
     std::filesystem::remove(beside, ignored);
     return false;

@@ -5,11 +5,11 @@
 #include <QFileInfo>
 #include <QPageSize>
 #include <QPdfWriter>
-#include <QSaveFile>
 #include <QSvgGenerator>
 
 #include "desktop/graph/GraphPlot.h"
 #include "desktop/graph/MetafileEngine.h"
+#include "desktop/graph/PictureFile.h"
 
 namespace zel {
 namespace {
@@ -100,6 +100,8 @@ void copyGraph(const Graph& graph, Graph& shown) {
     shown.setTrigger(graph.trigger());
     for (int i = 1; i <= graph.cursorCount(); ++i) shown.addCursor(graph.cursor(i));
     shown.plotY(graph.values(), graph.firstX(), graph.increment());
+    shown.Incomplete = graph.Incomplete.get();
+    shown.Note = graph.Note.get();
 }
 
 QString save(const Graph& graph, const ViewAnnotations& view, const QString& path, QSize size,
@@ -119,12 +121,7 @@ QString save(const Graph& graph, const ViewAnnotations& view, const QString& pat
     if (!kind->keepsClip) picture.clipToView();
     const QByteArray bytes = kind->write(plot, size);
     if (bytes.isEmpty()) return "Cannot draw " + path;
-    QSaveFile file(path);
-    // The commit does not report bytes that only its own flush failed to write.
-    if (file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.flush() &&
-        file.commit())
-        return {};
-    return "Cannot write " + path + ": " + file.errorString();
+    return writePicture(path, bytes);
 }
 
 }  // namespace

@@ -6,8 +6,9 @@
 #include <QImage>
 #include <QPageSize>
 #include <QPdfWriter>
-#include <QSaveFile>
 #include <QSvgGenerator>
+
+#include "desktop/platform/SystemFiles.h"
 
 namespace zel {
 namespace {
@@ -77,18 +78,20 @@ QString save(const QString& path, QSize size, const Paint& paint) {
         buffer.open(QIODevice::WriteOnly);
         if (!row.write(buffer, size, paint, row.kind) || bytes.isEmpty())
             return "Cannot draw " + path;
-        QSaveFile file(path);
-        // The commit does not report bytes that only its own flush failed to write.
-        if (file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.flush() &&
-            file.commit())
-            return {};
-        return "Cannot write " + path + ": " + file.errorString();
+        return writePicture(path, bytes);
     }
     return ending.isEmpty() ? "A picture's name ends in its kind: svg, png or pdf"
                             : "Unknown kind of picture: ." + ending + " (svg, png or pdf)";
 }
 
 }  // namespace
+
+QString writePicture(const QString& path, const QByteArray& bytes) {
+    const FileProblem problem = SystemFiles().replace(
+        path.toStdString(), {bytes.constData(), static_cast<std::size_t>(bytes.size())});
+    if (problem.empty()) return {};
+    return "Cannot write " + path + ": " + QString::fromStdString(problem);
+}
 
 bool savePicture(const QString& path, QSize size, QString* error, const Paint& paint) {
     const QString problem = save(path, size, paint);

@@ -1,6 +1,7 @@
 #pragma once
 // A painted picture in a file: png, svg or pdf by its ending.
 
+#include <QByteArray>
 #include <QPainter>
 #include <QSize>
 #include <QString>
@@ -19,5 +20,9 @@ struct PictureKind {
 /// QApplication, and says so where there is none.
 bool savePicture(const QString& path, QSize size, QString* error,
                  const std::function<void(QPainter&, const PictureKind&)>& paint);
+
+/// Puts a finished picture into its file, in one step. A text says what went wrong, else it is
+/// empty; an older file is then as it was.
+QString writePicture(const QString& path, const QByteArray& bytes);
 
 }  // namespace zel

@@ -192,6 +192,26 @@ TEST_F(Stores, WriteIni_RightsOfTheFile_Stay) {
     EXPECT_EQ(std::filesystem::status(name).permissions(), perms::owner_read | perms::owner_write);
 }
 
+TEST_F(Stores, WriteIni_LinkAtTheTemporaryName_IsNotFollowed) {
+    const std::string name = write("[A]\nx=1\n");
+    const std::string other = file("precious");
+    std::ofstream(other) << "kept";
+    std::filesystem::create_symlink(other, name + ".new");
+    ASSERT_TRUE(WriteIni(name, "A", "x", std::string("2")));
+    EXPECT_EQ(read(other), "kept");
+    EXPECT_TRUE(std::filesystem::is_symlink(name + ".new"));
+    EXPECT_EQ(read(name), "[A]\nx=2\n");
+}
+
+TEST_F(Stores, WriteIni_FileThatIsALink_ReplacesWhatItPointsTo) {
+    const std::string name = write("[A]\nx=1\n");
+    const std::string link = file("link.ini");
+    std::filesystem::create_symlink(name, link);
+    ASSERT_TRUE(WriteIni(link, "A", "x", std::string("2")));
+    EXPECT_TRUE(std::filesystem::is_symlink(link));
+    EXPECT_EQ(read(name), "[A]\nx=2\n");
+}
+
 class Registry : public Stores {
   protected:
     cRegistry registry() {

@@ -254,6 +254,13 @@ TEST_F(GraphImage, FailedWrite_LeavesTheOlderFileAsItWas) {
     EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files).size(), 4) << "something was left behind";
 }
 
+TEST_F(GraphImage, IncompleteTrace_SaysSoInThePicture) {
+    graph.Incomplete = "INCOMPLETE 150/301";
+    EXPECT_TRUE(contents(written("incomplete.svg")).contains("INCOMPLETE 150/301"));
+    graph.Incomplete = "";
+    EXPECT_FALSE(contents(written("whole.svg")).contains("INCOMPLETE"));
+}
+
 TEST_F(GraphImage, Success_ReplacesTheOlderFile) {
     const QString path = written("r.wmf");
     const QByteArray first = contents(path);
