@@ -174,6 +174,10 @@ struct Program::Rooms {
         // No wait, loop or modal form holds the end up.
         handlers.on(end.Ended, [this] {
             line.Ending = true;
+            if (forms.specialMeas.RunsActive > 0) {
+                forms.specialMeas.cmdStop.Click();
+                forms.specialMeas.ReleaseWait();
+            }
             for (Form* form : forms.all())
                 if (form->Modal) form->Hide();
         });

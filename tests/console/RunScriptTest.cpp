@@ -11,6 +11,7 @@
 #include "console/PanelSession.h"
 #include "console/RunScript.h"
 #include "console/Tool.h"
+#include "desktop/platform/QtSignals.h"
 #include "desktop/platform/SystemFiles.h"
 #include "tests/files/DiskFolder.h"
 #include "tests/files/FileSession.h"
@@ -49,7 +50,8 @@ struct RunScriptTest : ::testing::Test {
         const auto before = std::filesystem::current_path();
         std::filesystem::current_path(folder.file(""));
         if (!interruptedBy.empty())
-            front->events().schedule(1000, [this] { signals.request(interruptedBy); });
+            front->events().schedule(
+                1000, [this, &front] { front->endSignals().request(interruptedBy); });
         const int result = runScript(options, {program,
                                                files,
                                                events,
@@ -59,11 +61,12 @@ struct RunScriptTest : ::testing::Test {
                                                dialogs,
                                                answers,
                                                errorLines,
-                                               signals,
+                                               front->endSignals(),
                                                {}});
         EXPECT_EQ(std::filesystem::current_path(),
                   std::filesystem::path(folder.file("")).parent_path());
         std::filesystem::current_path(before);
+        EXPECT_FALSE(front->endSignals().takes);
         errorLines.settle();
         return result;
     }
@@ -72,7 +75,6 @@ struct RunScriptTest : ::testing::Test {
     SystemFiles files;
     std::ostringstream errors;
     bool connected = true;
-    Signals signals;
     std::string interruptedBy;  ///< a signal that comes after a second
 };
 
@@ -116,19 +118,13 @@ TEST_F(RunScriptTest, StepMode_TakesALineAPressAndGoesOnAtTheEnd) {
     EXPECT_EQ(errors.str(), "");
 }
 
-TEST_F(RunScriptTest, Sigint_IsTheStopButtonAndOtherSignalsAreNot) {
-    int ends = 0;
-    signals.EndRequested.connect([&](const std::string&) { ++ends; });
-    interruptedBy = "SIGINT";
-    EXPECT_EQ(run({"SAVERESULTS OUT.TXT", "COMMENT A", "PAUSE 3600", "COMMENT B"}, ""), 1);
-    EXPECT_EQ(linesOf(folder.read("OUT.TXT")).size(), 1U);
-    EXPECT_EQ(ends, 0);
-    interruptedBy = "SIGTERM";
-    EXPECT_EQ(run({"SAVERESULTS OUT.TXT", "PAUSE 2", "COMMENT B"}, ""), 0);
-    EXPECT_EQ(ends, 1);
-    // Behind the run the signal asks for the end again.
-    signals.request("SIGINT");
-    EXPECT_EQ(ends, 2);
+TEST_F(RunScriptTest, Signals_EndTheRunAtOnce) {
+    for (const char* signal : {"SIGINT", "SIGTERM", "SIGHUP"}) {
+        interruptedBy = signal;
+        const std::string name = signal + std::string(".TXT");
+        EXPECT_EQ(run({"SAVERESULTS " + name, "COMMENT A", "PAUSE 3600", "COMMENT B"}, ""), 1);
+        EXPECT_EQ(linesOf(folder.read(name)).size(), 1U) << signal;
+    }
 }
 
 TEST_F(RunScriptTest, Failures_EndWithOne) {

@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# Interrupts scripts that pause, wait for a press or show a box: they end at once with status 1. Kills
-# one that writes: it leaves whole lines.
+# Signals end scripts that pause, wait for a press or show a box at once, with status 1. A script that
+# writes and is killed leaves whole lines.
 #
 #   interrupted_script.sh ZELCTL
 set -euo pipefail
@@ -24,11 +24,11 @@ printf 'SAVERESULTS OUT.TXT\nCOMMENT A\nSTEPMODE\nCOMMENT B\n' > step.txt
 printf 'SAVERESULTS OUT.TXT\nCOMMENT A\nSHOWDIALOG X\nCOMMENT B\n' > box.txt
 
 # A shell's background commands ignore the interrupt key; python's do not. The input stays open.
-interrupted() { # SCRIPT [CONNECTION...]
+interrupted() { # SIGNAL SCRIPT [CONNECTION...]
     rm -f OUT.TXT
     python3 - "$zelctl" "$@" <<'EOF'
 import os, signal, subprocess, sys, time
-zelctl, script, *connection = sys.argv[1:]
+zelctl, name, script, *connection = sys.argv[1:]
 run = subprocess.Popen([zelctl, *connection, "--home", "home", "run", script], stdin=subprocess.PIPE,
                        preexec_fn=lambda: signal.signal(signal.SIGINT, signal.SIG_DFL))
 for _ in range(400):
@@ -36,7 +36,7 @@ for _ in range(400):
         break
     time.sleep(0.05)
 time.sleep(0.2)
-run.send_signal(signal.SIGINT)
+run.send_signal(getattr(signal, name))
 try:
     sys.exit(run.wait(timeout=20))
 except subprocess.TimeoutExpired:
@@ -44,11 +44,12 @@ except subprocess.TimeoutExpired:
     sys.exit(99)
 EOF
 }
-for case in pause.txt step.txt box.txt "step.txt --connect sim:" "box.txt --connect sim:"; do
+for case in "SIGINT pause.txt" "SIGINT step.txt" "SIGINT box.txt" "SIGINT step.txt --connect sim:" \
+    "SIGINT box.txt --connect sim:" "SIGTERM pause.txt" "SIGTERM step.txt"; do
     status=0
     # shellcheck disable=SC2086
     interrupted $case || status=$?
-    [ "$status" = 1 ] || { echo "$case: status $status after the interrupt key"; exit 1; }
+    [ "$status" = 1 ] || { echo "$case: status $status"; exit 1; }
     [ "$(wc -l < OUT.TXT)" = 1 ] || { echo "$case: the run went on"; cat OUT.TXT; exit 1; }
 done
 
