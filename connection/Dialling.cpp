@@ -67,8 +67,8 @@ Dialling::Dialling(Forms& forms, const InstrumentLink& link, ConnectionDialog& d
       start_(start),
       disconnection_(disconnection),
       session_(session) {
-    form_.DialButton.Clicked.connect([this] { DialButton_Click(); });
-    form_.CancelButton.Clicked.connect([this] { CancelButton_Click(); });
+    handlers_.on(form_.DialButton.Clicked, [this] { DialButton_Click(); });
+    handlers_.on(form_.CancelButton.Clicked, [this] { CancelButton_Click(); });
 }
 
 double Dialling::seconds() const { return static_cast<double>(session_.clock.micros()) / 1e6; }

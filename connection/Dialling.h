@@ -61,6 +61,7 @@ class Dialling {
     bool told_ = false;  ///< why there is no connection
     /// In seconds of the monotonic clock; long ago while nothing was dialled.
     double DialStartTime_ = -1e9;
+    Handlers handlers_;
 };
 
 }  // namespace zel

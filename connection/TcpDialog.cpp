@@ -15,6 +15,7 @@ namespace zel {
 namespace {
 
 constexpr const char* kSection = "TCPCON";
+constexpr std::string_view kTlsOf = "Tls of ";  // and the server: "0", or "1 " and the fingerprint
 constexpr int kPollMs = 50;
 constexpr int kProbeMs = 5000;
 constexpr int kConnectMs = 30'000;
@@ -85,6 +86,8 @@ void TcpDialog::rememberServer(const std::string& server) {
     for (std::size_t i = 0; i < servers.size(); ++i)
         settings_.set(kProgramName, kSection, "Recent" + std::to_string(i + 1), servers[i]);
     dialog_.RecentServersList.setItems(std::move(servers));
+    settings_.set(kProgramName, kSection, std::string(kTlsOf) + server,
+                  dialog_.chkTls.Value() ? "1 " + dialog_.FingerprintTextBox.Text.get() : "0");
 }
 
 void TcpDialog::chooseRecent() {
@@ -93,6 +96,10 @@ void TcpDialog::chooseRecent() {
     if (colon == std::string::npos) return;
     dialog_.IPAdressTextBox.Text = server.substr(0, colon);
     dialog_.RemotePortTextBox.Text = server.substr(colon + 1);
+    const std::string tls =
+        settings_.get(kProgramName, kSection, std::string(kTlsOf) + server, "0");
+    dialog_.chkTls.setValue(startsWith(tls, "1"));
+    dialog_.FingerprintTextBox.Text = startsWith(tls, "1 ") ? tls.substr(2) : std::string();
 }
 
 void TcpDialog::saveSettings() {

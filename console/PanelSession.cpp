@@ -118,12 +118,20 @@ bool PanelSession::readAndExecute() {
         return true;
     }
     std::string line;
-    switch (m_.input.next(line, m_.virtualTime)) {
+    if (held_) {
+        if (holdsBack(*held_)) return false;
+        line = *std::exchange(held_, std::nullopt);
+        execute(line);
+        return true;
+    }
+    switch (atEnd_ ? LineInput::Got::End : m_.input.next(line, m_.virtualTime)) {
         case LineInput::Got::Nothing:
             return false;
         case LineInput::Got::End:
-            ended_ = true;
-            return true;
+            // The attempt under way is still to come to its end.
+            atEnd_ = true;
+            ended_ = !connecting_;
+            return ended_;
         case LineInput::Got::TooLong:
             ++line_;
             complain("the line is too long");
@@ -132,8 +140,23 @@ bool PanelSession::readAndExecute() {
             break;
     }
     if (++line_ == 1 && startsWith(line, kUtf8Mark)) line.erase(0, kUtf8Mark.size());
-    execute(bytesToUtf8(line));
+    line = bytesToUtf8(line);
+    if (holdsBack(line)) {
+        held_ = line;
+        return false;
+    }
+    execute(line);
     return true;
+}
+
+/// While `connect` reaches for a server, only what leaves the attempt goes at once: the lines after
+/// it ask for its outcome.
+bool PanelSession::holdsBack(std::string_view line) const {
+    if (!connecting_ || !program_.forms().tcpConnection.Connecting) return false;
+    const std::string text = trimmed(line);
+    const auto [word, rest] = firstWord(text);
+    return !word.empty() && word.front() != '#' && word != "pump" && word != "quit" &&
+           rest != "TCPConnectionForm.QuitTCPButton";
 }
 
 void PanelSession::execute(std::string_view line) {
@@ -160,6 +183,7 @@ void PanelSession::runCommand(const std::function<void()>& command) {
     try {
         command();
     } catch (...) {
+        connecting_ = false;
         program_.showFailure();  // the session goes on
     }
     --depth_;
@@ -286,7 +310,10 @@ void PanelSession::connect(std::string_view) {
     const MenuItem& item = address_->overNetwork() ? panel.TCPConnection : panel.Direct;
     if (const Done refused = refusal(item, false); refused != Done::Yes)
         return tell(refused, item.name());
-    if (program_.connect(*address_, true) || program_.ended()) return;
+    connecting_ = true;
+    const bool connected = program_.connect(*address_, true);
+    connecting_ = false;
+    if (connected || program_.ended()) return;
     m_.output.settle();
     m_.errors.line("zelctl: line " + std::to_string(line_) + ": no instrument was connected");
     if (const std::string advice = program_.connectionAdvice(); !advice.empty())

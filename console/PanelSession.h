@@ -52,6 +52,7 @@ class PanelSession {
     void serveLines();
     bool whileWaiting(int ms);
     bool readAndExecute();
+    bool holdsBack(std::string_view line) const;
     void execute(std::string_view line);
     void idle(int ms);
     std::int64_t microsLeft() const;
@@ -79,8 +80,11 @@ class PanelSession {
     Means m_;
     std::optional<LinkAddress> address_;
     Interlock& interlock_;
-    long line_ = 0;  ///< number of the line at hand
-    int depth_ = 0;  ///< commands on the stack
+    long line_ = 0;                    ///< number of the line at hand
+    int depth_ = 0;                    ///< commands on the stack
+    bool connecting_ = false;          ///< the line `connect` is at work
+    std::optional<std::string> held_;  ///< a line whose turn comes after it
+    bool atEnd_ = false;               ///< of the input
     std::int64_t pumpUntil_ = 0;
     bool ended_ = false;
     int status_ = kDone;

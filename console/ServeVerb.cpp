@@ -74,14 +74,17 @@ int runDevices(const Options& options, const VerbStage& stage) {
         stage.output.lines(names);
         return kDone;
     }
-    if (std::find(names.begin(), names.end(), options.serve.configure) == names.end()) {
+    // Names of the file ignore case, as everything in it does; "NONE" stands for no device.
+    const auto named = std::find_if(names.begin(), names.end(), [&](const std::string& name) {
+        return lowerCase(name) == lowerCase(trimmed(options.serve.configure));
+    });
+    if (named == names.end() || names == std::vector<std::string>{"NONE"}) {
         stage.errors.line("zelctl: settings.ini has no device \"" + options.serve.configure + "\"");
         return kWrongUse;
     }
     constexpr int kUsualBaud = 57600;
     const int baud = options.serve.baud == 0 ? kUsualBaud : options.serve.baud;
-    const bool ok =
-        stage.program.configureDevice(options.serve.configure, options.serve.serial, baud);
+    const bool ok = stage.program.configureDevice(*named, options.serve.serial, baud);
     stage.errors.settle();
     return ok ? kDone : kLinkFailed;
 }

@@ -191,6 +191,7 @@ void ServerBridge::watchInstrument() {
     const CallScope call(log_, kComponent, kClass, "watchInstrument");
     watchTask_ = 0;
     if (port_.isOpen()) {
+        repair();
         // A client whose connection broke without a word is noticed here.
         const SocketState state = socket_.client().state();
         if (hasClient_ && state != SocketState::Connected && state != SocketState::Connecting)

@@ -44,7 +44,12 @@ class QtServerSocket::Listener : public QTcpServer {
 };
 
 QtServerSocket::QtServerSocket(QtEvents& events)
-    : listener_(std::make_unique<Listener>(*this)), client_(events, false) {}
+    : listener_(std::make_unique<Listener>(*this)), client_(events, false) {
+    QObject::connect(listener_.get(), &QTcpServer::acceptError, listener_.get(), [this] {
+        problem_ = listener_->errorString().toStdString() + ".";
+        failed_ = true;
+    });
+}
 
 QtServerSocket::~QtServerSocket() { close(); }
 
@@ -64,7 +69,8 @@ void QtServerSocket::knocked(QTcpSocket* socket) {
 
 bool QtServerSocket::prove(int requestId) {
     const auto found = requests_.find(requestId);
-    if (!configuration_ || found == requests_.end() || found->second.proof != Proof::None) return false;
+    if (!configuration_ || found == requests_.end() || found->second.proof != Proof::None)
+        return false;
     auto* secured = qobject_cast<QSslSocket*>(found->second.socket);
     if (secured == nullptr) return false;
     found->second.proof = Proof::Running;

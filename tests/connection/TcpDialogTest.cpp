@@ -174,6 +174,25 @@ TEST_F(TcpDialogTest, Tls_PassesTheFingerprintOn) {
     EXPECT_EQ(socket.pinned(), "abcd");
 }
 
+TEST_F(TcpDialogTest, RecentServer_BringsItsTlsBack) {
+    const auto connectTo = [this](const char* host, bool tls, const char* fingerprint) {
+        socket.expect("\r").silence();
+        tcp.IPAdressTextBox.Text = host;
+        tcp.chkTls.setValue(tls);
+        tcp.FingerprintTextBox.Text = fingerprint;
+        tcp.ConnectTCPButton.Click();
+    };
+    connectTo("safe", true, "ab:cd");
+    connectTo("plain", false, "");
+    tcp.RecentServersList.pick(1);
+    EXPECT_EQ(tcp.IPAdressTextBox.Text.get(), "safe");
+    EXPECT_TRUE(tcp.chkTls.Value());
+    EXPECT_EQ(tcp.FingerprintTextBox.Text.get(), "ab:cd");
+    tcp.RecentServersList.pick(0);
+    EXPECT_FALSE(tcp.chkTls.Value());
+    EXPECT_EQ(tcp.FingerprintTextBox.Text.get(), "");
+}
+
 TEST_F(TcpDialogTest, PeerClosing_IsShownAndTheWaitGoesOn) {
     socket.connectsTo(SocketState::Connecting);
     later(1000, [this] { socket.setState(SocketState::PeerClosing); });

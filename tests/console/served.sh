@@ -126,6 +126,7 @@ stop_server
 "$zelsim" --pty --link "$scratch/silent" --fault silence:byte=1 > silent.log 2>&1 &
 silent=$!
 until [ -s silent.log ]; do sleep 0.05; done
+: > server.log
 "$zelctl" --home home serve --serial "$scratch/silent" --listen 127.0.0.1:0 > server.log \
     2> server.errors.log &
 server=$!
