@@ -127,8 +127,10 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
     state_.InputBuffer.clear();
     const Stopwatch firstAnswer(session_.clock);
     std::string answer = reader_.ReadAnswer();
-    const auto socketEnded = [this] { return link_.isTcp() && !link_.usable(); };
-    while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs && !socketEnded()) {
+    const auto over = [this] {
+        return (link_.isTcp() && !link_.usable()) || state_.mustLeave(session_.clock.micros());
+    };
+    while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs && !over()) {
         session_.events.wait(kRetryPauseMs);
         answer = reader_.ReadAnswer();
     }

@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <functional>
 #include <string>
 #include <utility>
 #include <vector>
@@ -35,7 +36,12 @@ class LosingPort : public SerialPort {
     bool open(const SerialSetup& setup) override { return inner_.open(setup); }
     void close() override { inner_.close(); }
     bool isOpen() const override { return inner_.isOpen(); }
-    void output(std::string_view bytes) override { inner_.output(bytes); }
+    void output(std::string_view bytes) override {
+        if (spoken) spoken(bytes);
+        inner_.output(bytes);
+    }
+    /// Gets what the program sends; may be empty.
+    std::function<void(std::string_view)> spoken;
     std::string problem() const override { return inner_.problem(); }
     std::string input() override {
         std::string bytes = inner_.input();
