@@ -1,5 +1,7 @@
 #include "link/BinaryReader.h"
 
+#include <algorithm>
+
 #include "support/NumberText.h"
 #include "support/Text.h"
 
@@ -99,8 +101,12 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         chunk += behind;
     }
     if (!chunk.empty()) {
-        chunk.erase(0, kStatusBytes);
+        // A line that pauses inside the status brings the rest of it before the samples.
+        std::size_t ofStatus = kStatusBytes;
         for (;;) {
+            const std::size_t passed = std::min(ofStatus, chunk.size());
+            chunk.erase(0, passed);
+            ofStatus -= passed;
             result += chunk;
             if (result.size() > wanted) result.resize(wanted);
             chunk = link_.takeBytes();
@@ -113,6 +119,7 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         }
         // The end of the block is near or the instrument has stopped: the chunk at hand and the
         // last bytes still belong to the samples.
+        chunk.erase(0, std::min(ofStatus, chunk.size()));
         result += chunk;
         if (result.size() + 2 >= wanted && result.size() < wanted)
             result += takeTail(wanted - result.size());

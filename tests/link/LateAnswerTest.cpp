@@ -84,5 +84,20 @@ TEST_F(Line, AfterATimeOut_OneExchangeLooksForTheLateAnswerAndNoOther) {
     expectPlayed();
 }
 
+TEST_F(Line, PauseInsideTheStatusOfATransfer_ShiftsNoSample) {
+    for (const int ms : {100, 5500, 9000}) {
+        LineRig rig;
+        std::string block;
+        for (int i = 0; i < 301; ++i) block += std::string(1, static_cast<char>(i)) + "abc";
+        rig.port.expect("GET\r").answer("0\r");
+        rig.port.expect("TRACEBIN\r").answer("0").answer("\r" + block + "x").after(ms);
+        RawTrace trace;
+        EXPECT_TRUE(rig.binary.GetTraceBinary(trace, false));
+        EXPECT_TRUE(trace.whole()) << ms;
+        EXPECT_EQ(trace.values.at(1) - trace.values.at(0), 1) << ms;
+        rig.expectPlayed();
+    }
+}
+
 }  // namespace
 }  // namespace zel
