@@ -126,6 +126,7 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         if (result.size() > wanted) result.resize(wanted);
     }
     state_.TCPDataArrived = false;
+    link_.noteBlock(result.size());
     if (result.size() < wanted) state_.AnswerOverdue = true;
     if (link_.isTcp() && result.size() < wanted && !link_.usable()) link_.tellLoss();
     return result;

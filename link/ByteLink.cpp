@@ -107,7 +107,9 @@ void ByteLink::WriteToLink(const std::string& text) {
     state_.LateAnswerFirst = std::exchange(state_.AnswerOverdue, false);
     if (state_.LateAnswerFirst) takeBytes();
     if (isTcp()) {
-        if (socket_.sendData(*bytes)) state_.LossTold = false;
+        if (!socket_.sendData(*bytes)) return;
+        state_.LossTold = false;
+        debug_.output("-> " + text);
     } else if (dialog_.IsConnectedToPort) {
         port_.output(*bytes);
         debug_.output("-> " + text);
@@ -148,6 +150,10 @@ void ByteLink::drain(int times) {
 void ByteLink::CloseComPort() { port_.close(); }
 
 void ByteLink::CloseTCPSocket() { socket_.close(); }
+
+void ByteLink::noteBlock(std::size_t bytes) {
+    debug_.output("<-" + std::to_string(bytes) + " bytes");
+}
 
 std::string ByteLink::takeBytes() { return isTcp() ? socket_.getData() : port_.input(); }
 

@@ -46,6 +46,8 @@ class ByteLink {
     std::string problem() const { return port_.problem(); }
     /// Binary reads: takes what has arrived on either link, without waiting.
     std::string takeBytes();
+    /// Says on the debug channel that a block of so many bytes came.
+    void noteBlock(std::size_t bytes);
 
   private:
     std::string takeFromSocket();

@@ -1,5 +1,7 @@
 #include "shell/Logs.h"
 
+#include <algorithm>
+
 #include "support/Text.h"
 #include "support/Windows1252.h"
 
@@ -8,6 +10,13 @@ namespace {
 
 constexpr std::string_view kCame = "<-";
 constexpr std::string_view kPin = "CPIN=";
+
+/// Bytes that no text of the instrument has: samples of a trace.
+bool isBinary(const std::string& text) {
+    return std::any_of(text.begin(), text.end(), [](char c) {
+        return static_cast<unsigned char>(c) < ' ' && c != '\r' && c != '\n' && c != '\t';
+    });
+}
 
 bool holdsWord(const std::string& words, std::string_view word) {
     return contains(upperCase(words), word);
@@ -18,6 +27,8 @@ bool holdsWord(const std::string& words, std::string_view word) {
 std::string loggedText(const std::string& text) {
     // The bytes that came are the instrument's own; what goes out is text already.
     const bool came = startsWith(text, kCame);
+    if (came && isBinary(text))
+        return "<- " + std::to_string(text.size() - kCame.size()) + " bytes";
     std::string line =
         came ? std::string(kCame) + " " + fromWindows1252(text.substr(kCame.size())) : text;
     while (!line.empty() && (line.back() == '\r' || line.back() == '\n')) line.pop_back();

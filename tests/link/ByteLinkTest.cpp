@@ -150,11 +150,13 @@ TEST_F(Line, WriteToLink_PortNotOpenedByTheDialog_DropsTheText) {
     EXPECT_EQ(shown(), Texts{});
 }
 
-TEST_F(Line, WriteToLink_Tcp_SendsOnTheSocketAndLogsNothing) {
+TEST_F(Line, WriteToLink_Tcp_SendsOnTheSocketAndLogsIt) {
     overTcp();
     link.WriteToLink("FREQ\r");
     EXPECT_EQ(socket.written(), "FREQ\r");
-    EXPECT_EQ(debug.texts(), Texts{});
+    EXPECT_EQ(debug.texts(), Texts{"-> FREQ\r"});
+    link.noteBlock(1205);
+    EXPECT_EQ(debug.texts().back(), "<-1205 bytes");
 }
 
 TEST_F(Line, WriteToLink_EverySerialKind_GoesToThePort) {

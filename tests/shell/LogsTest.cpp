@@ -59,6 +59,7 @@ TEST(LoggedText, LineEndsAndPins_AreShownAsSigns) {
     EXPECT_EQ(loggedText("<-10 \xB5s\r"), "<- 10 µs");
     EXPECT_EQ(loggedText("-> AT+CPIN=1234\r"), "-> AT+CPIN=****");
     EXPECT_EQ(loggedText("-> at+cpin=1234\rx"), "-> at+cpin=****");
+    EXPECT_EQ(loggedText(std::string("<-0\r\0\x01\xFF\x7F", 8)), "<- 6 bytes");
     EXPECT_EQ(loggedText(""), "");
 }
 
