@@ -2,6 +2,7 @@
 
 #include <QCheckBox>
 #include <QComboBox>
+#include <QEvent>
 #include <QFormLayout>
 #include <QGroupBox>
 #include <QHBoxLayout>
@@ -12,6 +13,7 @@
 #include <QProgressBar>
 #include <QPushButton>
 #include <QVBoxLayout>
+#include <algorithm>
 
 #include "desktop/binders/Binder.h"
 #include "forms/Forms.h"
@@ -42,7 +44,10 @@ QComboBox* list(Binder& binder, DropDownList& control) {
 QPushButton* button(Binder& binder, Button& control) {
     auto* key = new QPushButton;
     key->setAutoDefault(false);
-    key->setMinimumWidth(kButtonWidth);
+    constexpr int kAroundText = 28;  // px
+    const QString text = QString::fromStdString(control.Caption.get());
+    const int wide = key->fontMetrics().horizontalAdvance(text) + kAroundText;
+    key->setMinimumWidth(std::max(kButtonWidth, wide));
     binder.bind(control, key);
     return key;
 }
@@ -106,10 +111,12 @@ TcpWindow::TcpWindow(TCPConnectionForm& form, Binder& binder, QWidget* parent)
     fields->addRow("Fingerprint", pinned);
     fields->addRow("State", box(binder, form.IDTextBox));
     QLabel* reason = label(binder, form.lblReason);
+    QLabel* advice = label(binder, form.AdviceLabel);
     reason->setMinimumHeight(2 * reason->fontMetrics().height());
-    reason->setAlignment(Qt::AlignTop | Qt::AlignLeft);
-    fields->addRow("", reason);
+    for (QLabel* words : {reason, advice}) words->setAlignment(Qt::AlignTop | Qt::AlignLeft);
     layout->addLayout(fields);
+    layout->addWidget(reason);
+    layout->addWidget(advice);
     layout->addStretch(1);
     auto* keys = new QHBoxLayout;
     keys->addStretch(1);
@@ -121,6 +128,15 @@ TcpWindow::TcpWindow(TCPConnectionForm& form, Binder& binder, QWidget* parent)
     setCancel(form.QuitTCPButton);
     setMinimumWidth(440);
     followForm();
+}
+
+// The words of a failure differ in length; none is cut.
+bool TcpWindow::event(QEvent* event) {
+    const bool taken = FormWindow::event(event);
+    if (event->type() != QEvent::LayoutRequest || layout() == nullptr) return taken;
+    const int wanted = layout()->totalHeightForWidth(width());
+    if (height() < wanted) resize(width(), wanted);
+    return taken;
 }
 
 DevicesWindow::DevicesWindow(DevicesChoiceForm& form, Binder& binder, QWidget* parent)
@@ -239,8 +255,10 @@ QWidget* ServerWindow::happenings() {
     binder_.bindShow(server_.picConnected, light_, [this] { showLight(); });
     auto* fields = new QFormLayout;
     auto* client = new QHBoxLayout;
-    client->addWidget(box(binder_, server_.txtClientIP), 1);
-    client->addWidget(button(binder_, server_.cmdDisconnectClient));
+    PanelLineEdit* from = box(binder_, server_.txtClientIP);
+    from->setMinimumWidth(110);
+    client->addWidget(from, 1);
+    client->addWidget(button(binder_, server_.cmdDisconnectClient), 0, Qt::AlignRight);
     // The row keeps its place while nobody is connected.
     auto* row = new QWidget;
     row->setLayout(client);

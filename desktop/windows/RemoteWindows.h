@@ -16,6 +16,9 @@ class ServerForm;
 class TcpWindow : public FormWindow {
   public:
     TcpWindow(TCPConnectionForm& form, Binder& binder, QWidget* parent);
+
+  protected:
+    bool event(QEvent* event) override;
 };
 
 class DevicesWindow : public FormWindow {
