@@ -91,7 +91,7 @@ int main(int argc, char** argv) {
         {'w', "served", [&] { return zelbench::servedIdle(simulator, console); }},
         {'w', "served", [&] { return zelbench::servedMemory(simulator, console); }},
         {'v', "slow road", [] { return zelbench::slowRoad(); }},
-        {'w', "rehearsal", [] { return zelbench::rehearsalOfANight(); }},
+        {'x', "rehearsal", [] { return zelbench::rehearsalOfANight(); }},
     };
     zelbench::Figures figures;
     bool allMet = true;

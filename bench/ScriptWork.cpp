@@ -178,7 +178,7 @@ Figure rehearsalOfANight() {
             throw std::runtime_error("the night was not run to its end");
     }
     const double seconds = median(times);
-    return {"(w) the check of a night's script, 480 sweeps in 8 hours",
+    return {"(x) the check of a night's script, 480 sweeps in 8 hours",
             timeText(seconds),
             timeText(kRehearsalAllowed),
             seconds / kRehearsalAllowed,
