@@ -39,7 +39,6 @@ class WaterfallView {
 
   private:
     void setProjection(bool isOrthographic);
-    void chooseProjection(bool isOrthographic);
     /// The camera takes over what the user moved in this mode; the rest of the set is the camera's.
     void takeMoved(const GraphView3D& set, bool& rotated, bool& zoomed, bool& panned);
     void place(int plot, int point);
