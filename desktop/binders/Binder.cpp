@@ -75,7 +75,18 @@ QObject* Binder::widgetOf(const Control& control) const {
 }
 
 QString Binder::reasonFor(const Control& control) const {
+    if (const auto found = blocked_.find(&control); found != blocked_.end())
+        return text(found->second);
     return reasonAgainst ? text(reasonAgainst(control)).replace("\r\n", "\n") : QString();
+}
+
+void Binder::block(const Control& control, const std::string& reason) {
+    if (reason.empty()) {
+        if (blocked_.erase(&control) == 0) return;
+    } else {
+        blocked_[&control] = reason;
+    }
+    markDirty(&control);
 }
 
 void Binder::markDirty(const void* key) {
@@ -120,14 +131,16 @@ void Binder::follow(Control& control, QObject* widget, std::function<void()> sho
 }
 
 void Binder::describe(const Control& control, QWidget* widget) {
+    if (widget->property("refused").toBool()) return;  // the tip says why
     const std::string& own = control.ToolTip;
     const QString words = own.empty() ? toolTipOf(control) : text(own);
     const QString keys = shortcutOf(control);
     QString tip = keys.isEmpty() ? words : words + " (" + keys + ")";
     if (const QString reason = reasonFor(control); !reason.isEmpty()) tip += "\n" + reason;
-    if (widget->toolTip() == tip && !widget->accessibleName().isEmpty()) return;
-    widget->setToolTip(tip);
-    widget->setAccessibleName(words.isEmpty() ? text(control.name()) : words);
+    const QString name = own.empty() ? accessibleNameOf(control) : words;
+    if (widget->toolTip() != tip) widget->setToolTip(tip);
+    // Without a name of ours the toolkit takes that of the label beside the widget.
+    if (widget->accessibleName() != name) widget->setAccessibleName(name);
 }
 
 void Binder::bind(Button& control, QPushButton* widget) {

@@ -52,6 +52,8 @@ class Binder : public QObject {
     /// Shows the form again with the next frame.
     void refresh(const Form& form) { markDirty(&form); }
     void refresh(const Control& control) { markDirty(&control); }
+    /// Keeps a control from being used, with the reason; an empty one ends that.
+    void block(const Control& control, const std::string& reason);
     /// Shows every control and form again: the colours have changed.
     void refreshAll();
     /// Shows all changes now.
@@ -86,6 +88,7 @@ class Binder : public QObject {
     };
     std::unordered_map<const void*, Entry> entries_;
     std::unordered_set<const void*> dirty_;
+    std::unordered_map<const Control*, std::string> blocked_;
     QTimer frame_;
     bool flushing_ = false;
 };
@@ -97,6 +100,13 @@ class PanelLineEdit : public QLineEdit {
     /// `enter` may take an Enter over that has to wait for its turn.
     void setControl(TextBox* control, std::function<bool()> refused,
                     std::function<bool(std::function<void()>)> enter);
+    /// Looks at an entry before Enter sends it: changes the text into what the panel reads, or
+    /// says false with the problem, and nothing is sent.
+    void setReader(std::function<bool(QString& text, QString& problem)> reader) {
+        reader_ = std::move(reader);
+    }
+    /// Marks the text as one that cannot be read, until it changes; an empty problem ends that.
+    void showProblem(const QString& problem);
     /// A key is on its way into the text, and its control knows of it.
     bool typing() const { return typing_; }
 
@@ -105,11 +115,15 @@ class PanelLineEdit : public QLineEdit {
 
   private:
     void insertKey(QKeyEvent* event);
+    bool readable();
 
     TextBox* control_ = nullptr;
     bool typing_ = false;
     std::function<bool()> refused_;
     std::function<bool(std::function<void()>)> enter_;
+    std::function<bool(QString& text, QString& problem)> reader_;
+    QString ownTip_;
+    bool marked_ = false;
 };
 
 /// The face of a control's colour for the style sheet: "plain", "red", "green", "gray".

@@ -1,4 +1,6 @@
 #include <QKeyEvent>
+#include <QStyle>
+#include <QToolTip>
 
 #include "desktop/binders/Binder.h"
 
@@ -18,6 +20,7 @@ int characterOf(const QKeyEvent& event, int code) {
 PanelLineEdit::PanelLineEdit(QWidget* parent) : QLineEdit(parent) {
     // What is dropped would pass the keys by; a file is for the window.
     setAcceptDrops(false);
+    connect(this, &QLineEdit::textChanged, this, [this] { showProblem({}); });
 }
 
 void PanelLineEdit::setControl(TextBox* control, std::function<bool()> refused,
@@ -34,6 +37,7 @@ void PanelLineEdit::keyPressEvent(QKeyEvent* event) {
         event->matches(QKeySequence::Undo) || event->matches(QKeySequence::Redo))
         return QLineEdit::keyPressEvent(event);
     const bool enters = keyCodeOf(*event) == kKeyEnter;
+    if (enters && !readable()) return;
     if (enters && enter_ && enter_([control = control_] {
             int key = kKeyEnter;
             control->KeyDown(key, 0);
@@ -43,6 +47,32 @@ void PanelLineEdit::keyPressEvent(QKeyEvent* event) {
     typing_ = true;
     insertKey(event);
     typing_ = false;
+}
+
+bool PanelLineEdit::readable() {
+    if (!reader_ || text().isEmpty()) return true;
+    QString made = text();
+    QString problem;
+    if (!reader_(made, problem)) {
+        showProblem(problem);
+        return false;
+    }
+    if (made == text()) return true;
+    setText(made);
+    control_->Text = made.toStdString();
+    return true;
+}
+
+void PanelLineEdit::showProblem(const QString& problem) {
+    const bool marked = !problem.isEmpty();
+    if (marked == marked_ && !marked) return;
+    if (!marked_) ownTip_ = toolTip();
+    marked_ = marked;
+    setProperty("refused", marked);
+    style()->unpolish(this);
+    style()->polish(this);
+    setToolTip(marked ? problem : ownTip_);
+    if (marked && hasFocus()) QToolTip::showText(mapToGlobal(QPoint(0, height())), problem, this);
 }
 
 void PanelLineEdit::insertKey(QKeyEvent* event) {

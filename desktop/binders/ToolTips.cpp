@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "platform/Controls.h"
+
 namespace zel {
 namespace {
 
@@ -86,6 +88,55 @@ const Tip kTips[] = {
     {"CWGraph1", "The sweep. With a marker on, drag it or move it with the arrow keys"},
 };
 
+/// Names of what the screen itself does not name.
+const Tip kNames[] = {
+    {"CWGraph1", "Graph"},
+    {"SpectrogramPicture", "Spectrogram"},
+    {"ManualCommandText", "Command"},
+    {"ManualCommandTextAnsw", "Answer"},
+    {"DebugTextBox", "Last step"},
+    {"TimeLabel", "Length of the session"},
+    {"COMList", "Port"},
+    {"BaudList", "Baud rate"},
+    {"IDText", "Instrument"},
+    {"TelNumberBox", "Number"},
+    {"AirBaudRateText", "Modem"},
+    {"ConnectedPic", "State of the connection"},
+    {"Picture3", "State of the connection"},
+    {"FileLabel", "Progress"},
+    {"WaitLabel", "Wait"},
+};
+
+/// "1" of "SoftKey(0)": people count from one.
+QString numberOf(const std::string& name) {
+    const auto bracket = name.find('(');
+    if (bracket == std::string::npos) return {};
+    const QString index = QString::fromStdString(name.substr(bracket + 1)).chopped(1);
+    return QString::number(index.toInt() + 1);
+}
+
+/// What stands on the control, in one line.
+QString writtenOn(const Control& control) {
+    std::string caption;
+    switch (control.kind()) {
+        case ControlKind::Button:
+            caption = static_cast<const Button&>(control).Caption;
+            break;
+        case ControlKind::CheckBox:
+            caption = static_cast<const CheckBox&>(control).Caption;
+            break;
+        case ControlKind::OptionButton:
+            caption = static_cast<const OptionButton&>(control).Caption;
+            break;
+        case ControlKind::Label:
+            caption = static_cast<const Label&>(control).Caption;
+            break;
+        default:
+            break;
+    }
+    return QString::fromStdString(caption).simplified();
+}
+
 bool darkInk = true;
 
 }  // namespace
@@ -98,6 +149,25 @@ QString toolTipOf(const Control& control) {
     if (base == "SoftTextBox") return "Value: type a number with its prefix, then Enter";
     if (base == "ChoiceBox") return "Choice";
     return {};
+}
+
+QString accessibleNameOf(const Control& control) {
+    const std::string base = control.name().substr(0, control.name().find('('));
+    for (const Tip& row : kNames)
+        if (base == row.name) return QString::fromUtf8(row.text);
+    const QString written = writtenOn(control);
+    const QString number = numberOf(control.name());
+    if (base == "SoftKey")
+        return "Soft key " + number + (written.isEmpty() ? QString() : ", " + written);
+    if (base == "SoftTextBox") return "Value " + number;
+    if (base == "ChoiceBox") return "Choice " + number;
+    // A readout is read with its value.
+    if (control.kind() == ControlKind::Label && !written.isEmpty()) return written;
+    if (!written.isEmpty() && control.kind() != ControlKind::Label) {
+        const QString tip = toolTipOf(control);
+        return tip.isEmpty() ? written : written + ", " + tip;
+    }
+    return toolTipOf(control);
 }
 
 void useDarkInk(bool darkTheme) { darkInk = darkTheme; }

@@ -10,6 +10,9 @@ namespace zel {
 
 /// The tip of a control; empty for one that speaks for itself.
 QString toolTipOf(const Control& control);
+/// The name of a control for those who hear the screen: words of the screen, with its number where
+/// several are alike, and never a name of the source. Empty where its label says it.
+QString accessibleNameOf(const Control& control);
 /// The theme in use shows coloured texts on a dark or a light ground.
 void useDarkInk(bool darkTheme);
 /// A colour of the panel as a text colour with enough contrast.

@@ -1,5 +1,6 @@
 #include "desktop/graph/DivisionTicker.h"
 
+#include <algorithm>
 #include <cmath>
 
 #include "model/Numeric.h"
@@ -8,6 +9,10 @@
 namespace zel {
 namespace {
 
+constexpr int kDivisions = 10;
+constexpr int kFewTicks = 7;  // that all have room for a text
+constexpr double kClose = 1e-6;
+
 /// A tick of a range does not show what lies far below the range's own steps.
 double tidy(double value, double step) {
     if (step <= 0) return value;
@@ -15,12 +20,34 @@ double tidy(double value, double step) {
     return std::nearbyint(value / unit) * unit;
 }
 
+/// The smallest of 1, 2, 5 and their tenfolds that is not below the value.
+double roundStep(double value) {
+    const double decade = std::pow(10.0, std::floor(std::log10(value)));
+    for (const double step : {1.0, 2.0, 5.0})
+        if (value <= step * decade * (1 + kClose)) return step * decade;
+    return 10 * decade;
+}
+
+bool isWhole(double value) { return std::fabs(value - std::nearbyint(value)) < kClose; }
+
 }  // namespace
+
+double divisionOf(double lower, double upper) {
+    const double tenth = (upper - lower) / kDivisions;
+    return tenth > 0 && std::isfinite(tenth) ? roundStep(tenth) : 0;
+}
+
+double DivisionTicker::getTickStep(const QCPRange& range) {
+    return std::max(divisionOf(range.lower, range.upper), range.size() * 1e-3);
+}
 
 QVector<double> DivisionTicker::createTickVector(double tickStep, const QCPRange& range) {
     QVector<double> ticks;
-    for (int i = 0; i <= kDivisions; ++i) ticks << range.lower + i * tickStep;
-    ticks.back() = range.upper;
+    if (!(tickStep > 0)) return ticks;
+    const double first = std::ceil(range.lower / tickStep - kClose);
+    const double last = std::floor(range.upper / tickStep + kClose);
+    if (last - first > 1000) return ticks;
+    for (double at = first; at <= last; ++at) ticks << at * tickStep;
     return ticks;
 }
 
@@ -28,12 +55,13 @@ QVector<QString> DivisionTicker::createLabelVector(const QVector<double>& ticks,
                                                    QChar, int) {
     QVector<QString> labels;
     const double step = ticks.size() > 1 ? ticks[1] - ticks[0] : 0;
-    for (int i = 0; i < ticks.size(); ++i) {
-        if (i % labelEvery_ != 0) {
+    const int every = ticks.size() > kFewTicks ? labelEvery_ : 1;
+    for (const double tick : ticks) {
+        if (every > 1 && step > 0 && !isWhole(std::nearbyint(tick / step) / every)) {
             labels << QString();
             continue;
         }
-        double value = tidy(ticks[i], step);
+        double value = tidy(tick, step);
         if (std::fabs(value) < step * 1e-6) value = 0;
         const std::string text =
             unit_.empty() ? generalNumber(roundHalfEven(value, 6)) : FormatValue(value, unit_);

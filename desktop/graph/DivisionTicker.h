@@ -1,5 +1,5 @@
 #pragma once
-// Ticks at the ten divisions of an axis, with texts in engineering units.
+// Ticks of an axis at round places (1, 2, 5), with texts in engineering units.
 
 #include <qcustomplot.h>
 
@@ -7,22 +7,25 @@
 
 namespace zel {
 
+/// The step of about ten divisions of a range: the tenth part where that is round and the range
+/// begins on a division, else the next round step. 0 for a range without a size.
+double divisionOf(double lower, double upper);
+
 class DivisionTicker : public QCPAxisTicker {
   public:
-    /// A text stands at every `labelEvery`th tick.
+    /// With `labelEvery` 2 a text stands at every second tick where there are many.
     explicit DivisionTicker(int labelEvery) : labelEvery_(labelEvery) {}
     /// With a unit the texts carry prefix and unit, without one they are plain numbers.
     void setUnit(const std::string& unit) { unit_ = unit; }
 
   protected:
-    double getTickStep(const QCPRange& range) override { return range.size() / kDivisions; }
+    double getTickStep(const QCPRange& range) override;
     int getSubTickCount(double) override { return 0; }
     QVector<double> createTickVector(double tickStep, const QCPRange& range) override;
     QVector<QString> createLabelVector(const QVector<double>& ticks, const QLocale& locale,
                                        QChar formatChar, int precision) override;
 
   private:
-    static constexpr int kDivisions = 10;
     int labelEvery_;
     std::string unit_;
 };

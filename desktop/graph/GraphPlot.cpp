@@ -3,8 +3,10 @@
 #include <cmath>
 #include <limits>
 
+#include "desktop/graph/AxisText.h"
 #include "desktop/graph/DivisionTicker.h"
 #include "desktop/graph/PolylineClip.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {
@@ -13,6 +15,9 @@ constexpr double kCursorReach = 8;  // pixels
 constexpr int kFontPoints = 9;
 /// Half of the last label of the x axis stands in it: one that does not fit is not drawn at all.
 constexpr int kRightMargin = 42;
+constexpr std::size_t kPairedValues = 602;
+constexpr double kBandShare = 0.35;  // of the line's ink in the band's
+constexpr double kLabelGap = 9;      // pixels from the point to its text
 
 QFont plotFont() {
     QFont font;
@@ -42,6 +47,8 @@ GraphColors lightGraph() {
     colors.text = QColor(0x10, 0x14, 0x18);
     colors.trace = QColor(0x0b, 0x4f, 0xa8);
     colors.trigger = QColor(0xb0, 0x20, 0x20);
+    colors.file = QColor(0x1d, 0x5c, 0xa0);
+    colors.shade = QColor(0xe4, 0xec, 0xf6);
     colors.cursorDarkness = 170;
     return colors;
 }
@@ -77,6 +84,17 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     layout->setRowStretchFactor(2, 0.001);
 
     styleAxes();
+    channel_ = new QCPItemRect(&plot_);
+    channel_->setLayer("background");
+    channel_->setPen(QPen(colors_.frame, 1, Qt::DashLine));
+    channel_->setBrush(colors_.shade);
+    channel_->topLeft->setTypeX(QCPItemPosition::ptPlotCoords);
+    channel_->topLeft->setTypeY(QCPItemPosition::ptAxisRectRatio);
+    channel_->bottomRight->setTypeX(QCPItemPosition::ptPlotCoords);
+    channel_->bottomRight->setTypeY(QCPItemPosition::ptAxisRectRatio);
+    channel_->setVisible(false);
+    low_ = plot_.addGraph();
+    low_->setAdaptiveSampling(false);
     trace_ = plot_.addGraph();
     trace_->setPen(QPen(colors_.trace, 1));
     trace_->setAdaptiveSampling(false);
@@ -87,6 +105,11 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
         cursor.point->setSize(9);
         cursor.line->setVisible(false);
         cursor.point->setVisible(false);
+        cursor.text = new QCPItemText(&plot_);
+        cursor.text->position->setType(QCPItemPosition::ptAbsolute);
+        cursor.text->setFont(plotFont());
+        cursor.text->setClipToAxisRect(false);
+        cursor.text->setVisible(false);
     }
     trigger_ = new QCPItemStraightLine(&plot_);
     trigger_->setPen(QPen(colors_.trigger, 1, Qt::DashLine));
@@ -99,6 +122,8 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     old_ = addNote(0.04);
     old_->setText("OLD TRACE");
     incomplete_ = addNote(0.10);
+    source_ = addNote(0.16);
+    source_->setColor(colors_.file);
 }
 
 QCPItemText* GraphPlot::addNote(double height) {
@@ -153,10 +178,13 @@ void GraphPlot::setRanges(const Graph& graph) {
 
 void GraphPlot::takeTrace(const Graph& graph) {
     const std::vector<double>& values = graph.values();
-    QVector<double> keys;
-    QVector<double> points;
-    keys.reserve(static_cast<qsizetype>(values.size()));
-    points.reserve(static_cast<qsizetype>(values.size()));
+    const auto xOf = [&](std::size_t i) {
+        return graph.firstX() + static_cast<double>(i) * graph.increment();
+    };
+    paired_ = values.size() == kPairedValues;
+    resolution_ = std::fabs(graph.increment()) * (paired_ ? 2 : 1);
+    points_.clear();
+    points_.reserve(static_cast<qsizetype>(values.size()));
     bool gap = true;
     for (std::size_t i = 0; i < values.size(); ++i) {
         // Of a pair one value may be missing: the line goes on through the other. Two and more
@@ -165,10 +193,71 @@ void GraphPlot::takeTrace(const Graph& graph) {
         const bool alone = missing && i + 1 < values.size() && !std::isnan(values[i + 1]);
         if (missing && (alone || gap)) continue;
         gap = missing;
-        keys << graph.firstX() + static_cast<double>(i) * graph.increment();
-        points << values[i];
+        points_ << QPointF(xOf(i), values[i]);
     }
-    trace_->setData(keys, points, true);
+    const bool band = band_ && paired_;
+    low_->setVisible(band);
+    trace_->setChannelFillGraph(band ? low_ : nullptr);
+    QVector<double> keys;
+    QVector<double> highs;
+    QVector<double> lows;
+    if (!band) {
+        for (const QPointF& point : points_) {
+            keys << point.x();
+            highs << point.y();
+        }
+        low_->data()->clear();
+        return trace_->setData(keys, highs, true);
+    }
+    for (std::size_t i = 0; i + 1 < values.size(); i += 2) {
+        // fmin and fmax pass over a value that is missing.
+        keys << xOf(i);
+        lows << std::fmin(values[i], values[i + 1]);
+        highs << std::fmax(values[i], values[i + 1]);
+    }
+    trace_->setData(keys, highs, true);
+    low_->setData(keys, lows, true);
+}
+
+QColor GraphPlot::bandInk(const QColor& line) const {
+    const auto mix = [](int ink, int ground) {
+        return static_cast<int>(ink * kBandShare + ground * (1 - kBandShare));
+    };
+    const QColor& ground = colors_.plotArea;
+    return {mix(line.red(), ground.red()), mix(line.green(), ground.green()),
+            mix(line.blue(), ground.blue())};
+}
+
+void GraphPlot::setSource(const QString& name) {
+    source_->setText(name);
+    source_->setVisible(!name.isEmpty());
+}
+
+void GraphPlot::setChannel(double left, double right) {
+    channel_->setVisible(right > left);
+    channel_->topLeft->setCoords(left, 0);
+    channel_->bottomRight->setCoords(right, 1);
+}
+
+std::pair<double, double> GraphPlot::levelsAt(double x) const {
+    const double nothing = std::numeric_limits<double>::quiet_NaN();
+    std::pair<double, double> levels(nothing, nothing);
+    const bool band = low_->visible() && paired_;
+    const auto at = trace_->data()->findBegin(x, true);
+    double distance = resolution_ * (band ? 0.75 : 0.5001);
+    qsizetype found = -1;
+    const auto begin = trace_->data()->constBegin();
+    for (auto it = at; it != trace_->data()->constEnd() && it - at < 3; ++it) {
+        const double away = std::fabs(it->key - x);
+        if (std::isnan(it->value) || away > distance) continue;
+        distance = away;
+        found = it - begin;
+    }
+    if (found < 0) return levels;
+    levels.second = (begin + found)->value;
+    levels.first = band && found < low_->dataCount() ? low_->dataMainValue(static_cast<int>(found))
+                                                     : levels.second;
+    return levels;
 }
 
 void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
@@ -183,21 +272,8 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
         serial_ = graph.plotSerial();
         drawn_ = true;
     }
-    for (int i = 0; i < 2; ++i) {
-        CursorItems& items = cursors_.at(static_cast<std::size_t>(i));
-        const GraphCursor& cursor = graph.cursor(i + 1);
-        items.visible = cursor.Visible;
-        items.x = cursor.X;
-        items.line->setVisible(cursor.Visible);
-        items.point->setVisible(cursor.Visible);
-        if (!cursor.Visible) continue;
-        const QColor color = colorOf(cursor.color).darker(colors_.cursorDarkness);
-        items.line->setPen(QPen(color, 1));
-        items.line->point1->setCoords(cursor.X, 0);
-        items.line->point2->setCoords(cursor.X, 1);
-        items.point->setPen(QPen(color, 2));
-        items.point->position->setCoords(cursor.X, cursor.Y);
-    }
+    view_ = view;
+    placeCursors(graph);
     const std::string& note = graph.Note;
     old_->setText(note.empty() ? "OLD TRACE" : text(note));
     old_->setVisible(graph.Old || !note.empty());
@@ -205,7 +281,11 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     incomplete_->setVisible(!graph.Incomplete.get().empty());
     QColor ink = colors_.trace;
     if (graph.Old) ink = ink.darker(200);
-    if (trace_->pen().color() != ink) trace_->setPen(QPen(ink, trace_->pen().widthF()));
+    if (trace_->pen().color() != ink || trace_->pen().widthF() != width_) {
+        trace_->setPen(QPen(ink, width_));
+        low_->setPen(QPen(bandInk(ink), width_));
+    }
+    trace_->setBrush(low_->visible() ? QBrush(bandInk(ink)) : QBrush(Qt::NoBrush));
     const GraphAnnotation& trigger = graph.trigger();
     trigger_->setVisible(trigger.Visible);
     triggerText_->setVisible(trigger.Visible);
@@ -213,7 +293,12 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     trigger_->point2->setCoords(plot_.xAxis->range().upper, trigger.Height);
     triggerText_->position->setCoords(plot_.xAxis->range().lower, trigger.Height);
     triggerText_->setText(text(trigger.Caption));
-    top_[0]->setText(joined({text(view.refLevel), text(view.range)}));
+    // The scale as the axis is drawn, be it by hand or by a zoom.
+    QString range = text(view.range);
+    const GraphAxis& y = graph.yAxis();
+    if (range.endsWith("dB/DIV"))
+        range = text(generalNumber(divisionOf(y.Minimum, y.Maximum))) + "dB/DIV";
+    top_[0]->setText(joined({text(view.refLevel), range}));
     top_[1]->setText(joined({text(view.rbw), text(view.vbw)}));
     top_[2]->setText(joined({text(view.mode), text(view.detector)}));
     top_[3]->setText(text(view.sweepTime));
@@ -223,12 +308,59 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     strike(view);
 }
 
+void GraphPlot::placeCursors(const Graph& graph) {
+    for (std::size_t i = 0; i < cursors_.size(); ++i) {
+        CursorItems& items = cursors_.at(i);
+        const GraphCursor& cursor = graph.cursor(static_cast<int>(i) + 1);
+        items.visible = cursor.Visible;
+        items.x = cursor.X;
+        items.line->setVisible(cursor.Visible);
+        items.point->setVisible(cursor.Visible);
+        items.text->setVisible(false);
+        if (!cursor.Visible) continue;
+        const QColor color = colorOf(cursor.color).darker(colors_.cursorDarkness);
+        items.line->setPen(QPen(color, 1));
+        items.line->point1->setCoords(cursor.X, 0);
+        items.line->point2->setCoords(cursor.X, 1);
+        items.point->setPen(QPen(color, 2));
+        items.text->setColor(color);
+        // On the trace as it is now: the cursor's own level is that of an earlier sweep.
+        const double level = levelsAt(cursor.X).second;
+        const QPointF point(cursor.X, markerTexts_ && std::isfinite(level) ? level : cursor.Y);
+        items.point->position->setCoords(point);
+        if (markerTexts_ && std::isfinite(level)) writeCursor(i, point);
+    }
+}
+
+void GraphPlot::writeCursor(std::size_t index, const QPointF& point) {
+    const QPointF first = cursors_[0].point->position->coords();
+    const bool delta = index == 1 && cursors_[0].visible;
+    QCPItemText& label = *cursors_.at(index).text;
+    const double x = delta ? point.x() - first.x() : point.x();
+    const double y = delta ? point.y() - first.y() : point.y();
+    label.setText((delta ? QString::fromUtf8("Δ1  ") : QString("1  ")) +
+                  text(axisText(x, resolution_, view_.xUnit)) + "; " +
+                  text(levelText(y, delta ? "dB" : view_.unit)));
+    // Above its point, inside of the plot.
+    const QRectF area = axisRect_->rect();
+    const QPointF pixel(plot_.xAxis->coordToPixel(point.x()), plot_.yAxis->coordToPixel(point.y()));
+    label.setVisible(area.adjusted(-1, -1, 1, 1).contains(pixel));
+    const double half = QFontMetricsF(label.font()).horizontalAdvance(label.text()) / 2 + 4;
+    const double line = QFontMetricsF(label.font()).height();
+    const double right = std::max(area.left() + half, area.right() - half);
+    const double place = pixel.y() - kLabelGap - line;
+    label.setPositionAlignment(Qt::AlignHCenter | Qt::AlignTop);
+    // The second one goes a line lower where both would stand at one place.
+    label.position->setCoords(std::clamp(pixel.x(), area.left() + half, right),
+                              std::max(place, area.top() + 2 + (index == 1 ? line : 0)));
+}
+
 void GraphPlot::strike(const ViewAnnotations& view) {
     const auto ifUnsure = [](bool unsure, const std::string& part) {
         return unsure ? QStringList{text(part)} : QStringList{};
     };
     top_[0]->setStruck(ifUnsure(view.refLevelUnsure, view.refLevel) +
-                       ifUnsure(view.rangeUnsure, view.range));
+                       (view.rangeUnsure ? top_[0]->text().split("    ").mid(1) : QStringList()));
     top_[2]->setStruck(ifUnsure(view.detectorUnsure, view.detector));
     bottom_[0]->setStruck(ifUnsure(view.xUnsure, view.left));
     bottom_[1]->setStruck(ifUnsure(view.xUnsure, view.center));
@@ -245,8 +377,7 @@ void GraphPlot::strike(const ViewAnnotations& view) {
 void GraphPlot::clipToView() {
     const QCPRange x = plot_.xAxis->range();
     const QCPRange y = plot_.yAxis->range();
-    QPolygonF line;
-    for (const QCPGraphData& point : *trace_->data()) line.append({point.key, point.value});
+    const QPolygonF line(points_);
     QVector<double> keys;
     QVector<double> values;
     for (const QPolygonF& part : clipPolyline(line, {x.lower, y.lower, x.size(), y.size()})) {
@@ -280,11 +411,11 @@ QPointF GraphPlot::pointAt(double x) const {
     // The nearest point that is a number: a cursor never stands in a gap.
     QPointF nearest(x, 0);
     double distance = std::numeric_limits<double>::infinity();
-    for (const QCPGraphData& point : *trace_->data()) {
-        const double away = std::fabs(point.key - x);
-        if (std::isnan(point.value) || away >= distance) continue;
+    for (const QPointF& point : points_) {
+        const double away = std::fabs(point.x() - x);
+        if (std::isnan(point.y()) || away >= distance) continue;
         distance = away;
-        nearest = {point.key, point.value};
+        nearest = point;
     }
     return nearest;
 }

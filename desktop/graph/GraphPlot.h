@@ -4,6 +4,7 @@
 #include <qcustomplot.h>
 
 #include <array>
+#include <utility>
 
 #include "desktop/graph/AnnotationText.h"
 #include "platform/Graph.h"
@@ -19,7 +20,9 @@ struct GraphColors {
     QColor text{0xd8, 0xe0, 0xe8};
     QColor trace{0xff, 0xd8, 0x4d};
     QColor trigger{0xff, 0x6b, 0x6b};
-    int cursorDarkness = 100;  ///< percent: cursors are made for a dark ground
+    QColor file{0x8e, 0xc9, 0xff};   ///< the name of a loaded file
+    QColor shade{0x1d, 0x2b, 0x3d};  ///< a channel
+    int cursorDarkness = 100;        ///< percent: cursors are made for a dark ground
 };
 GraphColors darkGraph();
 GraphColors lightGraph();  ///< for paper
@@ -32,7 +35,16 @@ class GraphPlot {
     /// Takes the data and the texts over; the caller replots.
     void update(const Graph& graph, const ViewAnnotations& view);
     /// In pixels of the plot. One pixel of the device is what Qt draws fast.
-    void setTraceWidth(double width) { trace_->setPen(QPen(colors_.trace, width)); }
+    void setTraceWidth(double width) { width_ = width; }
+    /// Draws pairs of a minimum and a maximum as a band between two lines. Without it the pairs are
+    /// one line up and down, which every format of pictures has.
+    void setBand(bool band) { band_ = band; }
+    /// What the trace was loaded from; empty for a sweep of the instrument.
+    void setSource(const QString& name);
+    /// Shades a stretch of the x axis; nothing where both ends are the same.
+    void setChannel(double left, double right);
+    /// Writes number and value at the markers that are shown.
+    void setMarkerTexts(bool shown) { markerTexts_ = shown; }
     /// Ends the trace and all that goes with it at the edges of the graticule, for pictures whose
     /// format has no clip. Holds until the next update.
     void clipToView();
@@ -41,11 +53,18 @@ class GraphPlot {
     int cursorAt(const QPointF& pixel) const;
     /// The point of the trace that lies nearest to x; (x, 0) where there is no trace.
     QPointF pointAt(double x) const;
+    /// The samples at x: the nearest one, of a pair its minimum and maximum. NaN where there is
+    /// none.
+    std::pair<double, double> levelsAt(double x) const;
+    /// Distance of two points of the trace, in the unit of the x axis.
+    double resolution() const { return resolution_; }
+    const ViewAnnotations& view() const { return view_; }
 
   private:
     struct CursorItems {
         QCPItemStraightLine* line = nullptr;
         QCPItemTracer* point = nullptr;
+        QCPItemText* text = nullptr;
         bool visible = false;
         double x = 0;
     };
@@ -55,6 +74,9 @@ class GraphPlot {
     void styleAxes();
     void setRanges(const Graph& graph);
     void strike(const ViewAnnotations& view);
+    void placeCursors(const Graph& graph);
+    void writeCursor(std::size_t index, const QPointF& point);
+    QColor bandInk(const QColor& line) const;
 
     QCustomPlot& plot_;
     GraphColors colors_;
@@ -67,6 +89,16 @@ class GraphPlot {
     QCPItemText* triggerText_ = nullptr;
     QCPItemText* old_ = nullptr;
     QCPItemText* incomplete_ = nullptr;
+    QCPGraph* low_ = nullptr;  ///< the lower edge of the band
+    QCPItemText* source_ = nullptr;
+    QCPItemRect* channel_ = nullptr;
+    QList<QPointF> points_;  ///< of the trace, each value for itself
+    ViewAnnotations view_;
+    double resolution_ = 0;
+    double width_ = 1;
+    bool band_ = false;
+    bool paired_ = false;
+    bool markerTexts_ = false;
     unsigned long serial_ = 0;
     bool drawn_ = false;
 };

@@ -4,6 +4,7 @@
 #include <QMouseEvent>
 #include <QRubberBand>
 #include <algorithm>
+#include <cmath>
 
 #include "desktop/platform/KeyCodes.h"
 
@@ -11,6 +12,9 @@ namespace zel {
 namespace {
 
 constexpr int kSmallestRectangle = 6;  // pixels
+constexpr double kWheelStep = 1.25;    // a notch
+constexpr int kNotch = 120;            // an eighth of a degree
+constexpr double kSharpScreen = 1.5;   // device pixels a pixel
 
 }  // namespace
 
@@ -20,6 +24,9 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
       annotate_(std::move(annotate)),
       band_(new QRubberBand(QRubberBand::Rectangle, this)) {
     picture_ = std::make_unique<GraphPlot>(*this);
+    picture_->setBand(true);
+    picture_->setMarkerTexts(true);
+    setAccessibleName("Graph");
     setMouseTracking(true);
     setFocusPolicy(Qt::StrongFocus);
     setMinimumSize(320, 220);
@@ -27,6 +34,7 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
 }
 
 void GraphWidget::refresh() {
+    picture_->setTraceWidth(devicePixelRatioF() >= kSharpScreen ? 1.5 : 1);
     picture_->update(graph_, annotate_());
     showPointer(mapFromGlobal(QCursor::pos()));
     replot(QCustomPlot::rpQueuedReplot);
@@ -39,7 +47,9 @@ void GraphWidget::drawNow() {
 
 void GraphWidget::showPointer(const QPointF& pixel) {
     const bool movable = graph_.TrackMode == static_cast<int>(TrackMode::DragCursors);
-    if (zooming()) {
+    if (panFrom_ || spaceHeld_) {
+        setCursor(panFrom_ ? Qt::ClosedHandCursor : Qt::OpenHandCursor);
+    } else if (zooming()) {
         setCursor(Qt::CrossCursor);
     } else if (movable && (dragged_ > 0 || picture_->cursorAt(pixel) > 0)) {
         setCursor(Qt::SplitHCursor);
@@ -60,6 +70,13 @@ QPointF GraphWidget::clamped(const QPointF& pixel) {
 
 void GraphWidget::mousePressEvent(QMouseEvent* event) {
     setFocus(Qt::MouseFocusReason);
+    const bool pans =
+        event->button() == Qt::MiddleButton || (event->button() == Qt::LeftButton && spaceHeld_);
+    if (pans && navigator_ != nullptr && !graph_.values().empty()) {
+        navigator_->endStep();
+        panFrom_ = event->position();
+        return showPointer(event->position());
+    }
     if (event->button() != Qt::LeftButton) return;
     if (zooming()) {
         bandStart_ = clamped(event->position()).toPoint();
@@ -76,14 +93,66 @@ void GraphWidget::mouseMoveEvent(QMouseEvent* event) {
         band_->setGeometry(QRect(bandStart_, clamped(pixel).toPoint()).normalized());
         return;
     }
+    if (panFrom_) return panTo(pixel);
     showPointer(pixel);
     if (dragged_ > 0) return moveCursor(dragged_, xAxis->pixelToCoord(clamped(pixel).x()));
-    if (picture_->axisRect().rect().contains(pixel.toPoint()) && !graph_.values().empty())
-        graph_.PlotAreaTracking(xAxis->pixelToCoord(pixel.x()), yAxis->pixelToCoord(pixel.y()));
+    if (!picture_->axisRect().rect().contains(pixel.toPoint()) || graph_.values().empty()) {
+        if (pointed) pointed(std::nullopt);
+        return;
+    }
+    if (tracking) tracking(true);
+    graph_.PlotAreaTracking(xAxis->pixelToCoord(pixel.x()), yAxis->pixelToCoord(pixel.y()));
+    if (tracking) tracking(false);
+    if (pointed) pointed(xAxis->pixelToCoord(pixel.x()));
+}
+
+void GraphWidget::panTo(const QPointF& pixel) {
+    navigator_->pan(xAxis->pixelToCoord(panFrom_->x()) - xAxis->pixelToCoord(pixel.x()),
+                    yAxis->pixelToCoord(panFrom_->y()) - yAxis->pixelToCoord(pixel.y()));
+    panFrom_ = pixel;
+    drawNow();
+}
+
+void GraphWidget::leaveEvent(QEvent* event) {
+    QCustomPlot::leaveEvent(event);
+    if (pointed) pointed(std::nullopt);
+}
+
+void GraphWidget::mouseDoubleClickEvent(QMouseEvent* event) {
+    if (event->button() == Qt::LeftButton && !zooming() && navigator_ != nullptr)
+        return wholeView();
+    mousePressEvent(event);
+}
+
+void GraphWidget::wholeView() {
+    if (navigator_ != nullptr) navigator_->whole();
+}
+
+void GraphWidget::wheelEvent(QWheelEvent* event) {
+    const QPoint turned = event->angleDelta();
+    const int notches = turned.y() != 0 ? turned.y() : turned.x();
+    if (navigator_ == nullptr || notches == 0 || graph_.values().empty() ||
+        !picture_->axisRect().rect().contains(event->position().toPoint()))
+        return event->ignore();
+    const double factor = std::pow(kWheelStep, -static_cast<double>(notches) / kNotch);
+    if (event->modifiers().testFlag(Qt::ShiftModifier)) {
+        navigator_->zoomY(yAxis->pixelToCoord(event->position().y()), factor);
+    } else {
+        navigator_->zoomX(xAxis->pixelToCoord(event->position().x()), factor);
+    }
+    event->accept();
+}
+
+void GraphWidget::contextMenuEvent(QContextMenuEvent* event) {
+    if (menuAsked) menuAsked(event->globalPos(), xAxis->pixelToCoord(clamped(event->pos()).x()));
 }
 
 void GraphWidget::mouseReleaseEvent(QMouseEvent* event) {
     dragged_ = 0;
+    if (panFrom_) {
+        panFrom_.reset();
+        return showPointer(event->position());
+    }
     if (!band_->isVisible()) return;
     band_->hide();
     finishZoom(QRect(bandStart_, clamped(event->position()).toPoint()).normalized());
@@ -95,8 +164,12 @@ void GraphWidget::finishZoom(const QRect& rectangle) {
     const double right = xAxis->pixelToCoord(rectangle.right());
     const double bottom = yAxis->pixelToCoord(rectangle.bottom());
     const double top = yAxis->pixelToCoord(rectangle.top());
-    graph_.setXRange(left, right);
-    graph_.setYRange(bottom, top);
+    if (navigator_ != nullptr) {
+        navigator_->showRectangle({left, right, bottom, top});
+    } else {
+        graph_.setXRange(left, right);
+        graph_.setYRange(bottom, top);
+    }
     graph_.ZoomFinished();
 }
 
@@ -105,7 +178,34 @@ void GraphWidget::moveCursor(int index, double x) {
     graph_.CursorMoved(index, point.x(), point.y());
 }
 
+bool GraphWidget::navigate(const QKeyEvent& event) {
+    if (navigator_ == nullptr) return false;
+    const bool alt = event.modifiers() == Qt::AltModifier;
+    if (alt && event.key() == Qt::Key_Left) {
+        navigator_->back();
+    } else if (alt && event.key() == Qt::Key_Right) {
+        navigator_->forward();
+    } else if (event.key() == Qt::Key_Home) {
+        navigator_->whole();
+    } else if (event.key() == Qt::Key_Space) {
+        spaceHeld_ = true;
+        showPointer(mapFromGlobal(QCursor::pos()));
+    } else {
+        return false;
+    }
+    return true;
+}
+
+void GraphWidget::keyReleaseEvent(QKeyEvent* event) {
+    if (event->key() == Qt::Key_Space && !event->isAutoRepeat()) {
+        spaceHeld_ = false;
+        showPointer(mapFromGlobal(QCursor::pos()));
+    }
+    QCustomPlot::keyReleaseEvent(event);
+}
+
 void GraphWidget::keyPressEvent(QKeyEvent* event) {
+    if (navigate(*event)) return;
     const int key = event->key();
     if (const int code = keyCodeOf(*event); code != 0)
         graph_.KeyDown(code, event->modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);

@@ -1,11 +1,14 @@
 #pragma once
-// The graph on the screen: drawing, zoom rectangle, pointer readout, movable cursors.
+// The graph on the screen: drawing, zoom rectangle, pointer readout, movable cursors, looking
+// closer with wheel and keys.
 
 #include <qcustomplot.h>
 
 #include <functional>
 #include <memory>
+#include <optional>
 
+#include "desktop/graph/GraphNavigator.h"
 #include "desktop/graph/GraphPlot.h"
 #include "platform/Graph.h"
 #include "trace/ViewAnnotations.h"
@@ -20,19 +23,38 @@ class GraphWidget : public QCustomPlot {
     void refresh();
     /// Draws at once.
     void drawNow();
+    /// With a navigator wheel, middle button and keys change the view.
+    void setNavigator(GraphNavigator* navigator) { navigator_ = navigator; }
     /// Both axes as they were before the user looked closer.
-    void wholeView() {}
+    void wholeView();
     /// Where the trace is drawn, in pixels of the widget.
     QRect plotArea() const { return picture_->axisRect().rect(); }
+    const GraphPlot& picture() const { return *picture_; }
+    void setSource(const QString& name) { picture_->setSource(name); }
+    void setChannel(double left, double right) { picture_->setChannel(left, right); }
+
+    /// The pointer is over the plot at that x (in the axis' unit), or has left it.
+    std::function<void(std::optional<double>)> pointed;
+    /// Before and after the text of the pointer is written.
+    std::function<void(bool before)> tracking;
+    /// A menu is asked for at a place of the screen; x is where the pointer is on the axis.
+    std::function<void(QPoint, double)> menuAsked;
 
   protected:
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
+    void mouseDoubleClickEvent(QMouseEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    void contextMenuEvent(QContextMenuEvent* event) override;
+    void leaveEvent(QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
+    void keyReleaseEvent(QKeyEvent* event) override;
 
   private:
     bool zooming() const;
+    bool navigate(const QKeyEvent& event);
+    void panTo(const QPointF& pixel);
     /// The pointer's shape: a cross while a rectangle is awaited, arrows over a cursor to drag.
     void showPointer(const QPointF& pixel);
     void moveCursor(int index, double x);
@@ -42,9 +64,12 @@ class GraphWidget : public QCustomPlot {
     Graph& graph_;
     std::function<ViewAnnotations()> annotate_;
     std::unique_ptr<GraphPlot> picture_;
+    GraphNavigator* navigator_ = nullptr;
     QRubberBand* band_;
     QPoint bandStart_;
     int dragged_ = 0;
+    bool spaceHeld_ = false;
+    std::optional<QPointF> panFrom_;  ///< pixel where the pan has got to
 };
 
 }  // namespace zel

@@ -2,10 +2,13 @@
 
 #include <QApplication>
 #include <QClipboard>
+#include <QDir>
 #include <QFileDialog>
+#include <QFileInfo>
 #include <QGuiApplication>
 #include <QInputDialog>
 #include <QMessageBox>
+#include <QStandardPaths>
 
 namespace zel {
 namespace {
@@ -71,9 +74,30 @@ QStringList filtersOf(const std::string& filter) {
     return result;
 }
 
+QString& lastFolder() {
+    static QString folder;
+    return folder;
+}
+
+/// Where the user was last, as long as the program runs; else what is asked for, but never a folder
+/// that file managers hide: nobody would find the file again.
+QString startFolder(const QString& asked) {
+    if (!lastFolder().isEmpty() && QFileInfo(lastFolder()).isDir()) return lastFolder();
+    const bool hidden = asked.isEmpty() || asked.contains("/.") || !QFileInfo(asked).isDir();
+    if (!hidden) return asked;
+    const QString documents = QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation);
+    return QFileInfo(documents).isDir() ? documents : QDir::homePath();
+}
+
+/// "txt" of "Text Files (*.txt)"; empty for one of all files.
+QString endingOf(const QString& filter) {
+    const auto at = filter.lastIndexOf("*.");
+    return at < 0 ? QString() : filter.mid(at + 2).section(')', 0, 0).section(' ', 0, 0);
+}
+
 std::optional<std::string> chosen(const FileDialogRequest& request, bool save) {
     QFileDialog dialog(QApplication::activeWindow(), QString::fromStdString(request.title),
-                       QString::fromStdString(request.folder));
+                       startFolder(QString::fromStdString(request.folder)));
     dialog.setAcceptMode(save ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
     dialog.setFileMode(save ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
     dialog.setOption(QFileDialog::DontConfirmOverwrite, !request.promptOverwrite);
@@ -83,8 +107,15 @@ std::optional<std::string> chosen(const FileDialogRequest& request, bool save) {
         const int index = request.filterIndex - 1;
         if (index >= 0 && index < filters.size()) dialog.selectNameFilter(filters[index]);
     }
+    if (save) {
+        dialog.setDefaultSuffix(endingOf(dialog.selectedNameFilter()));
+        QObject::connect(
+            &dialog, &QFileDialog::filterSelected, &dialog,
+            [&dialog](const QString& filter) { dialog.setDefaultSuffix(endingOf(filter)); });
+    }
     if (!request.fileName.empty()) dialog.selectFile(QString::fromStdString(request.fileName));
     if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty()) return std::nullopt;
+    lastFolder() = QFileInfo(dialog.selectedFiles().first()).absolutePath();
     return dialog.selectedFiles().first().toStdString();
 }
 

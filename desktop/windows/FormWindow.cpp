@@ -8,6 +8,7 @@
 
 #include "desktop/binders/ToolTips.h"
 #include "forms/MainForm.h"
+#include "panel/EntryText.h"
 
 namespace zel {
 namespace {
@@ -16,17 +17,28 @@ struct Field {
     const char* control;
     const char* caption;  ///< empty where a label of the form says it
     const char* unit = "";
+    /// Of a number; nothing for a text.
+    std::optional<EntryUnit> number = std::nullopt;
+    bool aboveZero = false;
 };
 constexpr Field kFields[] = {
-    {"manualSizeMin", "Minimum"},
-    {"manualSizeMax", "Maximum"},
-    {"TimeIntervalBox", "", "s"},
+    {"manualSizeMin", "Minimum", "", EntryUnit::Enter},
+    {"manualSizeMax", "Maximum", "", EntryUnit::Enter},
+    {"TimeIntervalBox", "", "s", EntryUnit::WholeSeconds, true},
 };
 
 Field fieldOf(const Control& control) {
     for (const Field& row : kFields)
         if (control.name() == row.control) return row;
     return {control.name().c_str(), control.name().c_str()};
+}
+
+/// Why a field's text cannot be taken; empty when it can.
+QString problemOf(const Field& field, const QString& text) {
+    if (!field.number) return {};
+    const EntryReading reading = readEntry(text.toStdString(), *field.number);
+    if (!reading.ok) return QString::fromStdString(reading.problem);
+    return field.aboveZero && !(reading.value > 0) ? QString("It is to be more than 0") : QString();
 }
 
 /// Buttons that leave a dialog without doing what it is for.
@@ -161,6 +173,11 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
             fields->addRow(caption, row);
             caption = nullptr;
             binder.bind(static_cast<TextBox&>(*control), line);
+            connect(line, &QLineEdit::textChanged, this, [this, line, field](const QString& text) {
+                line->showProblem(problemOf(field, text));
+                checkFields();
+            });
+            checked_.push_back([line, field] { return problemOf(field, line->text()); });
         } else if (control->kind() == ControlKind::OptionButton) {
             auto* option = new QRadioButton;
             layout->addWidget(option);
@@ -169,7 +186,10 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
             auto* button = new QPushButton;
             button->setAutoDefault(false);
             button->setMinimumWidth(90);
-            if (buttons->count() == 1) button->setDefault(true);  // after the stretch
+            if (buttons->count() == 1) {  // after the stretch
+                button->setDefault(true);
+                accept_ = control;
+            }
             buttons->addWidget(button);
             binder.bind(static_cast<Button&>(*control), button);
             for (const char* name : kCancels)
@@ -179,6 +199,14 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
     layout->addStretch(1);
     layout->addLayout(buttons);
     followForm();
+}
+
+void PlainFormWindow::checkFields() {
+    if (accept_ == nullptr) return;
+    QString problem;
+    for (const auto& check : checked_)
+        if (problem.isEmpty()) problem = check();
+    binder_.block(*accept_, problem.toStdString());
 }
 
 ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* parent)

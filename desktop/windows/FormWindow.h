@@ -40,6 +40,13 @@ class FormWindow : public QDialog {
 class PlainFormWindow : public FormWindow {
   public:
     PlainFormWindow(Form& form, Binder& binder, QWidget* parent);
+
+  private:
+    /// The button that takes the fields over can be used while all of them can be read.
+    void checkFields();
+
+    std::vector<std::function<QString()>> checked_;
+    const Control* accept_ = nullptr;
 };
 
 /// The connection dialog.

@@ -1,9 +1,12 @@
 #include "desktop/windows/GraphSide.h"
 
+#include <QDateTime>
 #include <QEvent>
+#include <QFileInfo>
 #include <QVBoxLayout>
 
 #include "desktop/graph/SpectrogramWidget.h"
+#include "desktop/windows/GraphMenu.h"
 #include "desktop/windows/PlaybackBar.h"
 #include "trace/ViewAnnotations.h"
 
@@ -15,17 +18,29 @@ constexpr int kSpacing = 6;
 }  // namespace
 
 GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, QWidget* parent)
-    : QWidget(parent), program_(program), panel_(program.forms().controller), binder_(binder) {
+    : QWidget(parent),
+      program_(program),
+      panel_(program.forms().controller),
+      binder_(binder),
+      navigator_(program.forms().controller) {
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(kSpacing);
     graph_ = new GraphWidget(panel_.CWGraph1,
                              [this] { return annotateView(panel_, program_.variables()); });
     empty_ = new EmptyScreen(std::move(ways), graph_);
+    power_ = new PowerDisplay(panel_, graph_);
     readouts_ = new Readouts(panel_, binder_);
-    binder_.bindShow(panel_.CWGraph1, graph_, [this] {
-        graph_->refresh();
-        showEmpty();
+    graph_->setNavigator(&navigator_);
+    pointer_ = std::make_unique<PointerText>(*graph_, *readouts_, panel_);
+    graph_->menuAsked = [this](QPoint at, double x) {
+        showGraphMenu(at, x, *graph_, navigator_, panel_, binder_, [this] {
+            if (copyPicture) copyPicture();
+        });
+    };
+    binder_.bindShow(panel_.CWGraph1, graph_, [this] { refreshGraph(); });
+    panel_.SoftTextBox(0).Changed.connect([self = QPointer<GraphSide>(this)] {
+        if (self && self->power_->isVisibleTo(self->graph_)) self->power_->take();
     });
     graph_->installEventFilter(this);
     layout->addWidget(graph_, 2);
@@ -54,6 +69,46 @@ QWidget* GraphSide::spectrogram() {
     return earlier;
 }
 
+void GraphSide::refreshGraph() {
+    showSource();
+    showChannel();
+    graph_->refresh();
+    pointer_->show();
+    showEmpty();
+    showPower();
+}
+
+void GraphSide::showSource() {
+    QString source;
+    if (panel_.Shown.fromFile && !panel_.CWGraph1.values().empty()) {
+        source = QString::fromStdString(panel_.RecentFile(0).Caption);
+        const QFileInfo file(QString::fromStdString(panel_.RecentFile(0).ToolTip));
+        if (file.isFile()) source += file.lastModified().toString("   yyyy-MM-dd hh:mm");
+    }
+    graph_->setSource(source);
+}
+
+void GraphSide::showChannel() {
+    const ZEL3Variables& mirror = program_.variables();
+    double width = 0;
+    if (panel_.isConnected && !panel_.Shown.fromFile) {
+        if (panel_.InstrumentMode == ControllerForm::CHANNELPOWER)
+            width = mirror.ChannelPowerBandwidth;
+        if (panel_.InstrumentMode == ControllerForm::OCCBANDWIDTH)
+            width = mirror.OccBWChannelBandwidth;
+    }
+    const double half = mirror.Span > 0 ? width / 2 : 0;
+    graph_->setChannel(mirror.CenterFrequency - half, mirror.CenterFrequency + half);
+}
+
+void GraphSide::showPower() {
+    const bool power = panel_.isConnected && panel_.InstrumentMode == ControllerForm::POWERSENSOR;
+    if (power == power_->isVisibleTo(graph_)) return;
+    power_->setVisible(power);
+    if (power) power_->take();
+    place();
+}
+
 void GraphSide::showEmpty() {
     const bool empty = !panel_.isConnected && panel_.CWGraph1.values().empty();
     if (empty == empty_->isVisibleTo(graph_)) return;
@@ -61,7 +116,10 @@ void GraphSide::showEmpty() {
     place();
 }
 
-void GraphSide::place() { empty_->setGeometry(graph_->rect()); }
+void GraphSide::place() {
+    empty_->setGeometry(graph_->rect());
+    power_->setGeometry(graph_->rect());
+}
 
 bool GraphSide::eventFilter(QObject* watched, QEvent* event) {
     if (event->type() == QEvent::Resize) place();

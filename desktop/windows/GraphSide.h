@@ -2,10 +2,14 @@
 // The graph with all that stands on it and under it.
 
 #include <QWidget>
+#include <functional>
+#include <memory>
 
 #include "desktop/binders/Binder.h"
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/windows/EmptyScreen.h"
+#include "desktop/windows/PointerText.h"
+#include "desktop/windows/PowerDisplay.h"
 #include "desktop/windows/Readouts.h"
 #include "shell/Program.h"
 
@@ -17,8 +21,12 @@ class GraphSide : public QWidget {
 
     GraphWidget& graph() { return *graph_; }
     EmptyScreen& empty() { return *empty_; }
+    /// For the menu of the graph.
+    std::function<void()> copyPicture;
     /// The ways to begin, while there is neither a connection nor a trace.
     void showEmpty();
+    /// The power sensor's display, while that mode is on.
+    void showPower();
 
   protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -26,13 +34,19 @@ class GraphSide : public QWidget {
   private:
     QWidget* spectrogram();
     void place();
+    void refreshGraph();
+    void showSource();
+    void showChannel();
 
     Program& program_;
     ControllerForm& panel_;
     Binder& binder_;
     GraphWidget* graph_;
     EmptyScreen* empty_;
+    PowerDisplay* power_;
     Readouts* readouts_;
+    GraphNavigator navigator_;
+    std::unique_ptr<PointerText> pointer_;
 };
 
 }  // namespace zel

@@ -90,6 +90,7 @@ void MainWindow::buildCentre() {
                            panel_.UtilityTrouble.Click();
                        },
                        [this] { panel_.LoadData.Click(); }});
+    graphSide_->copyPicture = [this] { copyPicture(); };
     layout->addWidget(graphSide_, 1);
     side_ = new PanelSide(panel_, program_.variables(), binder_);
     terminators_ = &side_->terminators();
@@ -173,6 +174,7 @@ void MainWindow::showState() {
     status_->showState();
     tools_->showConnected(panel_.isConnected);
     graphSide_->showEmpty();
+    graphSide_->showPower();
     greyWhatRefuses();
     LinkAddress address;
     if (recent_ && panel_.isConnected && !panel_.LinkLost && addressOf(program_.forms(), address) &&
@@ -188,6 +190,7 @@ void MainWindow::greyWhatRefuses() {
                       (panel_.RecordDataFlag ? 8 : 0);
     if (state == lockState_) return;
     lockState_ = state;
+    side_->showViewRuns(view);
     for (const Control* control : panel_.controls()) binder_.refresh(*control);
 }
 

@@ -5,6 +5,7 @@
 #include <QVBoxLayout>
 
 #include "desktop/windows/KeyPictures.h"
+#include "panel/EntryText.h"
 
 namespace zel {
 namespace {
@@ -39,6 +40,7 @@ PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder&
                      QWidget* parent)
     : QScrollArea(parent),
       panel_(panel),
+      mirror_(mirror),
       binder_(binder),
       terminators_(new TerminatorRow(panel, mirror, binder)),
       column_(new QWidget),
@@ -80,6 +82,10 @@ FoldGroup* PanelSide::addGroup(const QString& name, const QString& caption, QWid
 void PanelSide::resizeEvent(QResizeEvent* event) {
     QScrollArea::resizeEvent(event);
     foldByRoom();
+}
+
+void PanelSide::showViewRuns(bool runs) {
+    reason_->setText(runs ? "Stop the view to use the grey keys" : "Soft key");
 }
 
 void PanelSide::foldByRoom() {
@@ -125,6 +131,17 @@ QWidget* PanelSide::runKeys() {
     return row;
 }
 
+bool PanelSide::readPosition(int index, QString& text, QString& problem) const {
+    const EntryUnit unit = entryUnitOf(panel_, mirror_, index);
+    // A name, or a value that was only read and is not sent again.
+    if (unit == EntryUnit::Enter || panel_.SoftBoxFirstKey == 1) return true;
+    // Of a marker's readout the position counts.
+    const EntryReading reading = readEntry(text.section(';', 0, 0).toStdString(), unit);
+    problem = QString::fromStdString(reading.problem);
+    if (reading.ok) text = QString::fromStdString(reading.text);
+    return reading.ok;
+}
+
 QWidget* PanelSide::softPosition(int index) {
     auto* place = new QWidget;
     place->setMinimumHeight(kShortestPosition);
@@ -154,6 +171,9 @@ QWidget* PanelSide::softPosition(int index) {
         places->addWidget(field, 1);
     }
     binder_.bind(panel_.SoftTextBox(index), box);
+    box->setReader([this, index](QString& text, QString& problem) {
+        return readPosition(index, text, problem);
+    });
     binder_.bind(panel_.ChoiceBox(index), list);
     binder_.bind(panel_.SoftFrame(index), fields, caption);
     beside->addWidget(fields);
@@ -166,7 +186,9 @@ QWidget* PanelSide::softPositions() {
     auto* group = new QWidget;
     auto* layout = layoutOf<QVBoxLayout>(group);
     auto* options = new QHBoxLayout;
-    options->addWidget(smallCaption("Soft key"));
+    // Beside the key that stops: why keys are grey.
+    reason_ = smallCaption("Soft key");
+    options->addWidget(reason_);
     options->addStretch(1);
     for (OptionButton* control : {&panel_.GetOption, &panel_.SetOption}) {
         auto* option = new QRadioButton;

@@ -27,6 +27,8 @@ class PanelSide : public QScrollArea {
     const std::vector<FoldGroup*>& groups() const { return groups_; }
     /// Opens and folds the groups that the user has not chosen for, so that the rest fits.
     void foldByRoom();
+    /// While the continuous view runs a line says why keys are grey.
+    void showViewRuns(bool runs);
 
   signals:
     /// The user has folded or opened a group.
@@ -47,9 +49,13 @@ class PanelSide : public QScrollArea {
     QPushButton* key(Button& control, bool tall = false);
     QPushButton* fitted(QPushButton* button, Button& control, bool tall);
 
+    bool readPosition(int index, QString& text, QString& problem) const;
+
     ControllerForm& panel_;
+    const ZEL3Variables& mirror_;
     Binder& binder_;
     TerminatorRow* terminators_;
+    QLabel* reason_ = nullptr;
     QWidget* column_;
     QVBoxLayout* layout_;
     std::vector<FoldGroup*> groups_;  ///< the first one folds last

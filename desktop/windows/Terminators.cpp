@@ -7,6 +7,7 @@
 #include <QShortcut>
 
 #include "desktop/binders/ShortcutTable.h"
+#include "panel/EntryText.h"
 #include "panel/SoftPositions.h"
 
 namespace zel {
@@ -28,12 +29,25 @@ constexpr const char* kLevelCaption = "TRIGGER\r\nLEVEL";
 
 }  // namespace
 
+EntryUnit entryUnitOf(const ControllerForm& panel, const ZEL3Variables& mirror, int position) {
+    const SoftPosition* row = softPosition(panel.State, position);
+    if (row == nullptr) return EntryUnit::Enter;
+    switch (row->entryUnit) {
+        case EntryUnit::MarkerX:
+            if (panel.InstrumentMode == CF::DISTTOFAULTMEASURE) return EntryUnit::Metres;
+            return mirror.Span != 0 ? EntryUnit::Hertz : EntryUnit::Seconds;
+        case EntryUnit::TriggerValue:
+            return panel.SoftKey(position).Caption.get() == kLevelCaption ? EntryUnit::Level
+                                                                          : EntryUnit::Seconds;
+        default:
+            return row->entryUnit;
+    }
+}
+
 const std::vector<Terminator>& terminatorsOf(const ControllerForm& panel,
                                              const ZEL3Variables& mirror, int position) {
     const SoftPosition* row = softPosition(panel.State, position);
-    switch (row == nullptr ? EntryUnit::Enter : row->entryUnit) {
-        case EntryUnit::Enter:
-            break;
+    switch (entryUnitOf(panel, mirror, position)) {
         case EntryUnit::Hertz:
             return kHertz;
         case EntryUnit::Seconds:
@@ -45,14 +59,10 @@ const std::vector<Terminator>& terminatorsOf(const ControllerForm& panel,
         case EntryUnit::Decibels:
             return kDecibels;
         case EntryUnit::Metres:
-            return kMetres;
-        case EntryUnit::MarkerX:
-            if (panel.InstrumentMode == CF::DISTTOFAULTMEASURE) return kLengths;
-            return mirror.Span != 0 ? kHertz : kSeconds;
-        case EntryUnit::TriggerValue:
-            return panel.SoftKey(position).Caption.get() == kLevelCaption ? kLevel : kSeconds;
+            return row->entryUnit == EntryUnit::MarkerX ? kLengths : kMetres;
+        default:
+            return kEnter;
     }
-    return kEnter;
 }
 
 bool isBareNumber(const QString& text) {
@@ -149,6 +159,10 @@ void TerminatorRow::press(std::size_t index) {
     // A value that was only read is not sent again, and a unit alone is no value.
     const bool typed = panel_.SoftBoxFirstKey != 1 && !box->text().isEmpty();
     const bool plainEntry = &terminators == &kEnter;
+    if (const EntryReading number = readEntry(box->text().toStdString(), EntryUnit::Enter);
+        typed && !plainEntry && number.ok && number.text != box->text().toStdString())
+        panel_.SoftTextBox(at).Text = number.text;
+    binder_.flush();
     if (!typed || (!plainEntry && !isBareNumber(box->text()))) return box->selectAll();
     const QString unit = terminators[index].typed;
     box->deselect();

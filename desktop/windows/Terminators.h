@@ -9,6 +9,7 @@
 #include "desktop/binders/Binder.h"
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
+#include "panel/SoftPositions.h"
 
 class QKeyEvent;
 
@@ -24,6 +25,8 @@ struct Terminator {
 /// a unit of its own has Enter.
 const std::vector<Terminator>& terminatorsOf(const ControllerForm& panel,
                                              const ZEL3Variables& mirror, int position);
+/// What a soft position takes, with marker and trigger made into what they are at the moment.
+EntryUnit entryUnitOf(const ControllerForm& panel, const ZEL3Variables& mirror, int position);
 /// A number with a point and without a unit, to which a terminator can add one.
 bool isBareNumber(const QString& text);
 

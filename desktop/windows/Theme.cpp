@@ -28,13 +28,14 @@ struct ThemeColors {
     const char* yellowEdge;
     const char* red;
     const char* green;
+    const char* problem;  ///< texts that cannot be read
 };
 constexpr ThemeColors kDark = {"#12171e", "#0b0f14", "#e6ebf0", "#7d8894", "#aab4bf", "#232b34",
                                "#2f3a46", "#3a4653", "#19202a", "#2b3541", "#2873c6", "#ffffff",
-                               "#35321f", "#ffd966", "#8f7a30", "#c0392b", "#1e8449"};
+                               "#35321f", "#ffd966", "#8f7a30", "#c0392b", "#1e8449", "#ff7b72"};
 constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#48525c", "#ffffff",
                                 "#e3e9f0", "#9aa5b1", "#f7f9fb", "#cbd3db", "#1d6fc4", "#ffffff",
-                                "#fdf1bf", "#574600", "#c9a93f", "#c0392b", "#1e8449"};
+                                "#fdf1bf", "#574600", "#c9a93f", "#c0392b", "#1e8449", "#b3261e"};
 
 constexpr const char* kStyleSheet = R"(
 QWidget { font-size: 12px; }
@@ -71,6 +72,8 @@ QLineEdit[face="locked"] { background: transparent; border: 1px dashed @border; 
 QComboBox[face="locked"] { background: transparent; border: 1px dashed @border; }
 QComboBox[face="locked"]::down-arrow { border: none; }
 QLineEdit[face="locked"]:focus, QComboBox[face="locked"]:focus { border: 2px dashed @accent; }
+QLineEdit[refused="true"], QLineEdit[refused="true"]:focus { border: 2px solid @problem;
+    color: @problem; padding: 0px 3px; }
 QPushButton[face="terminator"] { background: @base; padding: 1px 2px; font-size: 11px; }
 QPushButton[face="terminator"]:hover { background: @buttonHover; }
 QPushButton[face="terminator"]:pressed { background: @accent; color: @accentText; }
@@ -141,6 +144,7 @@ QString styled(const ThemeColors& c) {
         {"@caption", c.caption},
         {"@red", c.red},
         {"@green", c.green},
+        {"@problem", c.problem},
     };
     QString sheet = kStyleSheet;
     for (const auto& [name, value] : names) sheet.replace(name, value);

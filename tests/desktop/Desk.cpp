@@ -18,7 +18,8 @@ QApplication& testApplication() {
 }
 
 bool savePicture(QWidget& widget, const QString& name) {
-    const QString folder = QApplication::applicationDirPath() + "/pictures";
+    const QString beside = QApplication::applicationDirPath() + "/pictures";
+    const QString folder = qEnvironmentVariable("ZEL_PICTURES", beside);
     return QDir().mkpath(folder) && widget.grab().save(folder + "/" + name + ".png");
 }
 

@@ -2,6 +2,8 @@
 // nothing is cut, nothing lies on anything else. The pictures are left beside the test's program.
 
 #include <QAbstractItemView>
+#include <QTest>
+#include <QWheelEvent>
 
 #include "tests/desktop/Desk.h"
 
@@ -174,15 +176,74 @@ TEST_P(Looks, PlaybackBarAndProgress_FitTheWindowWithNothingCut) {
     EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-playback"));
 }
 
+TEST_P(Looks, CloserViewWithMarkers_FitsTheWindowWithNothingCut) {
+    panel().MarkerCheckBox.Click();
+    panel().DeltaCheckBox.Click();
+    panel().MarkPkButton.Click();
+    show();
+    GraphWidget& graph = window->graph();
+    const QPointF place(graph.xAxis->coordToPixel(1.6e9), graph.plotArea().center().y());
+    QWheelEvent wheel(place, graph.mapToGlobal(place), {}, {0, 600}, Qt::NoButton, Qt::NoModifier,
+                      Qt::NoScrollPhase, false);
+    QApplication::sendEvent(&graph, &wheel);
+    QTest::mouseMove(&graph, place.toPoint());
+    show();
+    ASSERT_TRUE(panel().GraphZoomed);
+    expectSound("closer");
+    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-closer"));
+}
+
+TEST_P(Looks, Dialogs_ArePictures) {
+    panel().UtilityGraphSettings.Click();
+    show();
+    auto* scale = window->findChild<QDialog*>("ManualScaleForm");
+    ASSERT_TRUE(scale->isVisible());
+    widgetOf<QLineEdit>(program->forms().manualScale.manualSizeMin)->setText("-80x");
+    window->binder().flush();
+    EXPECT_TRUE(savePicture(*scale, QString(GetParam().name) + "-scale"));
+    scale->close();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    QTest::keyClicks(box, "5 dBm");
+    QTest::keyClick(box, Qt::Key_Return);
+    show();
+    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-refused"));
+}
+
+class BareLooks : public Looks {
+  protected:
+    void SetUp() override {
+        applyTheme(testApplication(), GetParam().theme);
+        window->resize(GetParam().size);
+        show();
+    }
+};
+
+TEST_P(BareLooks, WindowWithoutAnInstrument_ShowsTheWaysToBegin) {
+    expectSound("empty");
+    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-empty"));
+}
+
+const auto kNameOfLook = [](const auto& look) {
+    return QString(look.param.name).replace('-', '_').toStdString();
+};
+
+INSTANTIATE_TEST_SUITE_P(Sizes, BareLooks,
+                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
+                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
+                                         Look{"dark-1280x760", ThemeChoice::Dark, {1280, 760}},
+                                         Look{"light-1280x760", ThemeChoice::Light, {1280, 760}},
+                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
+                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
+                         kNameOfLook);
+
 INSTANTIATE_TEST_SUITE_P(Sizes, Looks,
                          testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
                                          Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
                                          Look{"dark-1280x760", ThemeChoice::Dark, {1280, 760}},
+                                         Look{"light-1280x760", ThemeChoice::Light, {1280, 760}},
                                          Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
                                          Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
-                         [](const auto& look) {
-                             return QString(look.param.name).replace('-', '_').toStdString();
-                         });
+                         kNameOfLook);
 
 }  // namespace
 }  // namespace zel

@@ -217,7 +217,7 @@ TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
 TEST_F(Desk, ToolTipOfTheForm_TakesTheWidgetsPlace) {
     auto* key = widgetOf<QPushButton>(panel().SpanButton);
     EXPECT_EQ(key->toolTip(), "Span menu (Ctrl+Shift+F)");
-    EXPECT_EQ(key->accessibleName(), "Span menu");
+    EXPECT_EQ(key->accessibleName(), "SPAN, Span menu");
     panel().SpanButton.ToolTip = "not now";
     window->binder().flush();
     EXPECT_EQ(key->toolTip(), "not now (Ctrl+Shift+F)");

@@ -27,9 +27,20 @@ TEST(DivisionTickerTest, Levels_ArePlainNumbersWithAPoint) {
     EXPECT_EQ(labels(-1, 0, "").at(5).toStdString(), "-0.5");
 }
 
-TEST(DivisionTickerTest, Frequencies_HavePrefixAndUnitAtEachSecondDivision) {
+TEST(DivisionTickerTest, Frequencies_StandAtRoundPlacesWithPrefixAndUnit) {
     EXPECT_EQ(labels(0, 3e9, "Hz", 2).join("|").toStdString(),
-              "0 Hz||600 MHz||1.2 GHz||1.8 GHz||2.4 GHz||3 GHz");
+              "0 Hz|500 MHz|1 GHz|1.5 GHz|2 GHz|2.5 GHz|3 GHz");
+    EXPECT_EQ(labels(2.35e9, 2.45e9, "Hz", 2).join("|").toStdString(),
+              "|2.36 GHz||2.38 GHz||2.4 GHz||2.42 GHz||2.44 GHz|");
+    EXPECT_EQ(labels(2.351e9, 2.379e9, "Hz").join("|").toStdString(),
+              "2.355 GHz|2.36 GHz|2.365 GHz|2.37 GHz|2.375 GHz");
+}
+
+TEST(DivisionTickerTest, Division_IsTheNextRoundStep) {
+    EXPECT_EQ(divisionOf(-120, -20), 10);
+    EXPECT_EQ(divisionOf(-100, -37), 10);
+    EXPECT_EQ(divisionOf(-60, -56.5), 0.5);
+    EXPECT_EQ(divisionOf(5, 5), 0);
 }
 
 TEST(DivisionTickerTest, SmallStepsOfALargeNumber_KeepTheirPlaces) {

@@ -1,0 +1,56 @@
+#include "desktop/windows/GraphMenu.h"
+
+#include <QMenu>
+
+#include "desktop/windows/MainMenus.h"
+#include "desktop/windows/ThemeIcons.h"
+
+namespace zel {
+namespace {
+
+/// The entry of the window's menu, under words that fit here.
+void addControl(QMenu& menu, const char* icon, const QString& text, MenuItem& item,
+                Binder& binder) {
+    auto* other = qobject_cast<QAction*>(binder.widgetOf(item));
+    QAction* action = menu.addAction(themeIcon(icon), text, &menu, [other] { other->trigger(); });
+    action->setEnabled(other != nullptr && other->isEnabled());
+}
+
+void addMarker(double x, GraphWidget& graph, ControllerForm& panel, Binder& binder) {
+    auto* box = qobject_cast<QAbstractButton*>(binder.widgetOf(panel.MarkerCheckBox));
+    if (!panel.CWGraph1.cursor(1).Visible && box != nullptr) box->click();
+    if (!panel.CWGraph1.cursor(1).Visible) return;
+    graph.drawNow();
+    const QPointF point = graph.picture().pointAt(x);
+    panel.CWGraph1.CursorMoved(1, point.x(), point.y());
+}
+
+}  // namespace
+
+void showGraphMenu(QPoint place, double x, GraphWidget& graph, GraphNavigator& navigator,
+                   ControllerForm& panel, Binder& binder,
+                   const std::function<void()>& copyPicture) {
+    QMenu menu;
+    const bool trace = !panel.CWGraph1.values().empty();
+    menu.addAction(themeIcon("copy"), "Copy Picture", &menu, copyPicture)->setEnabled(trace);
+    addControl(menu, "picture", "Save Picture...", panel.MenuFileSaveImage, binder);
+    addControl(menu, "save", "Save View...", panel.SaveCurrentView, binder);
+    menu.addSeparator();
+    QAction* marker =
+        menu.addAction("Add Marker Here", &menu, [&] { addMarker(x, graph, panel, binder); });
+    const auto* box = qobject_cast<QAbstractButton*>(binder.widgetOf(panel.MarkerCheckBox));
+    marker->setEnabled(trace && (panel.CWGraph1.cursor(1).Visible ||
+                                 (panel.isConnected && box != nullptr && box->isEnabled())));
+    menu.addSeparator();
+    menu.addAction("Zoom Back\tAlt+Left", &menu, [&navigator] { navigator.back(); })
+        ->setEnabled(navigator.canGoBack());
+    menu.addAction("Zoom Forward\tAlt+Right", &menu, [&navigator] { navigator.forward(); })
+        ->setEnabled(navigator.canGoForward());
+    menu.addAction(themeIcon("home"), "Whole View\tHome", &menu, [&graph] { graph.wholeView(); })
+        ->setEnabled(trace);
+    addControl(menu, "zoom", "Manual Scale...", panel.UtilityGraphSettings, binder);
+    giveLetters(menu);
+    menu.exec(place);
+}
+
+}  // namespace zel

@@ -1,0 +1,91 @@
+// Typed entries: what the panel's parser gets, and what is refused with its reason.
+
+#include <gtest/gtest.h>
+
+#include "model/Numeric.h"
+#include "panel/EntryText.h"
+
+namespace zel {
+namespace {
+
+using U = EntryUnit;
+
+struct Typed {
+    const char* text;
+    EntryUnit unit;
+    const char* made;
+    double value;
+};
+const Typed kRead[] = {
+    {"2.4g", U::Hertz, "2.4 GHz", 2.4e9},
+    {"2,4 GHz", U::Hertz, "2.4 GHz", 2.4e9},
+    {"2.4 ghz", U::Hertz, "2.4 GHz", 2.4e9},
+    {"900M", U::Hertz, "900 MHz", 900e6},
+    {"900 mhz", U::Hertz, "900 MHz", 900e6},
+    {"100000000 Hz", U::Hertz, "100000000", 1e8},
+    {"100 000 000 Hz", U::Hertz, "100000000", 1e8},
+    {"1,234,567.5", U::Hertz, "1234567.5", 1234567.5},
+    {"10 KHZ", U::Hertz, "10 kHz", 1e4},
+    {"1.5e9", U::Hertz, "1.5e9", 1.5e9},
+    {"0,500 GHz", U::Hertz, "0.500 GHz", 0.5e9},
+    {",5G", U::Hertz, ".5 GHz", 0.5e9},
+    {"+3", U::Hertz, "3", 3},
+    {"-30 dBm", U::Level, "-30", -30},
+    {"- 30DBM", U::Level, "-30", -30},
+    {"\u221230,5", U::Level, "-30.5", -30.5},
+    {"3 dB", U::Decibels, "3", 3},
+    {"2 s", U::Seconds, "2", 2},
+    {"20 ms", U::Seconds, "20 ms", 0.02},
+    {"20m", U::Seconds, "20 ms", 0.02},
+    {"5 µs", U::Seconds, "5 us", 5e-6},
+    {"5 s", U::WholeSeconds, "5", 5},
+    {"12 m", U::Metres, "12", 12},
+    {"1200 cm", U::Metres, "12", 12},
+    {" 7 ", U::Enter, "7", 7},
+};
+
+TEST(EntryText, TypedEntry_IsWhatTheParserReads) {
+    for (const Typed& row : kRead) {
+        const EntryReading reading = readEntry(row.text, row.unit);
+        ASSERT_TRUE(reading.ok) << row.text << ": " << reading.problem;
+        EXPECT_EQ(reading.text, row.made) << row.text;
+        EXPECT_DOUBLE_EQ(reading.value, row.value) << row.text;
+        std::string prefix;
+        EXPECT_NEAR(ParseValue(reading.text, prefix), row.value, std::abs(row.value) * 1e-12)
+            << row.text;
+    }
+}
+
+struct Refused {
+    const char* text;
+    EntryUnit unit;
+    const char* part;  ///< of the reason
+};
+const Refused kRefused[] = {
+    {"abc", U::Hertz, "is not a frequency"},
+    {"", U::Hertz, "is not a frequency"},
+    {"5 dBm", U::Hertz, "no unit of a frequency"},
+    {"900m", U::Hertz, "thousandth"},
+    {"1,500", U::Hertz, "1.500 or 1500"},
+    {"1.500,5", U::Hertz, "only one"},
+    {"1,2,3", U::Hertz, "only one"},
+    {"1.2.3", U::Hertz, "is not a frequency"},
+    {"2.4 GHz x", U::Hertz, "no unit"},
+    {"20 M", U::Seconds, "no unit of a time"},
+    {"5 dBmV", U::Level, "no unit of a level"},
+    {"5 ms", U::WholeSeconds, "no unit of a time"},
+    {"e9", U::Hertz, "is not a frequency"},
+    {"12 m", U::Enter, "no unit of a number"},
+};
+
+TEST(EntryText, EntryThatCannotBeRead_HasItsReason) {
+    for (const Refused& row : kRefused) {
+        const EntryReading reading = readEntry(row.text, row.unit);
+        EXPECT_FALSE(reading.ok) << row.text << " became " << reading.text;
+        EXPECT_NE(reading.problem.find(row.part), std::string::npos)
+            << row.text << ": " << reading.problem;
+    }
+}
+
+}  // namespace
+}  // namespace zel
