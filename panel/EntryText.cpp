@@ -109,7 +109,7 @@ std::size_t numberLength(std::string_view text) {
     return end;
 }
 
-/// Whether commas stand where thousands end, ahead of a point: "1,234,567.8".
+/// Whether commas stand where thousands end, before a point: "1,234,567.8".
 bool groupsThousands(std::string_view number) {
     const std::size_t point = std::min(number.find('.'), number.size());
     std::size_t last = number.find(',');

@@ -5,7 +5,7 @@
 
 namespace zel {
 
-/// "2.41234 GHz" for a resolution of 10 kHz: the value in its prefix, with enough digits to tell
+/// "2.41234 GHz" for a resolution of 10 kHz: the value in its prefix, with enough digits to keep
 /// two values apart that lie `resolution` from each other. A unit that has no prefixes, such as
 /// "dBm", is written as it stands. Empty for what is no number.
 std::string axisText(double value, double resolution, const std::string& unit);

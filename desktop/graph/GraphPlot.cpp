@@ -283,8 +283,8 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     if (graph.Old) ink = ink.darker(200);
     if (trace_->pen().color() != ink || trace_->pen().widthF() != width_) {
         trace_->setPen(QPen(ink, width_));
-        low_->setPen(QPen(bandInk(ink), width_));
     }
+    low_->setPen(QPen(bandInk(ink), width_));
     trace_->setBrush(low_->visible() ? QBrush(bandInk(ink)) : QBrush(Qt::NoBrush));
     const GraphAnnotation& trigger = graph.trigger();
     trigger_->setVisible(trigger.Visible);

@@ -9,11 +9,14 @@ namespace {
 
 constexpr int kPaceWidth = 150;
 constexpr int kPointerWidth = 104;
+constexpr int kLineHeight = 17;
+constexpr int kRoomForTrace = 760;  // else the marker's own text on the graph says it
 
 QLabel* value() {
     auto* label = new QLabel;
     label->setProperty("readout", true);
     label->setTextFormat(Qt::PlainText);
+    label->setMinimumHeight(kLineHeight);  // an empty one keeps its place
     return label;
 }
 
@@ -92,8 +95,9 @@ void Readouts::showPointer(const QString& position, const QString& level) {
 }
 
 void Readouts::showTrace(const QString& atMarker, const QString& atDelta) {
-    atMarker_->setText(atMarker.isEmpty() ? QString() : "trace " + atMarker);
-    atDelta_->setText(atDelta.isEmpty() ? QString() : "trace " + atDelta);
+    const bool room = width() >= kRoomForTrace;
+    atMarker_->setText(atMarker.isEmpty() || !room ? QString() : "trace " + atMarker);
+    atDelta_->setText(atDelta.isEmpty() || !room ? QString() : "trace " + atDelta);
 }
 
 }  // namespace zel

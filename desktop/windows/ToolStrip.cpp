@@ -10,7 +10,7 @@ namespace zel {
 namespace {
 
 constexpr int kIconSize = 20;
-constexpr int kRoomForWords = 1180;  // pixels
+constexpr int kRoomForWords = 1430;  // pixels
 const QColor kLamp(0xe0, 0x48, 0x3a);
 
 }  // namespace

@@ -167,7 +167,7 @@ TEST_F(Desk, KeyThatWouldOnlyRefuse_IsGreyWithTheReason) {
     panel().ContinuosLoopActive = false;
 }
 
-TEST_F(Desk, Title_SaysWhatIsOnTheScreenAheadOfTheProgram) {
+TEST_F(Desk, Title_SaysFirstWhatIsOnTheScreen) {
     show();
     const QString caption = QString::fromStdString(panel().Caption);
     EXPECT_EQ(window->windowTitle(), caption);
