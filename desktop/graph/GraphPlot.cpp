@@ -210,10 +210,12 @@ void GraphPlot::takeTrace(const Graph& graph) {
         return trace_->setData(keys, highs, true);
     }
     for (std::size_t i = 0; i + 1 < values.size(); i += 2) {
-        // fmin and fmax pass over a value that is missing.
+        // In the array the maximum of a point stands in the pair after its own, and that of the
+        // last point is not there. fmin and fmax pass over a value that is missing.
+        const double high = i + 3 < values.size() ? values[i + 3] : qQNaN();
         keys << xOf(i);
-        lows << std::fmin(values[i], values[i + 1]);
-        highs << std::fmax(values[i], values[i + 1]);
+        lows << std::fmin(values[i], high);
+        highs << std::fmax(values[i], high);
     }
     trace_->setData(keys, highs, true);
     low_->setData(keys, lows, true);

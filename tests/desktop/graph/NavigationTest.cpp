@@ -113,9 +113,18 @@ TEST_F(NavigationDesk, PairsOfTheAutoPeakDetector_AreABand) {
     const std::size_t pair = 150;
     const double x = graph().firstX() + 2 * pair * graph().increment();
     const auto [low, high] = window->graph().picture().levelsAt(x);
-    EXPECT_EQ(low, std::min(graph().values()[2 * pair], graph().values()[2 * pair + 1]));
-    EXPECT_EQ(high, std::max(graph().values()[2 * pair], graph().values()[2 * pair + 1]));
+    // The maximum of a point stands in the next pair.
+    EXPECT_EQ(low, std::min(graph().values()[2 * pair], graph().values()[2 * pair + 3]));
+    EXPECT_EQ(high, std::max(graph().values()[2 * pair], graph().values()[2 * pair + 3]));
     EXPECT_LT(low, high);
+}
+
+TEST_F(NavigationDesk, PeakOfTheBand_StandsWhereTheInstrumentHasIt) {
+    panel().MarkerCheckBox.Click();
+    panel().MarkPkButton.Click();
+    window->showNow();
+    const double x = panel().CWGraph1.cursor(1).X;
+    EXPECT_NEAR(window->graph().picture().levelsAt(x).second, panel().MarkerLevel, 3);
 }
 
 TEST(AxisText, Digits_TellNeighboursApart) {
