@@ -48,7 +48,8 @@ SpectrumTrace spectrumOf(const Sweep& sweep) {
     trace.time = isoTimeOf(sweep.time);
     const std::size_t each = sweep.perPoint();
     const std::size_t points = sweep.physical.size() / each;
-    const double step = (sweep.axis.stop - sweep.axis.start) / sweep.axis.intervals;
+    const double step =
+        points < 2 ? 0 : (sweep.axis.stop - sweep.axis.start) / static_cast<double>(points - 1);
     trace.x.reserve(points);
     trace.level.reserve(points);
     for (std::size_t i = 0; i < points; ++i) {

@@ -12,7 +12,7 @@ namespace zel {
 std::string isoTimeOf(double date);
 
 /// The sweep's physical levels, of pairs the maxima; V and W become dBm at 50 ohm. x as a saved
-/// view holds it: 301 points over the span or the cable, at zero span i times the sweep time / 300;
+/// view holds it: all points over the span or the cable, at zero span i times the sweep time / 300;
 /// the RBW is 0 while the instrument chooses it. Throws std::runtime_error, with a text for the
 /// user, for an incomplete sweep and for a level that has no value in dB.
 SpectrumTrace spectrumOf(const Sweep& sweep);

@@ -18,7 +18,7 @@ Sweep sweepOf(std::vector<double> physical, int detector, int unit) {
     sweep.settings.ReferenceUnit = unit;
     sweep.settings.ResolutionBandwidth = 3;
     sweep.axis.start = 100;
-    sweep.axis.stop = 400;
+    sweep.axis.stop = 101;
     sweep.axis.unit = "Hz";
     sweep.time = 36925.5;
     return sweep;

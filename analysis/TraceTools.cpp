@@ -1,0 +1,100 @@
+#include "analysis/TraceTools.h"
+
+#include <algorithm>
+#include <stdexcept>
+#include <utility>
+
+#include "analysis/LiveTrace.h"
+
+namespace zel {
+namespace {
+
+constexpr std::size_t kPeaks = 10;
+
+}  // namespace
+
+TraceTools::TraceTools() { request.peaks = kPeaks; }
+
+void TraceTools::take(const Sweep& sweep, const SweepSource& source) {
+    problem_.clear();
+    try {
+        SpectrumTrace trace = spectrumOf(sweep);
+        if (source.rbw) trace.rbw = *source.rbw;
+        SpectrumTrace right = corrected(trace, corrections_);
+        plain_ = std::move(trace);
+        trace_ = std::move(right);
+    } catch (const std::runtime_error& wrong) {
+        problem_ = wrong.what();
+        plain_.reset();
+        trace_.reset();
+    }
+    if (mode_ >= 0 && source.mode != mode_) traces_.endBecause("mode");
+    mode_ = source.mode;
+    if (trace_) {
+        traces_.take(*trace_);
+        if (statistics_ && !statistics_->add(*trace_)) {
+            countStatistics(threshold_);
+            statistics_->add(*trace_);
+        }
+    }
+    workOut();
+    if (result_.mask && result_.mask->margin) {
+        ++maskCount_.sweeps;
+        if (result_.mask->pass) ++maskCount_.passed;
+    }
+    Changed();
+    if (result_.mask && !result_.mask->pass) MaskFailed();
+}
+
+void TraceTools::workOut() {
+    result_ = {};
+    readings_ = {};
+    adjacentFound_ = {};
+    if (!trace_) return;
+    result_ = analyseTrace(*trace_, request);
+    std::size_t wanted = 0;
+    for (const HostMarker& marker : markers)
+        if (marker.on) wanted = std::max(wanted, marker.peak);
+    // A marker may follow a peak that the table does not show.
+    readings_ = readMarkers(
+        *trace_, markers,
+        wanted > result_.peaks.size() ? findPeaks(*trace_, request.search) : result_.peaks);
+    if (adjacent)
+        adjacentFound_ = adjacentChannels(*trace_, adjacent->center, adjacent->width,
+                                          adjacent->spacing, adjacent->pairs);
+}
+
+void TraceTools::refresh() {
+    workOut();
+    Changed();
+}
+
+void TraceTools::setCorrections(std::vector<Correction> corrections) {
+    corrections_ = std::move(corrections);
+    traces_.endBecause("correction");
+    maskCount_ = {};
+    if (statistics_) countStatistics(threshold_);
+    problem_.clear();
+    trace_.reset();
+    try {
+        if (plain_) trace_ = corrected(*plain_, corrections_);
+    } catch (const std::runtime_error& wrong) {
+        problem_ = wrong.what();
+    }
+    if (trace_) traces_.take(*trace_);
+    refresh();
+}
+
+void TraceTools::setMask(std::optional<Mask> mask) {
+    request.mask = std::move(mask);
+    maskCount_ = {};
+    refresh();
+}
+
+void TraceTools::countStatistics(std::optional<double> threshold) {
+    threshold_ = threshold;
+    statistics_.reset();
+    if (threshold) statistics_.emplace(*threshold);
+}
+
+}  // namespace zel
