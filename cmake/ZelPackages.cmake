@@ -67,7 +67,8 @@ if(TARGET zelremote)
 markers, all measurement modes, saved views and recordings, scripts, a
 waterfall and a spectrogram. The instrument is reached over a serial line,
 modems or TCP.")
-    set(CPACK_DEBIAN_DESKTOP_PACKAGE_DEPENDS "zelremote-cli ${same}")
+    # The help book is a data base.
+    set(CPACK_DEBIAN_DESKTOP_PACKAGE_DEPENDS "zelremote-cli ${same}, libqt6sql6-sqlite")
 endif()
 
 include(CPack)

@@ -6,6 +6,8 @@
 #include <iostream>
 
 #include "desktop/StartOptions.h"
+#include "desktop/help/HelpKeyFilter.h"
+#include "desktop/help/HelpViewer.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/GuardedApplication.h"
@@ -54,6 +56,12 @@ int main(int argc, char** argv) {
         if (!program.endedBy().empty()) result = zel::kLinkFailed;
         QApplication::exit(result);
     });
+    zel::HelpViewer help(QString::fromStdString(platform.folder.programPath()),
+                         QString::fromStdString(platform.folder.path()));
+    platform.launcher.help = [&help](int context) { return help.show(context); };
+    zel::HelpKeyFilter helpKey(
+        [&program](int context) { program.forms().controller.ShowHelp(context); });
+    application.installEventFilter(&helpKey);
     zel::MainWindow window(program);
     window.useSettings(platform.settings);
     platform.launcher.ready = [&] { window.simulatorReady(platform.launcher.link()); };

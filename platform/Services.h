@@ -39,6 +39,9 @@ class Launcher {
     virtual ~Launcher() = default;
     /// Starts a program or opens a document; false when that failed.
     virtual bool start(const std::string& path, const std::vector<std::string>& arguments) = 0;
+    /// Opens the program's own help book at the topic of that context number; false where there is
+    /// no viewer or no book.
+    virtual bool showHelp(int /*context*/) { return false; }
 };
 
 /// The user's start-up folder.

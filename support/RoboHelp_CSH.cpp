@@ -17,7 +17,10 @@ void RoboHelp_CSH::showTopic(int context) {
 
 bool RoboHelp_CSH::RH_ShowHelp(int /*parent*/, const std::string& helpFile, int command,
                                int context) {
-    if (command != kContextHelp || !files_.stat(helpFile).exists()) return false;
+    if (command != kContextHelp) return false;
+    const bool own = std::filesystem::path(helpFile).filename() == kHelpBook;
+    if (own && launcher_.showHelp(context)) return true;
+    if (!files_.stat(helpFile).exists()) return false;
     return launcher_.start(helpFile, {std::to_string(context)});
 }
 

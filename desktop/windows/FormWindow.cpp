@@ -64,6 +64,7 @@ QLabel* adviceLine(Label& control, Binder& binder) {
 
 FormWindow::FormWindow(Form& form, Binder& binder, QWidget* parent)
     : QDialog(parent), form_(form), binder_(binder) {
+    setProperty("form", QString::fromStdString(form.name()));  // F1 opens its topic
     setObjectName(QString::fromStdString(form.name()));
     setWindowFlag(Qt::WindowContextHelpButtonHint, false);
     shown_.setSingleShot(true);

@@ -91,6 +91,12 @@ QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --connect "serial:$scratch/port@
     --home "$scratch/home2" --screenshot "$scratch/window.png"
 [ -s "$scratch/window.png" ] || fail "the window cannot be drawn"
 
+if [ -e "$build/help/zelremote.qch" ]; then
+    [ -n "$(find "$root/" -path '*/zelremote/help/zelremote.qch' -size +20k)" ] ||
+        fail "the help book is missing"
+    [ -s "$root/share/doc/zelremote/html/index.html" ] || fail "the help site is missing"
+fi
+
 for file in lib/systemd/system/zelremote-server@.service lib/udev/rules.d/70-zelremote.rules \
     share/applications/example.zelremote.ZELRemote.desktop share/mime/packages/zelremote.xml \
     share/metainfo/example.zelremote.ZELRemote.metainfo.xml \

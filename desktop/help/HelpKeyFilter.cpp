@@ -1,0 +1,45 @@
+#include "desktop/help/HelpKeyFilter.h"
+
+#include <QKeyEvent>
+#include <QMainWindow>
+#include <QWidget>
+
+namespace zel {
+namespace {
+
+struct Topic {
+    const char* form;
+    int context;
+};
+constexpr int kContents = 1110;
+constexpr int kPanel = 2111;
+constexpr Topic kTopics[] = {
+    {"ControllerForm", kPanel},  {"MainForm", 1113},      {"TCPConnectionForm", 1113},
+    {"DevicesChoiceForm", 1112}, {"TimeForm", 1114},      {"ServerForm", 3113},
+    {"SpecialMeasForm", 4111},   {"WaterfallForm", 5111},
+};
+
+}  // namespace
+
+int helpContextOf(const QString& form) {
+    for (const Topic& topic : kTopics)
+        if (form == QLatin1String(topic.form)) return topic.context;
+    return kContents;
+}
+
+bool HelpKeyFilter::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() != QEvent::KeyPress) return false;
+    const auto* key = static_cast<const QKeyEvent*>(event);
+    const auto* widget = qobject_cast<const QWidget*>(watched);
+    if (key->key() != Qt::Key_F1 || key->modifiers() != Qt::NoModifier || widget == nullptr)
+        return false;
+    const QWidget* window = widget->window();
+    const QVariant form = window->property("form");
+    const bool panel =
+        qobject_cast<const QMainWindow*>(window) != nullptr && !window->property("help").isValid();
+    if (!form.isValid() && !panel) return false;
+    open_(panel ? kPanel : helpContextOf(form.toString()));
+    return true;
+}
+
+}  // namespace zel
