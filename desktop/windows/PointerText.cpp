@@ -40,12 +40,9 @@ void PointerText::leave() {
 }
 
 QString PointerText::levelAt(double x) const {
-    const auto [low, high] = graph_.picture().levelsAt(x);
+    const double high = graph_.picture().levelsAt(x).second;
     if (!std::isfinite(high)) return {};
-    const std::string& unit = graph_.picture().view().unit;
-    const QString text = QString::fromStdString(levelText(high, unit));
-    if (!std::isfinite(low) || low == high) return text;
-    return text + QString::fromUtf8(" … ") + QString::fromStdString(levelText(low, ""));
+    return QString::fromStdString(levelText(high, graph_.picture().view().unit));
 }
 
 void PointerText::show() {
