@@ -59,9 +59,12 @@ void TraceTools::workOut() {
     readings_ = readMarkers(
         *trace_, markers,
         wanted > result_.peaks.size() ? findPeaks(*trace_, request.search) : result_.peaks);
-    if (adjacent)
-        adjacentFound_ = adjacentChannels(*trace_, adjacent->center, adjacent->width,
-                                          adjacent->spacing, adjacent->pairs);
+    if (!adjacent) return;
+    std::optional<double> center = adjacent->center;
+    if (!center && !result_.peaks.empty()) center = result_.peaks.front().x;
+    if (center)
+        adjacentFound_ =
+            adjacentChannels(*trace_, *center, adjacent->width, adjacent->spacing, adjacent->pairs);
 }
 
 void TraceTools::refresh() {

@@ -33,9 +33,9 @@ class TraceTools {
 
     AnalysisRequest request;  ///< peaks, bandwidth, channels, occupied, mask
     HostMarkers markers;
-    /// ACP about a channel; nothing: not asked.
+    /// Power of the channels beside one; nothing: not asked.
     struct Adjacent {
-        double center = 0;
+        std::optional<double> center;  ///< nothing: of the strongest peak
         double width = 0;
         double spacing = 0;
         std::size_t pairs = 1;

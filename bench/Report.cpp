@@ -16,6 +16,7 @@
 #include "bench/ScriptWork.h"
 #include "bench/ServedLine.h"
 #include "bench/SweepRate.h"
+#include "bench/TraceWork.h"
 #include "bench/Waterfall.h"
 #include "bench/Windows.h"
 
@@ -92,6 +93,8 @@ int main(int argc, char** argv) {
         {'w', "served", [&] { return zelbench::servedMemory(simulator, console); }},
         {'v', "slow road", [] { return zelbench::slowRoad(); }},
         {'x', "rehearsal", [] { return zelbench::rehearsalOfANight(); }},
+        {'y', "trace tools", [] { return zelbench::traceToolsCost(); }},
+        {'y', "recording", [] { return zelbench::recordingAnalysis(); }},
     };
     zelbench::Figures figures;
     bool allMet = true;

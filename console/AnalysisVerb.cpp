@@ -11,7 +11,7 @@ namespace {
 
 constexpr std::uint64_t kLargestFile = 2'000'000'000;
 constexpr std::uint64_t kLargestMask = 10'000'000;
-/// 3 February 2001, whose text tells the order of day, month and year.
+/// 3 February 2001, whose text shows the order of day, month and year.
 constexpr double kSampleDay = 36925;
 
 }  // namespace

@@ -17,6 +17,7 @@
 #include "desktop/windows/ScriptFormWindow.h"
 #include "desktop/windows/Shortcuts.h"
 #include "desktop/windows/ThemeIcons.h"
+#include "desktop/windows/TraceToolsDock.h"
 #include "desktop/windows/WaterfallWindow.h"
 #include "trace/Interlock.h"
 #include "trace/ViewAnnotations.h"
@@ -62,6 +63,7 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
         [this, &interlock] { return interlock.turnOf(panel_.LoadData) != Interlock::Turn::Now; },
         [this](const QString& path) { panel_.OpenFile(path.toStdString()); }));
     buildWindows();
+    addTraceTools(*this, program_, graph(), *menuOf(panel_.Utility, binder_));
     followState();
     binder_.flush();
     graph().setFocus();

@@ -1,0 +1,100 @@
+#include "desktop/graph/TraceOverlay.h"
+
+#include <array>
+
+namespace zel {
+namespace {
+
+constexpr const char* kLayer = "host";
+constexpr int kFontPoints = 9;
+const QColor kText(0xd8, 0xe0, 0xe8);
+
+QCPItemText* addText(QCustomPlot& plot, double x, double y, Qt::Alignment alignment) {
+    auto* text = new QCPItemText(&plot);
+    text->position->setType(QCPItemPosition::ptAxisRectRatio);
+    text->position->setCoords(x, y);
+    text->setPositionAlignment(alignment);
+    text->setTextAlignment(Qt::AlignLeft);
+    QFont font;
+    font.setPointSize(kFontPoints);
+    text->setFont(font);
+    text->setVisible(false);
+    return text;
+}
+
+}  // namespace
+
+QColor hostTraceColor(std::size_t place) {
+    static const std::array<QColor, 8> kColors = {
+        QColor(0x7f, 0xb8, 0xe8), QColor(0x5a, 0x8f, 0xc8), QColor(0xa9, 0xd0, 0xf0),
+        QColor(0x8f, 0xa8, 0xd8), QColor(0x6f, 0xa8, 0xb8), QColor(0x9c, 0xb4, 0xc8),
+        QColor(0xb8, 0xc4, 0xe4), QColor(0xcf, 0xe4, 0xf4)};
+    return kColors.at(place % kColors.size());
+}
+
+QColor limitColor() { return {0xff, 0x6b, 0x6b}; }
+
+TraceOverlay::TraceOverlay(QCustomPlot& plot) : plot_(plot) {
+    plot_.addLayer(kLayer, plot_.layer("main"), QCustomPlot::limBelow);
+    foot_ = addText(plot_, 0.01, 0.985, Qt::AlignLeft | Qt::AlignBottom);
+    notice_ = addText(plot_, 0.5, 0.16, Qt::AlignHCenter | Qt::AlignTop);
+    notice_->setColor(kText);
+    // The trace runs under these words.
+    for (QCPItemText* words : {foot_, notice_}) {
+        words->setBrush(QColor(0x06, 0x09, 0x0d, 0xd8));
+        words->setPadding(QMargins(4, 2, 4, 2));
+    }
+}
+
+void TraceOverlay::show(const OverlayPicture& picture) {
+    while (curves_.size() > picture.curves.size()) {
+        plot_.removeGraph(curves_.back());
+        curves_.pop_back();
+    }
+    while (curves_.size() < picture.curves.size()) {
+        curves_.push_back(plot_.addGraph());
+        curves_.back()->setLayer(kLayer);
+        curves_.back()->setAdaptiveSampling(false);
+    }
+    for (std::size_t i = 0; i < curves_.size(); ++i) {
+        const OverlayCurve& curve = picture.curves[i];
+        curves_[i]->setData(curve.x, curve.y, true);
+        curves_[i]->setPen(QPen(curve.color, 1, curve.dashed ? Qt::DashLine : Qt::SolidLine));
+    }
+    while (points_.size() > picture.markers.size()) {
+        plot_.removeItem(points_.back());
+        plot_.removeItem(labels_.back());
+        points_.pop_back();
+        labels_.pop_back();
+    }
+    while (points_.size() < picture.markers.size()) {
+        auto* point = new QCPItemTracer(&plot_);
+        point->setStyle(QCPItemTracer::tsSquare);
+        point->setSize(6);
+        point->setPen(QPen(hostTraceColor(7), 1));
+        auto* label = addText(plot_, 0, 0, Qt::AlignHCenter | Qt::AlignBottom);
+        label->position->setType(QCPItemPosition::ptPlotCoords);
+        label->setColor(hostTraceColor(7));
+        label->setClipToAxisRect(false);  // a marker may stand at the edge
+        label->setPadding(QMargins(0, 0, 0, 5));
+        points_.push_back(point);
+        labels_.push_back(label);
+    }
+    for (std::size_t i = 0; i < points_.size(); ++i) {
+        const OverlayMarker& marker = picture.markers[i];
+        const bool seen =
+            plot_.xAxis->range().contains(marker.x) && plot_.yAxis->range().contains(marker.y);
+        points_[i]->position->setCoords(marker.x, marker.y);
+        points_[i]->setVisible(seen);
+        labels_[i]->position->setCoords(marker.x, marker.y);
+        labels_[i]->setText(marker.label);
+        labels_[i]->setVisible(seen);
+    }
+    foot_->setText(picture.foot);
+    foot_->setColor(picture.failed ? limitColor() : kText);
+    foot_->setVisible(!picture.foot.isEmpty());
+    notice_->setText(picture.notice);
+    notice_->setVisible(!picture.notice.isEmpty());
+}
+
+}  // namespace zel

@@ -1,0 +1,51 @@
+#pragma once
+// What the trace tools draw over the graph: host traces, limits, host markers, verdicts.
+
+#include <qcustomplot.h>
+
+#include <vector>
+
+namespace zel {
+
+struct OverlayCurve {
+    QVector<double> x;  ///< on the graph's axes
+    QVector<double> y;
+    QColor color;
+    bool dashed = false;
+};
+
+struct OverlayMarker {
+    double x = 0;
+    double y = 0;
+    QString label;
+};
+
+struct OverlayPicture {
+    std::vector<OverlayCurve> curves;
+    std::vector<OverlayMarker> markers;
+    QString foot;  ///< verdict and corrections, at the lower left
+    bool failed = false;
+    QString notice;  ///< what ended, at the top
+};
+
+/// Pale blues, one a host trace.
+QColor hostTraceColor(std::size_t place);
+QColor limitColor();
+
+/// The items belong to the plot; all of them lie under the live trace.
+class TraceOverlay {
+  public:
+    explicit TraceOverlay(QCustomPlot& plot);
+    /// Replaces what is shown; the caller replots.
+    void show(const OverlayPicture& picture);
+
+  private:
+    QCustomPlot& plot_;
+    std::vector<QCPGraph*> curves_;
+    std::vector<QCPItemTracer*> points_;
+    std::vector<QCPItemText*> labels_;
+    QCPItemText* foot_;
+    QCPItemText* notice_;
+};
+
+}  // namespace zel

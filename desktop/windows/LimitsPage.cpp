@@ -1,0 +1,115 @@
+#include "desktop/windows/LimitsPage.h"
+
+#include <QHBoxLayout>
+#include <QPushButton>
+#include <QVBoxLayout>
+#include <stdexcept>
+
+namespace zel {
+namespace {
+
+QPushButton* key(QHBoxLayout& row, const QString& text) {
+    auto* button = new QPushButton(text);
+    row.addWidget(button);
+    return button;
+}
+
+}  // namespace
+
+LimitsPage::LimitsPage(TraceTools& tools) : TracePage(tools) {
+    auto* layout = new QVBoxLayout(this);
+    auto* caption = new QLabel("Mask: a row a point, x in Hz; a level may be empty");
+    layout->addWidget(caption);
+    table_ = new QPlainTextEdit;
+    table_->setObjectName("MaskTable");
+    table_->setAccessibleName("Mask");
+    table_->setTabChangesFocus(true);
+    table_->setPlainText("x;upper;lower\n");
+    caption->setBuddy(table_);
+    layout->addWidget(table_, 1);
+    auto* masks = new QHBoxLayout;
+    connect(key(*masks, "Apply"), &QPushButton::clicked, this,
+            [this] { applyMask(table_->toPlainText()); });
+    connect(key(*masks, "Load..."), &QPushButton::clicked, this, [this] {
+        const auto text = readTable(*this, "Load Mask", nullptr);
+        if (!text) return;
+        table_->setPlainText(*text);
+        applyMask(*text);
+    });
+    connect(key(*masks, "Save..."), &QPushButton::clicked, this,
+            [this] { saveTable(*this, "Save Mask", table_->toPlainText()); });
+    connect(key(*masks, "Remove"), &QPushButton::clicked, this, [this] {
+        word_->clear();
+        tools_.setMask(std::nullopt);
+    });
+    masks->addStretch();
+    layout->addLayout(masks);
+    verdict_ = new QLabel;
+    verdict_->setObjectName("MaskVerdict");
+    layout->addWidget(verdict_);
+    corrections_ = new QLabel;
+    corrections_->setWordWrap(true);
+    layout->addWidget(corrections_);
+    auto* tables = new QHBoxLayout;
+    constexpr std::pair<CorrectionKind, const char*> kKinds[] = {
+        {CorrectionKind::Antenna, "Antenna..."},
+        {CorrectionKind::Cable, "Cable..."},
+        {CorrectionKind::Amplifier, "Amplifier..."}};
+    for (const auto& [kind, text] : kKinds)
+        connect(key(*tables, text), &QPushButton::clicked, this, [this, which = kind] {
+            QString name;
+            if (const auto table = readTable(*this, "Load Correction", &name))
+                addCorrection(which, name, *table);
+        });
+    connect(key(*tables, "Remove"), &QPushButton::clicked, this, [this] {
+        word_->clear();
+        tools_.setCorrections({});
+    });
+    tables->addStretch();
+    layout->addLayout(tables);
+    word_ = new QLabel;
+    word_->setObjectName("LimitsWord");
+    word_->setWordWrap(true);
+    layout->addWidget(word_);
+    showState();
+}
+
+void LimitsPage::applyMask(const QString& table) {
+    try {
+        Mask mask = readMask(table.toStdString());
+        word_->clear();
+        tools_.setMask(std::move(mask));
+    } catch (const std::runtime_error& wrong) {
+        word_->setText("The mask was not taken, " + QString::fromUtf8(wrong.what()));
+    }
+}
+
+void LimitsPage::addCorrection(CorrectionKind kind, const QString& name, const QString& table) {
+    try {
+        std::vector<Correction> all = tools_.corrections();
+        all.push_back(readCorrection(table.toStdString(), kind, name.toStdString()));
+        word_->clear();
+        tools_.setCorrections(std::move(all));
+    } catch (const std::runtime_error& wrong) {
+        word_->setText("The correction was not taken, " + QString::fromUtf8(wrong.what()));
+    }
+}
+
+void LimitsPage::showState() {
+    const AnalysisResult& result = tools_.result();
+    QString verdict = tools_.request.mask ? "No sweep was held against the mask yet" : "No mask";
+    if (result.mask) {
+        verdict = result.mask->pass ? "Pass" : "FAIL";
+        verdict += result.mask->margin ? ", margin " + levelText(result.mask->margin, "dB") +
+                                             " at " + placeText(result.mask->x, result.xUnit)
+                                       : QString(", the mask covers no sample");
+    }
+    if (tools_.maskCount().sweeps > 0)
+        verdict += "; " + QString::fromStdString(tools_.maskCount().text());
+    verdict_->setText(verdict);
+    const std::string names = correctionNames(tools_.corrections());
+    corrections_->setText(names.empty() ? "No correction: tables x;db over frequency"
+                                        : "Corrected: " + QString::fromStdString(names));
+}
+
+}  // namespace zel

@@ -1,0 +1,130 @@
+#include "desktop/windows/PowerPage.h"
+
+#include <QGridLayout>
+
+namespace zel {
+namespace {
+
+constexpr double kMostDecibels = 1000;
+constexpr double kWhole = 100;
+
+QLineEdit* field(const QString& name, const QString& hint) {
+    auto* box = new QLineEdit;
+    box->setObjectName(name);
+    box->setAccessibleName(name);
+    box->setPlaceholderText(hint);
+    return box;
+}
+
+QLabel* finding(const QString& name) {
+    auto* label = new QLabel;
+    label->setObjectName(name + " result");
+    label->setWordWrap(true);
+    label->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    return label;
+}
+
+bool isWrong(const QLineEdit& box) {
+    return !box.text().trimmed().isEmpty() && !quantityOf(box.text());
+}
+
+}  // namespace
+
+PowerPage::PowerPage(TraceTools& tools) : TracePage(tools) {
+    auto* grid = new QGridLayout(this);
+    grid->setColumnStretch(1, 1);
+    grid->setColumnStretch(2, 1);
+    const auto row = [this, grid](const QString& name, QLineEdit*& one, const char* hint,
+                                  QLineEdit** two, const QString& twoName, const char* twoHint,
+                                  QLabel*& found) {
+        const int at = grid->rowCount();
+        one = field(name, hint);
+        auto* caption = new QLabel(name);
+        caption->setBuddy(one);
+        grid->addWidget(caption, at, 0);
+        grid->addWidget(one, at, 1);
+        connect(one, &QLineEdit::editingFinished, this, [this] { takeSettings(); });
+        if (two != nullptr) {
+            *two = field(twoName, twoHint);
+            grid->addWidget(*two, at, 2);
+            connect(*two, &QLineEdit::editingFinished, this, [this] { takeSettings(); });
+        }
+        found = finding(name);
+        grid->addWidget(found, at + 1, 1, 1, 2);
+    };
+    row("Bandwidth", down_, "dB down, as 3", nullptr, "", "", bandwidth_);
+    row("Channel", start_, "start, as 935M", &stop_, "Channel stop", "stop, as 960M", channel_);
+    row("Occupied", percent_, "percent, as 99", nullptr, "", "", occupied_);
+    row("Adjacent", width_, "width, as 5M", &spacing_, "Channel spacing", "spacing, as 5M",
+        adjacent_);
+    auto* note = new QLabel(
+        "The bandwidth stands about the strongest peak, the adjacent channels "
+        "about its frequency.");
+    note->setWordWrap(true);
+    grid->addWidget(note, grid->rowCount(), 0, 1, 3);
+    word_ = new QLabel;
+    grid->addWidget(word_, grid->rowCount(), 0, 1, 3);
+    grid->setRowStretch(grid->rowCount(), 1);
+    showState();
+}
+
+void PowerPage::takeSettings() {
+    AnalysisRequest& request = tools_.request;
+    const auto within = [](const QLineEdit& box, double highest) {
+        const auto value = quantityOf(box.text());
+        return value && *value > 0 && *value <= highest ? value : std::nullopt;
+    };
+    request.bandwidth = within(*down_, kMostDecibels);
+    request.occupied = within(*percent_, kWhole);
+    request.channels.clear();
+    const auto start = quantityOf(start_->text());
+    const auto stop = quantityOf(stop_->text());
+    if (start && stop && *stop >= *start) request.channels = {{*start, *stop}};
+    tools_.adjacent.reset();
+    const auto width = quantityOf(width_->text());
+    const auto spacing = quantityOf(spacing_->text());
+    if (width && spacing && *width > 0 && *spacing > 0)
+        tools_.adjacent = TraceTools::Adjacent{{}, *width, *spacing, 2};
+    QString word;
+    for (const QLineEdit* box : {down_, start_, stop_, percent_, width_, spacing_})
+        if (isWrong(*box)) word = box->accessibleName() + " is no number: " + box->text();
+    if (word.isEmpty() && start && stop && *stop < *start)
+        word = "The channel's stop lies below its start";
+    if (word.isEmpty() && !down_->text().trimmed().isEmpty() && !request.bandwidth)
+        word = "The bandwidth takes dB above 0";
+    if (word.isEmpty() && !percent_->text().trimmed().isEmpty() && !request.occupied)
+        word = "The occupied bandwidth takes percent above 0, 100 at most";
+    word_->setText(word);
+    tools_.refresh();
+}
+
+void PowerPage::showState() {
+    const AnalysisResult& result = tools_.result();
+    const AnalysisRequest& request = tools_.request;
+    const std::string& x = result.xUnit;
+    const auto fromTo = [&x](std::optional<double> low, std::optional<double> high) {
+        return ", " + placeText(low, x) + " to " + placeText(high, x);
+    };
+    const bool there = tools_.trace().has_value();
+    bandwidth_->setText(!request.bandwidth || !there
+                            ? QString()
+                            : placeText(result.width.width(), x) +
+                                  fromTo(result.width.low, result.width.high));
+    channel_->setText(result.channels.empty() ? QString()
+                                              : levelText(result.channels[0].power, result.unit));
+    occupied_->setText(!result.occupied ? QString()
+                                        : placeText(result.occupied->width(), x) +
+                                              fromTo(result.occupied->low, result.occupied->high));
+    QString beside;
+    const AdjacentChannels& found = tools_.adjacentFound();
+    if (tools_.adjacent && there) {
+        beside = "Channel " + levelText(found.power, result.unit);
+        for (std::size_t i = 0; i < found.sides.size(); ++i)
+            beside += "\n" + QString::number(i + 1) + ": lower " +
+                      levelText(found.sides[i].lower, "dB") + ", upper " +
+                      levelText(found.sides[i].upper, "dB");
+    }
+    adjacent_->setText(beside);
+}
+
+}  // namespace zel

@@ -1,0 +1,28 @@
+#pragma once
+// The page of the statistics over time: a graph of lowest, mean and highest level, and occupancy.
+
+#include <qcustomplot.h>
+
+#include <QCheckBox>
+#include <QLabel>
+#include <QLineEdit>
+
+#include "desktop/windows/TracePage.h"
+
+namespace zel {
+
+class StatisticsPage : public TracePage {
+  public:
+    explicit StatisticsPage(TraceTools& tools);
+    void showState() override;
+
+  private:
+    void takeSettings();
+
+    QCheckBox* on_;
+    QLineEdit* threshold_;
+    QLabel* count_;
+    QCustomPlot* plot_;
+};
+
+}  // namespace zel

@@ -1,0 +1,258 @@
+#include "desktop/windows/TraceToolsDock.h"
+
+#include <QMainWindow>
+#include <QMenu>
+#include <QMenuBar>
+#include <QScrollArea>
+#include <algorithm>
+#include <cmath>
+
+#include "desktop/windows/PowerPage.h"
+#include "desktop/windows/StatisticsPage.h"
+#include "model/CodeTables.h"
+#include "model/Numeric.h"
+#include "support/NumberText.h"
+#include "trace/Sweep.h"
+
+namespace zel {
+namespace {
+
+constexpr QSize kUsualSize(460, 430);
+constexpr double kHeadroom = 0.05;  // of the levels' extent, above and below
+
+}  // namespace
+
+TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow& window)
+    : QDockWidget("Trace Tools", &window),
+      program_(program),
+      panel_(program.forms().controller),
+      graph_(graph),
+      overlay_(graph),
+      pages_(new QTabWidget) {
+    setObjectName("TraceTools");
+    markers_ = new MarkersPage(tools_);
+    traces_ = new TracesPage(tools_, [this] { scaleLevelAxis(); });
+    limits_ = new LimitsPage(tools_);
+    const std::pair<const char*, TracePage*> pages[] = {
+        {"Traces", traces_},
+        {"Peaks", new PeaksPage(tools_, [this](std::size_t peak) { markers_->follow(peak); })},
+        {"Markers", markers_},
+        {"Power", new PowerPage(tools_)},
+        {"Limits", limits_},
+        {"Statistics", new StatisticsPage(tools_)}};
+    for (const auto& [name, page] : pages) pages_->addTab(page, name);
+    connect(pages_, &QTabWidget::currentChanged, this, [this] { showLater(); });
+    setWidget(pages_);
+    resize(kUsualSize);
+    follow();
+}
+
+TraceToolsDock::~TraceToolsDock() = default;
+
+void TraceToolsDock::follow() {
+    const QPointer<TraceToolsDock> self(this);
+    panel_.CWGraph1.Changed.connect([self] {
+        if (self) self->takeSweep(false);
+    });
+    panel_.TraceLoaded.connect([self] {
+        if (self) self->takeSweep(true);
+    });
+    tools_.Changed.connect([this] { showLater(); });
+}
+
+void TraceToolsDock::takeSweep(bool loaded) {
+    const Graph& graph = panel_.CWGraph1;
+    if (!loaded) {
+        // The axes or a note may have changed alone; a file's trace is there when it is loaded.
+        if (graph.plotSerial() == plotSerial_ || panel_.Shown.fromFile) return showLater();
+        plotSerial_ = graph.plotSerial();
+        // An earlier sweep that is shown once more was counted when it came.
+        if (graph.values() != program_.sweep().shown || program_.sweep().time == lastTime_)
+            return showLater();
+        lastTime_ = program_.sweep().time;
+    }
+    plotSerial_ = graph.plotSerial();
+    SweepSource source;
+    source.mode = panel_.InstrumentMode;
+    if (panel_.Shown.fromFile) source.rbw = leadingNumber(panel_.Shown.rbw);
+    tools_.take(program_.sweep(), source);
+}
+
+void TraceToolsDock::showLater() {
+    if (waits_) return;
+    waits_ = true;
+    QMetaObject::invokeMethod(
+        this, [this] { showNow(); }, Qt::QueuedConnection);
+}
+
+void TraceToolsDock::showNow() {
+    waits_ = false;
+    overlay_.show(picture());
+    graph_.replot(QCustomPlot::rpQueuedReplot);
+    if (isVisible())
+        if (auto* page = dynamic_cast<TracePage*>(pages_->currentWidget())) page->showState();
+}
+
+void TraceToolsDock::showEvent(QShowEvent* event) {
+    QDockWidget::showEvent(event);
+    showLater();
+}
+
+double TraceToolsDock::graphX(double x) const {
+    // At zero span the graph spreads the sweep over two intervals less.
+    const auto& trace = tools_.trace();
+    const double step = trace ? trace->step() : 0;
+    if (step <= 0) return x;
+    const Graph& graph = panel_.CWGraph1;
+    const double pairs = program_.sweep().autoPeak() ? 2 : 1;
+    return graph.firstX() + (x - trace->x.front()) / step * pairs * graph.increment();
+}
+
+std::optional<double> TraceToolsDock::graphY(double level) const {
+    const ZEL3Variables& settings = program_.sweep().settings;
+    const auto& trace = tools_.trace();
+    const bool field = trace && trace->unit == "dBuV/m" && settings.ReferenceUnit != UNITDBUVM;
+    if (settings.ReferenceRange < RANGELIN) return level;
+    if (field) return std::nullopt;  // percent of a level at the input
+    if (settings.ReferenceUnit == UNITV)
+        return DbmToPercent(level, VoltsToDbm(settings.ReferenceLevel));
+    if (settings.ReferenceUnit == UNITW)
+        return LinearToPercent(DbToLinear(level - 30), settings.ReferenceLevel);
+    return DbmToPercent(level, settings.ReferenceLevel);
+}
+
+void TraceToolsDock::addCurve(OverlayPicture& picture, const SpectrumTrace& trace,
+                              const QColor& color) const {
+    OverlayCurve curve;
+    curve.color = color;
+    for (std::size_t i = 0; i < trace.level.size(); ++i) {
+        const auto y = graphY(trace.level[i]);
+        if (!y) return;
+        curve.x << graphX(trace.x[i]);
+        curve.y << *y;
+    }
+    picture.curves.push_back(std::move(curve));
+}
+
+OverlayPicture TraceToolsDock::picture() const {
+    OverlayPicture picture;
+    TraceTools& tools = const_cast<TraceToolsDock*>(this)->tools_;
+    const std::optional<SpectrumTrace>& now = tools.trace();
+    QStringList foot;
+    if (!tools.problem().empty() && (tools.request.mask || !tools.corrections().empty()))
+        foot << "No figures: " + QString::fromStdString(tools.problem());
+    if (now) {
+        for (std::size_t i = 0; i < kHolds; ++i)
+            if (tools.traces().isOn(static_cast<HoldKind>(i)))
+                addCurve(picture, tools.traces().held(static_cast<HoldKind>(i)), hostTraceColor(i));
+        for (std::size_t i = 0; i < kMemories; ++i) {
+            const auto& memory = tools.traces().memory(i);
+            if (!memory || !traces_->memoryShown(i)) continue;
+            if (sameAxes(*memory, *now)) {
+                addCurve(picture, *memory, hostTraceColor(kHolds + i));
+            } else {
+                foot << "Reference " + QString::number(i + 1) + " has another span or unit";
+            }
+        }
+        if (const auto less = traces_->normalisedBy()) {
+            if (const auto trace = tools.traces().normalised(*now, *less)) {
+                addCurve(picture, *trace, hostTraceColor(kHolds + kMemories));
+                foot << "Sweep less reference " + QString::number(*less + 1) + ", dB";
+            }
+        }
+        if (!tools.corrections().empty())
+            addCurve(picture, *now, hostTraceColor(kHolds + kMemories));
+        for (std::size_t i = 0; i < kHostMarkers; ++i) {
+            const MarkerReading& reading = tools.readings().at(i);
+            if (!reading.x || !reading.level) continue;
+            if (const auto y = graphY(*reading.level))
+                picture.markers.push_back({graphX(*reading.x), *y, "M" + QString::number(i + 1)});
+        }
+    }
+    if (const auto& mask = tools.request.mask) {
+        for (const LimitLine* line : {&mask->upper, &mask->lower}) {
+            OverlayCurve curve;
+            curve.color = limitColor();
+            curve.dashed = true;
+            for (std::size_t i = 0; i < line->x.size(); ++i) {
+                const auto y = graphY(line->level[i]);
+                if (!y) break;
+                curve.x << graphX(line->x[i]);
+                curve.y << *y;
+            }
+            if (!curve.x.isEmpty()) picture.curves.push_back(std::move(curve));
+        }
+        const AnalysisResult& result = tools.result();
+        if (result.mask) {
+            picture.failed = !result.mask->pass;
+            QString verdict = picture.failed ? "Mask: FAIL" : "Mask: pass";
+            verdict += result.mask->margin ? ", margin " + levelText(result.mask->margin, "dB") +
+                                                 " at " + placeText(result.mask->x, result.xUnit)
+                                           : QString(", no sample covered");
+            foot << verdict + "; " + QString::fromStdString(tools.maskCount().text());
+        }
+    }
+    if (const std::string names = correctionNames(tools.corrections()); !names.empty())
+        foot << "Corrected: " + QString::fromStdString(names) +
+                    (now ? ", " + QString::fromStdString(now->unit) : QString());
+    picture.foot = foot.join('\n');
+    picture.notice = QString::fromStdString(tools.traces().ended());
+    return picture;
+}
+
+void TraceToolsDock::scaleLevelAxis() {
+    double low = 0;
+    double high = 0;
+    bool any = false;
+    const auto add = [&](double y) {
+        if (!std::isfinite(y)) return;
+        low = any ? std::min(low, y) : y;
+        high = any ? std::max(high, y) : y;
+        any = true;
+    };
+    for (const double value : panel_.CWGraph1.values()) add(value);
+    for (const OverlayCurve& curve : picture().curves)
+        for (const double value : curve.y) add(value);
+    if (!any) return;
+    const double room = std::max(1.0, (high - low) * kHeadroom);
+    panel_.CWGraph1.setYRange(std::floor(low - room), std::ceil(high + room));
+}
+
+void TraceToolsDock::fill(QMenu& menu) {
+    QAction* shown = toggleViewAction();
+    shown->setText("Trace Tools");
+    menu.addAction(shown);
+    menu.addSeparator();
+    for (std::size_t i = 0; i < kHolds; ++i) {
+        const auto kind = static_cast<HoldKind>(i);
+        QAction* action = menu.addAction(TracesPage::kNames.at(i));
+        action->setCheckable(true);
+        connect(action, &QAction::triggered, this, [this, kind](bool on) {
+            tools_.traces().switchOn(kind, on);
+            tools_.refresh();
+        });
+        connect(&menu, &QMenu::aboutToShow, action,
+                [this, action, kind] { action->setChecked(tools_.traces().isOn(kind)); });
+    }
+    menu.addAction("Clear Held Traces", this, [this] {
+        for (std::size_t i = 0; i < kHolds; ++i) tools_.traces().clear(static_cast<HoldKind>(i));
+        tools_.traces().acknowledge();
+        tools_.refresh();
+    });
+    menu.addSeparator();
+    menu.addAction("Scale Level Axis", this, [this] { scaleLevelAxis(); });
+}
+
+TraceToolsDock* addTraceTools(QMainWindow& window, Program& program, GraphWidget& graph,
+                              QMenu& before) {
+    auto* dock = new TraceToolsDock(program, graph, window);
+    window.addDockWidget(Qt::BottomDockWidgetArea, dock);
+    dock->setFloating(true);
+    dock->hide();
+    auto* menu = new QMenu("&Trace", &window);
+    window.menuBar()->insertMenu(before.menuAction(), menu);
+    dock->fill(*menu);
+    return dock;
+}
+
+}  // namespace zel

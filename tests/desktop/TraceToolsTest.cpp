@@ -1,0 +1,195 @@
+// The trace tools in the window: the same figures as from the file, drawn on the graph, in words.
+
+#include <QApplication>
+#include <QCheckBox>
+#include <QClipboard>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMenuBar>
+#include <QPushButton>
+#include <QTableWidget>
+#include <QTest>
+
+#include "analysis/SavedTraces.h"
+#include "desktop/windows/TraceToolsDock.h"
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+namespace {
+
+struct TraceToolsWindow : Desk {
+    TraceToolsDock& dock() { return *window->findChild<TraceToolsDock*>("TraceTools"); }
+    void sweep() {
+        panel().PlaySingleButton.Click();
+        settle();
+    }
+    void settle() {
+        show();
+        dock().showNow();
+    }
+    /// Opens a page, and gives it.
+    QWidget* page(int index) {
+        dock().show();
+        dock().pages().setCurrentIndex(index);
+        dock().showNow();
+        return dock().pages().currentWidget();
+    }
+    void type(const char* name, const QString& text) {
+        auto* box = dock().findChild<QLineEdit*>(name);
+        ASSERT_NE(box, nullptr) << name;
+        box->setText(text);
+        emit box->editingFinished();
+        dock().showNow();
+    }
+    enum Page { Traces, Peaks, Markers, Power, Limits, Statistics };
+};
+
+TEST_F(TraceToolsWindow, FiguresAreThoseOfTheSavedView) {
+    connect();
+    dock().tools().request.bandwidth = 3;
+    dock().tools().request.occupied = 99;
+    dock().tools().request.channels = {{1e9, 2e9}};
+    dock().tools().setMask(readMask("x;upper;lower\n0;-30;\n3e9;-30;\n"));
+    sweep();
+    platform.fileDialogs.answer("/view.csv");
+    panel().SaveCurrentView.Click();
+    const std::string text = platform.files.bytes("/view.csv");
+    ASSERT_NE(text, "");
+    std::vector<SpectrumTrace> saved;
+    readTraces(text, DateOrder::YearMonthDay, [&saved](const SpectrumTrace& trace) {
+        saved.push_back(trace);
+        return true;
+    });
+    ASSERT_EQ(saved.size(), 1U);
+    const AnalysisResult file = analyseTrace(saved[0], dock().tools().request);
+    const AnalysisResult& shown = dock().tools().result();
+    ASSERT_GT(shown.peaks.size(), 2U);
+    ASSERT_EQ(shown.peaks.size(), file.peaks.size());
+    for (std::size_t i = 0; i < file.peaks.size(); ++i) {
+        EXPECT_DOUBLE_EQ(shown.peaks[i].x, file.peaks[i].x);
+        EXPECT_DOUBLE_EQ(shown.peaks[i].level, file.peaks[i].level);
+    }
+    EXPECT_DOUBLE_EQ(shown.width.width().value(), file.width.width().value());
+    EXPECT_DOUBLE_EQ(shown.occupied->low, file.occupied->low);
+    EXPECT_DOUBLE_EQ(shown.channels[0].power.value(), file.channels[0].power.value());
+    EXPECT_EQ(shown.mask->margin, file.mask->margin);
+    EXPECT_EQ(shown.time, file.time);
+}
+
+TEST_F(TraceToolsWindow, LoadedView_GivesItsOwnFigures) {
+    platform.files.put("/two.csv",
+                       "Trace Name;Analyzer\r\nSpan;4\r\nResolution Bandwidth;1000\r\n"
+                       "Reference Unit;dBm\r\nReference Range;10 dB/div\r\nReference Level;-20\r\n"
+                       "Trace Write Pointer;5\r\n\r\n1.000;-90; \r\n2.000;-40; \r\n3.000;-10; \r\n"
+                       "4.000;-40; \r\n5.000;-90; \r\n");
+    panel().OpenFile("/two.csv");
+    settle();
+    ASSERT_EQ(dock().tools().result().peaks.size(), 1U);
+    EXPECT_EQ(dock().tools().result().peaks[0].x, 3);
+    EXPECT_EQ(dock().tools().result().peaks[0].level, -10) << "not the clipped level";
+    EXPECT_EQ(dock().tools().trace()->rbw, 1000);
+}
+
+TEST_F(TraceToolsWindow, MaxHold_CountsEachSweepOnce) {
+    connect();
+    page(Traces);
+    dock().findChild<QCheckBox*>("Max hold")->setChecked(true);
+    dock().tools().traces().clear(HoldKind::Max);
+    sweep();
+    sweep();
+    EXPECT_EQ(dock().tools().traces().count(HoldKind::Max), 2U);
+    panel().CWGraph1.Refresh();
+    settle();
+    EXPECT_EQ(dock().tools().traces().count(HoldKind::Max), 2U);
+}
+
+TEST_F(TraceToolsWindow, AnotherFrequency_EndsTheHoldsWithAWord) {
+    connect();
+    dock().tools().traces().switchOn(HoldKind::Max, true);
+    sweep();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    QTest::keyClicks(box, "900M");
+    QTest::keyClick(box, Qt::Key_Return);
+    sweep();
+    EXPECT_EQ(dock().tools().traces().ended(), "Held traces ended: frequency changed");
+}
+
+TEST_F(TraceToolsWindow, PeaksTable_ShowsTheToolsFiguresAndAClickSetsAMarker) {
+    connect();
+    sweep();
+    QWidget* peaks = page(Peaks);
+    auto* table = peaks->findChild<QTableWidget*>("PeaksTable");
+    const AnalysisResult& found = dock().tools().result();
+    ASSERT_EQ(static_cast<std::size_t>(table->rowCount()), found.peaks.size());
+    EXPECT_EQ(table->item(0, 1)->text(), placeText(found.peaks[0].x, "Hz"));
+    EXPECT_EQ(table->item(0, 2)->text(), levelText(found.peaks[0].level, "dBm"));
+    emit table->cellClicked(1, 0);
+    EXPECT_TRUE(dock().tools().markers[0].on);
+    EXPECT_EQ(dock().tools().readings()[0].level, found.peaks[1].level);
+    for (auto* key : peaks->findChildren<QPushButton*>())
+        if (key->text() == "Copy Table") key->click();
+    EXPECT_TRUE(QApplication::clipboard()->text().startsWith("Peak\tx\tLevel\n1\t"));
+}
+
+TEST_F(TraceToolsWindow, BadMask_IsNamedAndTheOldOneStays) {
+    connect();
+    page(Limits);
+    dock().limits().applyMask("x;upper;lower\n0;-150;\n3e9;-150;\n");
+    sweep();
+    EXPECT_TRUE(dock().findChild<QLabel*>("MaskVerdict")->text().startsWith("FAIL, margin -"));
+    dock().limits().applyMask("x;upper;lower\n0;a;\n");
+    EXPECT_TRUE(dock()
+                    .findChild<QLabel*>("LimitsWord")
+                    ->text()
+                    .startsWith("The mask was not taken, line 2"));
+    EXPECT_TRUE(dock().tools().request.mask);
+}
+
+TEST_F(TraceToolsWindow, TypedChannel_GivesItsPower) {
+    connect();
+    sweep();
+    page(Power);
+    type("Channel", "1G");
+    type("Channel stop", "2 GHz");
+    ASSERT_EQ(dock().tools().result().channels.size(), 1U);
+    EXPECT_EQ(dock().findChild<QLabel*>("Channel result")->text(),
+              levelText(dock().tools().result().channels[0].power, "dBm"));
+    type("Channel stop", "much");
+    EXPECT_TRUE(dock().tools().result().channels.empty());
+    EXPECT_EQ(dock().findChild<QLabel*>("Channel result")->text(), "");
+}
+
+TEST_F(TraceToolsWindow, Pictures_OfAllPages) {
+    for (const bool dark : {true, false}) {
+        applyTheme(testApplication(), dark ? ThemeChoice::Dark : ThemeChoice::Light);
+        if (!panel().isConnected) connect();
+        window->resize(dark ? QSize(1920, 1080) : QSize(1024, 600));
+        for (std::size_t i = 0; i < kHolds; ++i)
+            dock().tools().traces().switchOn(static_cast<HoldKind>(i), true);
+        dock().tools().setMask(
+            readMask("x;upper;lower\n0;-15;\n1e9;-15;\n1.2e9;-60;\n1.8e9;-60;\n"
+                     "2e9;-40;\n3e9;-40;\n"));
+        dock().tools().markers[0] = {true, 0, 1, 0};
+        dock().tools().markers[1] = {true, 0, 2, 1};
+        dock().tools().countStatistics(-80);
+        for (int i = 0; i < 10; ++i) sweep();
+        const QString look = dark ? "dark" : "light";
+        type("Channel", "1G");
+        type("Channel stop", "2G");
+        type("Bandwidth", "3");
+        type("Occupied", "99");
+        type("Adjacent", "50M");
+        type("Channel spacing", "50M");
+        for (int i = 0; i <= Statistics; ++i) {
+            page(i);
+            dock().resize(460, 430);
+            QApplication::processEvents();
+            EXPECT_TRUE(savePicture(dock(), "trace-tools-" + QString::number(i) + "-" + look));
+        }
+        EXPECT_TRUE(savePicture(*window, "trace-tools-graph-" + look));
+    }
+    applyTheme(testApplication(), ThemeChoice::Dark);
+}
+
+}  // namespace
+}  // namespace zel
