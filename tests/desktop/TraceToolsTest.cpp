@@ -103,7 +103,7 @@ TEST_F(TraceToolsWindow, MaxHold_CountsEachSweepOnce) {
     EXPECT_EQ(dock().tools().traces().count(HoldKind::Max), 2U);
 }
 
-TEST_F(TraceToolsWindow, AnotherFrequency_EndsTheHoldsWithAWord) {
+TEST_F(TraceToolsWindow, AnotherSpan_EndsTheHoldsWithAWord) {
     connect();
     dock().tools().traces().switchOn(HoldKind::Max, true);
     sweep();
@@ -111,7 +111,8 @@ TEST_F(TraceToolsWindow, AnotherFrequency_EndsTheHoldsWithAWord) {
     QTest::keyClicks(box, "900M");
     QTest::keyClick(box, Qt::Key_Return);
     sweep();
-    EXPECT_EQ(dock().tools().traces().ended(), "Held traces ended: frequency changed");
+    // The instrument's range ends at 0 Hz, so the span is narrower now.
+    EXPECT_EQ(dock().tools().traces().ended(), "Held traces ended: span changed");
 }
 
 TEST_F(TraceToolsWindow, PeaksTable_ShowsTheToolsFiguresAndAClickSetsAMarker) {
