@@ -2,10 +2,11 @@
 
 #include <unistd.h>
 
+#include <QByteArray>
+#include <QFile>
+#include <QList>
 #include <QTemporaryDir>
-#include <fstream>
 #include <memory>
-#include <sstream>
 #include <stdexcept>
 #include <thread>
 
@@ -95,26 +96,25 @@ Figure sweeps(const std::string& what, const Compared& got, double limit) {
         ""};
 }
 
+QList<QByteArray> numbersOf(pid_t process, const char* file) {
+    QFile numbers(QString("/proc/%1/%2").arg(process).arg(file));
+    if (!numbers.open(QIODevice::ReadOnly)) throw std::runtime_error("the server has ended");
+    const QByteArray text = numbers.readAll();
+    return text.mid(text.lastIndexOf(')') + 1).simplified().split(' ');
+}
+
 /// Seconds of a core that the process has used.
 double cpuSeconds(pid_t process) {
-    std::ifstream file("/proc/" + std::to_string(process) + "/stat");
-    std::string text;
-    std::getline(file, text);
-    std::istringstream fields(text.substr(text.rfind(')') + 1));
-    std::string skipped;
-    long user = 0;
-    long system = 0;
-    for (int i = 0; i < 11; ++i) fields >> skipped;
-    fields >> user >> system;
-    return static_cast<double>(user + system) / static_cast<double>(sysconf(_SC_CLK_TCK));
+    constexpr int kUser = 11;  // after the name, from 0
+    const QList<QByteArray> fields = numbersOf(process, "stat");
+    const double ticks = static_cast<double>(fields.value(kUser).toLongLong() +
+                                             fields.value(kUser + 1).toLongLong());
+    return ticks / static_cast<double>(sysconf(_SC_CLK_TCK));
 }
 
 double residentBytes(pid_t process) {
-    std::ifstream file("/proc/" + std::to_string(process) + "/statm");
-    long size = 0;
-    long resident = 0;
-    file >> size >> resident;
-    return static_cast<double>(resident) * static_cast<double>(sysconf(_SC_PAGESIZE));
+    const double pages = static_cast<double>(numbersOf(process, "statm").value(1).toLongLong());
+    return pages * static_cast<double>(sysconf(_SC_PAGESIZE));
 }
 
 }  // namespace
