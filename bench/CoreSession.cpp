@@ -38,7 +38,7 @@ CoreSession::CoreSession(const zel::LinkAddress& address) : platform_(home_.path
                                 own.serialPorts, own.tcpSocket, own.serverPort,  own.serverSocket,
                                 own.settings,    own.debug,     own.clipboard,   own.launcher,
                                 own.startup,     own.folder,    own.fileDialogs, own.files,
-                                own.endSignals};
+                                own.endSignals,  own.machine,   own.portProbe};
     program_ = std::make_unique<zel::Program>(counted, "");
     program_->start();
     if (!program_->connect(address, false))

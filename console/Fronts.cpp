@@ -31,9 +31,9 @@ class SimulatorFront : public Front {
     Events& events() override { return events_; }
     QtSignals& endSignals() override { return signals_; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
-        return {clock_,      served,        boxes,     port_,  ports_,     tcpSocket_,
-                serverPort_, serverSocket_, settings_, debug_, clipboard_, launcher_,
-                startup_,    folder_,       dialogs,   files_, signals_};
+        return {clock_,        served,    boxes,    port_,      ports_,    tcpSocket_, serverPort_,
+                serverSocket_, settings_, debug_,   clipboard_, launcher_, startup_,   folder_,
+                dialogs,       files_,    signals_, machine_,   portProbe_};
     }
 
   private:
@@ -53,6 +53,8 @@ class SimulatorFront : public Front {
     MemoryLauncher launcher_;
     MemoryStartupFolder startup_;
     SystemFiles files_;
+    SystemMachine machine_;
+    SystemPortProbe portProbe_;
 };
 
 class PortFront : public Front {
@@ -66,7 +68,7 @@ class PortFront : public Front {
                 qt_.serialPorts, qt_.tcpSocket, qt_.serverPort, qt_.serverSocket,
                 qt_.settings,    qt_.debug,     clipboard_,     launcher_,
                 qt_.startup,     qt_.folder,    dialogs,        qt_.files,
-                qt_.endSignals};
+                qt_.endSignals,  qt_.machine,   qt_.portProbe};
     }
 
   private:

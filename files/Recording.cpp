@@ -18,7 +18,6 @@ namespace {
 
 using CF = ControllerForm;
 
-constexpr int kHelpTopic = 1114;
 constexpr int kHourglass = 11;
 constexpr int kResyncMs = 300;
 constexpr int kRetryMs = 10;
@@ -49,9 +48,6 @@ Recording::Recording(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& 
     handlers_.on(dialog_.SubmitTimeButton.Clicked, [this] { SubmitTimeButton_Click(); });
     handlers_.on(dialog_.CancelTimeButton.Clicked, [this] { dialog_.unload(1); });
     handlers_.on(dialog_.X.Tick, [this] { X_Timer(); });
-    handlers_.on(dialog_.TimeIntervalBox.KeyDown, [this](int key, int) {
-        if (key == kKeyF1) panel_.ShowHelp(kHelpTopic);
-    });
     handlers_.on(panel_.UpNow.Tick, [this] { showProgress(); });
     // Stop need not wait for the next tick, which may be hours away.
     handlers_.on(panel_.StopButton.Clicked, [this] {

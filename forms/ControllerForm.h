@@ -166,6 +166,8 @@ class ControllerForm : public Form {
     MenuItem UtilityServer{*this, "UtilityServer", "Server Mode...", &Utility};
     MenuItem UtilityStartup{*this, "UtilityStartup", "Run on Startup", &Utility};
     MenuItem UtilityTrouble{*this, "UtilityTrouble", "Instrument Simulator", &Utility};
+    MenuItem UtilityDoctor{*this, "UtilityDoctor", "Connection Doctor...", &Utility};
+    MenuItem UtilityRecord{*this, "UtilityRecord", "Record Session...", &Utility};
     MenuItem DelLogFile{*this, "DelLogFile", "Delete Log File", &Utility};
     MenuItem ViewMenu{*this, "ViewMenu", "View"};
     MenuItem SpectrogramShow{*this, "SpectrogramShow", "Spectrogram", &ViewMenu};

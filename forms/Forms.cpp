@@ -5,7 +5,7 @@ namespace zel {
 std::vector<Form*> Forms::all() {
     return {&controller, &main,      &server,       &tcpConnection, &devicesChoice,
             &time,       &waterfall, &specialMeas,  &scriptEditor,  &std,
-            &about,      &error,     &powerAndRefl, &manualScale};
+            &about,      &error,     &powerAndRefl, &manualScale,   &doctor};
 }
 
 Form* Forms::form(std::string_view name) {

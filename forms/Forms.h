@@ -9,6 +9,7 @@
 #include "forms/MainForm.h"
 #include "forms/ScriptForms.h"
 #include "forms/ServerForm.h"
+#include "forms/SupportForms.h"
 #include "forms/WaterfallForm.h"
 #include "platform/Controls.h"
 
@@ -72,16 +73,6 @@ class TimeForm : public Form {
     Timer X{*this, "X", 0};
 };
 
-class AboutForm : public Form {
-  public:
-    AboutForm() : Form("AboutForm") { Caption = "About ZELRemote"; }
-};
-
-class ErrorForm : public Form {
-  public:
-    ErrorForm() : Form("ErrorForm") { Caption = "ZELRemote Error"; }
-};
-
 /// What the power sensor's readings bring: the power alone, or the reflection as well.
 class PowerAndReflForm : public Form {
   public:
@@ -120,6 +111,7 @@ struct Forms {
     STDForm std;
     AboutForm about;
     ErrorForm error;
+    DoctorForm doctor;
     PowerAndReflForm powerAndRefl;
     ManualScaleForm manualScale;
 

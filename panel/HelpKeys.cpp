@@ -1,26 +1,62 @@
 #include "panel/HelpKeys.h"
 
+#include <string_view>
+
+#include "platform/Graph.h"
 #include "platform/KeyInput.h"
 
 namespace zel {
+namespace {
 
-HelpKeys::HelpKeys(ControllerForm& panel) : panel_(panel) {
-    const auto connect = [this](Event<int, int>& event) {
-        event.connect([this](int key, int) { keyDown(key); });
-    };
-    for (Button* key :
-         {&panel_.FrequencyButton, &panel_.SpanButton, &panel_.AmplitudeButton, &panel_.BWButton,
-          &panel_.SweepButton, &panel_.TraceButton, &panel_.MeasButton, &panel_.TrackButton1,
-          &panel_.MarkerButton, &panel_.SendButton})
-        connect(key->KeyDown);
-    for (Button& key : panel_.SoftKey) connect(key.KeyDown);
-    for (TextBox& box : panel_.SoftTextBox) connect(box.KeyDown);
-    connect(panel_.CWGraph1.KeyDown);
-    panel_.HelpHelp.Clicked.connect([this] { panel_.ShowHelp(kContentsTopic); });
+struct Topic {
+    std::string_view form;
+    int context;
+};
+constexpr Topic kTopics[] = {
+    {"ControllerForm", kPanelTopic},
+    {"DevicesChoiceForm", 1112},
+    {"TCPConnectionForm", 1113},
+    {"MainForm", 1113},
+    {"TimeForm", 1114},
+    {"ServerForm", 3113},
+    {"SpecialMeasForm", 4111},
+    {"WaterfallForm", 5111},
+};
+
+Event<int, int>* keysOf(Control& control) {
+    switch (control.kind()) {
+        case ControlKind::Button:
+            return &static_cast<Button&>(control).KeyDown;
+        case ControlKind::TextBox:
+            return &static_cast<TextBox&>(control).KeyDown;
+        case ControlKind::Graph:
+            return &static_cast<Graph&>(control).KeyDown;
+        default:
+            return nullptr;
+    }
 }
 
-void HelpKeys::keyDown(int key) {
-    if (key == kKeyF1) panel_.ShowHelp(kPanelTopic);
+}  // namespace
+
+int helpTopicOf(const Form& form) {
+    for (const Topic& row : kTopics)
+        if (row.form == form.name()) return row.context;
+    return kContentsTopic;
+}
+
+HelpKeys::HelpKeys(Forms& forms) : panel_(forms.controller) {
+    for (Form* form : forms.all()) {
+        const int topic = helpTopicOf(*form);
+        const auto help = [this, topic](int key, int) { keyDown(key, topic); };
+        handlers_.on(form->KeyDown, help);
+        for (Control* control : form->controls())
+            if (Event<int, int>* keys = keysOf(*control)) handlers_.on(*keys, help);
+    }
+    handlers_.on(panel_.HelpHelp.Clicked, [this] { panel_.ShowHelp(kContentsTopic); });
+}
+
+void HelpKeys::keyDown(int key, int topic) {
+    if (key == kKeyF1) panel_.ShowHelp(topic);
 }
 
 }  // namespace zel

@@ -1,24 +1,25 @@
 #pragma once
-// F1 on the panel's keys, boxes and graph opens the help.
+// F1 on a control of any form opens the help at the form's topic.
 
-#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
 
 namespace zel {
 
-/// Help topics by the window that asks for them.
+/// Help topics by the window that asks for them; the contents for a form without one.
 inline constexpr int kPanelTopic = 2111;
 inline constexpr int kContentsTopic = 1110;
+int helpTopicOf(const Form& form);
 
 class HelpKeys {
   public:
-    /// Connects the hard keys, soft keys, entry boxes, the send button, the graph and the entry of
-    /// the help menu.
-    explicit HelpKeys(ControllerForm& panel);
+    /// Connects each control that gets keys, the forms themselves and the entry of the help menu.
+    explicit HelpKeys(Forms& forms);
 
   private:
-    void keyDown(int key);
+    void keyDown(int key, int topic);
 
     ControllerForm& panel_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -104,6 +104,9 @@ class Form : public PropertyOwner {
     Property<bool> Modal{this, false};
     Property<int> MousePointer{this, 0};
 
+    /// A key on a control that has no handler of its own for keys: key code, shift.
+    Event<int, int> KeyDown;
+
     /// Before each showing of a form that is not loaded; see `load`.
     Event<> Load;
     /// The user closes the window; a handler sets the argument to -1 to keep it.

@@ -4,7 +4,9 @@
 #include "platform/Clock.h"
 #include "platform/Events.h"
 #include "platform/Files.h"
+#include "platform/Machine.h"
 #include "platform/MessageBox.h"
+#include "platform/PortProbe.h"
 #include "platform/SerialPort.h"
 #include "platform/ServerSocket.h"
 #include "platform/Services.h"
@@ -32,6 +34,8 @@ struct Platform {
     FileDialogs& fileDialogs;
     FileService& files;
     Signals& endSignals;
+    Machine& machine;
+    PortProbe& portProbe;
 };
 
 }  // namespace zel

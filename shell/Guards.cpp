@@ -1,8 +1,5 @@
 #include "shell/Guards.h"
 
-#include <exception>
-#include <new>
-
 #include "support/Text.h"
 
 namespace zel {
@@ -27,23 +24,16 @@ bool ReportedSettings::set(const std::string& application, const std::string& se
 Guards::Guards(const Platform& front)
     : boxes(front.boxes),
       settings(front.settings, boxes),
-      platform{front.clock,      front.events,       boxes,
-               front.serialPort, front.serialPorts,  front.tcpSocket,
-               front.serverPort, front.serverSocket, settings,
-               front.debug,      front.clipboard,    front.launcher,
-               front.startup,    front.folder,       front.fileDialogs,
-               front.files,      front.endSignals} {}
-
-Box failureBox() {
-    try {
-        throw;
-    } catch (const std::bad_alloc&) {
-        return {BoxIcon::Critical, "There is not enough memory for this. It was not finished."};
-    } catch (const std::exception& problem) {
-        return {BoxIcon::Critical, "This could not be finished: " + std::string(problem.what())};
-    } catch (...) {
-        return {BoxIcon::Critical, "This could not be finished, for an unknown reason."};
-    }
-}
+      log(front.clock, front.files),
+      port(front.serialPort, log),
+      socket(front.tcpSocket, log),
+      serverPort(front.serverPort, log),
+      platform{front.clock,    front.events,       boxes,
+               port,           front.serialPorts,  socket,
+               serverPort,     front.serverSocket, settings,
+               front.debug,    front.clipboard,    front.launcher,
+               front.startup,  front.folder,       front.fileDialogs,
+               front.files,    front.endSignals,   front.machine,
+               front.portProbe} {}
 
 }  // namespace zel

@@ -1,6 +1,6 @@
 #pragma once
 // What stands between the program and the front's services: boxes that keep quiet, settings that
-// cannot be stored, and the words for a handler that failed.
+// cannot be stored, and the record of what goes over the lines.
 
 #include <functional>
 #include <string>
@@ -9,6 +9,8 @@
 #include "platform/MessageBox.h"
 #include "platform/Platform.h"
 #include "platform/Services.h"
+#include "support/RecordedPort.h"
+#include "support/SessionLog.h"
 
 namespace zel {
 
@@ -48,16 +50,17 @@ class ReportedSettings : public SettingsStore {
     bool reported_ = false;
 };
 
-/// The platform of a front with both in their places.
+/// The platform of a front with these in their places, and with its lines recorded.
 struct Guards {
     explicit Guards(const Platform& front);
 
     QuietBoxes boxes;
     ReportedSettings settings;
+    SessionLog log;
+    RecordedPort port;
+    RecordedSocket socket;
+    RecordedPort serverPort;
     Platform platform;
 };
-
-/// The box for the exception that is being handled; call it inside a catch alone.
-Box failureBox();
 
 }  // namespace zel

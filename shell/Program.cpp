@@ -43,12 +43,16 @@
 #include "server/ServerBridge.h"
 #include "server/ServerDialog.h"
 #include "shell/EndingBoxes.h"
+#include "shell/Failures.h"
 #include "shell/Guards.h"
 #include "shell/Logs.h"
 #include "shell/ProgramEnd.h"
 #include "shell/SecondTimer.h"
 #include "shell/ServerMode.h"
+#include "shell/SessionKeys.h"
 #include "shell/StartUp.h"
+#include "support/AboutBox.h"
+#include "support/ErrorReport.h"
 #include "support/RoboHelp_CSH.h"
 #include "trace/FrequencyLabels.h"
 #include "trace/GraphInteraction.h"
@@ -94,8 +98,9 @@ std::int16_t connectionKind(LinkAddress::Kind kind) {
 
 // In the order of the house: a room below stands before those that use it.
 struct Program::Rooms {
-    Rooms(const Platform& p, std::string commandLine)
+    Rooms(const Platform& p, SessionLog& sessionLog, std::string commandLine)
         : platform(p),
+          record(sessionLog),
           logs(p, commandLine),
           timers(p.events),
           link(forms, line, p.serialPort, p.tcpSocket, session, logs.line()),
@@ -139,7 +144,7 @@ struct Program::Rooms {
           modeKeys(forms, mirror, exchange, MenuRoutines{softPanel, fill}, scaling, interlock),
           markerKeys(panel, mirror, exchange, markerReadout, traces, interlock),
           manualCommand(panel, instrument, interlock),
-          helpKeys(panel),
+          helpKeys(forms),
           scripts(forms, {mirror, line, link, reader, exchange, binary},
                   {traces, recording, viewReader, files}, p.folder, interlock),
           help(p.folder, p.files, p.launcher, boxes),
@@ -159,7 +164,13 @@ struct Program::Rooms {
           serverMode(forms, p.startup, p.events),
           startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
           second(panel, bridge, sessionClock),
-          end(forms, boxes) {
+          end(forms, boxes),
+          about(forms.about,
+                {p.machine, p.files, p.clock, p.clipboard, p.launcher, boxes, p.events},
+                p.folder.path() + "/registry.ini"),
+          report(forms.error, {p.clipboard, p.fileDialogs, p.files, boxes, p.events}),
+          sessionKeys(panel, record, p.fileDialogs, boxes),
+          failures(logs, report, [this] { endAfterFailure(); }) {
         panel.CommandLine = std::move(commandLine);
         history.describe = [this] {
             OutputFile header(files.service(), "", OutputFile::Mode::Output);
@@ -181,6 +192,8 @@ struct Program::Rooms {
             for (Form* form : forms.all())
                 if (form->Modal) form->Hide();
         });
+        report.sessionLines = [this] { return record.lastLines(); };
+        panel.HelpAbout.Clicked.connect([this] { about.show(); });
         timers.attach(panel.UpNow);
         panel.ShowHelp.connect([this](int context) { help.showTopic(context); });
         timers.attach(panel.PaceTimer);
@@ -191,6 +204,20 @@ struct Program::Rooms {
             // It is a help on the side: a simulator that is not installed is no error.
             platform.launcher.start(platform.folder.programPath() + "/ZELSim/ZELSim", {"--pty"});
         });
+    }
+
+    /// In order, whatever failed: the recording stops, the port is released, the logs are closed.
+    void endAfterFailure() {
+        panel.MousePointer = 0;
+        line.Ending = true;
+        panel.RecordDataFlag = false;
+        try {
+            disconnection.endAtOnce();
+        } catch (...) {
+            // The failure itself is reported already; the port goes with the program.
+        }
+        record.end();
+        end.end();
     }
 
     /// LOCAL and the close, whatever is under way; then every wait and loop comes to its end.
@@ -204,6 +231,7 @@ struct Program::Rooms {
     }
 
     Platform platform;
+    SessionLog& record;
     std::string endedBy;  ///< the signal that ended the program
     Forms forms;
     ControllerForm& panel = forms.controller;
@@ -272,12 +300,16 @@ struct Program::Rooms {
     StartUp startUp;
     SecondTimer second;
     ProgramEnd end;
+    AboutBox about;
+    ErrorReport report;
+    SessionKeys sessionKeys;
+    Failures failures;
     Handlers handlers;
 };
 
 Program::Program(const Platform& platform, std::string commandLine)
     : guards_(std::make_unique<Guards>(platform)),
-      rooms_(std::make_unique<Rooms>(guards_->platform, std::move(commandLine))) {
+      rooms_(std::make_unique<Rooms>(guards_->platform, guards_->log, std::move(commandLine))) {
     guards_->boxes.quiet = [this] { return rooms_->recording.inTimedTick(); };
     rooms_->end.Ended.connect([this] { Ended(); });
 }
@@ -285,10 +317,15 @@ Program::Program(const Platform& platform, std::string commandLine)
 Program::~Program() { guards_->boxes.quiet = nullptr; }
 
 void Program::showFailure() {
-    const Box box = failureBox();
     rooms_->panel.MousePointer = 0;
-    guards_->boxes.show(box);
+    rooms_->failures.handle();
 }
+
+bool Program::failed() const { return rooms_->failures.failed(); }
+SessionLog& Program::sessionLog() { return guards_->log; }
+RoboHelp_CSH& Program::help() { return rooms_->help; }
+ErrorReport& Program::errorReport() { return rooms_->report; }
+Clipboard& Program::clipboard() { return guards_->platform.clipboard; }
 
 Forms& Program::forms() { return rooms_->forms; }
 ZEL3Variables& Program::variables() { return rooms_->mirror; }

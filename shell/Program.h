@@ -15,11 +15,15 @@ namespace zel {
 
 struct Guards;
 
+class Clipboard;
 class CommandExchange;
+class ErrorReport;
 class Interlock;
 class Logs;
+class RoboHelp_CSH;
 class ServerBridge;
 class ServerDialog;
+class SessionLog;
 class SweepHistory;
 class TraceReader;
 struct Scripts;
@@ -41,6 +45,10 @@ class Program {
     /// The sweeps of the last while.
     SweepHistory& history();
     Logs& logs();
+    SessionLog& sessionLog();
+    RoboHelp_CSH& help();
+    ErrorReport& errorReport();
+    Clipboard& clipboard();
     Interlock& interlock();
     Scripts& scripts();
     /// The sweep on the graph, be it read or loaded.
@@ -72,9 +80,11 @@ class Program {
     const std::string& endedBy() const;
     Event<> Ended;
 
-    /// Shows the exception that is being handled in a box; call it inside a catch alone. A front
-    /// catches what a handler throws and goes on.
+    /// Reports the exception that is being handled and ends the program; call it inside a catch
+    /// alone. A front catches what a handler, a timer or the line throws.
     void showFailure();
+    /// A failure ended the program; its exit status is 1 then.
+    bool failed() const;
 
   private:
     std::unique_ptr<Guards> guards_;

@@ -20,9 +20,9 @@ struct QtPlatform : QtSystem {
     Platform bundle() { return bundle(boxes, fileDialogs); }
     /// With boxes and file dialogs of another front.
     Platform bundle(MessageBoxes& otherBoxes, FileDialogs& otherDialogs) {
-        return {clock,      events,       otherBoxes,   serialPort, serialPorts, tcpSocket,
-                serverPort, serverSocket, settings,     debug,      clipboard,   launcher,
-                startup,    folder,       otherDialogs, files,      endSignals};
+        return {clock,        events,   otherBoxes, serialPort, serialPorts, tcpSocket, serverPort,
+                serverSocket, settings, debug,      clipboard,  launcher,    startup,   folder,
+                otherDialogs, files,    endSignals, machine,    portProbe};
     }
 };
 

@@ -11,6 +11,8 @@
 #include "desktop/platform/QtSignals.h"
 #include "desktop/platform/QtSocket.h"
 #include "desktop/platform/SystemFiles.h"
+#include "desktop/platform/SystemMachine.h"
+#include "desktop/platform/SystemPortProbe.h"
 
 namespace zel {
 
@@ -33,6 +35,8 @@ struct QtSystem {
     QtDebugChannel debug;
     QtStartupFolder startup;
     SystemFiles files;
+    SystemMachine machine;
+    SystemPortProbe portProbe;
 };
 
 }  // namespace zel

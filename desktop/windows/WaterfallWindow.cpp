@@ -206,7 +206,6 @@ void WaterfallWindow::reject() {
 }
 
 void WaterfallWindow::keyPressEvent(QKeyEvent* event) {
-    if (event->key() == Qt::Key_F1) return panel_.ShowHelp(kHelp);
     FormWindow::keyPressEvent(event);
 }
 

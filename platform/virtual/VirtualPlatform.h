@@ -2,6 +2,7 @@
 // The whole platform of tests and of the built-in simulator: virtual time, scripts and memory.
 
 #include "platform/Platform.h"
+#include "platform/virtual/FixedMachine.h"
 #include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/RecordedBoxes.h"
 #include "platform/virtual/ScriptedPort.h"
@@ -30,6 +31,8 @@ struct VirtualPlatform {
     QueuedFileDialogs fileDialogs;
     VirtualFiles files{clock};
     Signals endSignals;
+    FixedMachine machine;
+    FixedProbe portProbe;
 
     /// The bundle with the scripted port.
     Platform bundle() { return bundle(port); }
@@ -37,9 +40,9 @@ struct VirtualPlatform {
     Platform bundle(SerialPort& other) { return bundle(other, files); }
     /// The same on another disk.
     Platform bundle(SerialPort& other, FileService& disk) {
-        return {clock,      events,       boxes,       other, ports,     tcpSocket,
-                serverPort, serverSocket, settings,    debug, clipboard, launcher,
-                startup,    folder,       fileDialogs, disk,  endSignals};
+        return {clock,        events,   boxes,      other,     ports,    tcpSocket, serverPort,
+                serverSocket, settings, debug,      clipboard, launcher, startup,   folder,
+                fileDialogs,  disk,     endSignals, machine,   portProbe};
     }
 };
 

@@ -39,11 +39,12 @@ struct PanelSessionTest : ::testing::Test {
         ConsoleBoxes boxes(output, answers);
         ConsoleFileDialogs dialogs(output, answers);
         ServingEvents events(platform.events);
-        Program program({platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
-                         platform.serverPort, platform.serverSocket, platform.settings,
-                         platform.debug, platform.clipboard, platform.launcher, platform.startup,
-                         platform.folder, dialogs, platform.files, platform.endSignals},
-                        words);
+        Program program(
+            {platform.clock, events, boxes, port, platform.ports, platform.tcpSocket,
+             platform.serverPort, platform.serverSocket, platform.settings, platform.debug,
+             platform.clipboard, platform.launcher, platform.startup, platform.folder, dialogs,
+             platform.files, platform.endSignals, platform.machine, platform.portProbe},
+            words);
         if (prepare) prepare(program);
         PanelSession session(program,
                              {platform.clock, events, input, output, errorOutput, answers, true},

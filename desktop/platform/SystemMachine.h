@@ -1,0 +1,14 @@
+#pragma once
+// The machine that the program runs on.
+
+#include "platform/Machine.h"
+
+namespace zel {
+
+class SystemMachine : public Machine {
+  public:
+    MachineFacts facts() override;
+    std::string environment(const std::string& name) override;
+};
+
+}  // namespace zel

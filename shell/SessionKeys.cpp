@@ -1,0 +1,39 @@
+#include "shell/SessionKeys.h"
+
+#include "support/Text.h"
+
+namespace zel {
+
+SessionKeys::SessionKeys(ControllerForm& panel, SessionLog& log, FileDialogs& dialogs,
+                         MessageBoxes& boxes)
+    : panel_(panel), log_(log), dialogs_(dialogs), boxes_(boxes) {
+    handlers_.on(panel_.UtilityRecord.Clicked, [this] { UtilityRecord_Click(); });
+    handlers_.on(log_.Failed, [this](const std::string& why) {
+        panel_.UtilityRecord.Checked = false;
+        boxes_.show({BoxIcon::Exclamation,
+                     why + kCrLf + "The record of the session ends here; the session goes on."});
+    });
+}
+
+bool SessionKeys::begin(const std::string& path, const std::string& arguments) {
+    const std::string why = log_.begin(path, arguments);
+    if (!why.empty()) boxes_.show({BoxIcon::Critical, why});
+    panel_.UtilityRecord.Checked = why.empty();
+    return why.empty();
+}
+
+void SessionKeys::UtilityRecord_Click() {
+    if (log_.writing()) {
+        log_.end();
+        panel_.UtilityRecord.Checked = false;
+        return;
+    }
+    const auto path = dialogs_.save({.title = "Record Session",
+                                     .filter = "Session logs (*.log)|*.log|All files (*.*)|*.*",
+                                     .folder = {},
+                                     .fileName = "session.log",
+                                     .promptOverwrite = true});
+    if (path) begin(*path, panel_.CommandLine.empty() ? "zelremote" : panel_.CommandLine);
+}
+
+}  // namespace zel
