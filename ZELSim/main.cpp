@@ -10,11 +10,13 @@
 #include "ZELSim/Device.h"
 #include "ZELSim/Faults.h"
 #include "ZELSim/Modem.h"
+#include "ZELSim/ReplayLine.h"
 #include "ZELSim/TransportPty.h"
 #include "ZELSim/TransportTcp.h"
 #include "ZELSim/Wire.h"
 #include "support/ExitStatus.h"
 #include "support/NumberOption.h"
+#include "support/SessionText.h"
 #include "support/VersionInfo.h"
 
 namespace {
@@ -26,6 +28,8 @@ struct Options {
     std::string link;
     std::string tcp;
     std::vector<std::string> faults;
+    std::string replay;
+    bool pace = false;
     zelsim::DeviceSetup device;
     zelsim::WireSetup wire;
 };
@@ -48,7 +52,7 @@ int servePty(const Options& options, zelsim::HostLine& line) {
     return zelsim::serve(line, endpoint) ? 0 : fail("cannot wait for the line");
 }
 
-int serveTcp(const Options& options, zelsim::Wire& wire) {
+int serveTcp(const Options& options, zelsim::HostLine& wire) {
     zelsim::TcpEndpoint endpoint;
     if (!endpoint.open(options.tcp)) {
         return fail(endpoint.problem());
@@ -73,7 +77,44 @@ bool readPhonebook(const std::string& file, zelsim::Phonebook& book) {
     return false;
 }
 
+/// The text of a session log, as far as logs are read.
+bool readSession(const std::string& file, zel::SessionRecord& record) {
+    std::ifstream stream;
+    stream.imbue(std::locale::classic());
+    stream.open(file, std::ios::binary);
+    std::string text;
+    char byte = 0;
+    while (text.size() <= zel::kLongestSession && stream.get(byte)) {
+        text += byte;
+    }
+    if (text.empty() || text.size() > zel::kLongestSession) {
+        std::cerr << "ZELSim: " << file << ": "
+                  << (text.empty() ? "cannot be read, or is empty" : "is too long") << '\n';
+        return false;
+    }
+    record = zel::parseSession(text);
+    if (!record.problem.empty()) {
+        std::cerr << "ZELSim: " << file << ": " << record.problem << '\n';
+    }
+    return !record.events.empty();
+}
+
+int runReplay(const Options& options) {
+    zel::SessionRecord record;
+    if (!readSession(options.replay, record)) {
+        return zel::kLinkFailed;
+    }
+    zelsim::catchEndSignals();
+    zelsim::ReplayLine line(record, options.pace);
+    line.differs = [](const std::string& what) { std::cerr << what << std::endl; };
+    const int status = options.pty ? servePty(options, line) : serveTcp(options, line);
+    return line.compare().difference() ? zel::kLinkFailed : status;
+}
+
 int run(Options& options) {
+    if (!options.replay.empty()) {
+        return runReplay(options);
+    }
     zelsim::Phonebook book;
     if (!readPhonebook(options.phonebook, book)) {
         return zel::kWrongUse;
@@ -146,6 +187,16 @@ int main(int argc, char** argv) {
     app.add_option("--fault", options.faults, "A fault on purpose, see below")
         ->type_name("KIND[:NAME=VALUE,...]")
         ->allow_extra_args(false);
+    auto* replay =
+        app.add_option("--replay", options.replay,
+                       "Answer as the instrument of this session log did; the first byte that\n"
+                       "differs is reported on standard error, and nothing is answered from then\n"
+                       "on. The status at the end is 1 then.")
+            ->type_name("FILE")
+            ->excludes(modem)
+            ->excludes(strict);
+    app.add_flag("--pace", options.pace, "With --replay: answer at the recorded times")
+        ->needs(replay);
     try {
         app.parse(argc, argv);
         if (!options.pty && options.tcp.empty()) {

@@ -99,9 +99,13 @@ Done pressNamedKey(Control& control, std::string_view name) {
     const ControlKind kind = control.kind();
     const bool hasKeys =
         kind == ControlKind::TextBox || kind == ControlKind::Button || kind == ControlKind::Graph;
-    if (!hasKeys) return Done::Unfit;
+    if (!hasKeys && (key == nullptr || key->code != kKeyF1)) return Done::Unfit;
     if (key == nullptr) return Done::NoKey;
     if (const Done refused = refusal(control, true); refused != Done::Yes) return refused;
+    if (!hasKeys) {
+        control.form().KeyDown(key->code, 0);
+        return Done::Yes;
+    }
     if (kind == ControlKind::Button) {
         static_cast<Button&>(control).KeyDown(key->code, 0);
     } else if (kind == ControlKind::Graph) {

@@ -6,6 +6,7 @@
 #include "console/Address.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtSystem.h"
+#include "platform/virtual/FixedMachine.h"
 #include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/ScriptedServer.h"
 #include "platform/virtual/ScriptedSocket.h"
@@ -25,6 +26,9 @@ class SimulatorFront : public Front {
   public:
     explicit SimulatorFront(const std::string& home) : folder_(QString::fromStdString(home)) {
         ports_.ports = {kSimulatorPort};
+        portProbe_.known = {{kSimulatorPort, "", "built-in simulator", ""}};
+        portProbe_.rights[kSimulatorPort] = {
+            .exists = true, .terminal = true, .usable = true, .group = {}};
         tcpSocket_.connectsTo(SocketState::Error);  // there is no network in here
     }
     const Clock& clock() const override { return clock_; }
@@ -54,7 +58,7 @@ class SimulatorFront : public Front {
     MemoryStartupFolder startup_;
     SystemFiles files_;
     SystemMachine machine_;
-    SystemPortProbe portProbe_;
+    FixedProbe portProbe_;
 };
 
 class PortFront : public Front {

@@ -10,6 +10,7 @@
 #include "link/WireText.h"
 #include "server/Networks.h"
 #include "support/NumberOption.h"
+#include "support/SessionText.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -138,6 +139,17 @@ struct Parser {
             verb(Verb::Analyse, "analyse", "Measures the traces of saved views and recordings");
         analyse->add_option("FILE", options.traceFiles, "Saved views and recordings")->required();
         addAnalysisOptions(*analyse, analysis);
+        addSupportVerbs(options);
+    }
+
+    void addSupportVerbs(Options& options) {
+        verb(Verb::Words, "words", "Lists the instrument's words: meaning, unit, range or codes");
+        CLI::App* doctor =
+            verb(Verb::Doctor, "doctor", "Finds out what is wrong on the way to the instrument");
+        doctor->add_option("URL", options.argument, std::string("The connection: ") + kAddresses);
+        CLI::App* replay =
+            verb(Verb::Replay, "replay", "Runs a recorded session again and compares");
+        replay->add_option("FILE", options.argument, "Session log, as --log writes it")->required();
     }
 
     void addRemoteVerbs(Options& options) {
@@ -220,7 +232,8 @@ struct Parser {
 
 std::string missing(const Options& options) {
     if (options.verb == Verb::Panel || options.verb == Verb::Show || options.verb == Verb::Serve ||
-        options.verb == Verb::Devices || options.verb == Verb::Analyse)
+        options.verb == Verb::Devices || options.verb == Verb::Analyse ||
+        options.verb == Verb::Words || options.verb == Verb::Doctor || options.verb == Verb::Replay)
         return {};
     if (options.verb == Verb::Run && !options.address) return {};
     if (!options.address) return "this verb needs an instrument: --connect URL";
@@ -244,10 +257,17 @@ std::optional<int> parseOptions(int argc, const char* const* argv, Options& opti
     if (const auto status = readCommandLine(parser.app, argc, argv, out, errors)) return status;
     options.home = parser.common.home;
     options.words = parser.common.words;
+    options.log = parser.common.log;
+    options.given = joinArguments({argv + std::min(argc, 1), argv + argc});
     options.verb = parser.verbs.at(parser.app.get_subcommands().front());
     if (const std::string& url = parser.common.connect; !url.empty()) {
         options.address = parseAddress(url);
         if (!options.address) return refuseAddress(parser.app, kAddresses, url, errors);
+    }
+    if (options.verb == Verb::Doctor && !options.argument.empty()) {
+        options.address = parseAddress(options.argument);
+        if (!options.address)
+            return refuseAddress(parser.app, kAddresses, options.argument, errors);
     }
     if (options.verb == Verb::Analyse) {
         options.analysis = parser.analysis;

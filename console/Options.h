@@ -11,7 +11,23 @@
 
 namespace zel {
 
-enum class Verb { Info, Get, Set, Cmd, Sweep, Record, Show, Run, Panel, Serve, Devices, Analyse };
+enum class Verb {
+    Info,
+    Get,
+    Set,
+    Cmd,
+    Sweep,
+    Record,
+    Show,
+    Run,
+    Panel,
+    Serve,
+    Devices,
+    Words,
+    Doctor,
+    Replay,
+    Analyse
+};
 
 /// What the server and the devices take.
 struct ServeOptions {
@@ -31,6 +47,8 @@ struct Options {
     std::optional<ConnectAddress> address;
     std::string home;   ///< the application's folder; empty for the user's own
     std::string words;  ///< the program's command line
+    std::string log;    ///< file of the session's record; empty for none
+    std::string given;  ///< all arguments as one line, as the record keeps them
     bool verbose = false;
     Verb verb = Verb::Info;
     std::string argument;     ///< keyword of get, set, cmd; file of show, run and panel

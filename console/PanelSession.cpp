@@ -8,7 +8,11 @@
 #include "console/Graph3DText.h"
 #include "console/GraphText.h"
 #include "console/LogAccess.h"
+#include "console/PanelHelp.h"
 #include "support/NumberText.h"
+#include "support/RoboHelp_CSH.h"
+#include "support/RunTimeError.h"
+#include "support/SessionLog.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -43,7 +47,8 @@ const PanelSession::CommandRow PanelSession::kCommands[] = {
     {"connect", &PanelSession::connect}, {"disconnect", &PanelSession::disconnect},
     {"answer", &PanelSession::answer},   {"pump", &PanelSession::pump},
     {"image3d", &PanelSession::image3d}, {"quit", &PanelSession::quit},
-    {"call", &PanelSession::call},
+    {"call", &PanelSession::call},       {"fail", &PanelSession::fail},
+    {"help", &PanelSession::help},       {"list", &PanelSession::list},
 };
 
 PanelSession::PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address)
@@ -55,9 +60,20 @@ PanelSession::PanelSession(Program& program, const Means& means, std::optional<L
     });
     handlers_.on(program_.logs().DebuggerLine,
                  [this](const std::string& text) { m_.errors.line(text); });
+    // No viewer starts here.
+    const auto shown = [this](const std::string&, int, int context) {
+        m_.output.line("help " + std::to_string(context));
+        return true;
+    };
+    program_.help().HtmlHelpA = shown;
+    program_.help().WinHelpA = shown;
 }
 
-PanelSession::~PanelSession() { m_.events.whileWaiting = nullptr; }
+PanelSession::~PanelSession() {
+    m_.events.whileWaiting = nullptr;
+    program_.help().HtmlHelpA = nullptr;
+    program_.help().WinHelpA = nullptr;
+}
 
 int PanelSession::run() {
     interlock_.beginCommand();
@@ -67,10 +83,9 @@ int PanelSession::run() {
     serveLines();
     if (!program_.ended()) program_.disconnect();
     m_.output.settle();
-    if (!program_.endedBy().empty()) {
-        m_.errors.line("zelctl: ended by " + program_.endedBy());
-        if (status_ == kDone) status_ = kLinkFailed;
-    }
+    if (!program_.endedBy().empty()) m_.errors.line("zelctl: ended by " + program_.endedBy());
+    const bool broken = !program_.endedBy().empty() || program_.failed();
+    if (broken && status_ == kDone) status_ = kLinkFailed;
     return status_;
 }
 
@@ -129,6 +144,7 @@ bool PanelSession::readAndExecute() {
             return false;
         case LineInput::Got::End:
             // The attempt under way is still to come to its end.
+            if (!atEnd_) program_.sessionLog().input("quit");
             atEnd_ = true;
             ended_ = !connecting_;
             return ended_;
@@ -163,6 +179,7 @@ void PanelSession::execute(std::string_view line) {
     if (!line.empty() && line.back() == '\r') line.remove_suffix(1);
     line.remove_prefix(std::min(line.find_first_not_of(kBlanks), line.size()));
     if (line.empty() || line.front() == '#') return;
+    program_.sessionLog().input(std::string(line));
     const auto [word, rest] = firstWord(line);
     std::string problem;
     if (runGraph3DCommand(program_.forms().waterfall.Graph3D, word, rest, problem)) {
@@ -184,7 +201,7 @@ void PanelSession::runCommand(const std::function<void()>& command) {
         command();
     } catch (...) {
         connecting_ = false;
-        program_.showFailure();  // the session goes on
+        program_.showFailure();
     }
     --depth_;
     interlock_.endCommand();
@@ -284,6 +301,7 @@ void PanelSession::show(std::string_view rest) {
             m_.output.line(line);
         return;
     }
+    if (showService(path)) return;
     const std::optional<std::string> text =
         namesALog(path) ? logMember(program_.logs(), path)
                         : textOf(program_.forms(), program_.variables(), path);
@@ -292,6 +310,19 @@ void PanelSession::show(std::string_view rest) {
     } else {
         complain("there is nothing to show as \"" + path + "\"");
     }
+}
+
+/// What is no property: true when the path names it.
+bool PanelSession::showService(const std::string& path) {
+    if (path == "help") {
+        m_.output.line(program_.help().book());
+    } else if (path == "clipboard") {
+        const std::string text = replaceAll(program_.clipboard().text(), kCrLf, "\n");
+        m_.output.line(replaceAll(replaceAll(text, "\r", "\n"), "\n", " / "));
+    } else {
+        return false;
+    }
+    return true;
 }
 
 void PanelSession::image3d(std::string_view rest) {
@@ -342,6 +373,26 @@ void PanelSession::call(std::string_view rest) {
     if (!result)
         return complain("there is no routine \"" + std::string(name) + "\" of these arguments");
     if (!result->empty()) m_.output.line(*result);
+}
+
+void PanelSession::fail(std::string_view rest) {
+    const auto arguments = splitArguments(rest);
+    const auto number =
+        arguments && arguments->size() == 3 ? wholeNumber((*arguments)[0]) : std::optional<int>();
+    if (!number) return complain("fail takes NUMBER \"SOURCE\" \"DESCRIPTION\"");
+    Event<> happened;
+    happened.connect([&] { throw RunTimeError(*number, (*arguments)[1], (*arguments)[2]); });
+    happened();
+}
+
+void PanelSession::help(std::string_view) { m_.output.lines(panelHelp()); }
+
+void PanelSession::list(std::string_view rest) {
+    const std::string form = trimmed(rest);
+    if (form.empty()) return m_.output.lines(formList(program_.forms()));
+    const auto lines = controlList(program_.forms(), form);
+    if (!lines) return complain("there is no form \"" + form + "\"");
+    m_.output.lines(*lines);
 }
 
 }  // namespace zel

@@ -70,6 +70,10 @@ class PanelSession {
     void image3d(std::string_view rest);
     void quit(std::string_view rest);
     void call(std::string_view rest);
+    void fail(std::string_view rest);
+    void help(std::string_view rest);
+    void list(std::string_view rest);
+    bool showService(const std::string& path);
 
     void act(const Control& control, const std::string& name, const std::function<Done()>& work);
     void runCommand(const std::function<void()>& command);

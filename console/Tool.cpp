@@ -7,6 +7,7 @@
 #include <locale>
 #include <memory>
 
+#include "connection/Doctor.h"
 #include "console/AnalysisVerb.h"
 #include "console/ConsoleDialogs.h"
 #include "console/DebugWatch.h"
@@ -18,31 +19,44 @@
 #include "console/ServeVerb.h"
 #include "console/ServingEvents.h"
 #include "console/Verbs.h"
+#include "desktop/platform/CrashTrace.h"
 #include "desktop/platform/QtSignals.h"
+#include "model/InstrumentWords.h"
 #include "rehearsal/Rehearsal.h"
+#include "shell/Logs.h"
+#include "support/ErrorReport.h"
+#include "support/SessionLog.h"
+#include "support/Text.h"
 
 namespace zel {
 namespace {
 
 /// What both kinds of run stand on.
 struct Stage {
-    Stage(const Options& options, Front& front, LineOutput& boxOutput, LineOutput& errorOutput)
+    Stage(const Options& options, Front& front, LineOutput& boxOutput, LineOutput& errorOutput,
+          const Rerun* rerun)
         : boxes(boxOutput, answers),
           dialogs(boxOutput, answers),
           events(front.events()),
-          files(front.platform(events, boxes, dialogs).files),
-          program(front.platform(events, boxes, dialogs), options.words),
+          overlay(rerun == nullptr ? nullptr
+                                   : rerun->files(front.platform(events, boxes, dialogs).files)),
+          files(overlay ? *overlay : front.platform(events, boxes, dialogs).files),
+          program(platformOf(front), options.words),
           watch(program.forms().controller) {
         events.always = [&front] { front.endSignals().deliver(); };
+        // A session that runs again draws nothing.
         program.forms().controller.DrawImage.connect(
-            [this](const std::string& file, std::string& problem) {
-                problem = drawGraphImage(program, file);
+            [this, rerun](const std::string& file, std::string& problem) {
+                problem = rerun == nullptr ? drawGraphImage(program, file) : "";
             });
         program.forms().waterfall.DrawImage.connect(
-            [this](const std::string& file, std::string& problem) {
-                problem = drawWaterfallImage(program, file);
+            [this, rerun](const std::string& file, std::string& problem) {
+                problem = rerun == nullptr ? drawWaterfallImage(program, file) : "";
             });
         offerRehearsal(program, boxes, files);
+        beginRecord(options);
+        if (rerun == nullptr) watchFaults(errorOutput);
+        if (rerun != nullptr) rerun->begun(program);
         watch.onExchange = [&boxOutput] { boxOutput.settle(); };
         if (!options.verbose) return;
         const Clock& clock = front.clock();
@@ -52,10 +66,50 @@ struct Stage {
         };
     }
 
+    Platform platformOf(Front& front) {
+        Platform own = front.platform(events, boxes, dialogs);
+        return {own.clock,     own.events,     own.boxes,        own.serialPort, own.serialPorts,
+                own.tcpSocket, own.serverPort, own.serverSocket, own.settings,   own.debug,
+                own.clipboard, own.launcher,   own.startup,      own.folder,     own.fileDialogs,
+                files,         own.endSignals, own.machine,      own.portProbe};
+    }
+
+    void beginRecord(const Options& options) {
+        SessionLog& record = program.sessionLog();
+        record.simulatorPort = kSimulatorPort;
+        if (!options.log.empty()) program.recordSession(options.log, options.given);
+    }
+
+    void watchFaults(LineOutput& errors) {
+        if (!program.takeCrash().empty())
+            errors.line(
+                "zelctl: a fault ended an earlier run; its trace is in crash.1.log beside " +
+                program.crashFile());
+        traceFaultsInto({program.crashFile(), program.logs().rootDebug.FileName});
+    }
+
+    /// Runs a verb; a failure that nothing catches is printed and ends it.
+    int guarded(LineOutput& errors, const std::function<int()>& verb) {
+        program.errorReport().print = [&errors](const std::string& report) {
+            std::vector<std::string> lines = split(replaceAll(report, "\r", ""), '\n');
+            if (!lines.empty() && lines.back().empty()) lines.pop_back();
+            errors.lines(lines);
+        };
+        int status = kLinkFailed;
+        try {
+            status = verb();
+        } catch (...) {
+            program.showFailure();
+        }
+        errors.settle();
+        return program.failed() ? kLinkFailed : status;
+    }
+
     AnswerQueue answers;
     ConsoleBoxes boxes;
     ConsoleFileDialogs dialogs;
     ServingEvents events;
+    std::unique_ptr<FileService> overlay;
     FileService& files;
     Program program;
     DebugWatch watch;
@@ -81,11 +135,14 @@ void drawLine(std::ostream& stream, const std::string& text) {
            << std::flush;
 }
 
-int runPanel(const Options& options, Front& front, LineOutput& output, LineOutput& errors) {
+int runPanel(const Options& options, Front& front, LineOutput& output, LineOutput& errors,
+             const Rerun* rerun) {
     std::ifstream file;
     file.imbue(std::locale::classic());
     std::unique_ptr<LineInput> input;
-    if (options.argument.empty()) {
+    if (rerun != nullptr) {
+        input = rerun->input(front.clock(), front.events());
+    } else if (options.argument.empty()) {
         input = std::make_unique<DescriptorLines>(STDIN_FILENO, front.endSignals().descriptor());
     } else {
         file.open(options.argument, std::ios::binary);
@@ -97,7 +154,7 @@ int runPanel(const Options& options, Front& front, LineOutput& output, LineOutpu
         }
         input = std::make_unique<StreamLines>(file);
     }
-    Stage stage(options, front, output, errors);
+    Stage stage(options, front, output, errors, rerun);
     std::optional<LinkAddress> address;
     if (options.address) address = options.address->link;
     PanelSession session(stage.program,
@@ -117,13 +174,22 @@ bool missesDrawing(const Options& options) {
     return wanted && findDrawingProgram().empty();
 }
 
+int runDoctor(const Options& options, Program& program, LineOutput& output) {
+    std::optional<LinkAddress> address;
+    if (options.address) address = options.address->link;
+    program.start();
+    const bool well = program.doctor().examine(
+        address, [&output](const Finding& finding) { output.line(findingLine(finding)); });
+    return well && program.endedBy().empty() ? kDone : kLinkFailed;
+}
+
 int runOneVerb(const Options& options, Front& front, const Streams& streams, LineOutput& output,
-               LineOutput& errors) {
+               LineOutput& errors, const Rerun* rerun) {
     if (missesDrawing(options)) {
         errors.line(std::string("zelctl: ") + kNoDrawingProgram);
         return kLinkFailed;
     }
-    Stage stage(options, front, errors, errors);
+    Stage stage(options, front, errors, errors, rerun);
     if (options.verb == Verb::Analyse)
         return analyseFiles(options.traceFiles, *options.analysis, stage.files, front.clock(),
                             output, errors);
@@ -161,19 +227,39 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
                           progress,
                           script,
                           analysis ? &*analysis : nullptr};
-    if (options.verb == Verb::Serve) return runServer(options, verbs);
-    if (options.verb == Verb::Devices) return runDevices(options, verbs);
-    return runVerb(options, verbs);
+    return stage.guarded(errors, [&] {
+        if (options.verb == Verb::Doctor) return runDoctor(options, stage.program, output);
+        if (options.verb == Verb::Serve) return runServer(options, verbs);
+        if (options.verb == Verb::Devices) return runDevices(options, verbs);
+        return runVerb(options, verbs);
+    });
+}
+
+int printWords(LineOutput& output) {
+    std::vector<std::string> lines;
+    for (const InstrumentWord& word : instrumentWords()) lines.push_back(wordLine(word));
+    output.lines(lines);
+    return kDone;
+}
+
+int runAny(const Options& options, Front& front, const Streams& streams, LineOutput& output,
+           LineOutput& errors, const Rerun* rerun) {
+    switch (options.verb) {
+        case Verb::Words:
+            return printWords(output);
+        case Verb::Panel:
+            return runPanel(options, front, output, errors, rerun);
+        default:
+            return runOneVerb(options, front, streams, output, errors, rerun);
+    }
 }
 
 }  // namespace
 
-int runTool(const Options& options, Front& front, const Streams& streams) {
+int runTool(const Options& options, Front& front, const Streams& streams, const Rerun* rerun) {
     LineOutput output(streams.out, streams.outIsTerminal);
     LineOutput errors(streams.errors, streams.errorsAreTerminal);
-    const int status = options.verb == Verb::Panel
-                           ? runPanel(options, front, output, errors)
-                           : runOneVerb(options, front, streams, output, errors);
+    const int status = runAny(options, front, streams, output, errors, rerun);
     if (output.problem().empty()) return status;
     errors.line("zelctl: the output cannot be written: " + output.problem());
     return kLinkFailed;

@@ -1,9 +1,12 @@
 #pragma once
 // One run of the tool, from its options to its exit status.
 
+#include <functional>
 #include <iosfwd>
+#include <memory>
 
 #include "console/Fronts.h"
+#include "console/LineInput.h"
 #include "console/Options.h"
 
 namespace zel {
@@ -16,8 +19,16 @@ struct Streams {
     bool errorsAreTerminal = false;
 };
 
+/// What takes the place of the user and of the disk when a recorded session runs again.
+struct Rerun {
+    std::function<void(Program&)> begun;  ///< before the program starts
+    std::function<std::unique_ptr<FileService>(FileService& disk)> files;
+    std::function<std::unique_ptr<LineInput>(const Clock&, Events&)> input;
+};
+
 /// The exit status. Results that cannot be written end the run with 1. Lines of a panel session
 /// without a file come from standard input.
-int runTool(const Options& options, Front& front, const Streams& streams);
+int runTool(const Options& options, Front& front, const Streams& streams,
+            const Rerun* rerun = nullptr);
 
 }  // namespace zel

@@ -8,6 +8,7 @@
 
 #include "console/Fronts.h"
 #include "console/Options.h"
+#include "console/ReplayVerb.h"
 #include "console/Tool.h"
 #include "support/ExitStatus.h"
 
@@ -19,12 +20,13 @@ int main(int argc, char** argv) {
         return std::cout.flush() ? *status : zel::kLinkFailed;
     try {
         const zel::ToolkitSession toolkit(argc, argv);
+        const zel::Streams streams{std::cout, std::cerr, isatty(STDOUT_FILENO) != 0,
+                                   isatty(STDERR_FILENO) != 0};
+        if (options.verb == zel::Verb::Replay) return zel::runReplay(options, streams);
         const bool simulated = options.address && options.address->simulated;
         const auto front =
             simulated ? zel::makeSimulatorFront(options.home) : zel::makePortFront(options.home);
-        return zel::runTool(
-            options, *front,
-            {std::cout, std::cerr, isatty(STDOUT_FILENO) != 0, isatty(STDERR_FILENO) != 0});
+        return zel::runTool(options, *front, streams);
     } catch (const std::exception& problem) {
         std::cerr << "zelctl: " << problem.what() << '\n';
         return zel::kLinkFailed;

@@ -8,6 +8,7 @@
 #include "desktop/platform/CommonOptions.h"
 #include "support/LinkAddressText.h"
 #include "support/NumberText.h"
+#include "support/SessionText.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -61,6 +62,8 @@ std::optional<int> parseStartOptions(int argc, const char* const* argv, StartOpt
 
     options.home = common.home;
     options.words = common.words;
+    options.log = common.log;
+    options.given = joinArguments({argv + std::min(argc, 1), argv + argc});
     for (const std::string& word : words) {
         if (isFile(word))
             options.file = word;

@@ -16,6 +16,8 @@ struct StartOptions {
     std::string home;                  ///< the application's folder; empty for the user's own
     std::string words;                 ///< the program's command line
     std::string file;                  ///< saved view or recording to show; empty for none
+    std::string log;                   ///< file of the session's record; empty for none
+    std::string given;                 ///< all arguments as one line
     std::string screenshot;            ///< file of a picture of the window; empty for none
     QSize size;                        ///< of the window; none where it is not valid
     std::optional<ThemeChoice> theme;  ///< none: as it was chosen last

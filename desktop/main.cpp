@@ -8,13 +8,16 @@
 #include "desktop/StartOptions.h"
 #include "desktop/help/HelpKeyFilter.h"
 #include "desktop/help/HelpViewer.h"
+#include "desktop/platform/CrashTrace.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/GuardedApplication.h"
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
 #include "rehearsal/Rehearsal.h"
+#include "shell/Logs.h"
 #include "shell/Program.h"
+#include "support/ErrorReport.h"
 #include "support/ExitStatus.h"
 #include "support/VersionInfo.h"
 
@@ -49,11 +52,12 @@ int main(int argc, char** argv) {
     zel::applyTheme(application, theme);
     zel::Program program(platform.bundle(), options.words);
     zel::offerRehearsal(program, platform.boxes, platform.files);
+    if (!options.log.empty()) program.recordSession(options.log, "zelremote " + options.given);
     application.catchInto([&program] { program.showFailure(); });
     int result = 0;
     // Every wait and loop on the stack comes back, since the program has ended.
     program.Ended.connect([&] {
-        if (!program.endedBy().empty()) result = zel::kLinkFailed;
+        if (!program.endedBy().empty() || program.failed()) result = zel::kLinkFailed;
         QApplication::exit(result);
     });
     zel::HelpViewer help(QString::fromStdString(platform.folder.programPath()),
@@ -76,6 +80,9 @@ int main(int argc, char** argv) {
         program.start();
         if (program.ended()) return;
         window.show();
+        if (const std::string trace = program.takeCrash(); !trace.empty())
+            program.errorReport().displayCrash(trace);
+        zel::traceFaultsInto({program.crashFile(), program.logs().rootDebug.FileName});
         if (!options.file.empty()) program.forms().controller.OpenFile(options.file);
         if (options.address) program.connect(*options.address, true);
         if (program.ended()) return;

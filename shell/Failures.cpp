@@ -23,7 +23,7 @@ void Failures::handle() {
     RootDebug& log = logs_.rootDebug;
     log.FileLogEnabled = true;
     log.FileTimeStamping = true;
-    log.LogRuntimeError("ZELRemote", "", "EventHandler", failure);
+    log.LogRuntimeError("ZELRemote", "Program", "EventHandler", failure);
     // Without the window the program ends all the same.
     if (!handling_) finish();
 }

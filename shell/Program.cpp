@@ -6,6 +6,7 @@
 #include "connection/Devices.h"
 #include "connection/Dialling.h"
 #include "connection/Disconnection.h"
+#include "connection/DoctorKeys.h"
 #include "connection/Handshake.h"
 #include "connection/Profiles.h"
 #include "connection/SessionClock.h"
@@ -53,6 +54,7 @@
 #include "shell/StartUp.h"
 #include "support/AboutBox.h"
 #include "support/ErrorReport.h"
+#include "support/FileText.h"
 #include "support/RoboHelp_CSH.h"
 #include "trace/FrequencyLabels.h"
 #include "trace/GraphInteraction.h"
@@ -169,6 +171,8 @@ struct Program::Rooms {
                 {p.machine, p.files, p.clock, p.clipboard, p.launcher, boxes, p.events},
                 p.folder.path() + "/registry.ini"),
           report(forms.error, {p.clipboard, p.fileDialogs, p.files, boxes, p.events}),
+          doctor({p.portProbe, p.serialPort, p.tcpSocket, p.clock, p.events}),
+          doctorKeys(forms, doctor, p.clipboard, p.events),
           sessionKeys(panel, record, p.fileDialogs, boxes),
           failures(logs, report, [this] { endAfterFailure(); }) {
         panel.CommandLine = std::move(commandLine);
@@ -302,6 +306,8 @@ struct Program::Rooms {
     ProgramEnd end;
     AboutBox about;
     ErrorReport report;
+    Doctor doctor;
+    DoctorKeys doctorKeys;
     SessionKeys sessionKeys;
     Failures failures;
     Handlers handlers;
@@ -322,9 +328,28 @@ void Program::showFailure() {
 }
 
 bool Program::failed() const { return rooms_->failures.failed(); }
+std::string Program::crashFile() const { return rooms_->platform.folder.path() + "/crash.log"; }
+
+std::string Program::takeCrash() {
+    constexpr std::uint64_t kLongest = 1'000'000;
+    FileService& files = rooms_->platform.files;
+    const std::string file = crashFile();
+    if (!files.stat(file).isRegular()) return {};
+    FileProblem problem;
+    const std::string trace = readFile(files, file, kLongest, problem).value_or("");
+    files.replace(rooms_->platform.folder.path() + "/crash.1.log", trace);
+    files.remove(file);
+    return trace;
+}
+
+bool Program::recordSession(const std::string& path, const std::string& arguments) {
+    return rooms_->sessionKeys.begin(path, arguments);
+}
+
 SessionLog& Program::sessionLog() { return guards_->log; }
 RoboHelp_CSH& Program::help() { return rooms_->help; }
 ErrorReport& Program::errorReport() { return rooms_->report; }
+Doctor& Program::doctor() { return rooms_->doctor; }
 Clipboard& Program::clipboard() { return guards_->platform.clipboard; }
 
 Forms& Program::forms() { return rooms_->forms; }

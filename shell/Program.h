@@ -17,6 +17,7 @@ struct Guards;
 
 class Clipboard;
 class CommandExchange;
+class Doctor;
 class ErrorReport;
 class Interlock;
 class Logs;
@@ -48,6 +49,7 @@ class Program {
     SessionLog& sessionLog();
     RoboHelp_CSH& help();
     ErrorReport& errorReport();
+    Doctor& doctor();
     Clipboard& clipboard();
     Interlock& interlock();
     Scripts& scripts();
@@ -85,6 +87,12 @@ class Program {
     void showFailure();
     /// A failure ended the program; its exit status is 1 then.
     bool failed() const;
+    /// The file in which a fault leaves its trace.
+    std::string crashFile() const;
+    /// What a fault of an earlier run has left, which is put aside; empty for nothing.
+    std::string takeCrash();
+    /// Writes the session down in that file, as the option and the menu do.
+    bool recordSession(const std::string& path, const std::string& arguments);
 
   private:
     std::unique_ptr<Guards> guards_;

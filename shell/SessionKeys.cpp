@@ -17,7 +17,7 @@ SessionKeys::SessionKeys(ControllerForm& panel, SessionLog& log, FileDialogs& di
 
 bool SessionKeys::begin(const std::string& path, const std::string& arguments) {
     const std::string why = log_.begin(path, arguments);
-    if (!why.empty()) boxes_.show({BoxIcon::Critical, why});
+    if (!why.empty()) boxes_.show({BoxIcon::Exclamation, why});
     panel_.UtilityRecord.Checked = why.empty();
     return why.empty();
 }

@@ -12,6 +12,7 @@ using Kind = SessionEvent::Kind;
 
 constexpr std::string_view kPin = "CPIN=";
 constexpr std::size_t kTail = 64;
+constexpr std::size_t kMostShown = 48;
 constexpr const char* kEnd = "\n";
 
 }  // namespace
@@ -77,6 +78,7 @@ void SessionLog::closed() {
 void SessionLog::note(Kind kind, std::string text) {
     last_.push_back({clock_.micros() - began_, kind, std::move(text)});
     if (last_.size() > kKept) last_.pop_front();
+    Noted(last_.back());
     if (writing()) write(sessionLine(last_.back()) + kEnd);
 }
 
@@ -95,7 +97,16 @@ void SessionLog::write(const std::string& line) {
 
 std::vector<std::string> SessionLog::lastLines() const {
     std::vector<std::string> lines;
-    for (const SessionEvent& event : last_) lines.push_back(sessionLine(event));
+    for (SessionEvent event : last_) {
+        // A trace has thousands of bytes; a report is read by people.
+        std::string rest;
+        const bool bytes = event.kind == Kind::Sent || event.kind == Kind::Came;
+        if (bytes && event.text.size() > kMostShown) {
+            rest = " ... " + std::to_string(event.text.size()) + " bytes";
+            event.text.resize(kMostShown);
+        }
+        lines.push_back(sessionLine(event) + rest);
+    }
     return lines;
 }
 

@@ -38,9 +38,11 @@ class SessionLog {
     void input(const std::string& line) { note(SessionEvent::Kind::Input, line); }
     void clicked(const std::string& control) { note(SessionEvent::Kind::Click, control); }
 
-    /// The last events as lines, the oldest first.
+    /// The last events as lines, the oldest first; of many bytes the first ones and their count.
     std::vector<std::string> lastLines() const;
 
+    /// Each event as it happens.
+    Event<const SessionEvent&> Noted;
     /// The name of a port that is the built-in simulator.
     std::string simulatorPort;
     /// The file cannot be written any more; the argument says why.

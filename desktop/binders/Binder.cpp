@@ -69,6 +69,14 @@ void Binder::act(const Control& control, std::function<void()> work) const {
     }
 }
 
+void Binder::note(const Control& control, const char* act, const std::string& rest) const {
+    if (!tell) return;
+    const std::string& form = control.form().name();
+    const std::string name =
+        form == "ControllerForm" ? control.name() : form + "." + control.name();
+    tell(act, rest.empty() ? name : name + " " + rest);
+}
+
 QObject* Binder::widgetOf(const Control& control) const {
     const auto found = entries_.find(&control);
     return found == entries_.end() ? nullptr : found->second.widget;
@@ -145,8 +153,10 @@ void Binder::describe(const Control& control, QWidget* widget) {
 
 void Binder::bind(Button& control, QPushButton* widget) {
     widget->installEventFilter(new KeyTeller(control, widget));
-    connect(widget, &QPushButton::clicked, this,
-            [this, &control] { act(control, [&control] { control.Click(); }); });
+    connect(widget, &QPushButton::clicked, this, [this, &control] {
+        note(control, "click");
+        act(control, [&control] { control.Click(); });
+    });
     follow(control, widget, [this, &control, widget] {
         widget->setText(caption(control.Caption));
         widget->setEnabled(control.Enabled && hasHandler(control) && usable(control));
@@ -170,6 +180,7 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
         });
     connect(widget, &QLineEdit::textEdited, this, [this, &control, widget](const QString& typed) {
         if (refused(control)) return markDirty(&control);
+        note(control, "set", typed.toStdString());
         control.Text = typed.toStdString();
         // A paste does not come by the keys; it edits the text, which then is to stay.
         if (!widget->typing()) control.KeyDown(kKeyRight, 0);
@@ -204,6 +215,7 @@ void Binder::bind(Label& control, QLabel* widget) {
 
 void Binder::bind(CheckBox& control, QCheckBox* widget) {
     connect(widget, &QCheckBox::clicked, this, [this, &control, widget] {
+        note(control, "click");
         act(control, [&control] { control.Click(); });
         widget->setChecked(control.Value());
         markDirty(&control);
@@ -221,6 +233,7 @@ void Binder::bind(OptionButton& control, QRadioButton* widget) {
     // The group is the form's: Qt's own exclusion would not know what code selects.
     widget->setAutoExclusive(false);
     connect(widget, &QRadioButton::clicked, this, [this, &control, widget] {
+        note(control, "click");
         act(control, [&control] { control.Click(); });
         widget->setChecked(control.Value());
         markDirty(&control);
@@ -238,6 +251,7 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
     widget->installEventFilter(new ListGuard(control, widget));
     widget->setInsertPolicy(QComboBox::NoInsert);
     connect(widget, &QComboBox::activated, this, [this, &control](int index) {
+        note(control, "choose", std::to_string(index));
         act(control, [&control, index] {
             if (!control.Locked) control.pick(index);
         });
@@ -246,6 +260,7 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
     if (control.editable()) {
         connect(widget, &QComboBox::editTextChanged, this, [this, &control](const QString& typed) {
             if (refused(control)) return markDirty(&control);
+            note(control, "set", typed.toStdString());
             control.setText(typed.toStdString());
         });
     }
@@ -271,6 +286,7 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
 void Binder::bind(Slider& control, QSlider* widget) {
     connect(widget, &QSlider::valueChanged, this, [this, &control](int value) {
         if (refused(control)) return markDirty(&control);
+        note(control, "choose", std::to_string(value));
         control.Value = value;
         control.Scrolled();
     });
@@ -295,6 +311,7 @@ void Binder::bind(Frame& control, QWidget* widget, QLabel* captionLabel) {
 
 void Binder::bind(MenuItem& control, QAction* action) {
     connect(action, &QAction::triggered, this, [this, &control] {
+        note(control, "click");
         act(control, [&control] { control.Click(); });
         markDirty(&control);
     });
@@ -319,6 +336,7 @@ void Binder::bind(MenuItem& control, QAction* action) {
 template <class T>
 void Binder::addTwin(T& control, QAction* action, std::function<void()> show) {
     connect(action, &QAction::triggered, this, [this, &control] {
+        note(control, "click");
         act(control, [&control] { control.Click(); });
         markDirty(&control);
     });

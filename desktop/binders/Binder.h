@@ -68,6 +68,9 @@ class Binder : public QObject {
     std::function<std::string(const Control&)> reasonAgainst;
     /// Runs what a user does to a control, now or in its turn; at once where it is empty.
     std::function<void(const Control&, std::function<void()>)> perform;
+    /// Hears what the user does: "click NAME", "choose NAME INDEX", "set NAME TEXT", "key NAME
+    /// enter", in two parts.
+    std::function<void(const std::string& act, const std::string& what)> tell;
     /// Whether the control was bound, for the tests.
     QObject* widgetOf(const Control& control) const;
 
@@ -81,6 +84,7 @@ class Binder : public QObject {
     void describe(const Control& control, QWidget* widget);
     bool refused(const Control& control) const;
     void act(const Control& control, std::function<void()> work) const;
+    void note(const Control& control, const char* act, const std::string& rest = {}) const;
 
     struct Entry {
         QObject* widget = nullptr;

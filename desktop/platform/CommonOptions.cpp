@@ -17,6 +17,9 @@ void addCommonOptions(CLI::App& app, CommonOptions& options, const std::string& 
         ->type_name("DIR");
     app.add_option("--words", options.words, "Words of the program's command line")
         ->type_name("TEXT");
+    app.add_option("--log", options.log,
+                   "Writes the session down: each byte each way, the port's events, the clicks")
+        ->type_name("FILE");
 }
 
 std::optional<int> readCommandLine(CLI::App& app, int argc, const char* const* argv,

@@ -14,12 +14,13 @@ struct CommonOptions {
     std::string connect;  ///< the instrument; empty for none
     std::string home;     ///< the application's folder; empty for the user's own
     std::string words;    ///< the program's command line
+    std::string log;      ///< file of the session's record; empty for none
 };
 
 /// Adds --version.
 void addVersionOption(CLI::App& app);
 
-/// Adds --connect, --home, --words and --version; `addresses` says what --connect takes.
+/// Adds --connect, --home, --words, --log and --version; `addresses` says what --connect takes.
 void addCommonOptions(CLI::App& app, CommonOptions& options, const std::string& addresses);
 
 /// Reads the command line. An exit status when the program is over with that: 0 after a help text

@@ -16,9 +16,11 @@
 #include "desktop/windows/ScriptEditorWindow.h"
 #include "desktop/windows/ScriptFormWindow.h"
 #include "desktop/windows/Shortcuts.h"
+#include "desktop/windows/SupportWindows.h"
 #include "desktop/windows/ThemeIcons.h"
 #include "desktop/windows/TraceToolsDock.h"
 #include "desktop/windows/WaterfallWindow.h"
+#include "support/SessionLog.h"
 #include "trace/Interlock.h"
 #include "trace/ViewAnnotations.h"
 
@@ -101,6 +103,12 @@ void MainWindow::buildCentre() {
 }
 
 void MainWindow::buildWindows() {
+    binder_.tell = [this](const std::string& act, const std::string& what) {
+        SessionLog& record = program_.sessionLog();
+        act == "click" ? record.clicked(what) : record.input(act + " " + what);
+    };
+    auto* help = new QShortcut(QKeySequence(Qt::Key_F1), this);
+    connect(help, &QShortcut::activated, this, [this] { panel_.KeyDown(kKeyF1, 0); });
     Forms& forms = program_.forms();
     windows_.push_back(std::make_unique<ConnectionWindow>(forms.main, binder_, this));
     windows_.push_back(std::make_unique<WaterfallWindow>(forms, binder_, this));
@@ -111,6 +119,9 @@ void MainWindow::buildWindows() {
                        static_cast<Form*>(&forms.powerAndRefl), static_cast<Form*>(&forms.time)})
         windows_.push_back(std::make_unique<PlainFormWindow>(*form, binder_, this));
     windows_.push_back(std::make_unique<TcpWindow>(forms.tcpConnection, binder_, this));
+    windows_.push_back(std::make_unique<AboutWindow>(forms.about, binder_, this));
+    windows_.push_back(std::make_unique<ErrorWindow>(forms.error, binder_, this));
+    windows_.push_back(std::make_unique<DoctorWindow>(forms.doctor, binder_, this));
     windows_.push_back(std::make_unique<DevicesWindow>(forms.devicesChoice, binder_, this));
     windows_.push_back(std::make_unique<ServerWindow>(forms.server, binder_, this));
 }

@@ -18,7 +18,6 @@ namespace {
 constexpr int kSpacing = 8;
 constexpr int kBarWidth = 84;
 constexpr int kBoxWidth = 76;
-constexpr int kHelp = 5111;
 constexpr QSize kSmallestPicture(800, 500);
 
 struct Keys {
@@ -64,7 +63,6 @@ class ColourBar : public QWidget {
 WaterfallWindow::WaterfallWindow(Forms& forms, Binder& binder, QWidget* parent)
     : FormWindow(forms.waterfall, binder, parent),
       waterfall_(forms.waterfall),
-      panel_(forms.controller),
       canvas_(new WaterfallCanvas(forms.waterfall)) {
     setWindowFlag(Qt::WindowMaximizeButtonHint);
     setSizeGripEnabled(false);
@@ -203,10 +201,6 @@ void WaterfallWindow::reject() {
     } else {
         close();
     }
-}
-
-void WaterfallWindow::keyPressEvent(QKeyEvent* event) {
-    FormWindow::keyPressEvent(event);
 }
 
 }  // namespace zel

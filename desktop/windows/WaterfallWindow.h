@@ -17,7 +17,6 @@ class WaterfallWindow : public FormWindow {
   protected:
     void focusFirst() override { canvas_->setFocus(); }
     void reject() override;
-    void keyPressEvent(QKeyEvent* event) override;
 
   private:
     QMenuBar* menus();
@@ -26,7 +25,6 @@ class WaterfallWindow : public FormWindow {
     void showScreen();
 
     WaterfallForm& waterfall_;
-    ControllerForm& panel_;
     WaterfallCanvas* canvas_;
 };
 

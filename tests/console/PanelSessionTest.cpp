@@ -116,20 +116,20 @@ TEST_F(PanelSessionTest, HiddenDisabledAndLockedControls_AreRefused) {
     EXPECT_EQ(status, kDone);
 }
 
-TEST_F(PanelSessionTest, HandlerThatThrows_EndsInABoxAndTheSessionGoesOn) {
+TEST_F(PanelSessionTest, HandlerThatThrows_OpensTheReportAndEndsTheSession) {
     prepare = [](Program& program) {
         program.forms().controller.FrequencyButton.Clicked.connect([] { throw std::bad_alloc(); });
     };
-    EXPECT_EQ(play("click FrequencyButton\nshow State\n"),
-              "box[critical] ZELRemote | There is not enough memory for this. It was not "
-              "finished.\n3\n");
-    EXPECT_EQ(status, kDone);
+    EXPECT_EQ(play("click FrequencyButton\nshow ErrorForm.Info(2).Text\n"),
+              "DESCRIPTION : There is not enough memory for this.\n");
+    EXPECT_EQ(status, kLinkFailed);
 }
 
-TEST_F(PanelSessionTest, TimerThatThrows_EndsInABoxAndTheSessionGoesOn) {
+TEST_F(PanelSessionTest, TimerThatThrows_OpensTheReportAndEndsTheSession) {
     platform.events.schedule(50, [] { throw std::runtime_error("no room"); });
-    EXPECT_EQ(play("pump 100\nshow State\n"),
-              "box[critical] ZELRemote | This could not be finished: no room\n0\n");
+    EXPECT_EQ(play("pump 100\nshow ErrorForm.Info(2).Text\nclick ErrorForm.ButtonOK\nshow State\n"),
+              "DESCRIPTION : no room\n");
+    EXPECT_EQ(status, kLinkFailed);
 }
 
 TEST_F(PanelSessionTest, BoxOfTheSameText_WithinOneLine_PrintsOnceWithItsCount) {

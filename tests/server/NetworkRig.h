@@ -255,12 +255,13 @@ struct NetworkRig {
         return {desk.clock,     desk.events,     desk.boxes,        desk.port,     desk.ports,
                 socket,         desk.serverPort, desk.serverSocket, desk.settings, desk.debug,
                 desk.clipboard, desk.launcher,   desk.startup,      desk.folder,   desk.fileDialogs,
-                desk.files,     desk.endSignals};
+                desk.files,     desk.endSignals, desk.machine,      desk.portProbe};
     }
     Platform farPlatform() {
-        return {desk.clock,  desk.events, far.boxes,       far.port,  far.ports,     far.tcpSocket,
-                line,        listener,    far.settings,    far.debug, far.clipboard, far.launcher,
-                far.startup, far.folder,  far.fileDialogs, far.files, far.endSignals};
+        return {desk.clock,    desk.events,    far.boxes,   far.port,     far.ports,
+                far.tcpSocket, line,           listener,    far.settings, far.debug,
+                far.clipboard, far.launcher,   far.startup, far.folder,   far.fileDialogs,
+                far.files,     far.endSignals, far.machine, far.portProbe};
     }
 };
 

@@ -170,7 +170,8 @@ TruthRun::TruthRun(bool tcp, std::uint64_t seed)
       program({platform.clock, platform.events, platform.boxes, port, platform.ports, socket,
                platform.serverPort, platform.serverSocket, platform.settings, platform.debug,
                platform.clipboard, platform.launcher, platform.startup, platform.folder,
-               platform.fileDialogs, platform.files, platform.endSignals},
+               platform.fileDialogs, platform.files, platform.endSignals, platform.machine,
+               platform.portProbe},
               ""),
       tcp_(tcp) {
     platform.ports.ports = {"COM1"};

@@ -1,0 +1,63 @@
+#include "console/ReplayInput.h"
+
+#include <algorithm>
+
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+using Kind = SessionEvent::Kind;
+
+constexpr std::int64_t kPatience = 60'000'000;  // microseconds that a line waits for bytes
+
+}  // namespace
+
+ReplayInput::ReplayInput(const SessionRecord& record, const SessionCompare& compare,
+                         const Clock& clock, Events& events)
+    : compare_(compare), clock_(clock), events_(events), origin_(clock.micros()) {
+    // A window writes an answer down when it is given, after the question; here it has to wait.
+    const bool window = !record.events.empty() && startsWith(record.events[0].text, "zelremote");
+    std::size_t answers = 0;
+    for (std::size_t i = 0; i < record.events.size(); ++i) {
+        const SessionEvent& event = record.events[i];
+        end_ = std::max(end_, event.micros);
+        if (event.kind == Kind::Click) items_.push_back({i, event.micros, "click " + event.text});
+        if (event.kind != Kind::Input) continue;
+        if (window && startsWith(event.text, "answer ")) {
+            items_.insert(items_.begin() + static_cast<std::ptrdiff_t>(answers++),
+                          {0, 0, event.text});
+        } else {
+            items_.push_back({i, event.micros, event.text});
+        }
+    }
+}
+
+ReplayInput::~ReplayInput() {
+    if (task_ != 0) events_.cancel(task_);
+}
+
+bool ReplayInput::due(const Item& item) {
+    const std::int64_t now = clock_.micros() - origin_;
+    if (now < item.micros) {
+        // The loop looks again at that very moment.
+        if (task_ != 0) events_.cancel(task_);
+        task_ =
+            events_.schedule(static_cast<double>(item.micros - now) / 1000, [this] { task_ = 0; });
+        return false;
+    }
+    return compare_.place() > item.event || compare_.difference() || now > item.micros + kPatience;
+}
+
+LineInput::Got ReplayInput::next(std::string& line, bool /*block*/) {
+    if (at_ == items_.size()) {
+        const bool over = compare_.complete() || compare_.difference() ||
+                          clock_.micros() - origin_ > end_ + kPatience;
+        return over ? Got::End : Got::Nothing;
+    }
+    if (!due(items_[at_])) return Got::Nothing;
+    line = items_[at_++].line;
+    return Got::Line;
+}
+
+}  // namespace zel

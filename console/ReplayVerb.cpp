@@ -1,0 +1,123 @@
+#include "console/ReplayVerb.h"
+
+#include <QTemporaryDir>
+#include <memory>
+#include <sstream>
+
+#include "console/LineOutput.h"
+#include "console/OverlayFiles.h"
+#include "console/ReplayFront.h"
+#include "console/ReplayInput.h"
+#include "desktop/platform/SystemFiles.h"
+#include "support/ExitStatus.h"
+#include "support/FileText.h"
+#include "support/LinkAddressText.h"
+#include "support/SessionCompare.h"
+#include "support/SessionLog.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+/// The options of the recorded run; those of a window become a panel session.
+Options recordedOptions(const SessionRecord& record) {
+    Options recorded;
+    const std::vector<std::string> given = splitArgumentLine(record.events.front().text);
+    std::vector<const char*> arguments = {"zelctl"};
+    for (const std::string& argument : given) arguments.push_back(argument.c_str());
+    const bool window = given.empty() || given.front() == "zelremote";
+    std::ostringstream silent;
+    const bool parsed = !window && !parseOptions(static_cast<int>(arguments.size()),
+                                                 arguments.data(), recorded, silent, silent);
+    if (!parsed || recorded.verb == Verb::Replay) {
+        recorded = {};
+        recorded.verb = Verb::Panel;
+    }
+    if (window && given.size() > 1) recorded.words = given[1];
+    recorded.log.clear();
+    recorded.image.clear();
+    recorded.waterfall.clear();
+    recorded.spectrogram.clear();
+    return recorded;
+}
+
+/// The address of the first opening in the record.
+std::optional<ConnectAddress> recordedAddress(const SessionRecord& record) {
+    for (const SessionEvent& event : record.events)
+        if (event.kind == SessionEvent::Kind::Open) return parseAddress(event.text);
+    return std::nullopt;
+}
+
+/// What differs, on the two outputs; true when something does.
+bool tellDifference(const SessionRecord& record, const SessionCompare& compare, LineOutput& output,
+                    LineOutput& errors) {
+    const auto line = [&record](std::size_t event) {
+        return "line " + std::to_string(record.numbers[event]) + ": " + record.lines[event];
+    };
+    if (const auto& difference = compare.difference()) {
+        const std::size_t last = record.events.size() - 1;
+        output.line(line(std::min(difference->event, last)));
+        errors.line("zelctl: " + difference->text);
+        return true;
+    }
+    if (compare.complete()) return false;
+    output.line(line(compare.place()));
+    errors.line("zelctl: the program did not send this");
+    return true;
+}
+
+}  // namespace
+
+int runReplay(const Options& options, const Streams& streams) {
+    LineOutput output(streams.out, streams.outIsTerminal);
+    LineOutput errors(streams.errors, streams.errorsAreTerminal);
+    const auto fail = [&errors](const std::string& what) {
+        errors.line("zelctl: " + what);
+        return kLinkFailed;
+    };
+    SystemFiles files;
+    FileProblem problem;
+    const auto text = readFile(files, options.argument, kLongestSession, problem);
+    if (!text) return fail(readProblem(options.argument, problem));
+    const SessionRecord record = parseSession(*text);
+    const bool damaged = !record.problem.empty();
+    if (damaged) errors.line("zelctl: " + options.argument + ": " + record.problem);
+    if (record.events.empty() || record.events.front().kind != SessionEvent::Kind::Start)
+        return kLinkFailed;
+
+    const QTemporaryDir own;
+    Options recorded = recordedOptions(record);
+    recorded.home = options.home.empty() ? own.path().toStdString() : options.home;
+    recorded.verbose = options.verbose;
+    recorded.address = options.address ? options.address : recorded.address;
+    if (!recorded.address) recorded.address = recordedAddress(record);
+    std::unique_ptr<Front> front;
+    if (!options.address) {
+        front = makeReplayFront(record, recorded.home);
+        // The answers come from the record, whatever the address says.
+        if (recorded.address) recorded.address->simulated = false;
+    } else {
+        front = options.address->simulated ? makeSimulatorFront(recorded.home)
+                                           : makePortFront(recorded.home);
+    }
+    SessionCompare compare(record);
+    Rerun rerun;
+    rerun.begun = [&compare](Program& program) {
+        program.sessionLog().Noted.connect([&compare](const SessionEvent& event) {
+            if (event.kind == SessionEvent::Kind::Sent) compare.sent(event.text);
+        });
+    };
+    rerun.files = [](FileService& disk) { return std::make_unique<OverlayFiles>(disk); };
+    rerun.input = [&](const Clock& clock, Events& events) {
+        return std::make_unique<ReplayInput>(record, compare, clock, events);
+    };
+    const int status = runTool(recorded, *front, streams, &rerun);
+    // Of a log that was cut nobody knows how it went on.
+    const bool beyond =
+        damaged && (!compare.difference() || compare.difference()->event >= record.events.size());
+    const bool differs = !beyond && tellDifference(record, compare, output, errors);
+    static_cast<void>(status);  // a session that failed then fails again
+    return differs || damaged ? kLinkFailed : kDone;
+}
+
+}  // namespace zel

@@ -1,0 +1,210 @@
+#include "desktop/windows/SupportWindows.h"
+
+#include <QCheckBox>
+#include <QFontDatabase>
+#include <QFormLayout>
+#include <QHBoxLayout>
+#include <QPushButton>
+#include <QScrollBar>
+#include <QStyle>
+#include <QVBoxLayout>
+
+#include "support/SupportAddress.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr int kButtonWidth = 100;
+constexpr int kPictureSize = 40;
+constexpr int kTextColumns = 84;
+
+QPushButton* key(Binder& binder, Button& control) {
+    auto* button = new QPushButton;
+    button->setAutoDefault(false);
+    button->setMinimumWidth(kButtonWidth);
+    binder.bind(control, button);
+    return button;
+}
+
+QFont evenFont() {
+    QFont font("Lucida Console");
+    if (!QFontDatabase::hasFamily(font.family()))
+        font = QFontDatabase::systemFont(QFontDatabase::FixedFont);
+    font.setStyleHint(QFont::Monospace);
+    return font;
+}
+
+/// A text of many lines to read and to copy, in a font whose columns line up.
+QPlainTextEdit* reading(Binder& binder, TextBox& control, int lines) {
+    auto* view = new QPlainTextEdit;
+    view->setReadOnly(true);
+    view->setFont(evenFont());
+    view->setLineWrapMode(QPlainTextEdit::NoWrap);
+    view->setTabChangesFocus(true);
+    const QFontMetrics metrics(view->font());
+    view->setMinimumWidth(metrics.horizontalAdvance('x') * kTextColumns / 2);
+    view->setMinimumHeight(metrics.lineSpacing() * lines);
+    binder.bindShow(control, view, [&control, view] {
+        const QString text =
+            QString::fromStdString(replaceAll(control.Text.get(), kCrLf, "\n")).trimmed();
+        if (view->toPlainText() != text) view->setPlainText(text);
+        view->setVisible(control.Visible);
+    });
+    return view;
+}
+
+/// A label whose caption keeps the signs of its keys.
+QLabel* words(Binder& binder, Label& control) {
+    auto* label = new QLabel;
+    label->setWordWrap(true);
+    label->setTextFormat(Qt::PlainText);
+    binder.bindShow(control, label, [&control, label] {
+        label->setText(
+            QString::fromStdString(captionText(control.Caption)).trimmed().replace("\r\n", "\n"));
+        label->setVisible(control.Visible);
+    });
+    return label;
+}
+
+void setCaptionSize(QLabel* label, double factor) {
+    QFont font = label->font();
+    font.setPointSizeF(font.pointSizeF() * factor);
+    font.setBold(true);
+    label->setFont(font);
+}
+
+}  // namespace
+
+AboutWindow::AboutWindow(AboutForm& form, Binder& binder, QWidget* parent)
+    : FormWindow(form, binder, parent) {
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(18, 16, 18, 14);
+    layout->setSpacing(8);
+    QLabel* title = words(binder, form.TitleLabel);
+    setCaptionSize(title, 1.7);
+    layout->addWidget(title);
+    layout->addWidget(words(binder, form.VersionLabel));
+    layout->addWidget(words(binder, form.LicenceLabel));
+    auto* parts = new QHBoxLayout;
+    for (Button* control : {&form.ShowSystemInfo, &form.ShowDriverInfo, &form.ShowLegalNotes})
+        parts->addWidget(key(binder, *control));
+    layout->addLayout(parts);
+    constexpr int kLines = 16;
+    for (TextBox* control : {&form.SystemInfo, &form.DriverInfo, &form.LegalNotes}) {
+        QPlainTextEdit* view = reading(binder, *control, kLines);
+        // The window has the same size whatever it shows.
+        layout->addWidget(view, 1);
+    }
+    layout->addStretch(0);
+    auto* keys = new QHBoxLayout;
+    keys->addWidget(key(binder, form.CreateSupportString));
+    keys->addWidget(key(binder, form.StartNISpy));
+    keys->addStretch(1);
+    QPushButton* close = key(binder, form.ButtonOK);
+    close->setDefault(true);
+    keys->addWidget(close);
+    layout->addLayout(keys);
+    setCancel(form.ButtonOK);
+    setMinimumWidth(560);
+    followForm();
+}
+
+ErrorWindow::ErrorWindow(ErrorForm& form, Binder& binder, QWidget* parent)
+    : FormWindow(form, binder, parent) {
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(18, 16, 18, 14);
+    layout->setSpacing(10);
+    auto* head = new QHBoxLayout;
+    head->setSpacing(14);
+    auto* picture = new QLabel;
+    picture->setPixmap(style()->standardIcon(QStyle::SP_MessageBoxCritical).pixmap(kPictureSize));
+    picture->setAlignment(Qt::AlignTop);
+    binder.bindShow(form.ErrirPicture, picture, [] {});
+    head->addWidget(picture);
+    auto* plain = new QVBoxLayout;
+    QLabel* first = words(binder, form.Label(0));
+    setCaptionSize(first, 1.1);
+    plain->addWidget(first);
+    plain->addWidget(words(binder, form.Label(2)));
+    head->addLayout(plain, 1);
+    layout->addLayout(head);
+
+    layout->addWidget(words(binder, form.Label(1)));
+    auto* details = new QVBoxLayout;
+    details->setSpacing(2);
+    for (TextBox& info : form.Info) {
+        auto* line = new PanelLineEdit;
+        line->setFont(evenFont());
+        binder.bind(info, line);
+        details->addWidget(line);
+    }
+    auto* calls = new QListWidget;
+    calls->setFont(evenFont());
+    calls->setMinimumHeight(QFontMetrics(calls->font()).lineSpacing() * 6);
+    binder.bindShow(form.CallerList, calls, [&form, calls] {
+        calls->clear();
+        for (const std::string& item : form.CallerList.Items.get())
+            calls->addItem(QString::fromStdString(item));
+    });
+    details->addWidget(calls, 1);
+    layout->addLayout(details, 1);
+
+    layout->addWidget(words(binder, form.Label(3)));
+    layout->addWidget(words(binder, form.Label(4)));
+    auto* attach = new QCheckBox;
+    binder.bind(form.chkAttachLog, attach);
+    layout->addWidget(attach);
+    auto* keys = new QHBoxLayout;
+    QPushButton* copy = key(binder, form.CopyToClipboard);
+    binder.bindShow(form.CopyToClipboard, copy, [&form, copy] {
+        copy->setText(QString::fromStdString(form.CopyToClipboard.Caption));  // with its key
+        copy->setEnabled(form.CopyToClipboard.Enabled);
+    });
+    keys->addWidget(copy);
+    keys->addWidget(key(binder, form.cmdSaveReport));
+    keys->addStretch(1);
+    QPushButton* close = key(binder, form.ButtonOK);
+    close->setDefault(true);
+    keys->addWidget(close);
+    layout->addLayout(keys);
+    setCancel(form.ButtonOK);
+    setMinimumSize(620, 480);
+    followForm();
+}
+
+DoctorWindow::DoctorWindow(DoctorForm& form, Binder& binder, QWidget* parent)
+    : FormWindow(form, binder, parent) {
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(14, 12, 14, 12);
+    layout->setSpacing(8);
+    auto* fields = new QFormLayout;
+    auto* address = new PanelLineEdit;
+    address->setPlaceholderText("serial:DEVICE@BAUD or tcp:HOST:PORT; empty: all ports");
+    binder.bind(form.AddressBox, address);
+    QLabel* caption = words(binder, form.AddressCaption);
+    caption->setWordWrap(false);
+    caption->setBuddy(address);
+    fields->addRow(caption, address);
+    layout->addLayout(fields);
+    constexpr int kLines = 14;
+    QPlainTextEdit* findings = reading(binder, form.FindingsBox, kLines);
+    findings->setLineWrapMode(QPlainTextEdit::WidgetWidth);
+    layout->addWidget(findings, 1);
+    QLabel* status = words(binder, form.StatusLabel);
+    status->setMinimumHeight(status->fontMetrics().lineSpacing());
+    layout->addWidget(status);
+    auto* keys = new QHBoxLayout;
+    QPushButton* again = key(binder, form.cmdRunAgain);
+    again->setDefault(true);
+    keys->addWidget(again);
+    keys->addWidget(key(binder, form.cmdCopy));
+    keys->addStretch(1);
+    keys->addWidget(key(binder, form.cmdClose));
+    layout->addLayout(keys);
+    setCancel(form.cmdClose);
+    setMinimumSize(640, 440);
+    followForm();
+}
+
+}  // namespace zel

@@ -1,0 +1,205 @@
+#include <gtest/gtest.h>
+
+#include "ZELSim/InProcessPort.h"
+#include "connection/Doctor.h"
+#include "platform/virtual/VirtualPlatform.h"
+#include "support/Text.h"
+
+namespace zel {
+namespace {
+
+constexpr const char* kPath = "/dev/ttyUSB0";
+
+struct DoctorTest : ::testing::Test {
+    DoctorTest() {
+        platform.portProbe.known = {{kPath, "Maker", "Adapter", "A123"}};
+        platform.portProbe.rights[kPath] = {
+            .exists = true, .terminal = true, .usable = true, .group = {}};
+        platform.portProbe.lines[kPath] = {.cts = true};
+    }
+    /// The findings by name, at a port of the test's choice.
+    std::string look(SerialPort& port, std::optional<LinkAddress> address) {
+        Doctor doctor(
+            {platform.portProbe, port, platform.tcpSocket, platform.clock, platform.events});
+        std::string text;
+        well = doctor.examine(address, [&](const Finding& finding) {
+            text += findingLine(finding) + "\n";
+            if (finding.grade != Finding::Grade::Ok) EXPECT_NE(finding.remedy, "");
+        });
+        return text;
+    }
+    std::string look(int baud = 57600) {
+        return look(platform.port, LinkAddress{LinkAddress::Kind::Serial, kPath, baud});
+    }
+    bool wrote() const { return !platform.port.written().empty(); }
+
+    VirtualPlatform platform;
+    bool well = false;
+};
+
+TEST_F(DoctorTest, InstrumentAtTheRightSpeed_IsFound) {
+    zelsim::InProcessPort port(platform.clock, platform.events, {}, {.baud = 57600});
+    EXPECT_EQ(look(port, LinkAddress{LinkAddress::Kind::Serial, kPath, 57600}),
+              "ok device: /dev/ttyUSB0: Maker Adapter, serial number A123\n"
+              "ok rights: /dev/ttyUSB0 may be read and written\n"
+              "ok holder: no program holds /dev/ttyUSB0\n"
+              "ok lines: CTS on, DSR off, DCD off, RI off\n"
+              "ok loopback: nothing of what was sent came back\n"
+              "ok search: an instrument answers at 57600 baud: "
+              "Marlow&Tenby,9102,100234,V2.31\n");
+    EXPECT_TRUE(well);
+    EXPECT_FALSE(port.isOpen());
+}
+
+TEST_F(DoctorTest, InstrumentAtAnotherSpeed_IsFoundWithTheRemedy) {
+    zelsim::InProcessPort port(platform.clock, platform.events, {}, {.baud = 38400});
+    const std::string text = look(port, LinkAddress{LinkAddress::Kind::Serial, kPath, 57600});
+    EXPECT_TRUE(contains(text, "warning search: an instrument answers at 38400 baud")) << text;
+    EXPECT_TRUE(contains(text, "; Choose 38400 baud for the connection.\n")) << text;
+    EXPECT_TRUE(well);
+}
+
+TEST_F(DoctorTest, SilentLine_IsAFault) {
+    platform.port.expect("\r");
+    EXPECT_TRUE(contains(look(),
+                         "fault search: no instrument answers; what came at each speed: "
+                         "57600 nothing, 115200 nothing"));
+    EXPECT_FALSE(well);
+}
+
+TEST_F(DoctorTest, PortThatIsHeld_IsNotWrittenTo) {
+    platform.portProbe.held[kPath] = {{{4711, "minicom", false}}, true};
+    const std::string text = look();
+    EXPECT_TRUE(contains(text,
+                         "fault holder: /dev/ttyUSB0 is held by minicom (process 4711); Close "
+                         "minicom, then run the doctor again.\n"));
+    EXPECT_FALSE(contains(text, "search"));
+    EXPECT_FALSE(wrote());
+    EXPECT_FALSE(well);
+}
+
+/// A holder that comes while the port is being opened.
+struct LateHolder : FixedProbe {
+    int asked = 0;
+    PortHolders holders(const std::string&) override {
+        if (++asked < 2) return {};
+        return {{{4711, "minicom", false}}, true};
+    }
+};
+
+TEST_F(DoctorTest, HolderThatComesInBetween_IsNotDisturbed) {
+    LateHolder probe;
+    probe.known = platform.portProbe.known;
+    probe.rights = platform.portProbe.rights;
+    Doctor doctor({probe, platform.port, platform.tcpSocket, platform.clock, platform.events});
+    std::string text;
+    EXPECT_FALSE(doctor.examine(LinkAddress{LinkAddress::Kind::Serial, kPath, 57600},
+                                [&](const Finding& f) { text += findingLine(f) + "\n"; }));
+    EXPECT_TRUE(contains(text, "fault open:")) << text;
+    EXPECT_FALSE(wrote());
+    EXPECT_FALSE(platform.port.isOpen());
+}
+
+TEST_F(DoctorTest, OwnSession_IsLeftAlone) {
+    SerialSetup setup;
+    setup.CommPort = kPath;
+    platform.port.open(setup);
+    EXPECT_TRUE(contains(look(), "ok port: a session is under way on the serial port"));
+    EXPECT_TRUE(platform.port.isOpen());
+    EXPECT_FALSE(wrote());
+}
+
+TEST_F(DoctorTest, MissingRights_NameTheGroup) {
+    PortAccess& access = platform.portProbe.rights[kPath];
+    access.usable = false;
+    access.group = "dialout";
+    EXPECT_TRUE(contains(look(),
+                         "fault rights: no rights to use /dev/ttyUSB0; Add yourself to the "
+                         "group \"dialout\""));
+    access.member = true;
+    EXPECT_TRUE(contains(look(), "; Log out and in again, so that your group \"dialout\""));
+    access.group = "";
+    EXPECT_TRUE(contains(look(), "; Install the udev rule"));
+    EXPECT_FALSE(wrote());
+}
+
+TEST_F(DoctorTest, WhatIsNoPort_IsSaid) {
+    platform.portProbe.rights[kPath].terminal = false;
+    EXPECT_TRUE(contains(look(), "fault port: /dev/ttyUSB0 is no serial port"));
+    platform.portProbe.rights[kPath].exists = false;
+    EXPECT_TRUE(contains(look(), "fault port: /dev/ttyUSB0 is not there"));
+}
+
+TEST_F(DoctorTest, ModemManagersAndLinesThatAreOff_AreWarnings) {
+    platform.portProbe.managers = {"ModemManager"};
+    platform.portProbe.lines[kPath] = {};
+    platform.portProbe.held[kPath] = {{}, false};
+    const std::string text = look();
+    EXPECT_TRUE(contains(text, "warning manager: ModemManager runs"));
+    EXPECT_TRUE(contains(text, "warning lines: CTS off, DSR off, DCD off, RI off; Check"));
+    EXPECT_TRUE(contains(text, "ok holder: no program that this user may look at holds"));
+}
+
+/// Gives back what is sent.
+struct EchoPort : SerialPort {
+    std::string bytes;
+    bool is = false;
+    bool open(const SerialSetup&) override { return is = true; }
+    void close() override { is = false; }
+    bool isOpen() const override { return is; }
+    std::string input() override { return std::exchange(bytes, {}); }
+    void output(std::string_view sent) override { bytes += sent; }
+    std::string problem() const override { return {}; }
+};
+
+TEST_F(DoctorTest, LoopbackPlug_IsFound) {
+    EchoPort port;
+    const std::string text = look(port, LinkAddress{LinkAddress::Kind::Serial, kPath, 57600});
+    EXPECT_TRUE(contains(text,
+                         "warning loopback: what was sent to /dev/ttyUSB0 came back as it "
+                         "was; Take the loopback plug off"))
+        << text;
+}
+
+TEST_F(DoctorTest, NoDeviceAndNoAddress_IsAWarning) {
+    platform.portProbe.known.clear();
+    EXPECT_EQ(
+        look(platform.port, std::nullopt),
+        "warning device: no serial port was found; Plug the cable in, or type the name of the "
+        "device.\n");
+    EXPECT_TRUE(well);
+}
+
+TEST_F(DoctorTest, ServerThatAnswers_IsFound) {
+    platform.tcpSocket.expect("\r");
+    platform.tcpSocket.expect("GET\r").answer("0\r");
+    platform.tcpSocket.expect("IDN?\r").answer("0\rMarlow&Tenby,9102,1,V1\r");
+    EXPECT_EQ(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
+              "ok reach: host:2277 can be reached\n"
+              "ok server: a server with an instrument answers: Marlow&Tenby,9102,1,V1\n");
+    EXPECT_TRUE(well);
+    EXPECT_EQ(platform.tcpSocket.state(), SocketState::Closed);
+}
+
+TEST_F(DoctorTest, ServerThatCannotBeReached_IsAFault) {
+    platform.tcpSocket.connectsTo(SocketState::Error);
+    platform.tcpSocket.setProblem("Connection refused");
+    EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
+                         "fault reach: host:2277 cannot be reached: Connection refused; Check"));
+    platform.tcpSocket.connectsTo(SocketState::Connecting);
+    const std::int64_t begun = platform.clock.micros();
+    EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
+                         "fault reach: host:2277 cannot be reached;"));
+    EXPECT_LT(platform.clock.micros() - begun, 6'000'000);
+    EXPECT_FALSE(well);
+}
+
+TEST_F(DoctorTest, ServerWithoutAnAnswer_IsAFault) {
+    platform.tcpSocket.expect("\r");
+    platform.tcpSocket.expect("GET\r").silence();
+    EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
+                         "fault server: nothing answers at host:2277; Check"));
+}
+
+}  // namespace
+}  // namespace zel
