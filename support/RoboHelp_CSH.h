@@ -1,5 +1,5 @@
 #pragma once
-// The help behind a single call: which viewer shows a help source, and at which topic.
+// The help with a single call: which viewer shows a help source, and at which topic.
 
 #include <functional>
 #include <string>
@@ -41,7 +41,7 @@ class RoboHelp_CSH {
     /// The path of the program's own book: the installed one, else one in the application's folder.
     std::string book() const;
 
-    /// The address of a topic in help on the web: a page gets its place behind the "#", a server's
+    /// The address of a topic in help on the web: a page gets its place after the "#", a server's
     /// address its arguments.
     static std::string webAddress(const std::string& source, int command, int context);
 

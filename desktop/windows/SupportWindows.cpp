@@ -68,10 +68,9 @@ QLabel* words(Binder& binder, Label& control) {
 }
 
 void setCaptionSize(QLabel* label, double factor) {
-    QFont font = label->font();
-    font.setPointSizeF(font.pointSizeF() * factor);
-    font.setBold(true);
-    label->setFont(font);
+    // The theme's style sheet decides over a font that is set.
+    label->setStyleSheet(QString("font-weight: bold; font-size: %1pt;")
+                             .arg(static_cast<int>(label->font().pointSizeF() * factor)));
 }
 
 }  // namespace
@@ -106,7 +105,7 @@ AboutWindow::AboutWindow(AboutForm& form, Binder& binder, QWidget* parent)
     keys->addWidget(close);
     layout->addLayout(keys);
     setCancel(form.ButtonOK);
-    setMinimumWidth(560);
+    setMinimumSize(580, 460);
     followForm();
 }
 

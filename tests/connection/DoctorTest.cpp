@@ -186,6 +186,7 @@ TEST_F(DoctorTest, ServerThatCannotBeReached_IsAFault) {
     platform.tcpSocket.setProblem("Connection refused");
     EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
                          "fault reach: host:2277 cannot be reached: Connection refused; Check"));
+    platform.tcpSocket.setProblem("");
     platform.tcpSocket.connectsTo(SocketState::Connecting);
     const std::int64_t begun = platform.clock.micros();
     EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
