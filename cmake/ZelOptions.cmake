@@ -33,6 +33,18 @@ if(ZEL_WERROR)
     add_compile_options(-Werror)
 endif()
 
+# A release checks what the library can check at little cost, and is hard to misuse: bounds of the
+# standard containers and of the C functions, the stack, the tables of the linker.
+if(CMAKE_SYSTEM_NAME STREQUAL "Linux")
+    add_compile_options(
+        "$<$<CONFIG:Release>:-D_GLIBCXX_ASSERTIONS;-U_FORTIFY_SOURCE;-D_FORTIFY_SOURCE=3>"
+        "$<$<CONFIG:Release>:-fstack-protector-strong;-fstack-clash-protection>")
+    if(CMAKE_SYSTEM_PROCESSOR MATCHES "x86_64|AMD64")
+        add_compile_options("$<$<CONFIG:Release>:-fcf-protection>")
+    endif()
+    add_link_options("$<$<CONFIG:Release>:-Wl,-z,relro,-z,now,-z,noexecstack>")
+endif()
+
 # zel_strict(TARGET)
 #
 # The further warnings, for a target that is free of them.

@@ -26,6 +26,7 @@ function(zel_room name)
     if(sources)
         set(visibility PUBLIC)
         add_library(zel_${name} STATIC ${sources} ${headers})
+        zel_strict(zel_${name})
     elseif(headers)
         set(visibility INTERFACE)
         add_library(zel_${name} INTERFACE)
@@ -89,3 +90,29 @@ macro(zel_subdirectory name)
         add_subdirectory(${name})
     endif()
 endmacro()
+
+# zel_house_picture()
+#
+# Adds `house_picture`, which draws docs/images/house.svg out of the table of rooms, where Graphviz
+# is installed. The build draws it into its own folder each time the table changes.
+function(zel_house_picture)
+    find_program(ZEL_DOT dot)
+    find_program(ZEL_TRED tred)
+    mark_as_advanced(ZEL_DOT ZEL_TRED)
+    if(NOT ZEL_DOT OR NOT ZEL_TRED)
+        return()
+    endif()
+    set(page "${PROJECT_SOURCE_DIR}/docs/architecture.md")
+    set(script "${PROJECT_SOURCE_DIR}/cmake/HousePicture.cmake")
+    set(picture "${PROJECT_BINARY_DIR}/house.svg")
+    add_custom_command(OUTPUT "${picture}"
+        COMMAND "${CMAKE_COMMAND}" "-DPAGE=${page}" "-DPICTURE=${picture}" "-DDOT=${ZEL_DOT}"
+            "-DTRED=${ZEL_TRED}" -P "${script}"
+        DEPENDS "${page}" "${script}"
+        COMMENT "Drawing the rooms" VERBATIM)
+    add_custom_target(zel_house_picture ALL DEPENDS "${picture}")
+    add_custom_target(house_picture
+        COMMAND "${CMAKE_COMMAND}" -E copy "${picture}"
+            "${PROJECT_SOURCE_DIR}/docs/images/house.svg"
+        DEPENDS "${picture}" VERBATIM)
+endfunction()

@@ -137,7 +137,7 @@ void ViewReader::takeRange(std::string_view entry) {
 ViewReader::Header ViewReader::readHeader(const std::string& text, const FieldList& lines,
                                           const std::string& fileTime) {
     Header header;
-    mirror_.TraceDetector = contains(text, kAutoPeak) ? DETAUTOPEAK : DETSAMPLE;
+    mirror_.TraceDetector = contains(text, kAutoPeak) ? std::uint8_t{DETAUTOPEAK} : std::uint8_t{DETSAMPLE};
     panel_.IsLINValued = contains(text, kLinear);
     panel_.isZELViewLinFile = panel_.IsLINValued && !contains(text, "ZELRemote");
     header.zeroSpan = contains(text, kZeroSpan);
@@ -362,7 +362,7 @@ void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
     panel_.Shown.fromFile = true;
     panel_.Shown.xUnit = zeroSpan ? "s" : "Hz";
     panel_.RawTraceData = values;
-    mirror_.TraceDetector = pairs ? DETAUTOPEAK : DETSAMPLE;
+    mirror_.TraceDetector = pairs ? std::uint8_t{DETAUTOPEAK} : std::uint8_t{DETSAMPLE};
     const double increment = xs.size() > 1 ? (xs[1] - xs[0]) / perRow : 0;
     panel_.ViewSpan = zeroSpan ? 0 : mirror_.Span;
     panel_.TraceIntervals = kIntervals;

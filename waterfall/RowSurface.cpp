@@ -103,7 +103,7 @@ class Maker {
             std::stable_sort(piece.begin(), piece.end(), byX);
         if (piece.size() == 1) {
             // A lone sample is as wide as a sample of a full row.
-            constexpr float kHalf = Camera::kWidth / 600;
+            constexpr auto kHalf = static_cast<float>(Camera::kWidth / 600);
             Point right = piece.front();
             piece.front().x -= kHalf;
             right.x += kHalf;

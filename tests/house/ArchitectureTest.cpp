@@ -56,6 +56,11 @@ TEST_F(Architecture, Tests_MirrorTheRooms) {
     EXPECT_EQ(lines(unmirroredRooms(house_, files_)), "");
 }
 
+TEST_F(Architecture, Picture_ShowsTheTable) {
+    EXPECT_EQ(lines(pictureBreaches(house_, readText(root_ + "/docs/images/house.svg"))), "")
+        << "cmake --build --preset release --target house_picture draws it again";
+}
+
 TEST_F(Architecture, QuotedInclude_IsAPathFromTheRoot) {
     EXPECT_EQ(lines(unknownIncludes(files_)), "");
 }

@@ -266,6 +266,44 @@ std::vector<std::string> circlesOfTable(const House& house) {
     return circlesIn(arrows);
 }
 
+std::vector<std::string> pictureBreaches(const House& house, const std::string& svg) {
+    const std::string open = "<title>";
+    const std::string arrow = "&#45;&gt;";
+    Arrows drawn;
+    for (std::size_t at = svg.find(open); at != std::string::npos; at = svg.find(open, at + 1)) {
+        const std::size_t end = svg.find("</title>", at);
+        if (end == std::string::npos) break;
+        const std::string title = svg.substr(at + open.size(), end - at - open.size());
+        const std::size_t middle = title.find(arrow);
+        if (middle == std::string::npos) continue;
+        drawn[title.substr(0, middle)].insert(title.substr(middle + arrow.size()));
+    }
+    std::vector<std::string> breaches;
+    for (const auto& [from, targets] : drawn) {
+        const Room* room = roomNamed(house.rooms, from);
+        for (const std::string& target : targets) {
+            const Room* other = roomNamed(house.rooms, target);
+            if (!room || !other || room->mayIncludeAll || !mayInclude(*room, *other))
+                breaches.push_back(from + " -> " + target + " is not in the table");
+        }
+    }
+    for (const Room& room : house.rooms) {
+        if (room.mayIncludeAll) continue;
+        std::set<std::string> reached;
+        std::vector<std::string> next{room.name};
+        while (!next.empty()) {
+            const std::string from = next.back();
+            next.pop_back();
+            for (const std::string& target : drawn[from])
+                if (reached.insert(target).second) next.push_back(target);
+        }
+        for (const std::string& target : room.mayInclude)
+            if (!reached.contains(target))
+                breaches.push_back(room.name + " -> " + target + " is not in the picture");
+    }
+    return breaches;
+}
+
 std::vector<std::string> longFiles(const std::vector<SourceFile>& files, std::size_t limit) {
     std::vector<std::string> breaches;
     for (const SourceFile& file : files) {

@@ -70,6 +70,10 @@ std::vector<std::string> realTimeUses(const House& house, const std::vector<Sour
 std::vector<std::string> localeUses(const House& house, const std::vector<SourceFile>& files);
 /// Headers that rooms of standard C++ include and that are none of the language's.
 std::vector<std::string> foreignHeaders(const House& house, const std::vector<SourceFile>& files);
+/// Arrows of the picture that the table does not allow, and arrows of the table that no way in the
+/// picture stands for; rooms that may include everything are not drawn. `svg` is as Graphviz
+/// writes it: each arrow has the title "from&#45;&gt;to".
+std::vector<std::string> pictureBreaches(const House& house, const std::string& svg);
 /// Files of more lines than `limit`.
 std::vector<std::string> longFiles(const std::vector<SourceFile>& files, std::size_t limit);
 

@@ -114,6 +114,27 @@ TEST(UnmirroredRooms, TestsOfNoRoom_AreNamed) {
               Breaches{"tests/lower mirrors no room"});
 }
 
+TEST(PictureBreaches, ArrowsOfTheTable_AreInOrder) {
+    EXPECT_EQ(pictureBreaches(readHouse(kTables),
+                              "<title>low/deep&#45;&gt;low</title><title>high&#45;&gt;low</title>"),
+              Breaches{});
+}
+
+TEST(PictureBreaches, LongerWay_StandsForAnArrow) {
+    std::string tables = kTables;
+    tables.replace(tables.find("| `high` | `low` |"), 18, "| `high` | `low/deep`, `low` |");
+    EXPECT_EQ(
+        pictureBreaches(readHouse(tables),
+                        "<title>low/deep&#45;&gt;low</title><title>high&#45;&gt;low/deep</title>"),
+        Breaches{});
+}
+
+TEST(PictureBreaches, MissingArrowAndForeignArrow_AreNamed) {
+    EXPECT_EQ(pictureBreaches(readHouse(kTables),
+                              "<title>low&#45;&gt;high</title><title>low/deep&#45;&gt;low</title>"),
+              (Breaches{"low -> high is not in the table", "high -> low is not in the picture"}));
+}
+
 TEST(UnknownIncludes, PathFromTheOwnFolder_IsNamed) {
     EXPECT_EQ(unknownIncludes({including("low/A.cpp", "A.h"), {"low/A.h", ""}}),
               Breaches{"low/A.cpp includes \"A.h\""});
