@@ -137,7 +137,8 @@ void ViewReader::takeRange(std::string_view entry) {
 ViewReader::Header ViewReader::readHeader(const std::string& text, const FieldList& lines,
                                           const std::string& fileTime) {
     Header header;
-    mirror_.TraceDetector = contains(text, kAutoPeak) ? std::uint8_t{DETAUTOPEAK} : std::uint8_t{DETSAMPLE};
+    mirror_.TraceDetector =
+        contains(text, kAutoPeak) ? std::uint8_t{DETAUTOPEAK} : std::uint8_t{DETSAMPLE};
     panel_.IsLINValued = contains(text, kLinear);
     panel_.isZELViewLinFile = panel_.IsLINValued && !contains(text, "ZELRemote");
     header.zeroSpan = contains(text, kZeroSpan);

@@ -110,8 +110,7 @@ BinaryTrace::Outcome BinaryTrace::readOnce(RawTrace& trace, bool doubleBlock, bo
 }
 
 void BinaryTrace::decode(const std::string& bytes, bool doubleBlock, RawTrace& trace) {
-    const std::size_t asked =
-        static_cast<std::size_t>(doubleBlock ? kDoubleBytes : kSingleBytes);
+    const std::size_t asked = static_cast<std::size_t>(doubleBlock ? kDoubleBytes : kSingleBytes);
     trace.wanted = doubleBlock ? kDoubleSamples : kSingleSamples;
     trace.values.resize(trace.wanted);
     std::size_t output = 0;

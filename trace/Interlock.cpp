@@ -250,9 +250,8 @@ Interlock::States Interlock::liveStates() const {
     for (const Form* form : forms_.all())
         if (form->Modal && form->Visible) states.insert(form);
     // What is dialled, connected or looked for can be left.
-    for (const bool* attempt :
-         {&forms_.main.Dialling, &forms_.tcpConnection.Connecting, &forms_.server.ServerConnecting,
-          &forms_.devicesChoice.Configuring})
+    for (const bool* attempt : {&forms_.main.Dialling, &forms_.tcpConnection.Connecting,
+                                &forms_.server.ServerConnecting, &forms_.devicesChoice.Configuring})
         if (*attempt) states.insert(attempt);
     if (panel_.STOPFlag || panel_.ContinuosLoopActive) states.insert(&panel_.STOPFlag);
     // A run may begin inside the wait of one that was stopped, and is a state of its own.

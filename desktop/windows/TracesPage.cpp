@@ -1,6 +1,5 @@
 #include "desktop/windows/TracesPage.h"
 
-
 #include "desktop/graph/TraceOverlay.h"
 
 namespace zel {

@@ -16,7 +16,7 @@ struct Writing {
     Outcome outcome;
 };
 
-/// Results are dropped without a word; what the panel saves is told; a picture ends the run.
+/// Results are dropped without a word; what the panel saves is shown; a picture ends the run.
 constexpr Writing kWritings[] = {
     {"GET FREQ", Outcome::Silent},
     {"COMMENT SOMETHING", Outcome::Silent},
@@ -62,7 +62,7 @@ TEST_P(DiskFailures, NothingWrittenIsLostAndTheRunGoesOn) {
         });
     session.platform.boxes.clear();
     session.run("SAVERESULTS KEPT\\OUT.TXT\r\n" + std::string(writing.statement) +
-                "\r\nCOMMENT BEHIND\r\n");
+                "\r\nCOMMENT AFTER\r\n");
     session.expectFree(writing.statement);
     EXPECT_EQ(session.form.ReachedEnd, writing.outcome != Outcome::BoxAndEnd);
     const std::size_t boxes = session.platform.boxes.boxes().size();
