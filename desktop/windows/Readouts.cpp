@@ -7,7 +7,7 @@
 namespace zel {
 namespace {
 
-constexpr int kPaceWidth = 128;
+constexpr int kPaceWidth = 152;
 constexpr int kPointerWidth = 92;
 constexpr int kLineHeight = 17;
 constexpr int kRoomForTrace = 760;  // else the marker's own text on the graph says it

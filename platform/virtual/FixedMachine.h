@@ -12,14 +12,21 @@ namespace zel {
 
 class FixedMachine : public Machine {
   public:
-    MachineFacts known{.operatingSystem = "Virtual System 1",
-                       .runtimeName = "Virtual library",
-                       .runtimeVersion = "1.0"};
+    MachineFacts known = virtualSystem();
     std::map<std::string, std::string> variables;
     MachineFacts facts() override { return known; }
     std::string environment(const std::string& name) override {
         const auto found = variables.find(name);
         return found == variables.end() ? std::string() : found->second;
+    }
+
+  private:
+    static MachineFacts virtualSystem() {
+        MachineFacts facts;
+        facts.operatingSystem = "Virtual System 1";
+        facts.runtimeName = "Virtual library";
+        facts.runtimeVersion = "1.0";
+        return facts;
     }
 };
 

@@ -24,7 +24,9 @@ struct DoctorTest : ::testing::Test {
         std::string text;
         well = doctor.examine(address, [&](const Finding& finding) {
             text += findingLine(finding) + "\n";
-            if (finding.grade != Finding::Grade::Ok) EXPECT_NE(finding.remedy, "");
+            if (finding.grade != Finding::Grade::Ok) {
+                EXPECT_NE(finding.remedy, "");
+            }
         });
         return text;
     }

@@ -108,7 +108,7 @@ TEST_F(GraphImage, Metafile_HasAllTextsInTheirPlaces) {
     const PlayedMetafile played = metafile();
     for (const char* text : {"Ref -123.45 dB\xB5V    10dB/DIV", "RBW 100 kHz    VBW Auto",
                              "Distance To Fault    Det Auto Peak", "SWT 123.456 ms", "Start 0 Hz",
-                             "Center 1.5 GHz", "Stop 3 GHz", "dBm", "-20", "-120", "600 MHz"})
+                             "Center 1.5 GHz", "Stop 3 GHz", "dBm", "-20", "-120", "500 MHz"})
         EXPECT_NE(played.text(text), nullptr) << text;
     ASSERT_NE(played.text("dBm"), nullptr);
     EXPECT_EQ(played.text("dBm")->font.escapement, 900);
