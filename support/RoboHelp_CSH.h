@@ -21,7 +21,7 @@ class RoboHelp_CSH {
     /// The name by which the forms ask for the program's own book.
     static constexpr const char* kBookName = "ZELRemoteHelp.chm";
     /// The book itself, below the folder of the program's companions.
-    static constexpr const char* kOwnBook = "help/zelremote.qhc";
+    static constexpr const char* kOwnBook = "help/zelremote.qch";
 
     RoboHelp_CSH(ApplicationFolder& folder, FileService& files, Launcher& launcher,
                  MessageBoxes& boxes)

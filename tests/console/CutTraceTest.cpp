@@ -60,9 +60,10 @@ class CutFront : public Front {
     Events& events() override { return p_.events; }
     QtSignals& endSignals() override { return signals_; }
     Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
-        return {p_.clock,      served,          boxes,       port,     p_.ports,     p_.tcpSocket,
-                p_.serverPort, p_.serverSocket, p_.settings, p_.debug, p_.clipboard, p_.launcher,
-                p_.startup,    p_.folder,       dialogs,     p_.files, signals_};
+        return {p_.clock,     served,        boxes,           port,        p_.ports,
+                p_.tcpSocket, p_.serverPort, p_.serverSocket, p_.settings, p_.debug,
+                p_.clipboard, p_.launcher,   p_.startup,      p_.folder,   dialogs,
+                p_.files,     signals_,      p_.machine,      p_.portProbe};
     }
     VirtualFiles& disk() { return p_.files; }
 

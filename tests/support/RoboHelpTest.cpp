@@ -44,10 +44,10 @@ TEST_F(RoboHelpTest, Source_DecidesTheCall) {
 }
 
 TEST_F(RoboHelpTest, TopicOfAForm_ComesFromTheProgramsOwnBook) {
-    platform.files.put("/program/help/zelremote.qhc", "");
+    platform.files.put("/program/help/zelremote.qch", "");
     help.showTopic(1112);
-    EXPECT_EQ(shown, "html /program/help/zelremote.qhc 15 1112");
-    EXPECT_EQ(help.book(), "/program/help/zelremote.qhc");
+    EXPECT_EQ(shown, "html /program/help/zelremote.qch 15 1112");
+    EXPECT_EQ(help.book(), "/program/help/zelremote.qch");
     EXPECT_TRUE(platform.boxes.texts().empty());
 }
 
