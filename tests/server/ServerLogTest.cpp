@@ -19,15 +19,15 @@ struct ServerLog : ServerBench, ::testing::Test {
         std::string source;
         while (at < bytes.size()) {
             const auto end = std::min(bytes.find('\n', at), bytes.size());
-            std::string line = bytes.substr(at, end - at);
+            std::string entry = bytes.substr(at, end - at);
             at = end + 1;
-            if (!line.empty() && line.back() == '\r') line.pop_back();
-            const auto after = [&line](const char* name) {
-                const auto found = line.find(name);
+            if (!entry.empty() && entry.back() == '\r') entry.pop_back();
+            const auto after = [&entry](const char* name) {
+                const auto found = entry.find(name);
                 return found == std::string::npos ? std::string()
-                                                  : line.substr(line.find(": ", found) + 2);
+                                                  : entry.substr(entry.find(": ", found) + 2);
             };
-            if (line.size() > 7 && line.substr(7, 3) != "   ") level = line.substr(7);
+            if (entry.size() > 7 && entry.substr(7, 3) != "   ") level = entry.substr(7);
             if (const std::string text = after("SOURCE"); !text.empty()) source = text;
             if (const std::string text = after("DESCRIPTION"); !text.empty())
                 all.push_back(level + " " + source + ": " + text);
