@@ -1,6 +1,7 @@
 #include "console/ReplayVerb.h"
 
 #include <QTemporaryDir>
+#include <locale>
 #include <memory>
 #include <sstream>
 
@@ -27,6 +28,7 @@ Options recordedOptions(const SessionRecord& record) {
     for (const std::string& argument : given) arguments.push_back(argument.c_str());
     const bool window = given.empty() || given.front() == "zelremote";
     std::ostringstream silent;
+    silent.imbue(std::locale::classic());
     const bool parsed = !window && !parseOptions(static_cast<int>(arguments.size()),
                                                  arguments.data(), recorded, silent, silent);
     if (!parsed || recorded.verb == Verb::Replay) {

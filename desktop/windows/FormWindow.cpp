@@ -4,7 +4,6 @@
 #include <QFormLayout>
 #include <QHBoxLayout>
 #include <QKeyEvent>
-#include <QShortcut>
 #include <QVBoxLayout>
 
 #include "desktop/binders/ToolTips.h"
@@ -68,8 +67,6 @@ FormWindow::FormWindow(Form& form, Binder& binder, QWidget* parent)
     setProperty("form", QString::fromStdString(form.name()));  // F1 opens its topic
     setObjectName(QString::fromStdString(form.name()));
     setWindowFlag(Qt::WindowContextHelpButtonHint, false);
-    auto* help = new QShortcut(QKeySequence(Qt::Key_F1), this);
-    connect(help, &QShortcut::activated, this, [this] { form_.KeyDown(kKeyF1, 0); });
     shown_.setSingleShot(true);
     connect(&shown_, &QTimer::timeout, this, [this] { focusFirst(); });
 }

@@ -6,7 +6,6 @@
 #include <QCloseEvent>
 #include <QHBoxLayout>
 #include <QMessageBox>
-#include <QShortcut>
 
 #include "desktop/graph/GraphImage.h"
 #include "desktop/platform/SimulatorChild.h"
@@ -107,8 +106,6 @@ void MainWindow::buildWindows() {
         SessionLog& record = program_.sessionLog();
         act == "click" ? record.clicked(what) : record.input(act + " " + what);
     };
-    auto* help = new QShortcut(QKeySequence(Qt::Key_F1), this);
-    connect(help, &QShortcut::activated, this, [this] { panel_.KeyDown(kKeyF1, 0); });
     Forms& forms = program_.forms();
     windows_.push_back(std::make_unique<ConnectionWindow>(forms.main, binder_, this));
     windows_.push_back(std::make_unique<WaterfallWindow>(forms, binder_, this));
