@@ -69,9 +69,10 @@ TEST_F(Help, EveryLink_LeadsSomewhere) {
             const QUrl url("qthelp://example.zelremote.help/book/" + page);
             EXPECT_FALSE(opened().engine().fileData(url).isEmpty())
                 << name.toStdString() << " leads to " << target.toStdString();
-            if (!found.captured(2).isEmpty() && all.count(page) != 0)
+            if (!found.captured(2).isEmpty() && all.count(page) != 0) {
                 EXPECT_TRUE(all.at(page).contains("id=\"" + found.captured(2) + '"'))
                     << name.toStdString() << " leads to #" << found.captured(2).toStdString();
+            }
         }
     }
     EXPECT_GT(count, 60);
