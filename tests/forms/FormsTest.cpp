@@ -20,7 +20,7 @@ TEST(FormsTest, Forms_HaveNamesOfTheirOwn) {
     Forms forms;
     std::set<std::string> names;
     for (const Form* form : forms.all()) EXPECT_TRUE(names.insert(form->name()).second);
-    EXPECT_EQ(names.size(), 14U);
+    EXPECT_EQ(names.size(), 15U);
 }
 
 TEST(FormsTest, BareName_IsAControlOfThePanel) {
