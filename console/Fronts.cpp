@@ -3,61 +3,33 @@
 #include <QCoreApplication>
 
 #include "ZELSim/InProcessPort.h"
-#include "console/Address.h"
+#include "console/VirtualFront.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtSystem.h"
 #include "platform/virtual/FixedMachine.h"
-#include "platform/virtual/MemoryServices.h"
-#include "platform/virtual/ScriptedServer.h"
 #include "platform/virtual/ScriptedSocket.h"
-#include "platform/virtual/VirtualTime.h"
 
 namespace zel {
 namespace {
 
 constexpr double kAnswerSeconds = 0.0001;
 
-class SilentDebugChannel : public DebugChannel {
+class SimulatorFront : public VirtualFront {
   public:
-    void output(const std::string&) override {}
-};
-
-class SimulatorFront : public Front {
-  public:
-    explicit SimulatorFront(const std::string& home) : folder_(QString::fromStdString(home)) {
-        ports_.ports = {kSimulatorPort};
+    explicit SimulatorFront(const std::string& home) : VirtualFront(home) {
         portProbe_.known = {{kSimulatorPort, "", "built-in simulator", ""}};
         portProbe_.rights[kSimulatorPort] = {
             .exists = true, .terminal = true, .usable = true, .group = {}};
         tcpSocket_.connectsTo(SocketState::Error);  // there is no network in here
     }
-    const Clock& clock() const override { return clock_; }
-    Events& events() override { return events_; }
-    QtSignals& endSignals() override { return signals_; }
-    Platform platform(Events& served, MessageBoxes& boxes, FileDialogs& dialogs) override {
-        return {clock_,        served,    boxes,    port_,      ports_,    tcpSocket_, serverPort_,
-                serverSocket_, settings_, debug_,   clipboard_, launcher_, startup_,   folder_,
-                dialogs,       files_,    signals_, machine_,   portProbe_};
-    }
 
   private:
-    QtSignals signals_;
-    VirtualClock clock_;
-    VirtualEvents events_{clock_};
+    Lines lines() override { return {port_, tcpSocket_, serverPort_, portProbe_}; }
+
     // Virtual time has to go on from one answer to the next also where no sweep is waited for.
     zelsim::InProcessPort port_{clock_, events_, {}, {.answering = kAnswerSeconds}};
-    FixedPortList ports_;
     ScriptedSocket tcpSocket_{events_};
     zelsim::InProcessPort serverPort_{clock_, events_, {}, {.answering = kAnswerSeconds}};
-    ScriptedServer serverSocket_{events_};
-    QtApplicationFolder folder_;
-    QtSettingsStore settings_{folder_};
-    SilentDebugChannel debug_;
-    MemoryClipboard clipboard_;
-    MemoryLauncher launcher_;
-    MemoryStartupFolder startup_;
-    SystemFiles files_;
-    SystemMachine machine_;
     FixedProbe portProbe_;
 };
 

@@ -4,6 +4,7 @@
 #include <cmath>
 
 #include "drawing/JsonReader.h"
+#include "picture/AnnotationFields.h"
 #include "picture/PictureJson.h"
 
 namespace zel {
@@ -31,30 +32,9 @@ GraphAxis axisOf(const JsonReader& json) {
 
 ViewAnnotations annotationsOf(const JsonReader& json) {
     ViewAnnotations view;
-    const std::pair<const char*, std::string&> texts[] = {
-        {"ref_level", view.refLevel},
-        {"range", view.range},
-        {"rbw", view.rbw},
-        {"vbw", view.vbw},
-        {"sweep_time", view.sweepTime},
-        {"detector", view.detector},
-        {"mode", view.mode},
-        {"unit", view.unit},
-        {"x_unit", view.xUnit},
-        {"left", view.left},
-        {"center", view.center},
-        {"right", view.right},
-    };
-    const std::pair<const char*, bool&> flags[] = {
-        {"ok", view.ok},
-        {"ref_level_unsure", view.refLevelUnsure},
-        {"range_unsure", view.rangeUnsure},
-        {"detector_unsure", view.detectorUnsure},
-        {"x_unsure", view.xUnsure},
-        {"y_unsure", view.yUnsure},
-    };
-    for (const auto& [name, flag] : flags) json.take(name, flag);
-    for (const auto& [name, text] : texts) json.take(name, text);
+    const auto read = [&json](const char* name, auto& value) { json.take(name, value); };
+    forEachAnnotationFlag(view, read);
+    forEachAnnotationText(view, read);
     return view;
 }
 

@@ -1,5 +1,6 @@
 #include "picture/PictureJson.h"
 
+#include "picture/AnnotationFields.h"
 #include "support/JsonWriter.h"
 
 namespace zel {
@@ -20,31 +21,10 @@ void writeAxis(JsonWriter& json, const GraphAxis& axis) {
 }
 
 void writeAnnotations(JsonWriter& json, const ViewAnnotations& view) {
-    const std::pair<const char*, const std::string&> texts[] = {
-        {"ref_level", view.refLevel},
-        {"range", view.range},
-        {"rbw", view.rbw},
-        {"vbw", view.vbw},
-        {"sweep_time", view.sweepTime},
-        {"detector", view.detector},
-        {"mode", view.mode},
-        {"unit", view.unit},
-        {"x_unit", view.xUnit},
-        {"left", view.left},
-        {"center", view.center},
-        {"right", view.right},
-    };
-    const std::pair<const char*, bool> flags[] = {
-        {"ok", view.ok},
-        {"ref_level_unsure", view.refLevelUnsure},
-        {"range_unsure", view.rangeUnsure},
-        {"detector_unsure", view.detectorUnsure},
-        {"x_unsure", view.xUnsure},
-        {"y_unsure", view.yUnsure},
-    };
     json.name("annotations").beginObject();
-    for (const auto& [name, flag] : flags) json.member(name, flag);
-    for (const auto& [name, text] : texts) json.member(name, text);
+    const auto write = [&json](const char* name, const auto& value) { json.member(name, value); };
+    forEachAnnotationFlag(view, write);
+    forEachAnnotationText(view, write);
     json.endObject();
 }
 
