@@ -55,6 +55,7 @@ void Relay::restart() {
     forLine_.clear();
     group_.clear();
     watch_.reset();
+    replies_.reset();
     form_.doBinaryData = false;
 }
 
@@ -75,6 +76,7 @@ void Relay::RelayToInstrument(const std::string& text) {
     const bool before = form_.doBinaryData;
     form_.doBinaryData = watch_.take(text);
     if (form_.doBinaryData && !before) ++sweeps_;
+    replies_.asked(text);
     toInstrument_ += text.size();
     forLine_ += text;
     feedLine();
@@ -111,8 +113,11 @@ void Relay::dataFromInstrument(int commEvent) {
     services_.events.cancel(groupTask_);
     groupTask_ = 0;
     if (form_.doBinaryData) return sendGroup();
+    const bool whole = replies_.answered(bytes);
+    const bool wholeTime = quietMs_ == kLongestGroupMs;
+    if (whole && !wholeTime) return sendGroup();
     const double latest = static_cast<double>(groupEnds_ - now) / 1000;
-    const double wait = quietMs_ == kLongestGroupMs ? latest : std::min<double>(quietMs_, latest);
+    const double wait = wholeTime ? latest : std::min<double>(quietMs_, latest);
     if (wait <= 0) return sendGroup();
     groupTask_ = services_.events.schedule(wait, [this] { sendGroup(); });
 }
@@ -120,6 +125,7 @@ void Relay::dataFromInstrument(int commEvent) {
 void Relay::sendGroup() {
     const CallScope call(log_, kComponent, kClass, "sendGroup");
     groupTask_ = 0;
+    replies_.quiet();
     sendToClient(std::exchange(group_, {}));
 }
 

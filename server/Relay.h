@@ -1,5 +1,6 @@
 #pragma once
-// Carries bytes between the client and the instrument, unchanged, and groups what comes back.
+// Carries bytes between the client and the instrument, unchanged, and groups what comes back: a
+// whole reply to what the client asked goes on at once, all else when the line has been quiet.
 
 #include <cstdint>
 #include <string>
@@ -8,6 +9,7 @@
 #include "platform/SerialPort.h"
 #include "platform/Session.h"
 #include "platform/Socket.h"
+#include "server/ReplyWatch.h"
 #include "support/RootDebug.h"
 
 namespace zel {
@@ -41,7 +43,8 @@ class Relay {
     Relay(const Relay&) = delete;
     Relay& operator=(const Relay&) = delete;
 
-    /// So long the line is quiet before a group goes on, in ms; 100 waits the whole time always.
+    /// So long the line is quiet before a group goes on that is no whole reply, in ms; 100 waits
+    /// the whole time always, for whole replies as well.
     void setQuiet(int ms);
     /// Another client, or none: what waits from the former one or for it is dropped.
     void restart();
@@ -70,6 +73,7 @@ class Relay {
     Session services_;
     RootDebug& log_;
     TraceWatch watch_;
+    ReplyWatch replies_;
     int quietMs_ = kQuietMs;
     std::string forLine_;
     std::string group_;
