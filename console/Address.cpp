@@ -1,5 +1,6 @@
 #include "console/Address.h"
 
+#include "desktop/platform/DeviceName.h"
 #include "support/LinkAddressText.h"
 
 namespace zel {
@@ -12,8 +13,9 @@ constexpr int kSimulatorBaud = 57600;
 std::optional<ConnectAddress> parseAddress(std::string_view url) {
     if (url == "sim:")
         return ConnectAddress{true, {LinkAddress::Kind::Serial, kSimulatorPort, kSimulatorBaud}};
-    const std::optional<LinkAddress> link = parseLinkAddress(url);
+    std::optional<LinkAddress> link = parseLinkAddress(url);
     if (!link) return std::nullopt;
+    useDevicePath(*link);
     return ConnectAddress{false, *link};
 }
 

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "desktop/platform/CommonOptions.h"
+#include "desktop/platform/DeviceName.h"
 #include "link/WireText.h"
 #include "server/Networks.h"
 #include "support/NumberOption.h"
@@ -259,6 +260,7 @@ std::optional<int> parseOptions(int argc, const char* const* argv, Options& opti
     options.words = parser.common.words;
     options.log = parser.common.log;
     options.given = joinArguments({argv + std::min(argc, 1), argv + argc});
+    options.serve.serial = devicePath(options.serve.serial);
     options.verb = parser.verbs.at(parser.app.get_subcommands().front());
     if (const std::string& url = parser.common.connect; !url.empty()) {
         options.address = parseAddress(url);

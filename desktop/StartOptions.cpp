@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "desktop/platform/CommonOptions.h"
+#include "desktop/platform/DeviceName.h"
 #include "support/LinkAddressText.h"
 #include "support/NumberText.h"
 #include "support/SessionText.h"
@@ -75,6 +76,7 @@ std::optional<int> parseStartOptions(int argc, const char* const* argv, StartOpt
     if (common.connect.empty()) return std::nullopt;
     options.address = parseLinkAddress(common.connect);
     if (!options.address) return refuseAddress(app, kAddresses, common.connect, errors);
+    useDevicePath(*options.address);
     return std::nullopt;
 }
 

@@ -161,7 +161,9 @@ std::string serialDeviceName(const std::string& text, const std::vector<std::str
     std::string name = trimmed(text);
     if (name.empty()) return "";
     if (std::find(known.begin(), known.end(), name) != known.end()) return name;
-    if (name.front() == '/') return name;
+    if (contains(name, "/")) return name;
+    for (const std::string& path : known)
+        if (path.ends_with("/" + name)) return path;
     const std::string number = trimmed(replaceAll(upperCase(name), "COM", ""));
     if (!IsNumericText(number)) return "";
     const double port = leadingNumber(number);

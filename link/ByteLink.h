@@ -65,8 +65,8 @@ class ByteLink {
 };
 
 /// The device that a port name of the dialog means: "COM" and a number in either case becomes
-/// "COMn"; a name that the platform listed or that is a path stands as it is. Empty when the
-/// name is no port.
+/// "COMn"; a name that the platform listed or that is a path stands as it is, and the last part of
+/// a listed path means that path. Empty when the name is no port.
 std::string serialDeviceName(const std::string& text, const std::vector<std::string>& known);
 
 }  // namespace zel

@@ -40,7 +40,8 @@ QString deviceOf(const std::string& name) {
         if (number && port > 0) return QString("/dev/ttyS%1").arg(port - 1);
     }
 #endif
-    return text;
+    // The toolkit takes a path that begins at the working folder for a name below /dev.
+    return text.contains('/') ? QFileInfo(text).absoluteFilePath() : text;
 }
 
 /// The ports that the kernel lists: each terminal with a device under it, and radio links. Asking

@@ -139,6 +139,24 @@ stop_server
 kill "$silent"
 echo "signals"
 
+# A device is named from the working folder as well.
+for name in instrument ./instrument; do
+    timeout 60 "$zelctl" --home client --connect "serial:$name" info > client.log \
+        2> client.errors.log || fail "the device $name: status $?"
+    : > server.log
+    "$zelctl" --home home serve --serial "$name" --baud 57600 --listen 127.0.0.1:0 > server.log \
+        2> server.errors.log &
+    server=$!
+    wait_for server.log '^instrument'
+    stop_server
+done
+echo "devices of the working folder"
+
+status=0
+"$zelctl" --home home serve --serial ttyNone --listen 127.0.0.1:0 > server.log \
+    2> server.errors.log || status=$?
+[ "$status" -eq 1 ] || fail "a name that is no device: status $status"
+grep -q '/dev/ttyNone is not there' server.errors.log || fail "no reason for a name"
 status=0
 "$zelctl" --home home serve --serial "$scratch/none" --listen 127.0.0.1:0 > server.log \
     2> server.errors.log || status=$?

@@ -82,6 +82,18 @@ TEST_F(PortFromDialog, NameThatThePlatformListed_IsTakenAsItStands) {
     EXPECT_EQ(port.openings().back().CommPort, "ttyS0");
 }
 
+TEST_F(PortFromDialog, LastPartOfAListedPath_MeansThatPath) {
+    dialog.CommPorts = {"/dev/ttyUSB1", "/dev/ttyUSB0"};
+    open("ttyUSB0");
+    EXPECT_EQ(port.openings().back().CommPort, "/dev/ttyUSB0");
+    EXPECT_EQ(serialDeviceName("USB0", dialog.CommPorts), "");
+}
+
+TEST_F(PortFromDialog, PathFromTheWorkingFolder_IsTakenAsItStands) {
+    open("ports/instrument");
+    EXPECT_EQ(port.openings().back().CommPort, "ports/instrument");
+}
+
 TEST_F(PortFromDialog, NameThatIsNoPort_IsTold) {
     for (const char* name : {"COM", "", " ", "COMx", "x", "COM1.5", "COM0", "COM99999999999",
                              "COM-1", "K\xC3\xB6ln"}) {
