@@ -51,12 +51,12 @@ class VirtualFront : public Front {
     FixedPortList ports_;
     ScriptedServer serverSocket_{events_};
     QtApplicationFolder folder_;
-    QtSettingsStore settings_{folder_};
+    SystemFiles files_;
+    QtSettingsStore settings_{folder_, files_};
     SilentDebugChannel debug_;
     MemoryClipboard clipboard_;
     MemoryLauncher launcher_;
     MemoryStartupFolder startup_;
-    SystemFiles files_;
     SystemMachine machine_;
 };
 

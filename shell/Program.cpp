@@ -117,7 +117,7 @@ struct Program::Rooms {
           scaling(panel, forms.waterfall, mirror, p.clock),
           graph(panel, mirror),
           rows(forms.waterfall),
-          waterfall(forms, rows, p.folder),
+          waterfall(forms, rows, p.folder, p.files),
           pictureOptions(forms.waterfall),
           history(forms),
           manualScale(panel, forms.manualScale, boxes),

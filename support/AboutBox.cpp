@@ -34,9 +34,10 @@ void setShown(AboutForm& form, const Part& part, bool shown) {
 AboutBox::AboutBox(AboutForm& form, const Services& services, const std::string& registryFile)
     : form_(form),
       s_(services),
-      registry_(registryFile, [&machine = services.machine](const std::string& name) {
-          return machine.environment(name);
-      }) {
+      registry_(services.files, registryFile,
+                [&machine = services.machine](const std::string& name) {
+                    return machine.environment(name);
+                }) {
     for (const Part& part : kParts) {
         (form_.*part.text).Locked = true;
         setShown(form_, part, false);

@@ -58,10 +58,11 @@ std::string cut(const std::string& text) {
 
 }  // namespace
 
-IniValue ReadIni(const std::string& fileName, const std::string& section, const std::string& key,
-                 const std::optional<IniValue>& fallback, std::optional<IniType> valueType) {
+IniValue ReadIni(FileService& files, const std::string& fileName, const std::string& section,
+                 const std::string& key, const std::optional<IniValue>& fallback,
+                 std::optional<IniType> valueType) {
     const IniValue& preset = fallback ? *fallback : kMissingDefault;
-    const std::optional<std::string> stored = IniFile::load(fileName).value(section, key);
+    const std::optional<std::string> stored = IniFile::load(files, fileName).value(section, key);
     const std::string text = cut(stored ? *stored : std::visit(TextOf(), preset));
     switch (valueType ? *valueType : typeOf(preset)) {
         case IniType::Boolean:
@@ -80,10 +81,10 @@ IniValue ReadIni(const std::string& fileName, const std::string& section, const 
     return text;
 }
 
-bool WriteIni(const std::string& fileName, const std::string& section, const std::string& key,
-              const IniValue& value) {
-    IniFile file = IniFile::load(fileName);
-    return file.setValue(section, key, std::visit(TextOf(), value)) && file.save(fileName);
+bool WriteIni(FileService& files, const std::string& fileName, const std::string& section,
+              const std::string& key, const IniValue& value) {
+    IniFile file = IniFile::load(files, fileName);
+    return file.setValue(section, key, std::visit(TextOf(), value)) && file.save(files, fileName);
 }
 
 }  // namespace zel

@@ -6,6 +6,8 @@
 #include <string>
 #include <variant>
 
+#include "platform/Files.h"
+
 namespace zel {
 
 using IniValue = std::variant<bool, std::int16_t, std::int32_t, float, double, std::string>;
@@ -16,13 +18,13 @@ enum class IniType { Boolean, Integer, Long, Single, Double, Text };
 /// the default; a missing default counts as the number 1. A value is cut after 750 characters.
 /// "1", "WAHR" and "TRUE" in either case are true; a number is what the text starts with, for the
 /// whole types the nearest that they hold.
-IniValue ReadIni(const std::string& fileName, const std::string& section, const std::string& key,
-                 const std::optional<IniValue>& fallback = std::nullopt,
+IniValue ReadIni(FileService& files, const std::string& fileName, const std::string& section,
+                 const std::string& key, const std::optional<IniValue>& fallback = std::nullopt,
                  std::optional<IniType> valueType = std::nullopt);
 
 /// A boolean is written as "1" or "0", a text as it stands, a number as its text. False when the
 /// file cannot be read or written, or when no line can hold the names; it is then as it was.
-bool WriteIni(const std::string& fileName, const std::string& section, const std::string& key,
-              const IniValue& value);
+bool WriteIni(FileService& files, const std::string& fileName, const std::string& section,
+              const std::string& key, const IniValue& value);
 
 }  // namespace zel

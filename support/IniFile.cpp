@@ -1,21 +1,17 @@
 #include "support/IniFile.h"
 
 #include <algorithm>
-#include <cstdio>
-#include <filesystem>
-#include <fstream>
 #include <iterator>
-#include <locale>
 #include <string>
 #include <utility>
 
+#include "support/FileText.h"
 #include "support/Text.h"
 
 namespace zel {
 namespace {
 
 constexpr std::size_t kLargestFile = 1U << 20;
-constexpr int kMostNames = 100;  // of temporary files that were left behind
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 constexpr std::string_view kBlanks = " \t";
 
@@ -53,42 +49,12 @@ std::optional<std::string> headerName(std::string_view plain) {
     return std::string(withoutBlanks(plain.substr(1, bracket - 1)));
 }
 
-/// The file's bytes; nothing where they cannot be read or are too many.
-std::optional<std::string> bytesOf(const std::string& fileName) {
-    std::error_code error;
-    if (!std::filesystem::is_regular_file(fileName, error)) return std::nullopt;
-    std::ifstream stream(fileName, std::ios::binary);
-    stream.imbue(std::locale::classic());
-    if (!stream) return std::nullopt;
-    std::string bytes(kLargestFile + 1, '\0');
-    stream.read(bytes.data(), static_cast<std::streamsize>(bytes.size()));
-    if (stream.bad() || !stream.eof()) return std::nullopt;
-    bytes.resize(static_cast<std::size_t>(stream.gcount()));
-    return bytes;
-}
-
-/// Puts the bytes into a new file beside the other and gives its name; empty where that failed. A
-/// name that is taken, be it by a link, is left alone.
-std::string createBeside(const std::string& fileName, const std::string& bytes) {
-    for (int i = 0; i < kMostNames; ++i) {
-        std::string name = fileName + ".new" + (i == 0 ? "" : std::to_string(i));
-        std::FILE* const file = std::fopen(name.c_str(), "wbx");
-        if (file == nullptr) continue;
-        const bool written = std::fwrite(bytes.data(), 1, bytes.size(), file) == bytes.size();
-        if (std::fclose(file) == 0 && written) return name;
-        std::remove(name.c_str());
-        return {};
-    }
-    return {};
-}
-
 }  // namespace
 
-IniFile IniFile::load(const std::string& fileName) {
-    std::error_code error;
-    if (std::filesystem::status(fileName, error).type() == std::filesystem::file_type::not_found)
-        return {};
-    if (const std::optional<std::string> bytes = bytesOf(fileName))
+IniFile IniFile::load(FileService& files, const std::string& fileName) {
+    if (!files.stat(fileName).exists()) return {};
+    FileProblem problem;
+    if (const auto bytes = readFile(files, fileName, kLargestFile, problem))
         return parse(bytesToUtf8(*bytes));
     IniFile unknown;
     unknown.readable_ = false;
@@ -226,22 +192,9 @@ std::string IniFile::text() const {
     return byteOrderMark_ ? std::string(kByteOrderMark) + text : text;
 }
 
-bool IniFile::save(const std::string& fileName) const {
+bool IniFile::save(FileService& files, const std::string& fileName) const {
     const std::string bytes = text();
-    if (!readable_ || bytes.size() > kLargestFile) return false;
-    std::error_code error;
-    // Where the name is a link, the file that it points to is replaced.
-    const std::filesystem::path found = std::filesystem::weakly_canonical(fileName, error);
-    const std::string target = error || found.empty() ? fileName : found.string();
-    const std::string beside = createBeside(target, bytes);
-    if (beside.empty()) return false;
-    const auto rights = std::filesystem::status(target, error).permissions();
-    if (!error) std::filesystem::permissions(beside, rights, error);
-    std::filesystem::rename(beside, target, error);
-    if (!error) return true;
-    std::error_code ignored;
-    std::filesystem::remove(beside, ignored);
-    return false;
+    return readable_ && bytes.size() <= kLargestFile && files.replace(fileName, bytes).empty();
 }
 
 }  // namespace zel

@@ -6,6 +6,8 @@
 #include <string_view>
 #include <vector>
 
+#include "platform/Files.h"
+
 namespace zel {
 
 /// Sections and keys compare without case; of two of the same name the first counts. Blanks around
@@ -15,7 +17,7 @@ class IniFile {
   public:
     /// A file that is not there is empty. One that cannot be read is empty too, and `save` refuses
     /// to replace what nobody has seen.
-    static IniFile load(const std::string& fileName);
+    static IniFile load(FileService& files, const std::string& fileName);
     static IniFile parse(std::string_view text);
 
     std::optional<std::string> value(std::string_view section, std::string_view key) const;
@@ -31,8 +33,8 @@ class IniFile {
     std::vector<std::string> keys(std::string_view section) const;
 
     std::string text() const;
-    /// Writes beside the file first, so that a failure leaves the file as it was; false then.
-    bool save(const std::string& fileName) const;
+    /// Replaces the file in one step. False after a failure; the file is then as it was.
+    bool save(FileService& files, const std::string& fileName) const;
 
   private:
     struct Line {

@@ -39,8 +39,8 @@ std::string valueName(const std::string& name) { return name.empty() ? kDefaultV
 
 }  // namespace
 
-cRegistry::cRegistry(std::string fileName, Environment environment)
-    : fileName_(std::move(fileName)), environment_(std::move(environment)) {}
+cRegistry::cRegistry(FileService& files, std::string fileName, Environment environment)
+    : files_(files), fileName_(std::move(fileName)), environment_(std::move(environment)) {}
 
 std::string cRegistry::keyName() const {
     for (const RootName& root : kRoots)
@@ -52,39 +52,39 @@ std::string cRegistry::keyName() const {
 bool cRegistry::KeyExists() const {
     const std::string name = upperCase(keyName());
     // A key is there as well when one below it is.
-    for (const std::string& section : IniFile::load(fileName_).sections())
+    for (const std::string& section : IniFile::load(files_, fileName_).sections())
         if (upperCase(section) == name || startsWith(upperCase(section), name + "\\")) return true;
     return false;
 }
 
 void cRegistry::CreateKey() {
     const std::string name = keyName();
-    IniFile file = IniFile::load(fileName_);
+    IniFile file = IniFile::load(files_, fileName_);
     if (file.hasSection(name)) return;
     // A key without values is kept by the value without a name.
-    if (!file.setValue(name, kDefaultValue, "") || !file.save(fileName_))
+    if (!file.setValue(name, kDefaultValue, "") || !file.save(files_, fileName_))
         throw RegistryError("Failed to create registry Key: '" + SectionKey + "'");
 }
 
 void cRegistry::DeleteKey() {
-    IniFile file = IniFile::load(fileName_);
-    if (!file.removeSection(keyName()) || !file.save(fileName_))
+    IniFile file = IniFile::load(files_, fileName_);
+    if (!file.removeSection(keyName()) || !file.save(files_, fileName_))
         throw RegistryError("Failed to delete registry Key: '" + keyText(ClassKey) +
                             "',Section: '" + SectionKey + "'");
 }
 
 void cRegistry::DeleteValue() {
-    IniFile file = IniFile::load(fileName_);
+    IniFile file = IniFile::load(files_, fileName_);
     if (!file.hasSection(keyName()))
         throw RegistryError("Failed to open key '" + keyText(ClassKey) + "',Section: '" +
                             SectionKey + "' for delete access");
-    if (!file.removeKey(keyName(), valueName(ValueKey)) || !file.save(fileName_))
+    if (!file.removeKey(keyName(), valueName(ValueKey)) || !file.save(files_, fileName_))
         throw RegistryError("Failed to delete registry Key: '" + keyText(ClassKey) +
                             "',Section: '" + SectionKey + "',Key: '" + ValueKey + "'");
 }
 
 std::string cRegistry::Value() {
-    const auto stored = IniFile::load(fileName_).value(keyName(), valueName(ValueKey));
+    const auto stored = IniFile::load(files_, fileName_).value(keyName(), valueName(ValueKey));
     ValueType = REG_SZ;
     if (!stored) return Default;
     for (const TypeMark& row : kTypeMarks) {
@@ -101,8 +101,8 @@ void cRegistry::setValue(const std::string& value) {
     const bool marked = ValueType != REG_SZ || beginsWithAMark(value);
     for (const TypeMark& row : kTypeMarks)
         if (marked && row.type == ValueType) written = row.mark + value;
-    IniFile file = IniFile::load(fileName_);
-    if (!file.setValue(keyName(), valueName(ValueKey), written) || !file.save(fileName_)) {
+    IniFile file = IniFile::load(files_, fileName_);
+    if (!file.setValue(keyName(), valueName(ValueKey), written) || !file.save(files_, fileName_)) {
         throw RegistryError("Failed to set registry value Key: '" + keyText(ClassKey) +
                             "',Section: '" + SectionKey + "',Key: '" + ValueKey + "' to value: '" +
                             value + "'");
@@ -123,7 +123,7 @@ std::string cRegistry::expanded(const std::string& text) const {
 }
 
 bool cRegistry::EnumerateValues(std::vector<std::string>& names, std::int32_t& count) const {
-    names = IniFile::load(fileName_).keys(keyName());
+    names = IniFile::load(files_, fileName_).keys(keyName());
     std::erase(names, kDefaultValue);
     count = static_cast<std::int32_t>(names.size());
     return KeyExists();
@@ -132,7 +132,7 @@ bool cRegistry::EnumerateValues(std::vector<std::string>& names, std::int32_t& c
 bool cRegistry::EnumerateSections(std::vector<std::string>& names, std::int32_t& count) const {
     names.clear();
     const std::string head = upperCase(keyName()) + "\\";
-    for (const std::string& section : IniFile::load(fileName_).sections()) {
+    for (const std::string& section : IniFile::load(files_, fileName_).sections()) {
         if (!startsWith(upperCase(section), head)) continue;
         const std::string rest = section.substr(head.size());
         const std::string child = rest.substr(0, rest.find('\\'));

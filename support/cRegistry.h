@@ -39,7 +39,7 @@ class cRegistry {
     using Environment = std::function<std::string(const std::string&)>;
 
     /// `fileName` holds the keys; `environment` gives the value of a variable by its name.
-    cRegistry(std::string fileName, Environment environment);
+    cRegistry(FileService& files, std::string fileName, Environment environment);
 
     std::int32_t ClassKey = HKEY_CURRENT_USER;
     std::string SectionKey;
@@ -77,6 +77,7 @@ class cRegistry {
     void writeAt(const std::string& section, const std::string& valueName,
                  const std::string& value);
 
+    FileService& files_;
     std::string fileName_;
     Environment environment_;
 };

@@ -45,20 +45,20 @@ constexpr Set kSets[] = {
       &WaterfallForm::spectrogramPanned}},
 };
 
-std::string stored(const std::string& file, const std::string& section, const std::string& key) {
-    return std::get<std::string>(ReadIni(file, section, key, IniValue(std::string())));
+}  // namespace
+
+std::string ViewSettings::stored(const std::string& file, const std::string& section,
+                                 const std::string& key) {
+    return std::get<std::string>(ReadIni(files_, file, section, key, IniValue(std::string())));
 }
 
-/// True when the file holds the key.
-bool read(const std::string& file, const std::string& section, const std::string& key,
-          double& number) {
+bool ViewSettings::read(const std::string& file, const std::string& section, const std::string& key,
+                        double& number) {
     const std::string text = stored(file, section, key);
     if (text.empty()) return false;
     number = ParseNumberInvariant(text);
     return true;
 }
-
-}  // namespace
 
 std::string ViewSettings::fileName() {
     const std::string folder = folder_.path();
@@ -110,7 +110,7 @@ double ViewSettings::readDistance(double fallback) {
 void ViewSettings::write() {
     const std::string file = fileName();
     if (file.empty()) return;
-    IniFile ini = IniFile::load(file);
+    IniFile ini = IniFile::load(files_, file);
     ini.setValue("Mode", "View", form_.IsSpectrogram ? "1" : "0");
     for (const char* kind : kKinds)
         for (const Set& set : kSets)
@@ -122,13 +122,13 @@ void ViewSettings::write() {
         ini.setValue(kAxes[i], "Max", generalNumber(form_.Graph3D.axis(i + 1).Maximum));
         ini.setValue(kAxes[i], "Min", generalNumber(form_.Graph3D.axis(i + 1).Minimum));
     }
-    ini.save(file);
+    ini.save(files_, file);
 }
 
 void ViewSettings::writeReset() {
     const std::string file = fileName();
     if (file.empty()) return;
-    IniFile ini = IniFile::load(file);
+    IniFile ini = IniFile::load(files_, file);
     for (int i = 0; i < 3; ++i) {
         ini.setValue(kAxes[i], "Max", generalNumber(kDesignMaxima[i]));
         ini.setValue(kAxes[i], "Min", "0");
@@ -138,7 +138,7 @@ void ViewSettings::writeReset() {
             if (std::string_view(entry.section) == "Translation")
                 ini.setValue(entry.section + std::string(set.letter), entry.key,
                              generalNumber(form_.*set.view.*entry.number));
-    ini.save(file);
+    ini.save(files_, file);
 }
 
 }  // namespace zel

@@ -18,11 +18,12 @@ constexpr double kAxisMaxima[] = {12, 10, 10};
 
 }  // namespace
 
-WaterfallView::WaterfallView(Forms& forms, Graph3dOps& ops, ApplicationFolder& folder)
+WaterfallView::WaterfallView(Forms& forms, Graph3dOps& ops, ApplicationFolder& folder,
+                             FileService& files)
     : form_(forms.waterfall),
       panel_(forms.controller),
       ops_(ops),
-      settings_(forms.waterfall, folder) {
+      settings_(forms.waterfall, folder, files) {
     form_.Load.connect([this] { Form_Load(); });
     form_.Unload.connect([this](int /*argument*/) { Form_Unload(); });
     form_.QueryUnload.connect([this](int& cancel) {

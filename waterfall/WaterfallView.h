@@ -4,6 +4,7 @@
 #include <string>
 
 #include "forms/Forms.h"
+#include "platform/Files.h"
 #include "platform/Services.h"
 #include "waterfall/Graph3dOps.h"
 #include "waterfall/ViewSettings.h"
@@ -14,7 +15,7 @@ class WaterfallView {
   public:
     /// Connects the menus, the key `cmd3D` and the mouse. The camera is kept in "3dgraph.ini" of
     /// the application's folder.
-    WaterfallView(Forms& forms, Graph3dOps& ops, ApplicationFolder& folder);
+    WaterfallView(Forms& forms, Graph3dOps& ops, ApplicationFolder& folder, FileService& files);
 
     /// Reads "3dgraph.ini"; what is not there keeps the design's value.
     void Form_Load();

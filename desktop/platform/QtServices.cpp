@@ -75,17 +75,21 @@ std::string QtApplicationFolder::programPath() {
         .toStdString();
 }
 
-QtSettingsStore::QtSettingsStore(ApplicationFolder& folder) : file_(folder.path() + "/user.ini") {}
+QtSettingsStore::QtSettingsStore(ApplicationFolder& folder, FileService& files)
+    : files_(files), file_(folder.path() + "/user.ini") {}
 
 std::string QtSettingsStore::get(const std::string& application, const std::string& section,
                                  const std::string& key, const std::string& fallback) {
-    return IniFile::load(file_).value(application, settingsKey(section, key)).value_or(fallback);
+    return IniFile::load(files_, file_)
+        .value(application, settingsKey(section, key))
+        .value_or(fallback);
 }
 
 bool QtSettingsStore::set(const std::string& application, const std::string& section,
                           const std::string& key, const std::string& value) {
-    IniFile settings = IniFile::load(file_);
-    return settings.setValue(application, settingsKey(section, key), value) && settings.save(file_);
+    IniFile settings = IniFile::load(files_, file_);
+    return settings.setValue(application, settingsKey(section, key), value) &&
+           settings.save(files_, file_);
 }
 
 void QtDebugChannel::output(const std::string& text) {

@@ -4,6 +4,7 @@
 #include <QString>
 #include <string>
 
+#include "platform/Files.h"
 #include "platform/Services.h"
 
 namespace zel {
@@ -23,7 +24,7 @@ class QtApplicationFolder : public ApplicationFolder {
 /// One ini file in the application's folder.
 class QtSettingsStore : public SettingsStore {
   public:
-    explicit QtSettingsStore(ApplicationFolder& folder);
+    QtSettingsStore(ApplicationFolder& folder, FileService& files);
     std::string get(const std::string& application, const std::string& section,
                     const std::string& key, const std::string& fallback) override;
     bool set(const std::string& application, const std::string& section, const std::string& key,
@@ -31,6 +32,7 @@ class QtSettingsStore : public SettingsStore {
     std::string place() override { return file_; }
 
   private:
+    FileService& files_;
     std::string file_;
 };
 

@@ -31,10 +31,10 @@ struct QtSystem {
     QtSerialPort serverPort{events, false};
     QtServerSocket serverSocket{events};
     QtApplicationFolder folder;
-    QtSettingsStore settings{folder};
+    SystemFiles files;
+    QtSettingsStore settings{folder, files};
     QtDebugChannel debug;
     QtStartupFolder startup;
-    SystemFiles files;
     SystemMachine machine;
     SystemPortProbe portProbe;
 };

@@ -3,38 +3,29 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
-#include <fstream>
-#include <iterator>
-#include <random>
 #include <string>
+
+#include "platform/virtual/VirtualFiles.h"
+#include "platform/virtual/VirtualTime.h"
 
 namespace zel {
 
 class Stores : public testing::Test {
   protected:
-    Stores() {
-        folder_ = std::filesystem::temp_directory_path() /
-                  ("zel-stores-" + std::to_string(std::random_device()()));
-        std::filesystem::create_directories(folder_);
-    }
-    ~Stores() override { std::filesystem::remove_all(folder_); }
+    Stores() { disk_.putFolder(folder_); }
 
-    std::string file(const std::string& name) const { return (folder_ / name).string(); }
-    std::string write(const std::string& text) const {
-        std::ofstream(file("a.ini"), std::ios::binary) << text;
+    std::string file(const std::string& name) const { return folder_ + "/" + name; }
+    std::string write(const std::string& text) {
+        disk_.put(file("a.ini"), text);
         return file("a.ini");
     }
-    static std::string read(const std::string& name) {
-        std::ifstream stream(name, std::ios::binary);
-        return {std::istreambuf_iterator<char>(stream), {}};
-    }
+    std::string read(const std::string& name) const { return disk_.bytes(name); }
     /// How many files the folder holds.
-    std::ptrdiff_t files() const {
-        return std::distance(std::filesystem::directory_iterator(folder_), {});
-    }
+    std::size_t files() { return disk_.list(folder_).size(); }
 
-    std::filesystem::path folder_;
+    const std::string folder_ = "/stores";
+    VirtualClock clock_;
+    VirtualFiles disk_{clock_};
 };
 
 }  // namespace zel

@@ -19,203 +19,217 @@ std::string textOf(const IniValue& value) { return std::get<std::string>(value);
 
 TEST_F(Stores, ReadIni_KeyThatIsNotThere_GivesTheDefault) {
     const std::string name = write("[A]\r\nx=1\r\n");
-    EXPECT_EQ(textOf(ReadIni(name, "A", "y", std::string("none"))), "none");
-    EXPECT_EQ(textOf(ReadIni(name, "B", "x", std::string("none"))), "none");
-    EXPECT_EQ(textOf(ReadIni(file("absent.ini"), "A", "x", std::string("none"))), "none");
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "y", std::string("none"))), "none");
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "B", "x", std::string("none"))), "none");
+    EXPECT_EQ(textOf(ReadIni(disk_, file("absent.ini"), "A", "x", std::string("none"))), "none");
 }
 
 TEST_F(Stores, ReadIni_MissingDefault_CountsAsTheNumberOne) {
     const std::string name = write("");
-    EXPECT_EQ(std::get<std::int16_t>(ReadIni(name, "A", "x")), 1);
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", std::nullopt, IniType::Text)), "1");
+    EXPECT_EQ(std::get<std::int16_t>(ReadIni(disk_, name, "A", "x")), 1);
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", std::nullopt, IniType::Text)), "1");
 }
 
 TEST_F(Stores, ReadIni_NamesCompareWithoutCase) {
-    EXPECT_EQ(textOf(ReadIni(write("[Devices]\nInit1=AT&F\n"), "DEVICES", "INIT1", std::string())),
-              "AT&F");
+    EXPECT_EQ(
+        textOf(ReadIni(disk_, write("[Devices]\nInit1=AT&F\n"), "DEVICES", "INIT1", std::string())),
+        "AT&F");
 }
 
 TEST_F(Stores, ReadIni_TypeFollowsTheNameOrElseTheDefault) {
     const std::string name = write("[A]\nx=42.5 dBm\n");
-    EXPECT_EQ(std::get<double>(ReadIni(name, "A", "x", 0.0)), 42.5);
-    EXPECT_EQ(std::get<float>(ReadIni(name, "A", "x", 0.0F)), 42.5F);
-    EXPECT_EQ(std::get<std::int32_t>(ReadIni(name, "A", "x", std::int32_t{0})), 42);
-    EXPECT_EQ(std::get<std::int16_t>(ReadIni(name, "A", "x", 0.0, IniType::Integer)), 42);
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", 0.0, IniType::Text)), "42.5 dBm");
+    EXPECT_EQ(std::get<double>(ReadIni(disk_, name, "A", "x", 0.0)), 42.5);
+    EXPECT_EQ(std::get<float>(ReadIni(disk_, name, "A", "x", 0.0F)), 42.5F);
+    EXPECT_EQ(std::get<std::int32_t>(ReadIni(disk_, name, "A", "x", std::int32_t{0})), 42);
+    EXPECT_EQ(std::get<std::int16_t>(ReadIni(disk_, name, "A", "x", 0.0, IniType::Integer)), 42);
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", 0.0, IniType::Text)), "42.5 dBm");
 }
 
 TEST_F(Stores, ReadIni_NumberPastItsType_IsHeldAtTheEnd) {
     const std::string name = write("[A]\nx=99999999999\n");
-    EXPECT_EQ(std::get<std::int16_t>(ReadIni(name, "A", "x", std::int16_t{0})), 32767);
+    EXPECT_EQ(std::get<std::int16_t>(ReadIni(disk_, name, "A", "x", std::int16_t{0})), 32767);
 }
 
 TEST_F(Stores, ReadIni_WholeType_TakesTheNearestNumber) {
     const std::string name = write("[A]\nx=42.7\ny=-3.6\n");
-    EXPECT_EQ(std::get<std::int16_t>(ReadIni(name, "A", "x", std::int16_t{0})), 43);
-    EXPECT_EQ(std::get<std::int32_t>(ReadIni(name, "A", "y", std::int32_t{0})), -4);
+    EXPECT_EQ(std::get<std::int16_t>(ReadIni(disk_, name, "A", "x", std::int16_t{0})), 43);
+    EXPECT_EQ(std::get<std::int32_t>(ReadIni(disk_, name, "A", "y", std::int32_t{0})), -4);
 }
 
 TEST_F(Stores, ReadIni_DefaultOfAnotherType_IsTurnedIntoText) {
     const std::string name = write("");
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", 2.5, IniType::Text)), "2.5");
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", 0.1F, IniType::Text)), "0.1");
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", true, IniType::Text)), "1");
-    EXPECT_EQ(std::get<double>(ReadIni(name, "A", "x", std::string("7 dB"), IniType::Double)), 7);
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", 2.5, IniType::Text)), "2.5");
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", 0.1F, IniType::Text)), "0.1");
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", true, IniType::Text)), "1");
+    EXPECT_EQ(
+        std::get<double>(ReadIni(disk_, name, "A", "x", std::string("7 dB"), IniType::Double)), 7);
 }
 
 TEST_F(Stores, ReadIni_TextWithoutANumber_GivesZero) {
-    EXPECT_EQ(std::get<std::int32_t>(ReadIni(write("[A]\nx=on\n"), "A", "x", std::int32_t{5})), 0);
+    EXPECT_EQ(
+        std::get<std::int32_t>(ReadIni(disk_, write("[A]\nx=on\n"), "A", "x", std::int32_t{5})), 0);
 }
 
 TEST_F(Stores, ReadIni_TrueTexts_ReadAsTrue) {
     for (const char* text : {"1", "TRUE", "true", "True", "Wahr", "WAHR"})
-        EXPECT_TRUE(std::get<bool>(ReadIni(write(std::string("[A]\nx=") + text), "A", "x", false)))
+        EXPECT_TRUE(
+            std::get<bool>(ReadIni(disk_, write(std::string("[A]\nx=") + text), "A", "x", false)))
             << text;
     for (const char* text : {"0", "2", "yes", ""})
-        EXPECT_FALSE(std::get<bool>(ReadIni(write(std::string("[A]\nx=") + text), "A", "x", true)))
+        EXPECT_FALSE(
+            std::get<bool>(ReadIni(disk_, write(std::string("[A]\nx=") + text), "A", "x", true)))
             << text;
 }
 
 TEST_F(Stores, ReadIni_LongValue_IsCutBehind750Characters) {
     const std::string name = write("[A]\nx=" + std::string(900, 'a') + "\n");
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", std::string())).size(), 750U);
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", std::string())).size(), 750U);
 }
 
 TEST_F(Stores, ReadIni_LongValueOfUmlauts_IsCutBetweenCharacters) {
     std::string umlauts;
     for (int i = 0; i < 800; ++i) umlauts += "ä";
-    EXPECT_EQ(textOf(ReadIni(write("[A]\nx=" + umlauts), "A", "x", std::string())).size(), 1500U);
+    EXPECT_EQ(textOf(ReadIni(disk_, write("[A]\nx=" + umlauts), "A", "x", std::string())).size(),
+              1500U);
 }
 
 TEST_F(Stores, ReadIni_QuotesAroundAValue_AreNoPartOfIt) {
-    EXPECT_EQ(textOf(ReadIni(write("[A]\nx=\" a \"\n"), "A", "x", std::string())), " a ");
+    EXPECT_EQ(textOf(ReadIni(disk_, write("[A]\nx=\" a \"\n"), "A", "x", std::string())), " a ");
 }
 
 TEST_F(Stores, ReadIni_FileInWindows1252_IsReadAsSuch) {
-    EXPECT_EQ(textOf(ReadIni(write("[A]\nx=\xB5V\n"), "A", "x", std::string())), "µV");
+    EXPECT_EQ(textOf(ReadIni(disk_, write("[A]\nx=\xB5V\n"), "A", "x", std::string())), "µV");
 }
 
 TEST_F(Stores, ReadIni_FileThatIsTooLarge_CountsAsEmpty) {
     const std::string name = write("[A]\nx=1\n" + std::string((1U << 20) + 1, ';'));
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", std::string("none"))), "none");
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", std::string("none"))), "none");
 }
 
 TEST_F(Stores, WriteIni_LeavesAllOtherLinesAsTheyStand) {
     const std::string name = write("; head\r\n[A]\r\n x = 1 \r\ny=2\r\n\r\n[B]\r\nz=3\r\n");
-    EXPECT_TRUE(WriteIni(name, "a", "Y", std::string("new")));
+    EXPECT_TRUE(WriteIni(disk_, name, "a", "Y", std::string("new")));
     EXPECT_EQ(read(name), "; head\r\n[A]\r\n x = 1 \r\nY=new\r\n\r\n[B]\r\nz=3\r\n");
 }
 
 TEST_F(Stores, WriteIni_NewKey_GoesToTheEndOfItsSection) {
     const std::string name = write("[A]\nx=1\n\n[B]\nz=3\n");
-    EXPECT_TRUE(WriteIni(name, "A", "y", std::string("2")));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "y", std::string("2")));
     EXPECT_EQ(read(name), "[A]\nx=1\ny=2\n\n[B]\nz=3\n");
 }
 
 TEST_F(Stores, WriteIni_EachType_IsWrittenAsItsText) {
     const std::string name = file("a.ini");
-    EXPECT_TRUE(WriteIni(name, "A", "b", true));
-    EXPECT_TRUE(WriteIni(name, "A", "c", false));
-    EXPECT_TRUE(WriteIni(name, "A", "i", std::int16_t{-5}));
-    EXPECT_TRUE(WriteIni(name, "A", "l", std::int32_t{100000}));
-    EXPECT_TRUE(WriteIni(name, "A", "f", 0.1F));
-    EXPECT_TRUE(WriteIni(name, "A", "d", 0.5));
-    EXPECT_TRUE(WriteIni(name, "A", "t", std::string("a b")));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "b", true));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "c", false));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "i", std::int16_t{-5}));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "l", std::int32_t{100000}));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "f", 0.1F));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "d", 0.5));
+    EXPECT_TRUE(WriteIni(disk_, name, "A", "t", std::string("a b")));
     EXPECT_EQ(read(name), "[A]\r\nb=1\r\nc=0\r\ni=-5\r\nl=100000\r\nf=0.1\r\nd=0.5\r\nt=a b\r\n");
 }
 
 TEST_F(Stores, WriteIni_ValueWithBlanksOrQuotes_ReadsBackAsItWas) {
     const std::string name = file("a.ini");
     for (const std::string text : {" a ", "\"q\"", "'", "", "a=b;c"}) {
-        ASSERT_TRUE(WriteIni(name, "A", "x", text));
-        EXPECT_EQ(textOf(ReadIni(name, "A", "x", std::string("none"))), text);
+        ASSERT_TRUE(WriteIni(disk_, name, "A", "x", text));
+        EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", std::string("none"))), text);
     }
 }
 
 TEST_F(Stores, WriteIni_LineEndInAValue_DoesNotBeginALine) {
     const std::string name = file("a.ini");
-    ASSERT_TRUE(WriteIni(name, "A", "x", std::string("1\r\n[B]\r\ny=2")));
-    EXPECT_EQ(textOf(ReadIni(name, "B", "y", std::string("none"))), "none");
+    ASSERT_TRUE(WriteIni(disk_, name, "A", "x", std::string("1\r\n[B]\r\ny=2")));
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "B", "y", std::string("none"))), "none");
 }
 
 TEST_F(Stores, WriteIni_FolderThatIsNotThere_FailsAndMakesNoFile) {
-    EXPECT_FALSE(WriteIni(file("no/such/a.ini"), "A", "x", true));
-    EXPECT_EQ(files(), 0);
+    EXPECT_FALSE(WriteIni(disk_, file("no/such/a.ini"), "A", "x", true));
+    EXPECT_EQ(files(), 0U);
 }
 
 TEST_F(Stores, WriteIni_FileThatIsTooLarge_FailsAndLeavesIt) {
     const std::string large = "[A]\nx=1\n" + std::string((1U << 20) + 1, ';');
     const std::string name = write(large);
-    EXPECT_FALSE(WriteIni(name, "A", "x", std::string("2")));
+    EXPECT_FALSE(WriteIni(disk_, name, "A", "x", std::string("2")));
     EXPECT_EQ(read(name), large);
 }
 
 TEST_F(Stores, WriteIni_FileThatWouldGrowTooLarge_FailsAndLeavesIt) {
     const std::string name = write("[A]\nx=1\n");
-    EXPECT_FALSE(WriteIni(name, "A", "y", std::string(1U << 20, 'a')));
+    EXPECT_FALSE(WriteIni(disk_, name, "A", "y", std::string(1U << 20, 'a')));
     EXPECT_EQ(read(name), "[A]\nx=1\n");
 }
 
 TEST_F(Stores, WriteIni_FolderInPlaceOfTheFile_FailsAndLeavesNothingBeside) {
-    std::filesystem::create_directories(folder_ / "a.ini" / "inner");
-    EXPECT_FALSE(WriteIni(file("a.ini"), "A", "x", true));
-    EXPECT_TRUE(std::filesystem::is_directory(folder_ / "a.ini" / "inner"));
-    EXPECT_EQ(files(), 1);
+    disk_.putFolder(file("a.ini") + "/inner");
+    EXPECT_FALSE(WriteIni(disk_, file("a.ini"), "A", "x", true));
+    EXPECT_EQ(disk_.stat(file("a.ini")).kind, FileKind::Folder);
+    EXPECT_EQ(files(), 1U);
 }
 
 TEST_F(Stores, Save_NameThatCannotBeReplaced_LeavesNothingBeside) {
-    std::filesystem::create_directories(folder_ / "a.ini" / "inner");
-    EXPECT_FALSE(IniFile::parse("[A]\nx=1\n").save(file("a.ini")));
-    EXPECT_EQ(files(), 1);
+    disk_.putFolder(file("a.ini") + "/inner");
+    EXPECT_FALSE(IniFile::parse("[A]\nx=1\n").save(disk_, file("a.ini")));
+    EXPECT_EQ(files(), 1U);
 }
 
 TEST_F(Stores, WriteIni_NameThatNoLineCanHold_FailsAndMakesNoFile) {
     for (const char* key : {"", " a", "a=b", ";a", "[a]", "a\nb", "\xB5"})
-        EXPECT_FALSE(WriteIni(file("a.ini"), "A", key, true)) << key;
+        EXPECT_FALSE(WriteIni(disk_, file("a.ini"), "A", key, true)) << key;
     for (const char* section : {"", "A ", "A]\r\n[B"})
-        EXPECT_FALSE(WriteIni(file("a.ini"), section, "x", true)) << section;
-    EXPECT_EQ(files(), 0);
+        EXPECT_FALSE(WriteIni(disk_, file("a.ini"), section, "x", true)) << section;
+    EXPECT_EQ(files(), 0U);
 }
 
 TEST_F(Stores, WriteIni_BytesThatAreNoUtf8_LeaveTheOtherTextsReadable) {
     const std::string name = write("[A]\nx=\xC2\xB5V\n");
-    ASSERT_TRUE(WriteIni(name, "A", "y", std::string("\xB5s")));
-    EXPECT_EQ(textOf(ReadIni(name, "A", "x", std::string())), "µV");
-    EXPECT_EQ(textOf(ReadIni(name, "A", "y", std::string())), "µs");
+    ASSERT_TRUE(WriteIni(disk_, name, "A", "y", std::string("\xB5s")));
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", std::string())), "µV");
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "y", std::string())), "µs");
 }
 
 TEST_F(Stores, WriteIni_RightsOfTheFile_Stay) {
-    using std::filesystem::perms;
-    const std::string name = write("[A]\nx=1\n");
-    std::filesystem::permissions(name, perms::owner_read | perms::owner_write);
-    ASSERT_TRUE(WriteIni(name, "A", "x", std::string("2")));
-    EXPECT_EQ(std::filesystem::status(name).permissions(), perms::owner_read | perms::owner_write);
+    disk_.put(file("a.ini"), "[A]\nx=1\n", 0600);
+    ASSERT_TRUE(WriteIni(disk_, file("a.ini"), "A", "x", std::string("2")));
+    EXPECT_EQ(disk_.mode(file("a.ini")), 0600U);
 }
 
-TEST_F(Stores, WriteIni_LinkAtTheTemporaryName_IsNotFollowed) {
+TEST_F(Stores, WriteIni_FullDisk_FailsAndLeavesIt) {
     const std::string name = write("[A]\nx=1\n");
-    const std::string other = file("precious");
-    std::ofstream(other) << "kept";
-    std::filesystem::create_symlink(other, name + ".new");
-    ASSERT_TRUE(WriteIni(name, "A", "x", std::string("2")));
-    EXPECT_EQ(read(other), "kept");
-    EXPECT_TRUE(std::filesystem::is_symlink(name + ".new"));
-    EXPECT_EQ(read(name), "[A]\nx=2\n");
+    disk_.room = 3;
+    EXPECT_FALSE(WriteIni(disk_, name, "A", "x", std::string("2")));
+    EXPECT_EQ(read(name), "[A]\nx=1\n");
+}
+
+TEST_F(Stores, WriteIni_FileThatCannotBeRead_FailsAndLeavesIt) {
+    const std::string name = write("[A]\nx=1\n");
+    disk_.readable = 4;
+    EXPECT_EQ(textOf(ReadIni(disk_, name, "A", "x", std::string("none"))), "none");
+    EXPECT_FALSE(WriteIni(disk_, name, "A", "x", std::string("2")));
+    EXPECT_EQ(read(name), "[A]\nx=1\n");
+}
+
+TEST_F(Stores, WriteIni_WhatIsNoRegularFile_IsNotTouched) {
+    disk_.putOther(file("pipe"));
+    EXPECT_FALSE(WriteIni(disk_, file("pipe"), "A", "x", true));
+    EXPECT_EQ(read(file("pipe")), "");
 }
 
 TEST_F(Stores, WriteIni_FileThatIsALink_ReplacesWhatItPointsTo) {
     const std::string name = write("[A]\nx=1\n");
     const std::string link = file("link.ini");
-    std::filesystem::create_symlink(name, link);
-    ASSERT_TRUE(WriteIni(link, "A", "x", std::string("2")));
-    EXPECT_TRUE(std::filesystem::is_symlink(link));
+    disk_.putLink(link, name);
+    ASSERT_TRUE(WriteIni(disk_, link, "A", "x", std::string("2")));
+    EXPECT_EQ(read(link), "");  // still a link
     EXPECT_EQ(read(name), "[A]\nx=2\n");
 }
 
 class Registry : public Stores {
   protected:
     cRegistry registry() {
-        cRegistry made(file("registry.ini"), [](const std::string& name) {
+        cRegistry made(disk_, file("registry.ini"), [](const std::string& name) {
             return name == "HOME" ? std::string("/home/rf") : std::string();
         });
         made.SectionKey = "Software\\ZEL";

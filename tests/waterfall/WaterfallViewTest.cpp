@@ -13,13 +13,11 @@ struct WaterfallViewTest : Stores {
     WaterfallForm& form = forms.waterfall;
     Graph3D& graph = form.Graph3D;
     Graph3dOps ops{form};
-    WaterfallView view{forms, ops, folder};
+    WaterfallView view{forms, ops, folder, disk_};
 
-    WaterfallViewTest() { folder.folder = folder_.string(); }
+    WaterfallViewTest() { folder.folder = folder_; }
 
-    void ini(const std::string& text) {
-        std::ofstream(file("3dgraph.ini"), std::ios::binary) << text;
-    }
+    void ini(const std::string& text) { disk_.put(file("3dgraph.ini"), text); }
     std::string stored() const { return read(file("3dgraph.ini")); }
     void rotate(double latitude, double longitude) {
         GraphView3D moved = graph.view();
@@ -150,7 +148,7 @@ TEST_F(WaterfallViewTest, UnloadAndLoad_KeepTheView) {
     form.unload(1);
     Forms again;
     Graph3dOps otherOps{again.waterfall};
-    const WaterfallView other{again, otherOps, folder};
+    const WaterfallView other{again, otherOps, folder, disk_};
     again.waterfall.load();
     EXPECT_TRUE(again.waterfall.IsSpectrogram);
     EXPECT_EQ(again.waterfall.Graph3D.view(), graph.view());
@@ -158,7 +156,7 @@ TEST_F(WaterfallViewTest, UnloadAndLoad_KeepTheView) {
 
 TEST_F(WaterfallViewTest, Unload_OfAFormThatIsNotLoaded_WritesNothing) {
     form.unload(1);
-    EXPECT_EQ(files(), 0);
+    EXPECT_EQ(files(), 0U);
 }
 
 TEST_F(WaterfallViewTest, Orthographic_ComesNearerOnceAndBackIsNoChange) {
