@@ -57,6 +57,38 @@ std::vector<Mark> rowMarks(const Graph3D& graph, const RowLimits& limits) {
     return marks;
 }
 
+struct TextPlace {
+    ScreenPoint at;
+    const std::string* text;
+};
+
+/// Texts lie flat: side by side they need their width.
+bool apart(const TextPlace& a, const TextPlace& b, double fontHeight) {
+    const auto letters = static_cast<double>(b.text->size()) + 2;
+    return std::fabs(a.at.x - b.at.x) >= 0.62 * fontHeight * letters ||
+           std::fabs(a.at.y - b.at.y) >= fontHeight * 1.15;
+}
+
+/// Each n-th of the places that has room after the one before it.
+std::vector<std::size_t> eachNth(const std::vector<TextPlace>& places, std::size_t n,
+                                 double fontHeight) {
+    std::vector<std::size_t> kept;
+    for (std::size_t i = 0; i < places.size(); i += n)
+        if (kept.empty() || apart(places[kept.back()], places[i], fontHeight)) kept.push_back(i);
+    return kept;
+}
+
+/// The places that get their texts: at even steps, unless that would leave out more than half of
+/// those that have room.
+std::vector<std::size_t> textsWithRoom(const std::vector<TextPlace>& places, double fontHeight) {
+    std::vector<std::size_t> most = eachNth(places, 1, fontHeight);
+    for (std::size_t n = 1; places.size() / n * 2 >= most.size() && n <= places.size(); ++n) {
+        std::vector<std::size_t> even = eachNth(places, n, fontHeight);
+        if (even.size() == (places.size() + n - 1) / n) return even;
+    }
+    return most;
+}
+
 class Box {
   public:
     Box(const Graph3D& graph, const Camera& camera, double fontHeight, WaterfallPicture& picture)
@@ -170,7 +202,7 @@ class Box {
             out = {-out.x, -out.y};
         const double tick = std::clamp(kTickLength * camera_.scale(), 4.0, 8.0);
         const bool hidden = axis == 2 && graph_.axis(3).LabelColor == graph_.BackColor;
-        ScreenPoint last{-1e9, -1e9};
+        std::vector<TextPlace> places;
         for (const Mark& mark : marks_.at(static_cast<std::size_t>(axis))) {
             BoxPoint place = start;
             part(place, axis) = mark.place;
@@ -178,18 +210,17 @@ class Box {
             const ScreenPoint at = camera_.project(place);
             picture_.before.push_back(
                 {at, {at.x + out.x * tick, at.y + out.y * tick}, PictureLine::Kind::Tick});
-            if (hidden) continue;
-            // Texts lie flat: side by side they need their width.
-            const double wide = 0.62 * fontHeight_ * (static_cast<double>(mark.text.size()) + 2);
-            if (std::fabs(at.x - last.x) < wide && std::fabs(at.y - last.y) < fontHeight_ * 1.15)
-                continue;
-            last = at;
-            const double gap = tick + 0.25 * fontHeight_;
+            places.push_back({at, &mark.text});
+        }
+        if (hidden) return;
+        const double gap = tick + 0.25 * fontHeight_;
+        for (const std::size_t i : textsWithRoom(places, fontHeight_)) {
             PictureText text;
+            const ScreenPoint& at = places[i].at;
             text.at = {at.x + out.x * gap, at.y + out.y * gap};
             text.right = out.x > 0.35 ? 1 : out.x < -0.35 ? -1 : 0;
             text.down = out.y > 0.35 ? 1 : out.y < -0.35 ? -1 : 0;
-            text.text = mark.text;
+            text.text = *places[i].text;
             picture_.texts.push_back(std::move(text));
         }
     }
@@ -236,7 +267,7 @@ void addMarkers(const Graph3D& graph, const Camera& camera, WaterfallPicture& pi
         text.down = -1;
         text.marker = true;
         text.text = axisNumber(cursor.X, graph.axis(1).Format, std::fabs(step)) + "  " +
-                    axisNumber(cursor.Z, graph.axis(3).Format, 0.1);
+                    axisNumber(cursor.Z, levelFormat(graph), 0.1);
         if (cursor.NameVisible) text.text += "  " + trimmed(cursor.Name);
         picture.texts.push_back(std::move(text));
     }

@@ -53,4 +53,10 @@ std::string axisNumber(double value, const std::string& format, double step) {
     return unit.empty() ? number : number + " " + unit;
 }
 
+std::string levelFormat(const Graph3D& graph) {
+    const GraphAxis& axis = graph.axis(3);
+    const bool hidden = axis.LabelColor == graph.BackColor;
+    return hidden && axis.Format == "%" ? "k\"dBm\"" : axis.Format;
+}
+
 }  // namespace zel

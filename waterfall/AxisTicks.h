@@ -4,6 +4,8 @@
 #include <string>
 #include <vector>
 
+#include "platform/Graph3D.h"
+
 namespace zel {
 
 /// At most `most` + 1 ticks at steps of 1, 2 or 5 between the two ends; none for a range of no
@@ -17,5 +19,8 @@ double tickStep(double first, double last, int most);
 std::string axisNumber(double value, const std::string& format, double step);
 /// The unit in a format: "Hz", "dBm", "%".
 std::string axisUnit(const std::string& format);
+/// The format of a single level: that of axis 3, but dBm where its numbers are hidden because they
+/// are dBm and not the unit (volts and watts on a logarithmic range).
+std::string levelFormat(const Graph3D& graph);
 
 }  // namespace zel

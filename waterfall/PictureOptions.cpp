@@ -73,7 +73,7 @@ std::string sampleText(const Graph3D& graph, const SurfaceHit& hit) {
     if (i >= plot.x.size() || i >= plot.level.size()) return "";
     const double step = std::fabs(graph.axis(1).Maximum - graph.axis(1).Minimum) / 1000;
     return axisNumber(plot.x[i], graph.axis(1).Format, step) + "   " + trimmed(plot.time) + "   " +
-           axisNumber(plot.level[i], graph.axis(3).Format, 0.1);
+           axisNumber(plot.level[i], levelFormat(graph), 0.1);
 }
 
 }  // namespace zel

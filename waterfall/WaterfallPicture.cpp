@@ -24,6 +24,11 @@ bool levelsOfRows(const Graph3D& graph, double& low, double& high) {
     return any;
 }
 
+int dotsOf(int pixels, double dots) {
+    const double wanted = std::isfinite(dots) && dots > 0 ? pixels * dots : pixels;
+    return static_cast<int>(std::clamp<double>(wanted, 1, SurfaceRenderer::kLargestSide));
+}
+
 }  // namespace
 
 RowLimits pictureLimits(const Graph3D& graph, const PictureStyle& style) {
@@ -63,10 +68,12 @@ WaterfallPicture drawWaterfall(const Graph3D& graph, const PictureStyle& style, 
     picture.map = &pictureMap(graph, style);
     const GraphView3D view = style.view.value_or(graph.view());
     const int over = std::clamp(style.oversampling, 1, 4);
-    const Camera fine(view, perspective, width * over, height * over);
+    const int columns = dotsOf(width, style.dots);
+    const int lines = dotsOf(height, style.dots);
+    const Camera fine(view, perspective, columns * over, lines * over);
     picture.rows =
         SurfaceRenderer(fine, *picture.map, kShade)
-            .draw(rowSurfaces(graph, picture.limits), width, height, style.threads, over);
+            .draw(rowSurfaces(graph, picture.limits), columns, lines, style.threads, over);
     const Camera camera(view, perspective, width, height);
     addAxisBox(graph, camera, fontHeight, picture);
     addMarkers(graph, camera, picture);

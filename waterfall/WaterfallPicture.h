@@ -22,6 +22,7 @@ struct PictureStyle {
     double high = 0;
     int threads = 2;
     int oversampling = 1;
+    double dots = 1;  ///< pixels of the rows' image in a pixel of lines and texts, each way
     std::optional<GraphView3D> view;  ///< in place of the graph's own
 
     bool operator==(const PictureStyle&) const = default;
@@ -57,7 +58,8 @@ struct WaterfallPicture {
 RowLimits pictureLimits(const Graph3D& graph, const PictureStyle& style);
 /// The map of the rows' own style, or the chosen one.
 const ColourMap& pictureMap(const Graph3D& graph, const PictureStyle& style);
-/// `width` and `height` in pixels, `fontHeight` keeps texts apart.
+/// `width` and `height` in pixels, `fontHeight` keeps texts apart. The image of the rows has
+/// `dots` times as many pixels each way.
 WaterfallPicture drawWaterfall(const Graph3D& graph, const PictureStyle& style, int width,
                                int height, double fontHeight);
 /// Plot and sample under a pixel of the same picture.

@@ -20,6 +20,10 @@ constexpr double kFarthestZoom = 100;
 constexpr int kPointerMs = 40;
 constexpr int kWheelEndMs = 250;
 constexpr int kRestMs = 80;
+/// Longer than a sweep takes on a line of 57,600 baud: sweeps that follow each other are not kept
+/// waiting for finer pictures.
+constexpr int kStillMs = 800;
+constexpr double kMostFineDots = 4e6;
 constexpr double kHighestLatitude = 180;
 
 /// The graph's own angles may be any; those that the mouse makes stay within a turn.
@@ -41,12 +45,22 @@ WaterfallCanvas::WaterfallCanvas(WaterfallForm& form, QWidget* parent)
     connect(&rest_, &QTimer::timeout, this, [this] {
         if (waits_) update();
     });
+    still_.setSingleShot(true);
+    still_.setInterval(kStillMs);
+    connect(&still_, &QTimer::timeout, this, [this] {
+        const double dots = devicePixelRatioF();
+        fine_ =
+            !changed_ && drag_ == Drag::None && width() * dots * height() * dots < kMostFineDots;
+        if (fine_ && isVisible()) update();
+    });
 }
 
 void WaterfallCanvas::refresh() {
     // A hand that moves the picture sees it move at once.
     const bool atOnce = drag_ != Drag::None || wheelEnd_.isActive() || !rest_.isActive();
     waits_ = !atOnce;
+    changed_ = true;
+    fine_ = false;
     if (atOnce && isVisible()) update();
     setCursor(placesCursors() ? Qt::CrossCursor : Qt::ArrowCursor);
 }
@@ -60,22 +74,30 @@ bool WaterfallCanvas::placesCursors() const {
     return form_.Graph3D.MouseMode == MouseMode3D::PlaceCursor;
 }
 
+/// The same one as long as nothing changed: a window that comes to the front costs no drawing.
+const WaterfallPicture& WaterfallCanvas::picture(double fontHeight) {
+    PictureStyle style = pictureStyle(form_);
+    style.dots = devicePixelRatioF();
+    if (size() != pictureSize_) fine_ = false;
+    style.oversampling = fine_ ? 2 : 1;
+    if (changed_ || style != pictureStyle_ || size() != pictureSize_) {
+        picture_ = drawWaterfall(form_.Graph3D, style, width(), height(), fontHeight);
+        pictureStyle_ = style;
+        pictureSize_ = size();
+        changed_ = false;
+        ++drawings_;
+        rest_.start(kRestMs);
+        if (!fine_) still_.start();
+    }
+    return picture_;
+}
+
 void WaterfallCanvas::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.fillRect(rect(), colors_.background);
     painter.setFont(waterfallFont());
-    const double line = painter.fontMetrics().height();
-    const double dots = devicePixelRatioF();
-    const PictureStyle style = pictureStyle(form_);
-    WaterfallPicture picture = drawWaterfall(form_.Graph3D, style, width(), height(), line);
-    if (dots != 1) {
-        picture.rows = drawWaterfall(form_.Graph3D, style, static_cast<int>(width() * dots),
-                                     static_cast<int>(height() * dots), line)
-                           .rows;
-    }
-    paintWaterfall(painter, rect(), picture, colors_);
+    paintWaterfall(painter, rect(), picture(painter.fontMetrics().height()), colors_);
     waits_ = false;
-    rest_.start(kRestMs);
     if (form_.Graph3D.hasRows()) return;
     painter.setPen(colors_.text);
     painter.drawText(rect(), Qt::AlignCenter,

@@ -19,6 +19,10 @@ class WaterfallCanvas : public QWidget {
     /// The graph has changed: drawn with the next frame, if anyone sees it.
     void refresh();
     void setColors(const GraphColors& colors);
+    /// A picture that rests is drawn once more without steps at its edges.
+    void setStillAfter(int milliseconds) { still_.setInterval(milliseconds); }
+    /// How many pictures of the rows were computed so far.
+    int drawings() const { return drawings_; }
 
   protected:
     void paintEvent(QPaintEvent* event) override;
@@ -38,6 +42,7 @@ class WaterfallCanvas : public QWidget {
     void zoom(double factor);
     void readPointer();
     bool placesCursors() const;
+    const WaterfallPicture& picture(double fontHeight);
 
     WaterfallForm& form_;
     GraphColors colors_;
@@ -49,6 +54,13 @@ class WaterfallCanvas : public QWidget {
     QTimer wheelEnd_;
     QTimer rest_;         ///< after a picture, so that sweeps have the processor as well
     bool waits_ = false;  ///< a change came meanwhile
+    WaterfallPicture picture_;
+    PictureStyle pictureStyle_;  ///< of `picture_`, and its size
+    QSize pictureSize_;
+    bool changed_ = true;  ///< since `picture_`
+    QTimer still_;
+    bool fine_ = false;  ///< the picture rests
+    int drawings_ = 0;
 };
 
 }  // namespace zel

@@ -37,14 +37,11 @@ void paintAll(QPainter& painter, const WaterfallForm& form, PictureStyle style, 
     const double line = QFontMetricsF(painter.font(), painter.device()).height();
     const QRectF area = whole.adjusted(0, kTitleHeight, -kBarWidth, 0);
     const QSize pixels = area.size().toSize();
-    style.oversampling = 1;
     // Lines and texts in pixels of the picture, the rows in dots of the file.
-    WaterfallPicture picture =
-        drawWaterfall(form.Graph3D, style, pixels.width(), pixels.height(), line);
     style.oversampling = 2;
-    picture.rows = drawWaterfall(form.Graph3D, style, static_cast<int>(pixels.width() * dots),
-                                 static_cast<int>(pixels.height() * dots), line)
-                       .rows;
+    style.dots = dots;
+    const WaterfallPicture picture =
+        drawWaterfall(form.Graph3D, style, pixels.width(), pixels.height(), line);
     paintWaterfall(painter, area, picture, colors);
     const double height = std::min<double>(area.height() - 2 * kMargin, kLongestBar);
     paintColourBar(painter,

@@ -14,9 +14,10 @@ struct Topic {
 constexpr int kContents = 1110;
 constexpr int kPanel = 2111;
 constexpr Topic kTopics[] = {
-    {"ControllerForm", kPanel},  {"MainForm", 1113},      {"TCPConnectionForm", 1113},
-    {"DevicesChoiceForm", 1112}, {"TimeForm", 1114},      {"ServerForm", 3113},
-    {"SpecialMeasForm", 4111},   {"WaterfallForm", 5111},
+    {"ControllerForm", kPanel},  {"MainForm", 1113}, {"TCPConnectionForm", 1113},
+    {"DevicesChoiceForm", 1112}, {"TimeForm", 1114}, {"ServerForm", 3113},
+    {"SpecialMeasForm", 4111},   {"STDForm", 4111},  {"ScriptEditor", 4111},
+    {"WaterfallForm", 5111},
 };
 
 }  // namespace

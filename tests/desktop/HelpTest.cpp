@@ -170,7 +170,8 @@ TEST(HelpKey, F1_OpensTheTopicOfTheWindowsForm) {
                                        {"TimeForm", 1114},
                                        {"ServerForm", 3113},
                                        {"SpecialMeasForm", 4111},
-                                       {"ScriptEditor", 1110},
+                                       {"STDForm", 4111},
+                                       {"ScriptEditor", 4111},
                                        {"AboutForm", 1110}}) {
         window.setProperty("form", form);
         EXPECT_TRUE(filter.eventFilter(&field, &key));

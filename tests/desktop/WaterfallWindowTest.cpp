@@ -2,6 +2,7 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QMenu>
+#include <QMouseEvent>
 #include <QTest>
 
 #include "desktop/graph/SpectrogramWidget.h"
@@ -10,6 +11,8 @@
 
 namespace zel {
 namespace {
+
+constexpr int kNever = 3600'000;
 
 struct WaterfallWindowTest : Desk {
     WaterfallForm& form() { return program->forms().waterfall; }
@@ -48,9 +51,16 @@ struct WaterfallWindowTest : Desk {
         }
         flush();
     }
+    /// Without a display another window may lie in front: the pointer moves for the canvas alone.
+    void pointAtPlace(const QPointF& place) {
+        QMouseEvent move(QEvent::MouseMove, place, canvas().mapToGlobal(place), Qt::NoButton,
+                         Qt::NoButton, Qt::NoModifier);
+        QApplication::sendEvent(&canvas(), &move);
+    }
     void open(int rows) {
         show();
         sweeps(rows);
+        canvas().setStillAfter(kNever);
         panel().cmd3D.Click();
         flush();
     }
@@ -198,6 +208,44 @@ TEST_F(WaterfallWindowTest, ClickInMarkersMode_PlacesACursorOnTheRow) {
     EXPECT_EQ(form().Graph3D.cursors().size(), 2U);
 }
 
+TEST_F(WaterfallWindowTest, Pointer_ReadsFrequencyTimeAndLevelOfTheRowUnderIt) {
+    open(100);
+    form().ViewSpectrogram.Click();
+    form().Graph3D.setView({0, 0, 1, 6, 5, 5});
+    flush();
+    const Camera camera(form().Graph3D.view(), false, canvas().width(), canvas().height());
+    // The carrier at 1 GHz, in row 42.
+    const ScreenPoint on = camera.project({12.0 * 100 / 300, 10.0 * 42 / 99, 9});
+    pointAtPlace({on.x, on.y});
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !form().lblPointer.Caption.get().empty(); }));
+    flush();
+    const std::string text = form().lblPointer.Caption;
+    EXPECT_NE(text.find("Hz   12:00:18   -4"), std::string::npos) << text;
+    EXPECT_EQ(widgetOf<QLabel>(form().lblPointer)->text(), QString::fromStdString(text));
+    EXPECT_TRUE(savePicture(waterfall(), "waterfall-pointer"));
+    pointAtPlace({1, 1});  // beside the rows
+    EXPECT_TRUE(QTest::qWaitFor([&] { return form().lblPointer.Caption.get().empty(); }));
+}
+
+TEST_F(WaterfallWindowTest, FullScreen_ComesAndGoesByKeyAndEscape) {
+    open(100);
+    const QSize before = waterfall().size();
+    QTest::keyClick(&waterfall(), Qt::Key_F11);
+    flush();
+    EXPECT_TRUE(form().ViewFullScreen.Checked);
+    EXPECT_TRUE(waterfall().isFullScreen());
+    EXPECT_TRUE(savePicture(waterfall(), "waterfall-full-screen"));
+    QTest::keyClick(&waterfall(), Qt::Key_Escape);
+    flush();
+    EXPECT_FALSE(waterfall().isFullScreen());
+    EXPECT_FALSE(form().ViewFullScreen.Checked);
+    EXPECT_TRUE(waterfall().isVisible());  // Escape left the full screen only
+    EXPECT_EQ(waterfall().size(), before);
+    QTest::keyClick(&waterfall(), Qt::Key_Escape);
+    flush();
+    EXPECT_FALSE(waterfall().isVisible());
+}
+
 TEST_F(WaterfallWindowTest, Lists_ChangeThePicture) {
     open(100);
     const QImage before = canvas().grab().toImage();
@@ -224,12 +272,64 @@ TEST_F(WaterfallWindowTest, SaveAndCopy_GiveThePicture) {
     form().DrawImage(file.toStdString(), problem);
     EXPECT_EQ(problem, "");
     EXPECT_TRUE(QFile::exists(file));
+    for (const auto& [ending, begin] :
+         {std::pair<const char*, const char*>{"pdf", "%PDF-"}, {"png", "\x89PNG"}}) {
+        QFile other(QApplication::applicationDirPath() + "/pictures/saved-waterfall." + ending);
+        form().DrawImage(other.fileName().toStdString(), problem);
+        EXPECT_EQ(problem, "");
+        ASSERT_TRUE(other.open(QIODevice::ReadOnly));
+        EXPECT_TRUE(other.readAll().startsWith(begin)) << ending;
+        EXPECT_GT(other.size(), 10000) << ending;
+    }
     form().DrawImage("/no/such/folder/x.png", problem);
     EXPECT_NE(problem, "");
     form().DrawImage("x.bmp", problem);
     EXPECT_EQ(problem, "Unknown kind of picture: .bmp (svg, png or pdf)");
     form().PictureCopy.Click();
     EXPECT_FALSE(QGuiApplication::clipboard()->image().isNull());
+}
+
+TEST_F(WaterfallWindowTest, NothingChanged_NothingIsComputed) {
+    open(20);
+    canvas().grab();
+    const int before = canvas().drawings();
+    canvas().grab();
+    waterfall().grab();
+    EXPECT_EQ(canvas().drawings(), before);
+    GraphView3D view = form().Graph3D.view();
+    view.Longitude += 10;
+    form().Graph3D.setView(view);
+    flush();
+    canvas().grab();
+    EXPECT_EQ(canvas().drawings(), before + 1);
+    waterfall().resize(waterfall().size() + QSize(40, 0));
+    canvas().grab();
+    EXPECT_EQ(canvas().drawings(), before + 2);
+    // A window that nobody sees draws nothing.
+    panel().cmd3D.Click();
+    flush();
+    sweeps(3);
+    QTest::qWait(120);
+    EXPECT_EQ(canvas().drawings(), before + 2);
+}
+
+TEST_F(WaterfallWindowTest, PictureThatRests_IsDrawnOnceMoreAndFiner) {
+    open(100);
+    const QImage coarse = canvas().grab().toImage();
+    const int before = canvas().drawings();
+    canvas().setStillAfter(30);
+    form().Graph3D.noteChange();
+    flush();
+    EXPECT_TRUE(QTest::qWaitFor([&] { return canvas().drawings() == before + 2; }));
+    EXPECT_NE(canvas().grab().toImage(), coarse);
+    EXPECT_TRUE(savePicture(waterfall(), "waterfall-still"));
+    QTest::qWait(100);
+    EXPECT_EQ(canvas().drawings(), before + 2);
+    // The next change is drawn fast again.
+    canvas().setStillAfter(kNever);
+    form().Graph3D.noteChange();
+    flush();
+    EXPECT_EQ(canvas().grab().toImage(), coarse);
 }
 
 TEST_F(WaterfallWindowTest, Window_OfTheSmallestSize_IsDrawn) {

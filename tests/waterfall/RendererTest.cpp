@@ -4,6 +4,7 @@
 #include <cmath>
 #include <limits>
 
+#include "waterfall/AxisTicks.h"
 #include "waterfall/WaterfallPicture.h"
 
 namespace zel {
@@ -180,6 +181,26 @@ TEST_F(RendererTest, Oversampling_IsTheMean) {
     EXPECT_GT(partly, 50);
 }
 
+TEST_F(RendererTest, Dots_MakeTheRowsFinerAndLeaveLinesAndTexts) {
+    rows();
+    const auto plain = draw();
+    const auto twice = draw(2 * kWidth, 2 * kHeight);
+    style.dots = 2;
+    const auto fine = draw();
+    EXPECT_EQ(fine.rows.width, 2 * kWidth);
+    EXPECT_EQ(fine.rows.height, 2 * kHeight);
+    EXPECT_EQ(fine.rows.pixels, twice.rows.pixels);
+    ASSERT_EQ(fine.texts.size(), plain.texts.size());
+    for (std::size_t i = 0; i < fine.texts.size(); ++i) {
+        EXPECT_EQ(fine.texts[i].at.x, plain.texts[i].at.x);
+        EXPECT_EQ(fine.texts[i].text, plain.texts[i].text);
+    }
+    for (const double none : {0.0, -1.0, std::numeric_limits<double>::quiet_NaN()}) {
+        style.dots = none;
+        EXPECT_EQ(draw().rows.width, kWidth);
+    }
+}
+
 TEST_F(RendererTest, PointAt_NamesTheSample) {
     rows();
     fromAbove();
@@ -312,6 +333,63 @@ TEST_F(RendererTest, Labels_StandAtTheirRows) {
     const double left = camera.project({0, 10.0 * 5 / 9, 0}).y;
     const double right = camera.project({12, 10.0 * 5 / 9, 0}).y;
     EXPECT_LT(std::min(std::fabs(found->at.y - left), std::fabs(found->at.y - right)), 15);
+}
+
+TEST_F(RendererTest, Labels_AreLeftOutAtEvenSteps) {
+    graph.setFormat(1, "k\"Hz\"");
+    graph.setRange(2, 0, 99);
+    for (int i = 0; i < 100; ++i) {
+        graph.stampNext(i + 1, "t");
+        row(i, -50);
+        if (i % 4 == 0)
+            graph.setValuePair(2, i + 1, {"12:" + std::to_string(10 + i / 4) + ":00", i + 1.0});
+    }
+    for (const auto& [width, height] : {std::pair{900, 600}, {1700, 900}, {500, 300}}) {
+        std::vector<int> minutes;
+        for (const PictureText& text : draw(width, height).texts)
+            if (text.text.size() == 8 && text.text.substr(5) == ":00")
+                minutes.push_back(std::stoi(text.text.substr(3, 2)));
+        ASSERT_GT(minutes.size(), 2U) << width;
+        EXPECT_EQ(minutes.front(), 34) << width;  // the newest
+        for (std::size_t i = 2; i < minutes.size(); ++i)
+            EXPECT_EQ(minutes[i] - minutes[i - 1], minutes[1] - minutes[0]) << width;
+    }
+}
+
+TEST_F(RendererTest, LabelsThatComeInCrowds_AreShownWhereThereIsRoom) {
+    graph.setRange(2, 0, 99);
+    for (int i = 0; i < 100; ++i) {
+        graph.stampNext(i + 1, "t");
+        row(i, -50);
+        if (i % 10 == 0 || (i > 40 && i < 46))
+            graph.setValuePair(2, i + 1, {"time " + std::to_string(i), i + 1.0});
+    }
+    int shown = 0;
+    for (const PictureText& text : draw(900, 600).texts)
+        shown += text.text.starts_with("time") ? 1 : 0;
+    EXPECT_GE(shown, 9);
+}
+
+TEST_F(RendererTest, SingleLevels_AreDbmWhereTheNumbersOfTheAxisAreHidden) {
+    graph.setFormat(3, "k\"dBuV\"");
+    EXPECT_EQ(levelFormat(graph), "k\"dBuV\"");
+    graph.setFormat(3, "%");
+    EXPECT_EQ(levelFormat(graph), "%");
+    graph.setLabelColor(3, graph.BackColor);
+    EXPECT_EQ(levelFormat(graph), "k\"dBm\"");
+    // The marker bears it.
+    row(4, -80, 300, -10);
+    graph.addCursor();
+    GraphCursor3D cursor = graph.cursors()[0];
+    cursor.X = 300;
+    cursor.Y = 4;
+    cursor.Z = -10;
+    cursor.placed = true;
+    graph.setCursor(0, cursor);
+    const auto texts = draw().texts;
+    EXPECT_TRUE(std::any_of(texts.begin(), texts.end(), [](const PictureText& text) {
+        return text.marker && text.text.find("-10 dBm") != std::string::npos;
+    }));
 }
 
 TEST_F(RendererTest, LimitsByHand_AndOfTheRows_ReplaceTheAxis) {
