@@ -114,6 +114,15 @@ std::size_t editDistance(std::string_view a, std::string_view b) {
     return above[b.size()];
 }
 
+/// What of a line is held against a word: as many words as it has, or as many characters.
+std::string_view headOf(std::string_view line, const std::string& word, bool whole) {
+    if (!whole) return line.substr(0, word.size());
+    std::size_t end = line.find(' ');
+    if (word.find(' ') != std::string::npos && end != std::string_view::npos)
+        end = line.find(' ', end + 1);
+    return line.substr(0, end);
+}
+
 }  // namespace
 
 std::span<const Statement> statements() { return kStatements; }
@@ -148,25 +157,23 @@ std::string argumentOf(const Statement& statement, std::string_view capitals) {
 
 const Statement* nearestStatement(std::string_view capitals) {
     constexpr std::size_t kLongestWord = 24;
-    const Statement* nearest = nullptr;
-    std::size_t least = 0;
     const std::string_view line = capitals.substr(0, kLongestWord);
-    for (const Statement& statement : kStatements) {
-        const std::string word = trimmed(statement.word);
-        if (word.size() < 2) continue;
-        // Words of one part are held against the line's first word, words of two against two.
-        std::size_t end = line.find(' ');
-        if (word.find(' ') != std::string::npos && end != std::string_view::npos)
-            end = line.find(' ', end + 1);
-        for (const std::string_view head : {line.substr(0, end), line.substr(0, word.size())}) {
-            const std::size_t distance = editDistance(head, word);
+    // GETSWEP is nearer to GETSWEEP than to GET: whole words count before their beginnings.
+    for (const bool whole : {true, false}) {
+        const Statement* nearest = nullptr;
+        std::size_t least = 0;
+        for (const Statement& statement : kStatements) {
+            const std::string word = trimmed(statement.word);
+            if (word.size() < 2) continue;
+            const std::size_t distance = editDistance(headOf(line, word, whole), word);
             if (distance > std::max<std::size_t>(1, word.size() / 3)) continue;
             if (nearest != nullptr && distance >= least) continue;
             nearest = &statement;
             least = distance;
         }
+        if (nearest != nullptr) return nearest;
     }
-    return nearest;
+    return nullptr;
 }
 
 std::int16_t wholeNumber(double value) {

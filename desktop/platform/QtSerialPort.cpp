@@ -139,6 +139,8 @@ bool QtSerialPort::open(const SerialSetup& setup) {
         problem_ = name_ + " does not take the baud rate " + setup.Settings.substr(0, 20) + ".";
         return false;
     }
+    // What is left of an earlier session, which may have ended in the middle of a transfer.
+    port_.clear(QSerialPort::Input);
     port_.setDataTerminalReady(setup.DTREnable);
     if (setup.Handshaking == 0) port_.setRequestToSend(setup.RTSEnable);
     port_.clearError();

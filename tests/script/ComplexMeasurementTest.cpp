@@ -133,6 +133,34 @@ TEST_F(ComplexMeasurementTest, TenthRowAndOn_KeepTheColumns) {
     EXPECT_EQ(std.rtfReceive.Text().substr(0, 6), "[10] L");
 }
 
+TEST_F(ComplexMeasurementTest, Window_IsClearedByARunAndItsKeysFollow) {
+    std.Show();
+    std.rtfReceive.append({"old", false, false, 0});
+    std.refMeasBox.append({"old", false, false, 0});
+    std.cmdStop.Enabled = false;
+    bool stopInRun = false;
+    atStatement(0, [&] {
+        stopInRun = std.cmdStop.Enabled;
+        EXPECT_EQ(std.rtfReceive.Text() + std.refMeasBox.Text(), "");
+    });
+    run({"# X"});
+    EXPECT_TRUE(stopInRun);
+    EXPECT_FALSE(std.cmdStop.Enabled);
+    atStatement(0, [&] {
+        std.cmdExecute.Enabled = false;
+        std.cmdStop.Click();
+    });
+    run({"# X", "# Y"});
+    EXPECT_FALSE(form.ReachedEnd);
+    EXPECT_FALSE(std.cmdStop.Enabled);
+    EXPECT_TRUE(std.cmdExecute.Enabled);
+    // The frame's cross empties both boxes.
+    std.rtfReceive.append({"old", false, false, 0});
+    std.refMeasBox.append({"old", false, false, 0});
+    std.Unload(0);
+    EXPECT_EQ(std.rtfReceive.Text() + std.refMeasBox.Text(), "");
+}
+
 TEST_F(ComplexMeasurementTest, WindowsExecute_RunsTheScript) {
     load({"SAVERESULTS R.TXT", "COMMENT X"});
     std.cmdExecute.Click();

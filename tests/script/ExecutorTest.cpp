@@ -409,6 +409,19 @@ TEST_F(ExecutorTest, SaveBoxWithoutAFile_AsksAtTheStart) {
     EXPECT_EQ(results("picked.txt"), Texts{mark("A")});
 }
 
+TEST_F(ExecutorTest, ARun_BeginsWithAnEmptyWaterfallAndNoNameOfTheLastOne) {
+    forms.waterfall.Graph3D.plotCurve({7, 7}, {0, 1}, {-10, -20}, {});
+    panel.YVectorVal = 7;
+    load({"COMMENT A"});
+    form.DataFileNameSpec = folder.file("last.txt");
+    boxes.answer(BoxAnswer::No);
+    form.cmdExecute.Click();
+    EXPECT_FALSE(forms.waterfall.Graph3D.hasRows());
+    EXPECT_EQ(panel.YVectorVal, 0);
+    EXPECT_EQ(boxTexts().size(), 1U);  // asks for a file
+    EXPECT_FALSE(folder.has("last.txt"));
+}
+
 TEST_F(ExecutorTest, StopAtEveryStatement_LeavesThePanelFree) {
     const Texts lines = {"SAVERESULTS OUT.TXT", "NOSAVE",        "STEPMODE",   "# X",
                          "SHOWDIALOG X",        "WATERFALL ON",  "DO",         "PAUSE 1",

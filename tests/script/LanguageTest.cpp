@@ -96,6 +96,9 @@ TEST(Language, NearestStatement_FindsWhatWasMeant) {
     EXPECT_EQ(nearest("WATERFAL ON"), "WATERFALL ON");
     EXPECT_EQ(nearest("SCANSTRT 100"), "SCANSTART");
     EXPECT_EQ(nearest("QUICK TRCE"), "QUICK TRACE");
+    EXPECT_EQ(nearest("GETSWEP"), "GETSWEEP");  // not GET, which it begins with
+    EXPECT_EQ(nearest("GETLEVEL"), "GET ");
+    EXPECT_EQ(nearest("SETFREQ,1E9"), "SET ");
     EXPECT_EQ(nearest("XYZ"), "-");
     EXPECT_EQ(nearest(""), "-");
 }

@@ -115,6 +115,14 @@ TEST_F(ResultTest, NoFile_AsksOnceAndNoKeepsSilent) {
     EXPECT_TRUE(form.noSaveAnswered);
 }
 
+TEST_F(ResultTest, FileStatement_OffersItsNameToTheDialogsAndAsksNobody) {
+    run({"SAVERESULTS OUT*.TXT"});
+    EXPECT_EQ(panel.CommonDialog1FileName, "OUT*.TXT");
+    run({"SAVERESULTS", "COMMENT A"});  // without a name the value is dropped
+    EXPECT_TRUE(boxTexts().empty());
+    EXPECT_FALSE(folder.has("OUTVALUES.TXT"));
+}
+
 TEST_F(ResultTest, NoFile_YesWritesToTheChosenOne) {
     name("");
     boxes.answer(BoxAnswer::Yes);

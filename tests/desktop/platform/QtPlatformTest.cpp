@@ -66,6 +66,23 @@ class OnQt : public testing::Test {
     QtPlatform platform{home.path()};
 };
 
+TEST_F(OnQt, SerialPort_BytesOfAnEarlierSession_AreNotRead) {
+    const Terminal line;
+    const int held = ::open(line.path.c_str(), O_RDWR | O_NOCTTY);  // keeps them waiting
+    ASSERT_GE(held, 0);
+    line.send("9102,100234\r");
+    ASSERT_TRUE(openPort(line.path));
+    line.send("0\r");
+    std::string bytes;
+    for (int i = 0; i < 100 && bytes.find('\r') == std::string::npos; ++i) {
+        platform.events.wait(10);
+        bytes += platform.serialPort.input();
+    }
+    EXPECT_EQ(bytes, "0\r");
+    platform.serialPort.close();
+    ::close(held);
+}
+
 TEST_F(OnQt, SerialPort_WritesAndReadsBytes) {
     const Terminal line;
     ASSERT_TRUE(openPort(line.path)) << platform.serialPort.problem();
