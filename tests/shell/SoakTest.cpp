@@ -27,7 +27,7 @@ struct Totals {
 
 class Soak {
   public:
-    explicit Soak(std::uint64_t seed) : random_(seed), run_(pick(2) == 0, seed) {}
+    explicit Soak(std::uint64_t seed) : random_(seed), run_(static_cast<LineKind>(pick(3)), seed) {}
 
     void play() {
         for (int i = 0; i < kActions; ++i) {

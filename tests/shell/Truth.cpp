@@ -87,7 +87,7 @@ std::string TruthTap::pass(const std::string& bytes) {
                 lateAt_ = clock_.micros() + std::int64_t{pauseMs_} * 1000;
             if (fault == LineFault::Pause && late_.empty()) {
                 late_ += c;
-                events_.schedule(pauseMs_, [] {});  // wakes whoever waits
+                events_.schedule(pauseMs_, [this] { Woke(); });
             }
             clean_ = false;
             if (fault == LineFault::Garble || fault == LineFault::Flip || fault == LineFault::Drop)
@@ -164,16 +164,39 @@ std::string TruthSocket::getData() {
     return std::exchange(waiting_, {});
 }
 
-TruthRun::TruthRun(bool tcp, std::uint64_t seed)
+ServedEnd::ServedEnd(VirtualPlatform& desk, SerialPort& line)
+    : socket_(desk.events),
+      listener_(desk.events),
+      server_({desk.clock, desk.events, far_.boxes, far_.port, far_.ports, far_.tcpSocket, line,
+               listener_, far_.settings, far_.debug, far_.clipboard, far_.launcher, far_.startup,
+               far_.folder, far_.fileDialogs, far_.files, far_.endSignals, far_.machine,
+               far_.portProbe},
+              "") {
+    socket_.knocks = [this](PipeSocket& who) { listener_.knock(who); };
+    server_.start();
+    server_.serverDialog().fillFields();
+    ServerForm& form = server_.forms().server;
+    form.COMList.setText("COM1");
+    form.chkBaudRate.setValue(false);
+    form.BaudList.setText("57600");
+}
+
+bool ServedEnd::serve() { return bridge().bridging() || bridge().connect(true); }
+
+TruthRun::TruthRun(LineKind kind, std::uint64_t seed)
     : instrument(platform.clock, platform.events, {.seed = seed},
-                 {.baud = tcp ? 0 : 57600, .answering = 0.0005, .wholeAnswers = tcp}),
-      program({platform.clock, platform.events, platform.boxes, port, platform.ports, socket,
-               platform.serverPort, platform.serverSocket, platform.settings, platform.debug,
-               platform.clipboard, platform.launcher, platform.startup, platform.folder,
-               platform.fileDialogs, platform.files, platform.endSignals, platform.machine,
-               platform.portProbe},
+                 {.baud = kind == LineKind::Tcp ? 0 : 57600,
+                  .answering = 0.0005,
+                  .wholeAnswers = kind == LineKind::Tcp}),
+      served(kind == LineKind::Served ? std::make_unique<ServedEnd>(platform, port) : nullptr),
+      program({platform.clock, platform.events, platform.boxes,
+               served ? static_cast<SerialPort&>(platform.port) : port, platform.ports,
+               served ? static_cast<Socket&>(served->socket()) : socket, platform.serverPort,
+               platform.serverSocket, platform.settings, platform.debug, platform.clipboard,
+               platform.launcher, platform.startup, platform.folder, platform.fileDialogs,
+               platform.files, platform.endSignals, platform.machine, platform.portProbe},
               ""),
-      tcp_(tcp) {
+      kind_(kind) {
     platform.ports.ports = {"COM1"};
     program.start();
     panel.SaveView.connect([this](const std::string&) {
@@ -186,8 +209,10 @@ void TruthRun::finding(const std::string& text) { findings.push_back(text); }
 
 bool TruthRun::connect() {
     platform.boxes.clear();
-    return program.connect(tcp_ ? LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}
-                                : LinkAddress{LinkAddress::Kind::Serial, "COM1", 57600},
+    if (served && !served->serve()) return false;
+    return program.connect(kind_ == LineKind::Serial
+                               ? LinkAddress{LinkAddress::Kind::Serial, "COM1", 57600}
+                               : LinkAddress{LinkAddress::Kind::Tcp, "host", 2277},
                            false);
 }
 

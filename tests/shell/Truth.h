@@ -3,6 +3,7 @@
 // check that whatever is shown as a whole trace is what the instrument sent.
 
 #include <cstdint>
+#include <memory>
 #include <set>
 #include <string>
 #include <string_view>
@@ -12,6 +13,7 @@
 #include "link/CommandExchange.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
+#include "tests/server/NetworkRig.h"
 #include "trace/TraceReader.h"
 
 namespace zel {
@@ -24,6 +26,10 @@ inline constexpr LineFault kLineFaults[] = {LineFault::Drop,  LineFault::Garble,
                                             LineFault::Flip,  LineFault::Silence,
                                             LineFault::Pause, LineFault::Close};
 const char* nameOf(LineFault fault);
+
+/// The way to the instrument. Served: over TCP to a server at the instrument's serial line, which
+/// is where the faults are.
+enum class LineKind { Serial, Tcp, Served };
 
 /// Sees every byte between program and instrument, and spoils one.
 class TruthTap {
@@ -40,6 +46,8 @@ class TruthTap {
     /// The line ended at the fault.
     bool closed() const { return closed_; }
     void reopened() { closed_ = false; }
+    /// Late bytes are due now.
+    Event<> Woke;
     /// Late bytes are due at this moment (us); -1 for none.
     std::int64_t lateAt() const { return late_.empty() ? -1 : lateAt_; }
 
@@ -79,6 +87,7 @@ class TruthPort : public SerialPort {
   public:
     TruthPort(SerialPort& inner, TruthTap& tap) : inner_(inner), tap_(tap) {
         inner_.OnComm.connect([this](int code) { OnComm(code); });
+        tap_.Woke.connect([this] { OnComm(2); });
     }
     bool open(const SerialSetup& setup) override;
     void close() override { inner_.close(); }
@@ -118,10 +127,26 @@ class TruthSocket : public Socket {
     std::string waiting_;
 };
 
+/// A second copy of the program: the server at the line, and a socket that leads to it.
+class ServedEnd {
+  public:
+    ServedEnd(VirtualPlatform& desk, SerialPort& line);
+    /// At the start, and where the line had ended.
+    bool serve();
+    ServerBridge& bridge() { return server_.server(); }
+    PipeSocket& socket() { return socket_; }
+
+  private:
+    VirtualPlatform far_;
+    PipeSocket socket_;
+    PipeServer listener_;
+    Program server_;
+};
+
 /// One run: a session whose every result is held against the instrument.
 class TruthRun {
   public:
-    TruthRun(bool tcp, std::uint64_t seed = 1);
+    explicit TruthRun(LineKind kind, std::uint64_t seed = 1);
 
     bool connect();
     /// The line of the session has not ended.
@@ -147,6 +172,7 @@ class TruthRun {
     TruthTap tap{platform.clock, platform.events};
     TruthPort port{instrument, tap};
     TruthSocket socket{instrument, tap};
+    std::unique_ptr<ServedEnd> served;  ///< null where there is no server
     Program program;
     ControllerForm& panel = program.forms().controller;
 
@@ -159,7 +185,7 @@ class TruthRun {
     void checkFile();
     void finding(const std::string& text);
 
-    bool tcp_;
+    LineKind kind_;
     std::vector<Sweep> saved_;  ///< what the recording wrote
 };
 
