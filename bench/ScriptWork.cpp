@@ -23,8 +23,8 @@ namespace {
 constexpr int kBaud = 57600;
 constexpr int kStatements = 10000;
 constexpr double kStatementsAllowed = 0.05;
-constexpr int kPoints = 60;
-constexpr int kScanRounds = 3;
+constexpr int kPoints = 1000;
+constexpr int kScanRounds = 1;  // of a minute and a half each
 constexpr int kSettlingMs = 50;
 constexpr double kFirstHz = 100e6;
 constexpr double kStepHz = 1e6;

@@ -104,8 +104,10 @@ void GraphScaling::setGraphYAxis(double level, int rangeByte, bool useRangeCode)
     // The numbers of volts and watts on a logarithmic range are dBm, whatever the format says.
     const bool inDbm = logarithmic && (unit == UNITV || unit == UNITW);
     const std::string unitText = inDbm ? "dBm" : formatUnit(axis.Format);
-    waterfall_.lblMin.Caption = generalNumber(axis.Minimum) + " " + unitText;
-    waterfall_.lblMAX.Caption = generalNumber(axis.Maximum) + " " + unitText;
+    // Volts and watts turned to dBm are a trace beside round numbers.
+    const auto text = [](double bound) { return generalNumber(roundHalfEven(bound, 9)); };
+    waterfall_.lblMin.Caption = text(axis.Minimum) + " " + unitText;
+    waterfall_.lblMAX.Caption = text(axis.Maximum) + " " + unitText;
 }
 
 void GraphScaling::SetYAxisFormat() {

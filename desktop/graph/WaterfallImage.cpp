@@ -59,7 +59,7 @@ void paintAll(QPainter& painter, const WaterfallForm& form, PictureStyle style, 
 
 QString colourBarText(const WaterfallForm& form, const PictureStyle& style, bool highest) {
     const std::string own = highest ? form.lblMAX.Caption : form.lblMin.Caption;
-    if (style.levels == LevelSource::Axis) return QString::fromStdString(own);
+    if (own.empty()) return {};
     // The unit is the label's own: it stands after the number.
     const RowLimits limits = pictureLimits(form.Graph3D, style);
     const auto blank = own.find(' ');

@@ -6,6 +6,7 @@
 #include <QTest>
 
 #include "desktop/graph/SpectrogramWidget.h"
+#include "desktop/graph/WaterfallImage.h"
 #include "desktop/windows/WaterfallWindow.h"
 #include "tests/desktop/Desk.h"
 
@@ -263,6 +264,19 @@ TEST_F(WaterfallWindowTest, Lists_ChangeThePicture) {
     form().LevelMinBox.Text = "rubbish";
     flush();
     EXPECT_EQ(canvas().grab().toImage(), before);
+}
+
+TEST_F(WaterfallWindowTest, ColourBar_HasShortNumbersInTheUnitOfItsLabels) {
+    show();
+    EXPECT_EQ(colourBarText(form(), pictureStyle(form()), true), "");
+    form().Graph3D.setRange(3, -117.447274949, -17.447274949);
+    form().lblMAX.Caption = "-17.447274949 dBm";
+    form().lblMin.Caption = "-117.447274949 dBm";
+    EXPECT_EQ(colourBarText(form(), pictureStyle(form()), true), "-17.4 dBm");
+    EXPECT_EQ(colourBarText(form(), pictureStyle(form()), false), "-117.4 dBm");
+    form().Graph3D.setRange(3, 0, 100);
+    form().lblMAX.Caption = "100 %";
+    EXPECT_EQ(colourBarText(form(), pictureStyle(form()), true), "100 %");
 }
 
 TEST_F(WaterfallWindowTest, SaveAndCopy_GiveThePicture) {

@@ -230,6 +230,32 @@ TEST_F(ExecutorTest, Scan_StepsToTheStopAndWritesWhatPassesALimit) {
     expectFree();
 }
 
+TEST_F(ExecutorTest, ScanLimits_AreNotPassedByAnEqualLevelAndCountForOneScan) {
+    for (const char* level : {"-30", "-10", "-50"}) {
+        set("FREQ, 100");
+        get("LEVEL", level);
+    }
+    run({"SAVERESULTS OUT.TXT", "SCANLVLUPPL -30", "SCANLVLLOWL -30", "SCANSTART 100",
+         "SCANSTOP 50", "SCANSTART 100", "SCANSTOP 50", "SCANSTART 100", "SCANSTOP 50"});
+    expectPlayed();
+    EXPECT_FALSE(folder.has("OUT.TXT"));
+}
+
+TEST_F(ExecutorTest, Scan_SettlesForFiftyMillisecondsAndStepsFromWhatTheInstrumentSays) {
+    set("FREQ, 100");
+    get("FREQ", "200");  // it has its own idea
+    get("LEVEL", "-20");
+    set("FREQ, 210");
+    get("LEVEL", "-20");
+    std::int64_t start = 0;
+    atStatement(2, [&] { start = platform.clock.micros(); });
+    run({"SCANSTART 100", "SCANSTEP 10", "SCANSTOP 210"});
+    expectPlayed();
+    const std::int64_t passed = platform.clock.micros() - start;
+    EXPECT_GE(passed, 2 * 50'000);
+    EXPECT_LT(passed, 3 * 50'000);
+}
+
 TEST_F(ExecutorTest, ScanOfOneFrequency_MeasuresOnceAndNeedsNoLimit) {
     set("FREQ, .5", "0");
     run({"SCANSTART 0.5"});

@@ -103,6 +103,12 @@ TEST_F(ResultTest, BuildName_ReturnsTheTemplateWhenAsked) {
     EXPECT_EQ(form.DataFileNameSpec, "B*C*.TXT");
 }
 
+TEST_F(ResultTest, TheNameCtrace_LeavesTheFilesNameAsItIs) {
+    name("OUT*.TXT");
+    output.saveValue("ctrace", "1");
+    EXPECT_EQ(results("OUT*.TXT"), Texts{" <ctrace_________>; 1 "});
+}
+
 TEST_F(ResultTest, NoFile_AsksOnceAndNoKeepsSilent) {
     name("");
     boxes.answer(BoxAnswer::No);

@@ -91,6 +91,26 @@ TEST_F(TraceStatementsTest, ExternalTrigger_TakesOneTraceWithTheTimeOutOfTheLine
     EXPECT_TRUE(form.ReachedEnd);
 }
 
+TEST_F(TraceStatementsTest, QuickTrace_HasTheTimeOutOfTheStatementBeforeIt) {
+    const auto triggered = [this](bool first) {
+        cmd("INIT");
+        cmd("WAIT");
+        if (first) settings();
+        sweep();
+    };
+    get("TRIGSRC", "2");
+    triggered(true);
+    triggered(false);
+    run({"GETSWEEP 5", "QUICK TRACE 40000"});
+    expectPlayed();
+    EXPECT_TRUE(form.ReachedEnd);
+    get("TRIGSRC", "2");
+    triggered(false);
+    run({"GETSWEEP 5", "QUICKSWEEP 40000"});
+    expectPlayed();
+    EXPECT_EQ(boxTexts(), Texts{"Overflow"});
+}
+
 TEST_F(TraceStatementsTest, TimeOutBeyondSixteenBits_IsAnOverflow) {
     get("TRIGSRC", "3");
     run({"GETSWEEP 40000"});
@@ -145,6 +165,63 @@ TEST_F(TraceStatementsTest, LoadTrace_ShowsTheSavedViewOfThePass) {
     run({"DO", "LOADTRACE view*.csv", "LOOP 2"});
     EXPECT_EQ(loaded, 2);
     EXPECT_TRUE(form.ReachedEnd);
+}
+
+TEST_F(TraceStatementsTest, LoadTrace_KnowsALogOfTheOlderFormatByItsNameOrItsLastLine) {
+    std::string log = "Data at;2010-05-01 10:00:00;\r\n______________________________\r\n \r\n";
+    for (int i = 0; i < 301; ++i) log += std::to_string(100 + 10 * i) + ";-35;\r\n";
+    folder.write("OLD.DAT", log);
+    folder.write("OLD.TXT", log + " ........END OF LOG FOR 2010-05-01 10:05:00\r\n");
+    for (const char* name : {"OLD.DAT", "OLD.TXT"}) {
+        panel.CWGraph1.plotY({1, 2, 3}, 0, 1);
+        panel.DataValArrayToLoad.clear();
+        run({std::string("LOADTRACE ") + name});
+        EXPECT_TRUE(form.ReachedEnd) << name;
+        EXPECT_EQ(panel.DataValArrayToLoad, std::vector<double>(301, -35)) << name;
+        EXPECT_EQ(panel.CWGraph1.firstX(), 100) << name;
+    }
+}
+
+TEST_F(TraceStatementsTest, LoadedRows_AreCountedWhileTheWaterfallIsOn) {
+    knownView();
+    Sweep& shown = program.sweep();
+    mirror.Span = 1;
+    shown.settings = mirror;
+    shown.wanted = shown.came = 301;
+    shown.physical.assign(301, -40);
+    shown.axis.start = 1;
+    shown.axis.stop = 2;
+    run({"SAVERESULTS VIEW.CSV", "SAVESWEEP"});
+    const auto depths = [this] {
+        std::vector<double> found;
+        for (const GraphCurve3D& plot : forms.waterfall.Graph3D.plots())
+            if (!plot.depth.empty()) found.push_back(plot.depth.front());
+        return found;
+    };
+    run({"WATERFALL ON", "LOADTRACE VIEW.CSV", "LOADTRACE VIEW.CSV", "LOADTRACE VIEW.CSV"});
+    EXPECT_EQ(depths().size(), 3U);
+    const std::vector<double> counted = depths();
+    run({"WATERFALL ON", "LOADTRACE VIEW.CSV", "WATERFALL OFF", "LOADTRACE VIEW.CSV",
+         "WATERFALL ON", "LOADTRACE VIEW.CSV"});
+    // Off, the count begins again: the last row is a first one.
+    EXPECT_EQ(depths().back(), counted.front());
+    EXPECT_NE(counted.front(), counted.back());
+}
+
+TEST_F(TraceStatementsTest, FileStatements_BringTheTemplateOfTheResultsBack) {
+    knownView();
+    panel.DrawImage.connect([](const std::string&, std::string&) {});
+    folder.write("OLD.DAT", "");
+    run({"SAVERESULTS OUT*.TXT", "DO", "LOOP 1"});
+    EXPECT_FALSE(form.fileNameIsIndexed);
+    run({"SAVERESULTS OUT*.TXT", "DO", "LOOP 1", "COMMENT A"});
+    EXPECT_EQ(form.DataFileNameSpec, "OUTVALUES.TXT");
+    run({"SAVERESULTS OUT*.TXT", "DO", "LOOP 1", "SAVESCREEN A.WMF", "COMMENT A"});
+    EXPECT_EQ(form.DataFileNameSpec, "OUT*.TXT");
+    run({"SAVERESULTS OUT*.TXT", "DO", "LOOP 1", "LOADTRACE OLD.DAT", "COMMENT A"});
+    EXPECT_EQ(form.DataFileNameSpec, "OUT*.TXT");
+    run({"SAVERESULTS OUT.TXT", "COMMENT A"});
+    EXPECT_FALSE(form.fileNameIsIndexed);
 }
 
 TEST_F(TraceStatementsTest, LoadTraceOfAMissingFile_TellsAndEndsTheRun) {

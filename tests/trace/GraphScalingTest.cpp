@@ -203,14 +203,21 @@ TEST_P(UnitFormat, SetYAxisFormat_OnALinearRange_IsPercent) {
 TEST_P(UnitFormat, SetGraphYAxis_WritesTheBoundsWithTheUnitOfTheFormat) {
     mirror.ReferenceUnit = GetParam().unit;
     scaling.setGraphYAxis(10, RANGE10DB, true);
-    const std::string low = generalNumber(graph.yAxis().Minimum);
-    const std::string high = generalNumber(graph.yAxis().Maximum);
+    const std::string low = generalNumber(roundHalfEven(graph.yAxis().Minimum, 9));
+    const std::string high = generalNumber(roundHalfEven(graph.yAxis().Maximum, 9));
     EXPECT_EQ(waterfall.lblMin.Caption.get(), low + " " + GetParam().shown);
     EXPECT_EQ(waterfall.lblMAX.Caption.get(), high + " " + GetParam().shown);
 }
 
 TEST_F(GraphScalingTest, SetGraphYAxis_InDbm_WritesTheBoundsAsTexts) {
     scaling.setGraphYAxis(-20, RANGE10DB, true);
+    EXPECT_EQ(waterfall.lblMin.Caption.get(), "-120 dBm");
+    EXPECT_EQ(waterfall.lblMAX.Caption.get(), "-20 dBm");
+}
+
+TEST_F(GraphScalingTest, SetGraphYAxis_InVolts_WritesRoundBoundsInDbm) {
+    mirror.ReferenceUnit = UNITV;
+    scaling.setGraphYAxis(0.0223606797749979, RANGE10DB, true);
     EXPECT_EQ(waterfall.lblMin.Caption.get(), "-120 dBm");
     EXPECT_EQ(waterfall.lblMAX.Caption.get(), "-20 dBm");
 }
