@@ -15,6 +15,7 @@
 #include "platform/virtual/VirtualFiles.h"
 #include "platform/virtual/VirtualTime.h"
 #include "server/Relay.h"
+#include "server/ReplyWatch.h"
 #include "support/Text.h"
 
 namespace {
@@ -44,6 +45,19 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         if (ends(seen.substr(seen.size() - room), "TRACEBIN") && !trace) std::abort();
         if (trace && !ends(seen, "TRACEBIN")) std::abort();
     }
+
+    // What is known of a reply does not depend on where its bytes and those of its question are
+    // split, and a whole one has a CR for each status and for the text.
+    zel::ReplyWatch whole;
+    zel::ReplyWatch split;
+    const std::size_t half = bytes.size() / 2;
+    whole.asked(bytes.substr(0, half));
+    for (const char c : bytes.substr(0, half)) split.asked(std::string(1, c));
+    const std::string reply = bytes.substr(half);
+    bool last = false;
+    for (const char c : reply) last = split.answered(std::string(1, c));
+    if (!reply.empty() && whole.answered(reply) != last) std::abort();
+    if (last && reply.back() != '\r') std::abort();
 
     zel::VirtualClock clock;
     zel::VirtualEvents events(clock);
