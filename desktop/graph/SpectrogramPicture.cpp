@@ -5,6 +5,7 @@
 
 #include "desktop/graph/PictureFile.h"
 #include "desktop/graph/WaterfallDrawing.h"
+#include "desktop/graph/WaterfallImage.h"
 #include "support/Text.h"
 #include "waterfall/AxisTicks.h"
 #include "waterfall/SpectrogramImage.h"
@@ -48,8 +49,8 @@ class Plot {
         const double height = std::min(area_.height(), 320.0);
         paintColourBar(painter_,
                        {area_.right() + 6, area_.center().y() - height / 2, kRight - 12.0, height},
-                       ColourMap::ofStyle(kStyle), QString::fromStdString(form_.lblMAX.Caption),
-                       QString::fromStdString(form_.lblMin.Caption), colors_);
+                       ColourMap::ofStyle(kStyle), colourBarText(form_, {}, true),
+                       colourBarText(form_, {}, false), colors_);
     }
 
   private:

@@ -32,6 +32,21 @@ TEST_F(ScriptWindowTest, TheKey_ShowsTheWindowAndCloseGivesThePanelBack) {
     EXPECT_FALSE(panel.RecordDataFlag);
 }
 
+TEST_F(ScriptWindowTest, Load_BeginsWithoutAScriptAndWithoutSteps) {
+    form.unload(1);
+    form.chkStep.setValue(true);
+    form.cmdEdit.Enabled = form.cmdExecute.Enabled = form.cmdStop.Enabled = true;
+    form.cmdExecute.Visible = false;
+    form.cmdStop.Visible = true;
+    panel.cmdSpecial.Click();
+    EXPECT_FALSE(form.chkStep.Value());
+    EXPECT_FALSE(form.cmdEdit.Enabled);
+    EXPECT_FALSE(form.cmdExecute.Enabled);
+    EXPECT_TRUE(form.cmdExecute.Visible);
+    EXPECT_FALSE(form.cmdStop.Enabled);
+    EXPECT_FALSE(form.cmdStop.Visible);
+}
+
 TEST_F(ScriptWindowTest, ClosingByItsFrame_IsTheCloseButtonAndKeepsTheList) {
     load({"NOSAVE"});
     int cancel = 0;
