@@ -88,8 +88,10 @@ std::string QtSettingsStore::get(const std::string& application, const std::stri
 bool QtSettingsStore::set(const std::string& application, const std::string& section,
                           const std::string& key, const std::string& value) {
     IniFile settings = IniFile::load(files_, file_);
-    return settings.setValue(application, settingsKey(section, key), value) &&
-           settings.save(files_, file_);
+    const std::string name = settingsKey(section, key);
+    // Each writing waits for the disk.
+    if (settings.value(application, name) == value) return true;
+    return settings.setValue(application, name, value) && settings.save(files_, file_);
 }
 
 void QtDebugChannel::output(const std::string& text) {

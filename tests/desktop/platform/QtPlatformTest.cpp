@@ -371,6 +371,26 @@ TEST_F(OnQt, Settings_SurviveTheProgram) {
     EXPECT_EQ(platform.settings.get("ZELRemote", "DIRECTCON", "absent", "R"), "R");
 }
 
+TEST_F(OnQt, Settings_ThatAreStoredAlready_AreNotWrittenAgain) {
+    ASSERT_TRUE(platform.settings.set("ZELRemote", "DIRECTCON", "CommPort", "3"));
+    QFile file(home.filePath("user.ini"));
+    ASSERT_TRUE(file.open(QIODevice::ReadWrite));
+    const QByteArray spaced = file.readAll().replace("CommPort=3", "CommPort = 3");
+    file.resize(0);
+    file.write(spaced);
+    file.close();
+    const auto bytes = [&] {
+        EXPECT_TRUE(file.open(QIODevice::ReadOnly));
+        const QByteArray all = file.readAll();
+        file.close();
+        return all;
+    };
+    EXPECT_TRUE(platform.settings.set("ZELRemote", "DIRECTCON", "CommPort", "3"));
+    EXPECT_EQ(bytes(), spaced);
+    EXPECT_TRUE(platform.settings.set("ZELRemote", "DIRECTCON", "CommPort", "4"));
+    EXPECT_NE(bytes(), spaced);
+}
+
 TEST(QtSerialPortList, NamesThePortsOfTheKernelsList) {
     QTemporaryDir folder;
     const auto add = [&](const QString& name, const char* type) {
