@@ -35,7 +35,9 @@ TEST_F(ScriptWindowTest, TheKey_ShowsTheWindowAndCloseGivesThePanelBack) {
 TEST_F(ScriptWindowTest, Load_BeginsWithoutAScriptAndWithoutSteps) {
     form.unload(1);
     form.chkStep.setValue(true);
-    form.cmdEdit.Enabled = form.cmdExecute.Enabled = form.cmdStop.Enabled = true;
+    form.cmdEdit.Enabled = true;
+    form.cmdExecute.Enabled = true;
+    form.cmdStop.Enabled = true;
     form.cmdExecute.Visible = false;
     form.cmdStop.Visible = true;
     panel.cmdSpecial.Click();
