@@ -23,8 +23,7 @@ constexpr int kHourglass = 11;
 /// What one trace's header and 301 rows come to.
 constexpr int kLargestSingle = 970;
 constexpr int kRowsBehindMark = 3;
-constexpr int kSlowestMs = 1000;
-constexpr int kMsPerStep = 100;
+constexpr int kMostRowsBack = 500;
 constexpr std::size_t kDayLength = 10;
 constexpr double kIntervals = 300;
 constexpr int kShownBytes = 4 * 1024 * 1024;
@@ -64,14 +63,16 @@ ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, File
       events_(interlock.session().events),
       boxes_(interlock.session().boxes),
       conversion_(conversion),
-      rows_(forms.controller, mirror) {
+      rows_(forms.controller, mirror),
+      playback_(forms, interlock) {
     handlers_.on(panel_.LoadData.Clicked, [this] { LoadData_Click(); });
     handlers_.on(panel_.OpenFile, [this](const std::string& path) {
         if (loading_ || interlock_.refuses(panel_.LoadData)) return;
         files_.note(path);
         loadFile(path);
     });
-    panel_.PlaybackFrame.Visible = false;
+    handlers_.on(playback_.Play, [this](int index) { playFrom(index); });
+    handlers_.on(playback_.Jump, [this](int index) { jumpTo(index); });
 }
 
 void ViewReader::LoadData_Click() {
@@ -89,21 +90,21 @@ void ViewReader::loadFile(const std::string& path) {
     });
     name_ = std::filesystem::path(path).filename().string();
     try {
-        const std::string text =
+        const auto text = std::make_shared<const std::string>(
             files_.ReadWholeFile(path, [this](std::uint64_t got, std::uint64_t size) {
                 if (size > kShownBytes)
                     progress("Reading", static_cast<double>(got) / static_cast<double>(size));
-            });
+            }));
         // The name decides before the contents.
-        if (isNameOfOldLog(path) || contains(text, "END OF LOG")) {
-            LoadTheDataForOlderVersions(text);
-            if (startsWith(text, kTraceName))
+        if (isNameOfOldLog(path) || contains(*text, "END OF LOG")) {
+            LoadTheDataForOlderVersions(*text);
+            if (startsWith(*text, kTraceName))
                 boxes_.show({BoxIcon::Information,
                              name_ + " begins as a saved view and was read as a log of the older " +
                                  "format, because its name holds \"dat\"." + kCrLf +
                                  "Under another name it shows the view."});
         } else {
-            LoadTheData(text, files_.dateTimeOf(path), 0);
+            takeView(text, files_.dateTimeOf(path), 0);
         }
         FileLoaded(path);
     } catch (const std::runtime_error& problem) {
@@ -116,10 +117,6 @@ void ViewReader::loadFile(const std::string& path) {
 void ViewReader::progress(const std::string& what, double part) {
     panel_.FileLabel.Caption = what + " " + name_ + ": " + percentText(part);
     events_.pump();
-}
-
-int ViewReader::nextMark(const FieldList& lines, std::string_view word, int from) {
-    return word.empty() ? -1 : findEntry(lines, word, from);
 }
 
 void ViewReader::takeRange(std::string_view entry) {
@@ -170,7 +167,6 @@ ViewReader::Header ViewReader::readHeader(const std::string& text, const FieldLi
             mirror_.ReferenceUnit = row.code;
     const int time = findEntry(lines, kTime);
     if (time >= 0) header.rowLabel = rowLabelOf(lines, time, fileTime);
-    header.fileTime = fileTime;
     rememberShown(lines, header.mark);
     const bool distance = panel_.Shown.mode == kFaultLocation;
     panel_.Shown.xUnit = distance ? "m" : header.zeroSpan ? "s" : "Hz";
@@ -196,16 +192,16 @@ void ViewReader::rememberShown(const FieldList& lines, int end) {
 
 void ViewReader::LoadTheData(const std::string& text, const std::string& fileTime,
                              std::int16_t rowNumber) {
-    if (text.empty()) return;
+    takeView(std::make_shared<const std::string>(text), fileTime, rowNumber);
+}
+
+void ViewReader::underStop(const std::function<void()>& work) {
     panel_.Connection.Enabled = false;
     panel_.Utility.Enabled = false;
     panel_.PlayContinuousButton.Visible = false;
     panel_.StopButton.Visible = true;
     panel_.STOPFlag = true;
-    panel_.YVectorVal = rowNumber;
-    if (rowNumber == 0) forms_.waterfall.clearGraph();
     const AtEnd done([this] {
-        panel_.PlaybackFrame.Visible = false;
         panel_.STOPFlag = false;
         panel_.Connection.Enabled = true;
         panel_.Utility.Enabled = true;
@@ -213,57 +209,118 @@ void ViewReader::LoadTheData(const std::string& text, const std::string& fileTim
         panel_.StopButton.Visible = false;
         panel_.MousePointer = 0;
     });
-    panel_.MousePointer = kHourglass;
-    events_.pump();
-
-    const FieldList lines(text, [this](double part) { progress("Loading", part); });
-    const Header header = readHeader(text, lines, fileTime);
-    const bool series = rowNumber == 0 && lines.last() > kLargestSingle;
-    showTraces(lines, header, series);
-    if (series) forms_.waterfall.styleLastRow();
-
-    forms_.waterfall.saveGraphView();
+    work();
 }
 
-void ViewReader::showTraces(const FieldList& lines, Header header, bool series) {
-    const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
-    int start = header.mark + kRowsBehindMark;
-    if (header.mark < 0) {
-        // A table without a header begins with its first number.
-        for (start = 0; start <= lines.last() && !looksLikeNumber(lines[start]);) ++start;
-    }
-    for (int shown = 1; start >= 0; ++shown) {
+void ViewReader::takeView(const Text& text, const std::string& fileTime, std::int16_t rowNumber) {
+    if (text->empty()) return;
+    playback_.close();
+    underStop([&] {
+        panel_.YVectorVal = rowNumber;
+        if (rowNumber == 0) forms_.waterfall.clearGraph();
+        panel_.MousePointer = kHourglass;
         events_.pump();
-        int next = -1;
-        if (rows_.ReadDataRows(lines, autoPeak, start, next) == 0) break;
-        const int mark = series && next >= 0 ? nextMark(lines, header.markWord, next) : -1;
-        showTrace(header, series);
+
+        FieldList lines(*text, [this](double part) { progress("Loading", part); });
+        Header header = readHeader(*text, lines, fileTime);
+        const bool series = header.series = rowNumber == 0 && lines.last() > kLargestSingle;
+        int start = header.mark + kRowsBehindMark;
+        if (header.mark < 0) {
+            // A table without a header begins with its first number.
+            for (start = 0; start <= lines.last() && !looksLikeNumber(lines[start]);) ++start;
+        }
+        const std::string_view mark = series ? header.markWord : std::string_view();
+        showSeries(std::make_shared<SeriesFrames>(text, std::move(lines), start, mark, fileTime),
+                   header, 0);
+        if (series) forms_.waterfall.styleLastRow();
+        forms_.waterfall.saveGraphView();
+    });
+}
+
+bool ViewReader::showFrame(SeriesFrames& frames, Header& header, int index) {
+    int next = -1;
+    const FieldList& lines = frames.lines();
+    const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
+    if (rows_.ReadDataRows(lines, autoPeak, frames.at(index).start, next) == 0) return false;
+    frames.rowsEnd(index, next < 0 ? lines.count() : next);
+    if (index > 0 || header.rowLabel.empty()) header.rowLabel = frames.at(index).label;
+    showTrace(header);
+    return true;
+}
+
+bool ViewReader::showUpTo(SeriesFrames& frames, Header& header, int index) {
+    const int position = playback_.position();
+    int from = position + 1;
+    if (index <= position || index - position > kMostRowsBack) {
+        panel_.YVectorVal = 0;
+        forms_.waterfall.clearGraph();
+        from = std::max(0, index - kMostRowsBack + 1);
+    }
+    for (int i = from; i <= index; ++i)
+        if (!frames.reach(i) || !showFrame(frames, header, i)) return false;
+    return true;
+}
+
+void ViewReader::showSeries(const std::shared_ptr<SeriesFrames>& frames, Header header, int first) {
+    bool begun = playback_.frames() == frames;
+    const AtEnd done([this] { playback_.setPlaying(false); });
+    for (int index = first; index >= 0;) {
+        events_.pump();
+        const bool jumps = begun && index != playback_.position() + 1;
+        if (jumps ? !showUpTo(*frames, header, index) : !showFrame(*frames, header, index)) {
+            frames->endAt(index);
+            break;
+        }
         panel_.TraceLoaded();
-        start = mark < 0 ? -1 : mark + kRowsBehindMark;
-        // The next trace bears its own time.
-        const int time = mark < 0 ? -1 : findEntry(lines, kTime, next);
-        if (time >= 0 && time < mark) header.rowLabel = rowLabelOf(lines, time, header.fileTime);
-        if (start < 0 && shown == 1) break;
-        panel_.PlaybackFrame.Visible = true;
+        const bool more = frames->reach(index + 1);
+        if (!begun && !more) break;
+        if (!begun) playback_.open(frames);
+        begun = true;
+        if (!playback_.playing()) playback_.setPlaying(true);
+        playback_.setPosition(index);
         panel_.FileLabel.Caption =
-            "Trace " + std::to_string(shown) + " of " + name_ + ", " +
-            percentText(start < 0 ? 1 : static_cast<double>(start) / lines.count());
-        if (start >= 0 && !pause()) break;
+            "Trace " + std::to_string(index + 1) + " of " + name_ + ", " +
+            percentText(more ? static_cast<double>(frames->at(index + 1).start) /
+                                   frames->lines().count()
+                             : 1);
+        index = playback_.next();
+        if (playback_.frames() != frames) break;
     }
 }
 
-bool ViewReader::pause() {
-    const Slider& speed = forms_.specialMeas.sldSpeed;
-    const Stopwatch watch(clock_);
-    // The slider may move while a trace stands.
-    const auto left = [&] {
-        return speed.Value == speed.Max
-                   ? 0
-                   : kSlowestMs - kMsPerStep * speed.Value.get() - watch.Elapsed();
-    };
-    while (panel_.STOPFlag && left() > 0) events_.wait(std::min(left(), kMsPerStep));
-    events_.pump();
-    return speed.Value >= 0 && panel_.STOPFlag;
+void ViewReader::playFrom(int index) {
+    const std::shared_ptr<SeriesFrames> frames = playback_.frames();
+    if (loading_ || !frames) return;
+    loading_ = true;
+    const AtEnd done([this] {
+        panel_.FileLabel.Caption = "";
+        loading_ = false;
+    });
+    underStop([&] {
+        panel_.MousePointer = kHourglass;
+        playback_.setPlaying(true);
+        Header header = readHeader(frames->text(), frames->lines(), frames->fileTime());
+        header.series = true;
+        showSeries(frames, header, index);
+        forms_.waterfall.styleLastRow();
+        forms_.waterfall.saveGraphView();
+    });
+}
+
+void ViewReader::jumpTo(int index) {
+    const std::shared_ptr<SeriesFrames> frames = playback_.frames();
+    if (loading_ || !frames) return;
+    Header header = readHeader(frames->text(), frames->lines(), frames->fileTime());
+    header.series = true;
+    if (!frames->reach(index)) return playback_.setPosition(playback_.position());
+    if (!showUpTo(*frames, header, index)) {
+        frames->endAt(index);
+        return playback_.setPosition(std::min(playback_.position(), frames->count() - 1));
+    }
+    panel_.TraceLoaded();
+    playback_.setPosition(index);
+    forms_.waterfall.styleLastRow();
+    forms_.waterfall.saveGraphView();
 }
 
 void ViewReader::spread(bool zeroSpan, double first, double last) {
@@ -278,7 +335,7 @@ void ViewReader::spread(bool zeroSpan, double first, double last) {
     panel_.SpanLabel.Caption = spanLabelText(generalNumber(mirror_.Span));
 }
 
-void ViewReader::showTrace(const Header& header, bool series) {
+void ViewReader::showTrace(const Header& header) {
     const std::vector<double>& xs = panel_.DataXAxisArrayToLoad;
     const std::vector<double>& values = panel_.DataValArrayToLoad;
     const bool autoPeak = mirror_.TraceDetector == DETAUTOPEAK;
@@ -305,7 +362,7 @@ void ViewReader::showTrace(const Header& header, bool series) {
     scaling_.setGraphYAxis(mirror_.ReferenceLevel, static_cast<int>(range), false);
     scaling_.addWaterfallRowLimit();
     forms_.waterfall.stampRow(header.rowLabel);
-    if (series) forms_.waterfall.styleLastRow();
+    if (header.series) forms_.waterfall.styleLastRow();
 
     panel_.CWGraph1.plotY(values, first, increment);
     scaling_.BuildXYVectors(increment);
@@ -336,6 +393,7 @@ void ViewReader::keepAsSweep(double increment) {
 
 void ViewReader::LoadTheDataForOlderVersions(const std::string& text) {
     if (text.empty()) return;
+    playback_.close();
     const bool pairs = contains(text, "MinMax");
     const bool linear = contains(text, "LIN");
     const bool zeroSpan = contains(text, "ZeroSpan");

@@ -1,11 +1,14 @@
 #pragma once
 // Shows saved files on the graph: one view, a series of them, a log of the older format.
 
+#include <functional>
+#include <memory>
 #include <string>
 
 #include "files/FieldList.h"
 #include "files/FileOps.h"
 #include "files/LoadedRows.h"
+#include "files/Playback.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
 #include "trace/GraphScaling.h"
@@ -43,19 +46,26 @@ class ViewReader {
         int mark = -1;  ///< entry of the data mark
         std::string_view markWord;
         std::string rowLabel;  ///< of the trace at hand
-        std::string fileTime;
+        bool series = false;
     };
 
     Header readHeader(const std::string& text, const FieldList& lines, const std::string& fileTime);
     void takeRange(std::string_view entry);
     void rememberShown(const FieldList& lines, int end);
-    void showTraces(const FieldList& lines, Header header, bool series);
-    void showTrace(const Header& header, bool series);
+    using Text = std::shared_ptr<const std::string>;
+    void takeView(const Text& text, const std::string& fileTime, std::int16_t rowNumber);
+    /// Locks the panel as a view does, runs the work and unlocks it.
+    void underStop(const std::function<void()>& work);
+    void showSeries(const std::shared_ptr<SeriesFrames>& frames, Header header, int first);
+    bool showFrame(SeriesFrames& frames, Header& header, int index);
+    /// The rows of the waterfall up to that trace, which is left on the graph.
+    bool showUpTo(SeriesFrames& frames, Header& header, int index);
+    void playFrom(int index);
+    void jumpTo(int index);
+    void showTrace(const Header& header);
     void keepAsSweep(double increment);
     void spread(bool zeroSpan, double first, double last);
-    bool pause();
     void progress(const std::string& what, double part);
-    static int nextMark(const FieldList& lines, std::string_view word, int from);
 
     Forms& forms_;
     ControllerForm& panel_;
@@ -69,6 +79,7 @@ class ViewReader {
     MessageBoxes& boxes_;
     const TraceConversion& conversion_;
     LoadedRows rows_;
+    Playback playback_;
     std::string name_;  ///< of the file, without its folder
     bool loading_ = false;
     Handlers handlers_;

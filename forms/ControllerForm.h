@@ -125,6 +125,7 @@ class ControllerForm : public Form {
     std::vector<double> YVector;
     std::int32_t YVectorVal = 0;  ///< row number of the current trace in the waterfall
     ShownView Shown;              ///< of the view on the graph
+    bool SeriesPlays = false;     ///< the traces of a loaded recording go over the graph
 
     /// Saves the trace just read: "trace" or "power".
     Event<const std::string&> SaveView;
@@ -192,7 +193,15 @@ class ControllerForm : public Form {
     Label MarkerLabel{*this, "MarkerLabel"};
     Label DeltaLabel{*this, "DeltaLabel"};
     Label PaceLabel{*this, "PaceLabel"};          ///< age of the trace, sweeps a second
-    Frame PlaybackFrame{*this, "PlaybackFrame"};  ///< shown while a series of traces is played
+    Frame PlaybackFrame{*this, "PlaybackFrame"};  ///< shown as long as a recording is loaded
+    Button PlaybackBack{*this, "PlaybackBack", "Back"};
+    Button PlaybackPlay{*this, "PlaybackPlay", "Play"};  ///< "Pause" while it plays
+    Button PlaybackForward{*this, "PlaybackForward", "Forward"};
+    Slider PlaybackPosition{*this, "PlaybackPosition"};  ///< the trace on the graph, from 1
+    Label PlaybackLabel{*this, "PlaybackLabel"};         ///< position and time of the trace
+    CheckBox PlaybackRepeat{*this, "PlaybackRepeat", "Repeat"};
+    CheckBox PlaybackRealTime{*this, "PlaybackRealTime", "Real time"};
+    Button PlaybackClose{*this, "PlaybackClose", "Close"};
     Label FileLabel{*this, "FileLabel"};  ///< progress of a recording or of a file that loads
     Label WaitLabel{*this, "WaitLabel"};  ///< what is waited for, and how long at most
     TextBox DebugTextBox{*this, "DebugTextBox"};

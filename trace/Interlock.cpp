@@ -60,6 +60,8 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
     rule({&p.LoadData}, {Rule::NoViewForFile, Rule::NoRecordingForFile});
     for (int i = 0; i < p.RecentFile.count(); ++i)
         rule({&p.RecentFile(i)}, {Rule::NoViewForFile, Rule::NoRecordingForFile});
+    rule({&p.PlaybackBack, &p.PlaybackPlay, &p.PlaybackForward, &p.PlaybackPosition},
+         {Rule::NoViewForFile, Rule::NoRecordingForFile});
     rule({&p.Disconnect, &forms.main.DisconnectButton, &forms.main.DisconnectButton2},
          {Rule::NoViewToEndFor});
 
@@ -72,6 +74,8 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
                &forms.specialMeas.chkStep, &forms.specialMeas.chkSave,
                &forms.specialMeas.chkWaterfall, &forms.specialMeas.chkGetSweep,
                &forms.specialMeas.cmdSave, &forms.std.cmdStop};
+    playback_ = {&p.PlaybackBack,   &p.PlaybackPlay,     &p.PlaybackForward, &p.PlaybackPosition,
+                 &p.PlaybackRepeat, &p.PlaybackRealTime, &p.PlaybackClose};
     quietInView_ = {&p.FrequencyButton, &p.SpanButton,  &p.AmplitudeButton, &p.BWButton,
                     &p.SweepButton,     &p.TraceButton, &p.MeasButton};
     silent_ = {&p.GetOption,
@@ -85,6 +89,13 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
                &p.MenuFileSaveImage,
                &p.cmdZoom,
                &p.cmd3D,
+               &p.PlaybackBack,
+               &p.PlaybackPlay,
+               &p.PlaybackForward,
+               &p.PlaybackPosition,
+               &p.PlaybackRepeat,
+               &p.PlaybackRealTime,
+               &p.PlaybackClose,
                &forms.time.CancelTimeButton};
     handlers_.on(state_.LineFree, [this] { scheduleWaiting(); });
     handlers_.on(state_.TurnGiven, [this] { runWaiting(); });
@@ -167,6 +178,8 @@ Interlock::Turn Interlock::turnOf(const Control& control) const {
     // What only looks at sweeps that have come disturbs nothing.
     if (always_.count(&control) > 0 || &control.form() == &forms_.waterfall) return Turn::Now;
     if (state_.Ending) return Turn::Never;
+    // The loop that plays a recording has the line free and waits for these.
+    if (panel_.SeriesPlays && playback_.count(&control) > 0) return Turn::Now;
     if (anyUnmet(control)) return Turn::Now;  // it refuses by itself, in words
     if (std::find(running_.begin(), running_.end(), &control) != running_.end()) return Turn::Never;
     // While the view runs, a hard key lays out its menu and asks nothing.

@@ -92,6 +92,7 @@ class Interlock {
     std::map<const Control*, std::vector<Rule>> rules_;
     std::set<const Control*> always_;       ///< stop, end or adjust what runs
     std::set<const Control*> silent_;       ///< begin no exchange
+    std::set<const Control*> playback_;     ///< act while a recording plays
     std::set<const Control*> quietInView_;  ///< begin none while the continuous view runs
     std::deque<Act> waiting_;
     std::vector<const Control*> running_;

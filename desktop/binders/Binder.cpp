@@ -25,8 +25,8 @@ constexpr Face kFaces[] = {{kRed, "red"},       {kGreen, "green"},   {65280, "gr
 QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
 
 /// A caption of two lines on a button; "&" is no mnemonic here.
-QString caption(const std::string& utf8) {
-    return text(utf8).replace("\r\n", "\n").replace("&", "&&");
+QString caption(const Control& control, const std::string& utf8) {
+    return ownCaption(control, utf8).replace("\r\n", "\n").replace("&", "&&");
 }
 
 /// Keys without a handler belong to rooms that are not built yet.
@@ -158,7 +158,7 @@ void Binder::bind(Button& control, QPushButton* widget) {
         act(control, [&control] { control.Click(); });
     });
     follow(control, widget, [this, &control, widget] {
-        widget->setText(caption(control.Caption));
+        widget->setText(caption(control, control.Caption));
         widget->setEnabled(control.Enabled && hasHandler(control) && usable(control));
         widget->setVisible(control.Visible);
         QString face = faceOf(control.BackColor);
@@ -221,7 +221,7 @@ void Binder::bind(CheckBox& control, QCheckBox* widget) {
         markDirty(&control);
     });
     follow(control, widget, [this, &control, widget] {
-        widget->setText(caption(control.Caption));
+        widget->setText(caption(control, control.Caption));
         widget->setChecked(control.Value());
         // Its value counts, with a handler or without.
         widget->setEnabled(control.Enabled && usable(control));
@@ -239,7 +239,7 @@ void Binder::bind(OptionButton& control, QRadioButton* widget) {
         markDirty(&control);
     });
     follow(control, widget, [this, &control, widget] {
-        widget->setText(caption(control.Caption));
+        widget->setText(caption(control, control.Caption));
         widget->setChecked(control.Value());
         widget->setEnabled(control.Enabled && usable(control));
         widget->setVisible(control.Visible);
@@ -320,7 +320,7 @@ void Binder::bind(MenuItem& control, QAction* action) {
     const bool opens = control.parent() == nullptr;
     if (!opens) action->setShortcut(QKeySequence(keys));
     follow(control, action, [&control, action, keys, opens] {
-        QString words = caption(control.Caption);
+        QString words = caption(control, control.Caption);
         if (opens && !keys.isEmpty())
             words.insert(std::max<qsizetype>(words.indexOf(keys.back(), 0, Qt::CaseInsensitive), 0),
                          '&');

@@ -1,5 +1,6 @@
 #include "desktop/binders/ToolTips.h"
 
+#include <QObject>
 #include <algorithm>
 
 #include "platform/Controls.h"
@@ -12,99 +13,140 @@ struct Tip {
     const char* text;
 };
 const Tip kTips[] = {
-    {"PlaySingleButton", "Read one sweep"},
-    {"PlayContinuousButton", "Read sweep after sweep"},
-    {"StopButton", "Stop the continuous view or the recording"},
-    {"cmdZoom", "Draw a rectangle to look closer; press again for the whole span"},
-    {"cmd3D", "Waterfall: a hundred sweeps in depth"},
-    {"ColourMapList", "Colours of the levels"},
-    {"DepthList", "How many of the newest sweeps the picture shows"},
-    {"LevelsList", "Where the lowest and the highest level come from"},
-    {"LevelMinBox", "Lowest level"},
-    {"LevelMaxBox", "Highest level"},
-    {"lblPointer", "Frequency, time and level under the pointer"},
-    {"cmdSpecial", "Scripts of measurements"},
-    {"CFLabel", "Centre frequency"},
-    {"SpanLabel", "Span"},
-    {"MarkerLabel", "Marker: position and level"},
-    {"DeltaLabel", "Delta marker or pointer: position and level"},
-    {"PaceLabel", "Age of the trace, sweeps a second, and what sets the pace"},
-    {"DebugTextBox", "Last step of the exchange with the instrument"},
-    {"GetOption", "A soft key asks the instrument"},
-    {"SetOption", "A soft key changes the instrument"},
-    {"FrequencyButton", "Frequency menu"},
-    {"SpanButton", "Span menu"},
-    {"AmplitudeButton", "Amplitude menu"},
-    {"BWButton", "Bandwidth menu"},
-    {"SweepButton", "Sweep menu"},
-    {"TraceButton", "Trace menu"},
-    {"MeasButton", "Measurement menu"},
-    {"TrackButton1", "Tracking generator menu"},
-    {"MarkerButton", "Marker menu"},
-    {"AnalyzerButton", "Analyzer mode"},
-    {"TrackButton", "Tracking generator mode"},
-    {"PwrButton", "Power sensor mode"},
-    {"ChnPwrButton", "Channel power mode"},
-    {"OccBWButton", "Occupied bandwidth mode"},
-    {"TDMAButton", "TDMA power mode"},
-    {"DistFaultButton", "Distance to fault mode"},
-    {"AnalyzerCheck", "Analyzer mode"},
-    {"TrackingGenCheck", "Tracking generator mode"},
-    {"PowerSensorCheck", "Power sensor mode"},
-    {"ChannelPowerCheck", "Channel power mode"},
-    {"OccBWCheck", "Occupied bandwidth mode"},
-    {"TDMAPowerCheck", "TDMA power mode"},
-    {"DistFaultCheck", "Distance to fault mode"},
-    {"MarkerCheckBox", "Switch the marker on or off"},
-    {"DeltaCheckBox", "Switch the delta marker on or off"},
-    {"MarkPkButton", "Marker to the highest peak"},
-    {"NextPeakButton", "Marker to the next peak"},
-    {"MinPeakButton", "Marker to the minimum"},
-    {"MarkToCentButton", "The marker's frequency becomes the centre"},
-    {"MarkToRefButton", "The marker's level becomes the reference level"},
-    {"ResetButton", "Preset the instrument"},
-    {"LocalButton", "Give the instrument's own keys back"},
-    {"OnOffButton", "Toggle remote (R) and local (L) control; the key shows the next state"},
-    {"ManualCommandText", "A line of the instrument's protocol"},
-    {"SendButton", "Send the line"},
-    {"ManualCommandTextAnsw", "The instrument's answer"},
-    {"TimeLabel", "Length of the session"},
-    {"COMList", "Serial port: choose one or type a device name"},
-    {"BaudList", "Baud rate: the instrument's own"},
-    {"ZELButton", "Open the port and connect"},
-    {"IDText", "Identity of the instrument"},
-    {"TelNumberBox", "Telephone number of the far modem"},
-    {"AirBaudRateText", "The modem's answer"},
-    {"manualSizeMin", "Lower end of the vertical axis"},
-    {"manualSizeMax", "Upper end of the vertical axis"},
-    {"IPAdressTextBox", "Name or address of the computer at the instrument"},
-    {"RemotePortTextBox", "TCP port of the server"},
-    {"IDTextBox", "State of the connection"},
-    {"localPortTextBox", "TCP port on which the server listens"},
-    {"txtDebug", "State of the server"},
-    {"FileLabel", "Progress of the recording or of the file that loads"},
-    {"sldSpeed", "Set the speed for loading traces."},
-    {"TimeIntervalBox", "Seconds from one trace to the next"},
-    {"CWGraph1", "The sweep. With a marker on, drag it or move it with the arrow keys"},
+    {"PlaySingleButton", QT_TRANSLATE_NOOP("QObject", "Read one sweep")},
+    {"PlayContinuousButton", QT_TRANSLATE_NOOP("QObject", "Read sweep after sweep")},
+    {"StopButton", QT_TRANSLATE_NOOP("QObject", "Stop the continuous view or the recording")},
+    {"cmdZoom", QT_TRANSLATE_NOOP(
+                    "QObject", "Draw a rectangle to look closer; press again for the whole span")},
+    {"cmd3D", QT_TRANSLATE_NOOP("QObject", "Waterfall: a hundred sweeps in depth")},
+    {"ColourMapList", QT_TRANSLATE_NOOP("QObject", "Colours of the levels")},
+    {"DepthList", QT_TRANSLATE_NOOP("QObject", "How many of the newest sweeps the picture shows")},
+    {"LevelsList",
+     QT_TRANSLATE_NOOP("QObject", "Where the lowest and the highest level come from")},
+    {"LevelMinBox", QT_TRANSLATE_NOOP("QObject", "Lowest level")},
+    {"LevelMaxBox", QT_TRANSLATE_NOOP("QObject", "Highest level")},
+    {"lblPointer", QT_TRANSLATE_NOOP("QObject", "Frequency, time and level under the pointer")},
+    {"cmdSpecial", QT_TRANSLATE_NOOP("QObject", "Scripts of measurements")},
+    {"CFLabel", QT_TRANSLATE_NOOP("QObject", "Centre frequency")},
+    {"SpanLabel", QT_TRANSLATE_NOOP("QObject", "Span")},
+    {"MarkerLabel", QT_TRANSLATE_NOOP("QObject", "Marker: position and level")},
+    {"DeltaLabel", QT_TRANSLATE_NOOP("QObject", "Delta marker or pointer: position and level")},
+    {"PaceLabel",
+     QT_TRANSLATE_NOOP("QObject", "Age of the trace, sweeps a second, and what sets the pace")},
+    {"DebugTextBox", QT_TRANSLATE_NOOP("QObject", "Last step of the exchange with the instrument")},
+    {"GetOption", QT_TRANSLATE_NOOP("QObject", "A soft key asks the instrument")},
+    {"SetOption", QT_TRANSLATE_NOOP("QObject", "A soft key changes the instrument")},
+    {"FrequencyButton", QT_TRANSLATE_NOOP("QObject", "Frequency menu")},
+    {"SpanButton", QT_TRANSLATE_NOOP("QObject", "Span menu")},
+    {"AmplitudeButton", QT_TRANSLATE_NOOP("QObject", "Amplitude menu")},
+    {"BWButton", QT_TRANSLATE_NOOP("QObject", "Bandwidth menu")},
+    {"SweepButton", QT_TRANSLATE_NOOP("QObject", "Sweep menu")},
+    {"TraceButton", QT_TRANSLATE_NOOP("QObject", "Trace menu")},
+    {"MeasButton", QT_TRANSLATE_NOOP("QObject", "Measurement menu")},
+    {"TrackButton1", QT_TRANSLATE_NOOP("QObject", "Tracking generator menu")},
+    {"MarkerButton", QT_TRANSLATE_NOOP("QObject", "Marker menu")},
+    {"AnalyzerButton", QT_TRANSLATE_NOOP("QObject", "Analyzer mode")},
+    {"TrackButton", QT_TRANSLATE_NOOP("QObject", "Tracking generator mode")},
+    {"PwrButton", QT_TRANSLATE_NOOP("QObject", "Power sensor mode")},
+    {"ChnPwrButton", QT_TRANSLATE_NOOP("QObject", "Channel power mode")},
+    {"OccBWButton", QT_TRANSLATE_NOOP("QObject", "Occupied bandwidth mode")},
+    {"TDMAButton", QT_TRANSLATE_NOOP("QObject", "TDMA power mode")},
+    {"DistFaultButton", QT_TRANSLATE_NOOP("QObject", "Distance to fault mode")},
+    {"AnalyzerCheck", QT_TRANSLATE_NOOP("QObject", "Analyzer mode")},
+    {"TrackingGenCheck", QT_TRANSLATE_NOOP("QObject", "Tracking generator mode")},
+    {"PowerSensorCheck", QT_TRANSLATE_NOOP("QObject", "Power sensor mode")},
+    {"ChannelPowerCheck", QT_TRANSLATE_NOOP("QObject", "Channel power mode")},
+    {"OccBWCheck", QT_TRANSLATE_NOOP("QObject", "Occupied bandwidth mode")},
+    {"TDMAPowerCheck", QT_TRANSLATE_NOOP("QObject", "TDMA power mode")},
+    {"DistFaultCheck", QT_TRANSLATE_NOOP("QObject", "Distance to fault mode")},
+    {"MarkerCheckBox", QT_TRANSLATE_NOOP("QObject", "Switch the marker on or off")},
+    {"DeltaCheckBox", QT_TRANSLATE_NOOP("QObject", "Switch the delta marker on or off")},
+    {"MarkPkButton", QT_TRANSLATE_NOOP("QObject", "Marker to the highest peak")},
+    {"NextPeakButton", QT_TRANSLATE_NOOP("QObject", "Marker to the next peak")},
+    {"MinPeakButton", QT_TRANSLATE_NOOP("QObject", "Marker to the minimum")},
+    {"MarkToCentButton", QT_TRANSLATE_NOOP("QObject", "The marker's frequency becomes the centre")},
+    {"MarkToRefButton",
+     QT_TRANSLATE_NOOP("QObject", "The marker's level becomes the reference level")},
+    {"ResetButton", QT_TRANSLATE_NOOP("QObject", "Preset the instrument")},
+    {"LocalButton", QT_TRANSLATE_NOOP("QObject", "Give the instrument's own keys back")},
+    {"OnOffButton",
+     QT_TRANSLATE_NOOP("QObject",
+                       "Toggle remote (R) and local (L) control; the key shows the next state")},
+    {"ManualCommandText", QT_TRANSLATE_NOOP("QObject", "A line of the instrument's protocol")},
+    {"SendButton", QT_TRANSLATE_NOOP("QObject", "Send the line")},
+    {"ManualCommandTextAnsw", QT_TRANSLATE_NOOP("QObject", "The instrument's answer")},
+    {"TimeLabel", QT_TRANSLATE_NOOP("QObject", "Length of the session")},
+    {"COMList", QT_TRANSLATE_NOOP("QObject", "Serial port: choose one or type a device name")},
+    {"BaudList", QT_TRANSLATE_NOOP("QObject", "Baud rate: the instrument's own")},
+    {"ZELButton", QT_TRANSLATE_NOOP("QObject", "Open the port and connect")},
+    {"IDText", QT_TRANSLATE_NOOP("QObject", "Identity of the instrument")},
+    {"TelNumberBox", QT_TRANSLATE_NOOP("QObject", "Telephone number of the far modem")},
+    {"AirBaudRateText", QT_TRANSLATE_NOOP("QObject", "The modem's answer")},
+    {"manualSizeMin", QT_TRANSLATE_NOOP("QObject", "Lower end of the vertical axis")},
+    {"manualSizeMax", QT_TRANSLATE_NOOP("QObject", "Upper end of the vertical axis")},
+    {"IPAdressTextBox",
+     QT_TRANSLATE_NOOP("QObject", "Name or address of the computer at the instrument")},
+    {"RemotePortTextBox", QT_TRANSLATE_NOOP("QObject", "TCP port of the server")},
+    {"IDTextBox", QT_TRANSLATE_NOOP("QObject", "State of the connection")},
+    {"localPortTextBox", QT_TRANSLATE_NOOP("QObject", "TCP port on which the server listens")},
+    {"txtDebug", QT_TRANSLATE_NOOP("QObject", "State of the server")},
+    {"FileLabel",
+     QT_TRANSLATE_NOOP("QObject", "Progress of the recording or of the file that loads")},
+    {"PlaybackBack", QT_TRANSLATE_NOOP("QObject", "One trace back")},
+    {"PlaybackPlay",
+     QT_TRANSLATE_NOOP("QObject", "Play the recording from here; the same key pauses")},
+    {"PlaybackForward", QT_TRANSLATE_NOOP("QObject", "One trace forward")},
+    {"PlaybackPosition", QT_TRANSLATE_NOOP("QObject", "The trace on the graph")},
+    {"PlaybackLabel",
+     QT_TRANSLATE_NOOP("QObject", "Position in the recording and time of the trace")},
+    {"PlaybackRepeat", QT_TRANSLATE_NOOP("QObject", "Begin again at the end")},
+    {"PlaybackRealTime",
+     QT_TRANSLATE_NOOP("QObject", "As quick as it was recorded, by the times in the file")},
+    {"PlaybackClose", QT_TRANSLATE_NOOP("QObject", "Close the recording; its last trace stays")},
+    {"sldSpeed", QT_TRANSLATE_NOOP("QObject", "Set the speed for loading traces.")},
+    {"TimeIntervalBox", QT_TRANSLATE_NOOP("QObject", "Seconds from one trace to the next")},
+    {"CWGraph1",
+     QT_TRANSLATE_NOOP("QObject",
+                       "The sweep. With a marker on, drag it or move it with the arrow keys")},
 };
 
 /// Names of what the screen itself does not name.
 const Tip kNames[] = {
-    {"CWGraph1", "Graph"},
-    {"SpectrogramPicture", "Spectrogram"},
-    {"ManualCommandText", "Command"},
-    {"ManualCommandTextAnsw", "Answer"},
-    {"DebugTextBox", "Last step"},
-    {"TimeLabel", "Length of the session"},
-    {"COMList", "Port"},
-    {"BaudList", "Baud rate"},
-    {"IDText", "Instrument"},
-    {"TelNumberBox", "Number"},
-    {"AirBaudRateText", "Modem"},
-    {"ConnectedPic", "State of the connection"},
-    {"Picture3", "State of the connection"},
-    {"FileLabel", "Progress"},
-    {"WaitLabel", "Wait"},
+    {"CWGraph1", QT_TRANSLATE_NOOP("QObject", "Graph")},
+    {"SpectrogramPicture", QT_TRANSLATE_NOOP("QObject", "Spectrogram")},
+    {"ManualCommandText", QT_TRANSLATE_NOOP("QObject", "Command")},
+    {"ManualCommandTextAnsw", QT_TRANSLATE_NOOP("QObject", "Answer")},
+    {"DebugTextBox", QT_TRANSLATE_NOOP("QObject", "Last step")},
+    {"TimeLabel", QT_TRANSLATE_NOOP("QObject", "Length of the session")},
+    {"COMList", QT_TRANSLATE_NOOP("QObject", "Port")},
+    {"BaudList", QT_TRANSLATE_NOOP("QObject", "Baud rate")},
+    {"IDText", QT_TRANSLATE_NOOP("QObject", "Instrument")},
+    {"TelNumberBox", QT_TRANSLATE_NOOP("QObject", "Number")},
+    {"AirBaudRateText", QT_TRANSLATE_NOOP("QObject", "Modem")},
+    {"ConnectedPic", QT_TRANSLATE_NOOP("QObject", "State of the connection")},
+    {"Picture3", QT_TRANSLATE_NOOP("QObject", "State of the connection")},
+    {"FileLabel", QT_TRANSLATE_NOOP("QObject", "Progress")},
+    {"PlaybackPosition", QT_TRANSLATE_NOOP("QObject", "Position in the recording")},
+    {"sldSpeed", QT_TRANSLATE_NOOP("QObject", "Speed")},
+    {"WaitLabel", QT_TRANSLATE_NOOP("QObject", "Wait")},
+};
+
+/// Captions of controls that the window has beside those of the instrument's panel.
+const Tip kOwn[] = {
+    {"PlaybackBack", QT_TRANSLATE_NOOP("QObject", "Back")},
+    {"PlaybackPlay", QT_TRANSLATE_NOOP("QObject", "Play")},
+    {"PlaybackPlay", QT_TRANSLATE_NOOP("QObject", "Pause")},
+    {"PlaybackForward", QT_TRANSLATE_NOOP("QObject", "Forward")},
+    {"PlaybackRepeat", QT_TRANSLATE_NOOP("QObject", "Repeat")},
+    {"PlaybackRealTime", QT_TRANSLATE_NOOP("QObject", "Real time")},
+    {"PlaybackClose", QT_TRANSLATE_NOOP("QObject", "Close")},
+    {"ViewMenu", QT_TRANSLATE_NOOP("QObject", "View")},
+    {"SpectrogramShow", QT_TRANSLATE_NOOP("QObject", "Spectrogram")},
+    {"SpectrogramPause", QT_TRANSLATE_NOOP("QObject", "Pause Spectrogram")},
+    {"SpectrogramSave", QT_TRANSLATE_NOOP("QObject", "Save Spectrogram as Recording...")},
+    {"UtilityDoctor", QT_TRANSLATE_NOOP("QObject", "Connection Doctor...")},
+    {"UtilityRecord", QT_TRANSLATE_NOOP("QObject", "Record Session...")},
+    {"RecentMenu", QT_TRANSLATE_NOOP("QObject", "Recent Files")},
 };
 
 /// "1" of "SoftKey(0)": people count from one.
@@ -134,7 +176,7 @@ QString writtenOn(const Control& control) {
         default:
             break;
     }
-    return QString::fromStdString(caption).simplified();
+    return ownCaption(control, caption).simplified();
 }
 
 bool darkInk = true;
@@ -144,23 +186,25 @@ bool darkInk = true;
 QString toolTipOf(const Control& control) {
     const std::string base = control.name().substr(0, control.name().find('('));
     for (const Tip& tip : kTips)
-        if (base == tip.name) return QString::fromUtf8(tip.text);
-    if (base == "SoftKey") return "Soft key";
-    if (base == "SoftTextBox") return "Value: type a number with its prefix, then Enter";
-    if (base == "ChoiceBox") return "Choice";
+        if (base == tip.name) return QObject::tr(tip.text);
+    if (base == "SoftKey") return QObject::tr("Soft key");
+    if (base == "SoftTextBox")
+        return QObject::tr("Value: type a number with its prefix, then Enter");
+    if (base == "ChoiceBox") return QObject::tr("Choice");
     return {};
 }
 
 QString accessibleNameOf(const Control& control) {
     const std::string base = control.name().substr(0, control.name().find('('));
     for (const Tip& row : kNames)
-        if (base == row.name) return QString::fromUtf8(row.text);
+        if (base == row.name) return QObject::tr(row.text);
     const QString written = writtenOn(control);
     const QString number = numberOf(control.name());
     if (base == "SoftKey")
-        return "Soft key " + number + (written.isEmpty() ? QString() : ", " + written);
-    if (base == "SoftTextBox") return "Value " + number;
-    if (base == "ChoiceBox") return "Choice " + number;
+        return QObject::tr("Soft key %1").arg(number) +
+               (written.isEmpty() ? QString() : ", " + written);
+    if (base == "SoftTextBox") return QObject::tr("Value %1").arg(number);
+    if (base == "ChoiceBox") return QObject::tr("Choice %1").arg(number);
     // A readout is read with its value.
     if (control.kind() == ControlKind::Label && !written.isEmpty()) return written;
     if (!written.isEmpty() && control.kind() != ControlKind::Label) {
@@ -168,6 +212,12 @@ QString accessibleNameOf(const Control& control) {
         return tip.isEmpty() ? written : written + ", " + tip;
     }
     return toolTipOf(control);
+}
+
+QString ownCaption(const Control& control, const std::string& caption) {
+    for (const Tip& own : kOwn)
+        if (control.name() == own.name && caption == own.text) return QObject::tr(own.text);
+    return QString::fromStdString(caption);
 }
 
 void useDarkInk(bool darkTheme) { darkInk = darkTheme; }

@@ -45,8 +45,7 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
     graph_->installEventFilter(this);
     layout->addWidget(graph_, 2);
     layout->addWidget(spectrogram(), 1);
-    layout->addWidget(
-        new PlaybackBar(panel_.PlaybackFrame, program_.forms().specialMeas.sldSpeed, binder_));
+    layout->addWidget(new PlaybackBar(program_.forms(), binder_));
     layout->addWidget(readouts_);
     showEmpty();
 }

@@ -1,17 +1,23 @@
 #pragma once
-// The bar under the graph that sets the pace while a series of traces plays.
+// The bar under the graph that plays a loaded recording.
 
 #include <QWidget>
 
 #include "desktop/binders/Binder.h"
-#include "platform/Controls.h"
+#include "forms/Forms.h"
 
 namespace zel {
 
 /// Shown as long as the frame is.
 class PlaybackBar : public QWidget {
   public:
-    PlaybackBar(Frame& frame, Slider& speed, Binder& binder, QWidget* parent = nullptr);
+    PlaybackBar(Forms& forms, Binder& binder, QWidget* parent = nullptr);
+
+  private:
+    void showPace();
+
+    Slider& speed_;
+    QLabel* pace_;
 };
 
 }  // namespace zel

@@ -167,7 +167,7 @@ TEST_F(SeriesTest, Position_IsToldAndThePlaybackShownForASeriesOnly) {
     ASSERT_EQ(told.size(), 1U);
     EXPECT_EQ(told[0].substr(0, 22), "Trace 1 of series.csv,");
     EXPECT_EQ(panel.FileLabel.Caption.get(), "");
-    EXPECT_FALSE(panel.PlaybackFrame.Visible);
+    EXPECT_TRUE(panel.PlaybackFrame.Visible);
     told.clear();
     load(record(1));
     EXPECT_FALSE(panel.PlaybackFrame.Visible);
