@@ -13,10 +13,13 @@ constexpr double kSecond = 1e6;             // microseconds
 constexpr std::int64_t kLongGap = 5000000;  // a pause is no pace
 constexpr std::int64_t kShortestCycle = 50000;
 
-std::string ageText(double seconds) {
-    if (seconds < 60) return formatPattern(seconds, "0.0") + " s";
+/// A view that runs shows tenths. A trace that only gets older is written as seldom as its age
+/// means something, since each writing costs an idle program time.
+std::string ageText(double seconds, bool running) {
     const auto whole = static_cast<long>(seconds);
-    return std::to_string(whole / 60) + " min " + std::to_string(whole % 60) + " s";
+    if (seconds < 60 && running) return formatPattern(seconds, "0.0") + " s";
+    if (seconds < 60) return std::to_string(whole) + " s";
+    return std::to_string(whole / 60) + " min";
 }
 
 }  // namespace
@@ -57,8 +60,8 @@ double PaceMonitor::sweepsPerSecond() const {
 void PaceMonitor::show() {
     if (drawnAt_.empty()) return;
     const std::int64_t age = clock_.micros() - drawnAt_.back();
-    std::string text = ageText(static_cast<double>(age) / kSecond) + " old";
     const bool running = viewRuns();
+    std::string text = ageText(static_cast<double>(age) / kSecond, running) + " old";
     if (running && sweepsPerSecond() > 0) {
         text += "   " + formatPattern(sweepsPerSecond(), "0.0") + " sweeps/s   ";
         text += sweepSetsThePace() ? "the sweep sets the pace" : "the line sets the pace";
