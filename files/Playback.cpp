@@ -58,7 +58,16 @@ void Playback::setPlaying(bool playing) {
 }
 
 void Playback::showState() {
-    panel_.PlaybackFrame.Visible = frames_ != nullptr;
+    for (Control* control :
+         {static_cast<Control*>(&panel_.PlaybackFrame), static_cast<Control*>(&panel_.PlaybackBack),
+          static_cast<Control*>(&panel_.PlaybackPlay),
+          static_cast<Control*>(&panel_.PlaybackForward),
+          static_cast<Control*>(&panel_.PlaybackPosition),
+          static_cast<Control*>(&panel_.PlaybackLabel),
+          static_cast<Control*>(&panel_.PlaybackRepeat),
+          static_cast<Control*>(&panel_.PlaybackRealTime),
+          static_cast<Control*>(&panel_.PlaybackClose)})
+        control->Visible = frames_ != nullptr;
     panel_.PlaybackPlay.Caption = panel_.SeriesPlays ? "Pause" : "Play";
     const int count = frames_ ? frames_->count() : 1;
     panel_.PlaybackPosition.Min = 1;
