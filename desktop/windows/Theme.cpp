@@ -6,36 +6,10 @@
 #include <QStyleFactory>
 
 #include "desktop/binders/ToolTips.h"
+#include "desktop/windows/ThemeColors.h"
 
 namespace zel {
 namespace {
-
-struct ThemeColors {
-    const char* window;
-    const char* base;
-    const char* text;
-    const char* dim;      ///< what cannot be used now
-    const char* caption;  ///< small texts beside fields
-    const char* button;
-    const char* buttonHover;
-    const char* border;
-    const char* panel;     ///< frames, one step from the window
-    const char* hairline;  ///< edges of frames
-    const char* accent;
-    const char* accentText;
-    const char* yellow;
-    const char* yellowText;
-    const char* yellowEdge;
-    const char* red;
-    const char* green;
-    const char* problem;  ///< texts that cannot be read
-};
-constexpr ThemeColors kDark = {"#12171e", "#0b0f14", "#e6ebf0", "#7d8894", "#aab4bf", "#232b34",
-                               "#2f3a46", "#3a4653", "#19202a", "#2b3541", "#2873c6", "#ffffff",
-                               "#35321f", "#ffd966", "#8f7a30", "#c0392b", "#1e8449", "#ff7b72"};
-constexpr ThemeColors kLight = {"#eef1f4", "#ffffff", "#15191e", "#77818b", "#48525c", "#ffffff",
-                                "#e3e9f0", "#9aa5b1", "#f7f9fb", "#cbd3db", "#1d6fc4", "#ffffff",
-                                "#fdf1bf", "#574600", "#c9a93f", "#c0392b", "#1e8449", "#b3261e"};
 
 constexpr const char* kStyleSheet = R"(
 QWidget { font-size: 12px; }
@@ -43,7 +17,7 @@ QPushButton { background: @button; color: @text; border: 1px solid @border; bord
     padding: 2px 6px; min-height: 20px; }
 QPushButton:hover { background: @buttonHover; }
 QPushButton:pressed { background: @accent; color: @accentText; }
-QPushButton:focus { border: 2px solid @accent; padding: 1px 5px; }
+QPushButton:focus { border: 2px solid @focus; padding: 1px 5px; }
 QPushButton:default { border-color: @accent; background: @accent; color: @accentText; }
 QPushButton:default:hover { border-color: @text; }
 QPushButton:default:focus { border-color: @text; }
@@ -60,7 +34,7 @@ QPushButton[face]:focus { border: 2px solid @text; }
 QPushButton#StopButton { background: @red; color: #ffffff; font-weight: bold; }
 QLineEdit, QComboBox { background: @base; color: @text; border: 1px solid @border;
     border-radius: 4px; padding: 1px 4px; min-height: 18px; }
-QLineEdit:focus, QComboBox:focus { border: 2px solid @accent; padding: 0px 3px; }
+QLineEdit:focus, QComboBox:focus { border: 2px solid @focus; padding: 0px 3px; }
 QComboBox QAbstractItemView { background: @base; color: @text; border: 1px solid @border;
     selection-background-color: @accent; selection-color: @accentText; }
 QComboBox::drop-down { border: none; width: 18px; }
@@ -71,7 +45,7 @@ QComboBox::down-arrow:disabled { border-left-color: @window; border-right-color:
 QLineEdit[face="locked"] { background: transparent; border: 1px dashed @border; }
 QComboBox[face="locked"] { background: transparent; border: 1px dashed @border; }
 QComboBox[face="locked"]::down-arrow { border: none; }
-QLineEdit[face="locked"]:focus, QComboBox[face="locked"]:focus { border: 2px dashed @accent; }
+QLineEdit[face="locked"]:focus, QComboBox[face="locked"]:focus { border: 2px dashed @focus; }
 QLineEdit[refused="true"], QLineEdit[refused="true"]:focus { border: 2px solid @problem;
     color: @problem; padding: 0px 3px; }
 QPushButton[face="terminator"] { background: @base; padding: 1px 2px; font-size: 11px; }
@@ -96,7 +70,7 @@ QToolBar::separator { background: transparent; width: 8px; }
 QToolBar QToolButton { background: @button; color: @text; border: 1px solid @border;
     border-radius: 6px; padding: 2px 6px; min-height: 22px; }
 QToolBar QToolButton:hover { background: @buttonHover; }
-QToolBar QToolButton:focus { border: 2px solid @accent; padding: 1px 5px; }
+QToolBar QToolButton:focus { border: 2px solid @focus; padding: 1px 5px; }
 QToolBar QToolButton:pressed, QToolBar QToolButton:checked { background: @accent;
     color: @accentText; }
 QToolBar QToolButton:disabled { color: @dim; background: @window; }
@@ -106,7 +80,7 @@ QToolBar QToolButton#StopTool:enabled { background: @red; color: #ffffff; }
 QToolButton#heading { background: transparent; color: @caption; border: none; font-size: 11px;
     font-weight: 600; text-align: left; padding: 1px 0px; min-height: 14px; }
 QToolButton#heading:hover { color: @text; }
-QToolButton#heading:focus { border: 1px solid @accent; border-radius: 3px; }
+QToolButton#heading:focus { border: 1px solid @focus; border-radius: 3px; }
 QMenuBar, QStatusBar { background: @window; }
 QStatusBar::item { border: none; }
 QScrollBar:vertical { background: transparent; width: 8px; margin: 0; }
@@ -115,7 +89,10 @@ QScrollBar::add-line:vertical, QScrollBar::sub-line:vertical { height: 0; }
 QToolTip { background: @base; color: @text; border: 1px solid @border; }
 QStatusBar QLabel { padding: 0 6px; }
 QMenuBar::item:disabled, QMenu::item:disabled { color: @dim; }
-QRadioButton:focus, QCheckBox:focus { background: @buttonHover; }
+QRadioButton, QCheckBox, QSlider { border: 1px solid transparent; }
+QRadioButton:focus, QCheckBox:focus { background: @buttonHover; border: 1px solid @focus; }
+QSlider:focus { border: 1px solid @focus; }
+QTabBar::tab:focus { border: 1px solid @focus; }
 QRadioButton::indicator, QCheckBox::indicator { width: 12px; height: 12px;
     border: 1px solid @dim; background: @base; }
 QCheckBox::indicator { border-radius: 3px; }
@@ -144,6 +121,7 @@ QString styled(const ThemeColors& c) {
         {"@caption", c.caption},
         {"@red", c.red},
         {"@green", c.green},
+        {"@focus", c.focus},
         {"@problem", c.problem},
     };
     QString sheet = kStyleSheet;
