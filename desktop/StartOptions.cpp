@@ -51,6 +51,9 @@ std::optional<int> parseStartOptions(int argc, const char* const* argv, StartOpt
     app.add_option("--theme", theme, "light, dark or system; without it the last choice")
         ->type_name("NAME")
         ->check(CLI::IsMember({"light", "dark", "system"}));
+    app.add_option("--language", options.language, "en or de; without it the last choice")
+        ->type_name("NAME")
+        ->check(CLI::IsMember({"en", "de"}));
     app.add_option("--size", size, "Size of the window, as 1024x600")
         ->type_name("SIZE")
         ->check(sizeProblem, "");

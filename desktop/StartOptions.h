@@ -19,6 +19,7 @@ struct StartOptions {
     std::string log;                   ///< file of the session's record; empty for none
     std::string given;                 ///< all arguments as one line
     std::string screenshot;            ///< file of a picture of the window; empty for none
+    std::string language;              ///< "en", "de"; empty: as it was chosen last
     QSize size;                        ///< of the window; none where it is not valid
     std::optional<ThemeChoice> theme;  ///< none: as it was chosen last
 };

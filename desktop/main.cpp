@@ -50,6 +50,11 @@ int main(int argc, char** argv) {
     const zel::ThemeChoice theme = options.theme.value_or(zel::themeFromText(
         QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Theme", ""))));
     zel::applyTheme(application, theme);
+    const QString language =
+        options.language.empty()
+            ? QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Language", ""))
+            : QString::fromStdString(options.language);
+    zel::useLanguage(language, QString::fromStdString(platform.folder.programPath()));
     zel::Program program(platform.bundle(), options.words);
     zel::offerRehearsal(program, platform.boxes, platform.files);
     if (!options.log.empty()) program.recordSession(options.log, "zelremote " + options.given);
@@ -74,6 +79,9 @@ int main(int argc, char** argv) {
         zel::applyTheme(application, choice);
         platform.settings.set("ZELRemote", "Desktop", "Theme",
                               zel::themeText(choice).toStdString());
+    });
+    window.addLanguageMenu(language, [&](const QString& choice) {
+        platform.settings.set("ZELRemote", "Desktop", "Language", choice.toStdString());
     });
     if (options.size.isValid()) window.resize(options.size);
     const auto run = [&] {

@@ -2,6 +2,7 @@
 
 #include <QObject>
 #include <algorithm>
+#include <cmath>
 
 #include "platform/Controls.h"
 
@@ -181,6 +182,19 @@ QString writtenOn(const Control& control) {
 
 bool darkInk = true;
 
+/// For a contrast of 4.5:1 on the grounds of the themes.
+constexpr double kDarkestOnDark = 0.25;
+constexpr double kLightestOnLight = 0.15;
+
+/// Relative luminance, 0 to 1, of an sRGB colour.
+double luminance(const QColor& color) {
+    const auto linear = [](double part) {
+        return part <= 0.03928 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
+    };
+    return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) +
+           0.0722 * linear(color.blueF());
+}
+
 }  // namespace
 
 QString toolTipOf(const Control& control) {
@@ -229,8 +243,15 @@ QColor inkOf(Color color) {
     int saturation = 0;
     int lightness = 0;
     plain.getHsl(&hue, &saturation, &lightness);
-    lightness = darkInk ? std::max(lightness, 170) : std::min(lightness, 90);
-    return QColor::fromHsl(hue < 0 ? 0 : hue, saturation, lightness);
+    QColor ink = QColor::fromHsl(std::max(hue, 0), saturation, lightness);
+    // Blue looks darker than green of the same lightness.
+    constexpr int kStep = 4;
+    while (darkInk ? luminance(ink) < kDarkestOnDark && lightness < 255
+                   : luminance(ink) > kLightestOnLight && lightness > 0) {
+        lightness = std::clamp(lightness + (darkInk ? kStep : -kStep), 0, 255);
+        ink = QColor::fromHsl(std::max(hue, 0), saturation, lightness);
+    }
+    return ink;
 }
 
 }  // namespace zel

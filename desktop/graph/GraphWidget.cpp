@@ -26,7 +26,7 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
     picture_ = std::make_unique<GraphPlot>(*this);
     picture_->setBand(true);
     picture_->setMarkerTexts(true);
-    setAccessibleName("Graph");
+    setAccessibleName(QObject::tr("Graph"));
     setMouseTracking(true);
     setFocusPolicy(Qt::StrongFocus);
     setMinimumSize(320, 220);

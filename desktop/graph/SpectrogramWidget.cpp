@@ -30,8 +30,9 @@ SpectrogramWidget::SpectrogramWidget(Forms& forms, SweepHistory& history,
     setFocusPolicy(Qt::StrongFocus);
     setMinimumHeight(90);
     setAttribute(Qt::WA_OpaquePaintEvent);
-    setAccessibleName("Spectrogram");
-    setToolTip("Earlier sweeps; the wheel goes back, a click shows a sweep as the trace");
+    setAccessibleName(QObject::tr("Spectrogram"));
+    setToolTip(
+        QObject::tr("Earlier sweeps; the wheel goes back, a click shows a sweep as the trace"));
     history_.Cleared.connect([self = QPointer<SpectrogramWidget>(this)] {
         if (!self) return;
         self->follows_ = true;
@@ -103,8 +104,8 @@ void SpectrogramWidget::paintEvent(QPaintEvent*) {
     }
     QString note;
     if (forms_.controller.SpectrogramPause.Checked) note = "PAUSED";
-    if (first > 0) note += (note.isEmpty() ? "" : "   ") + QString("%1 sweeps back").arg(first);
-    if (image_.rows() == 0) note = "No sweeps yet";
+    if (first > 0) note += (note.isEmpty() ? "" : "   ") + QObject::tr("%1 sweeps back").arg(first);
+    if (image_.rows() == 0) note = QObject::tr("No sweeps yet");
     if (!note.isEmpty()) {
         const QRect box = painter.fontMetrics().boundingRect(note).adjusted(-6, -2, 6, 2);
         const QRect at(place.right() - box.width() - 4, place.top() + 4, box.width(), box.height());

@@ -101,7 +101,7 @@ void WaterfallCanvas::paintEvent(QPaintEvent*) {
     if (form_.Graph3D.hasRows()) return;
     painter.setPen(colors_.text);
     painter.drawText(rect(), Qt::AlignCenter,
-                     "No sweeps yet: start the continuous view\nor load a recording");
+                     QObject::tr("No sweeps yet: start the continuous view\nor load a recording"));
 }
 
 void WaterfallCanvas::rotate(double right, double down) {

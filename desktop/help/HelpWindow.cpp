@@ -45,7 +45,7 @@ void HelpPage::doSetSource(const QUrl& url, QTextDocument::ResourceType type) {
 
 HelpWindow::HelpWindow(const QString& book, const QString& home, QWidget* parent)
     : QMainWindow(parent, Qt::Window) {
-    setWindowTitle("ZELRemote Help");
+    setWindowTitle(QObject::tr("ZELRemote Help"));
     setProperty("help", true);
     setWindowIcon(QApplication::windowIcon());
     ready_ = openBook(book, home);
@@ -55,9 +55,9 @@ HelpWindow::HelpWindow(const QString& book, const QString& home, QWidget* parent
     page_ = new HelpPage(*engine_, this);
     tabs_ = new QTabWidget(this);
     QHelpContentWidget* contents = engine_->contentWidget();
-    tabs_->addTab(contents, "Contents");
-    tabs_->addTab(indexTab(), "Index");
-    tabs_->addTab(searchTab(), "Search");
+    tabs_->addTab(contents, QObject::tr("Contents"));
+    tabs_->addTab(indexTab(), QObject::tr("Index"));
+    tabs_->addTab(searchTab(), QObject::tr("Search"));
     connect(contents, &QHelpContentWidget::linkActivated, this,
             [this](const QUrl& url) { page_->setSource(url); });
     connect(contents, &QHelpContentWidget::clicked, this, [this](const QModelIndex& at) {
@@ -106,7 +106,7 @@ bool HelpWindow::openBook(const QString& book, const QString& home) {
 }
 
 void HelpWindow::buildTools() {
-    QToolBar* bar = addToolBar("Pages");
+    QToolBar* bar = addToolBar(QObject::tr("Pages"));
     bar->setMovable(false);
     const auto add = [&](QStyle::StandardPixmap icon, const QString& text, QKeySequence key) {
         QAction* action = bar->addAction(style()->standardIcon(icon), text);
@@ -114,10 +114,12 @@ void HelpWindow::buildTools() {
         action->setToolTip(text + " (" + key.toString(QKeySequence::NativeText) + ")");
         return action;
     };
-    QAction* back = add(QStyle::SP_ArrowBack, "Back", QKeySequence(Qt::ALT | Qt::Key_Left));
+    QAction* back =
+        add(QStyle::SP_ArrowBack, QObject::tr("Back"), QKeySequence(Qt::ALT | Qt::Key_Left));
     QAction* forward =
-        add(QStyle::SP_ArrowForward, "Forward", QKeySequence(Qt::ALT | Qt::Key_Right));
-    QAction* home = add(QStyle::SP_DirHomeIcon, "First page", QKeySequence(Qt::ALT | Qt::Key_Home));
+        add(QStyle::SP_ArrowForward, QObject::tr("Forward"), QKeySequence(Qt::ALT | Qt::Key_Right));
+    QAction* home = add(QStyle::SP_DirHomeIcon, QObject::tr("First page"),
+                        QKeySequence(Qt::ALT | Qt::Key_Home));
     back->setEnabled(false);
     forward->setEnabled(false);
     connect(back, &QAction::triggered, page_, &QTextBrowser::backward);
@@ -138,7 +140,7 @@ QWidget* HelpWindow::indexTab() {
     auto* tab = new QWidget(this);
     auto* layout = new QVBoxLayout(tab);
     auto* filter = new QLineEdit(tab);
-    filter->setPlaceholderText("Key, statement, control");
+    filter->setPlaceholderText(QObject::tr("Key, statement, control"));
     QHelpIndexWidget* index = engine_->indexWidget();
     layout->addWidget(filter);
     layout->addWidget(index);
@@ -156,7 +158,7 @@ QWidget* HelpWindow::searchTab() {
     auto* tab = new QWidget(this);
     auto* layout = new QVBoxLayout(tab);
     words_ = new QLineEdit(tab);
-    words_->setPlaceholderText("Words, then Enter");
+    words_->setPlaceholderText(QObject::tr("Words, then Enter"));
     words_->setClearButtonEnabled(true);
     results_ = new QListWidget(tab);
     layout->addWidget(words_);
@@ -197,7 +199,7 @@ void HelpWindow::search(const QString& text) {
                      [](const auto& one, const auto& other) { return one.first > other.first; });
     for (const auto& [hits, item] : found) results_->addItem(item);
     if (found.isEmpty()) {
-        auto* none = new QListWidgetItem("No page holds all of these words.");
+        auto* none = new QListWidgetItem(QObject::tr("No page holds all of these words."));
         none->setFlags(Qt::NoItemFlags);
         results_->addItem(none);
     }

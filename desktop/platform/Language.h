@@ -1,12 +1,23 @@
 #pragma once
-// The language of the system's own messages.
+// The language of the window's own texts and of the system's messages.
 
-#include <clocale>
+#include <QString>
+#include <span>
 
 namespace zel {
 
-/// The program speaks English, so the reasons that the system gives (why a file cannot be written)
-/// are in English too. To be called after the toolkit has taken over the settings of the user.
-inline void useEnglishMessages() { std::setlocale(LC_MESSAGES, "C"); }
+/// The reasons that the system gives (why a file cannot be written) stand among the program's
+/// English texts, so they are in English too. To be called after the toolkit has taken over the
+/// settings of the user.
+void useEnglishMessages();
+
+struct UiLanguage {
+    const char* code;  ///< empty: that of the system
+    const char* name;  ///< in itself
+};
+std::span<const UiLanguage> languages();
+/// Takes the texts of that language from the folder `translations` of the program's folder; an
+/// empty choice is the system's. Returns the code of the language in use: "en" without a file.
+QString useLanguage(const QString& choice, const QString& programFolder);
 
 }  // namespace zel

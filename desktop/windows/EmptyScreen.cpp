@@ -23,18 +23,18 @@ EmptyScreen::EmptyScreen(Ways ways, QWidget* parent) : QWidget(parent), ways_(st
     layout_ = new QVBoxLayout(card);
     layout_->setContentsMargins(16, 14, 16, 16);
     layout_->setSpacing(8);
-    auto* heading = new QLabel("Nothing to show yet");
+    auto* heading = new QLabel(QObject::tr("Nothing to show yet"));
     heading->setProperty("readout", true);
     layout_->addWidget(heading);
-    QPushButton* first = addWay("Connect...", "connect", ways_.connect);
+    QPushButton* first = addWay(QObject::tr("Connect..."), "connect", ways_.connect);
     first->setProperty("face", "blue");
     first->setIcon(themeIcon("connect", Qt::white));
     for (int i = 0; i < kMostRecent; ++i) {
         recent_.push_back(addWay({}, "connect", [this, i] { ways_.connectAgain(i); }));
         recent_.back()->hide();
     }
-    addWay("Try it on a simulated instrument", "simulator", ways_.simulate);
-    addWay("Open a file...", "open", ways_.open);
+    addWay(QObject::tr("Try it on a simulated instrument"), "simulator", ways_.simulate);
+    addWay(QObject::tr("Open a file..."), "open", ways_.open);
     outer->addWidget(card, 0, Qt::AlignCenter);
 }
 
@@ -56,8 +56,8 @@ void EmptyScreen::setRecent(const QStringList& names) {
         const QString name = names[static_cast<qsizetype>(i)];
         recent_[i]->setText(fontMetrics().elidedText(QString(name).replace("&", "&&"),
                                                      Qt::ElideMiddle, kWidth - 90));
-        recent_[i]->setToolTip("Connect to " + name);
-        recent_[i]->setAccessibleName("Connect to " + name);
+        recent_[i]->setToolTip(QObject::tr("Connect to %1").arg(name));
+        recent_[i]->setAccessibleName(QObject::tr("Connect to %1").arg(name));
     }
 }
 

@@ -32,23 +32,26 @@ void showGraphMenu(QPoint place, double x, GraphWidget& graph, GraphNavigator& n
                    const std::function<void()>& copyPicture) {
     QMenu menu;
     const bool trace = !panel.CWGraph1.values().empty();
-    menu.addAction(themeIcon("copy"), "Copy Picture", &menu, copyPicture)->setEnabled(trace);
-    addControl(menu, "picture", "Save Picture...", panel.MenuFileSaveImage, binder);
-    addControl(menu, "save", "Save View...", panel.SaveCurrentView, binder);
+    menu.addAction(themeIcon("copy"), QObject::tr("Copy Picture"), &menu, copyPicture)
+        ->setEnabled(trace);
+    addControl(menu, "picture", QObject::tr("Save Picture..."), panel.MenuFileSaveImage, binder);
+    addControl(menu, "save", QObject::tr("Save View..."), panel.SaveCurrentView, binder);
     menu.addSeparator();
-    QAction* marker =
-        menu.addAction("Add Marker Here", &menu, [&] { addMarker(x, graph, panel, binder); });
+    QAction* marker = menu.addAction(QObject::tr("Add Marker Here"), &menu,
+                                     [&] { addMarker(x, graph, panel, binder); });
     const auto* box = qobject_cast<QAbstractButton*>(binder.widgetOf(panel.MarkerCheckBox));
     marker->setEnabled(trace && (panel.CWGraph1.cursor(1).Visible ||
                                  (panel.isConnected && box != nullptr && box->isEnabled())));
     menu.addSeparator();
-    menu.addAction("Zoom Back\tAlt+Left", &menu, [&navigator] { navigator.back(); })
+    menu.addAction(QObject::tr("Zoom Back\tAlt+Left"), &menu, [&navigator] { navigator.back(); })
         ->setEnabled(navigator.canGoBack());
-    menu.addAction("Zoom Forward\tAlt+Right", &menu, [&navigator] { navigator.forward(); })
+    menu.addAction(QObject::tr("Zoom Forward\tAlt+Right"), &menu,
+                   [&navigator] { navigator.forward(); })
         ->setEnabled(navigator.canGoForward());
-    menu.addAction(themeIcon("home"), "Whole View\tHome", &menu, [&graph] { graph.wholeView(); })
+    menu.addAction(themeIcon("home"), QObject::tr("Whole View\tHome"), &menu,
+                   [&graph] { graph.wholeView(); })
         ->setEnabled(trace);
-    addControl(menu, "zoom", "Manual Scale...", panel.UtilityGraphSettings, binder);
+    addControl(menu, "zoom", QObject::tr("Manual Scale..."), panel.UtilityGraphSettings, binder);
     giveLetters(menu);
     menu.exec(place);
 }

@@ -8,6 +8,7 @@
 #include <QMessageBox>
 
 #include "desktop/graph/GraphImage.h"
+#include "desktop/platform/Language.h"
 #include "desktop/platform/SimulatorChild.h"
 #include "desktop/windows/FileDrop.h"
 #include "desktop/windows/MainMenus.h"
@@ -107,31 +108,58 @@ void MainWindow::buildWindows() {
         act == "click" ? record.clicked(what) : record.input(act + " " + what);
     };
     Forms& forms = program_.forms();
-    windows_.push_back(std::make_unique<ConnectionWindow>(forms.main, binder_, this));
-    windows_.push_back(std::make_unique<WaterfallWindow>(forms, binder_, this));
-    windows_.push_back(std::make_unique<ScriptFormWindow>(forms.specialMeas, binder_, this));
-    windows_.push_back(std::make_unique<StatisticsWindow>(forms.std, binder_, this));
-    windows_.push_back(std::make_unique<ScriptEditorWindow>(forms.scriptEditor, binder_, this));
+    offer<ConnectionWindow>(forms.main);
+    offer<WaterfallWindow>(forms.waterfall, forms);
+    offer<ScriptFormWindow>(forms.specialMeas);
+    offer<StatisticsWindow>(forms.std);
+    offer<ScriptEditorWindow>(forms.scriptEditor);
     for (Form* form : {static_cast<Form*>(&forms.manualScale),
                        static_cast<Form*>(&forms.powerAndRefl), static_cast<Form*>(&forms.time)})
-        windows_.push_back(std::make_unique<PlainFormWindow>(*form, binder_, this));
-    windows_.push_back(std::make_unique<TcpWindow>(forms.tcpConnection, binder_, this));
-    windows_.push_back(std::make_unique<AboutWindow>(forms.about, binder_, this));
-    windows_.push_back(std::make_unique<ErrorWindow>(forms.error, binder_, this));
-    windows_.push_back(std::make_unique<DoctorWindow>(forms.doctor, binder_, this));
-    windows_.push_back(std::make_unique<DevicesWindow>(forms.devicesChoice, binder_, this));
-    windows_.push_back(std::make_unique<ServerWindow>(forms.server, binder_, this));
+        offer<PlainFormWindow>(*form);
+    offer<TcpWindow>(forms.tcpConnection);
+    offer<AboutWindow>(forms.about);
+    offer<ErrorWindow>(forms.error);
+    offer<DoctorWindow>(forms.doctor);
+    offer<DevicesWindow>(forms.devicesChoice);
+    offer<ServerWindow>(forms.server);
+}
+
+template <class Window, class Shown>
+void MainWindow::offer(Form& form, Shown& shown) {
+    const auto make = [this, &shown] {
+        windows_.push_back(std::make_unique<Window>(shown, binder_, this));
+    };
+    offers_.push_back(std::make_unique<Offer>(Offer{form, make}));
+    // Most sessions see few of them, and none before the panel.
+    form.Changed.connect([self = QPointer<MainWindow>(this), offer = offers_.back().get()] {
+        if (self && offer->form.Visible) self->build(*offer);
+    });
+    if (form.Visible) this->build(*offers_.back());
+}
+
+template <class Window, class Shown>
+void MainWindow::offer(Shown& form) {
+    offer<Window>(form, form);
+}
+
+void MainWindow::build(Offer& offer) {
+    if (std::exchange(offer.built, true)) return;
+    offer.build();
+}
+
+void MainWindow::buildAll() {
+    for (const auto& offer : offers_) build(*offer);
 }
 
 void MainWindow::buildViewKeys() {
     QMenu* view = menuOf(panel_.ViewMenu, binder_);
     view->addSeparator();
-    QAction* keys = view->addAction("Panel");
+    QAction* keys = view->addAction(QObject::tr("Panel"));
     keys->setCheckable(true);
     keys->setChecked(true);
     keys->setShortcut(QKeySequence("F12"));
     connect(keys, &QAction::toggled, this, [this](bool shown) { side_->setVisible(shown); });
-    QAction* whole = view->addAction("Full Screen");
+    QAction* whole = view->addAction(QObject::tr("Full Screen"));
     whole->setCheckable(true);
     whole->setShortcut(QKeySequence("F11"));
     whole->setObjectName("FullScreen");
@@ -141,7 +169,7 @@ void MainWindow::buildViewKeys() {
     });
     QMenu* file = menuOf(panel_.FileMenu, binder_);
     auto* image = qobject_cast<QAction*>(binder_.widgetOf(panel_.RecordData));
-    auto* copy = new QAction("Copy Picture", this);
+    auto* copy = new QAction(QObject::tr("Copy Picture"), this);
     copy->setObjectName("CopyPicture");
     copy->setShortcut(QKeySequence::Copy);
     connect(copy, &QAction::triggered, this, [this] { copyPicture(); });
@@ -218,13 +246,13 @@ void MainWindow::useSettings(SettingsStore& settings) {
 }
 
 void MainWindow::simulatorReady(const QString& device) {
-    status_->say("The simulated instrument runs at " + device);
+    status_->say(QObject::tr("The simulated instrument runs at %1").arg(device));
     const bool atOnce = connectToSimulator_;
     connectToSimulator_ = false;
     if (panel_.isConnected) return;
     if (!atOnce) {
         const auto answer = QMessageBox::question(
-            this, windowTitle(), "The simulated instrument runs. Connect to it now?");
+            this, windowTitle(), QObject::tr("The simulated instrument runs. Connect to it now?"));
         if (answer != QMessageBox::Yes) return;
     }
     connectTo({LinkAddress::Kind::Serial, device.toStdString(), kInstrumentBaud, {}, {}});
@@ -240,18 +268,37 @@ void MainWindow::addThemeMenu(ThemeChoice now, const std::function<void(ThemeCho
     menu->addSeparator();
     auto* group = new QActionGroup(menu);
     constexpr std::pair<ThemeChoice, const char*> kThemes[] = {
-        {ThemeChoice::System, "Theme of the System"},
-        {ThemeChoice::Light, "Light Theme"},
-        {ThemeChoice::Dark, "Dark Theme"},
+        {ThemeChoice::System, QT_TRANSLATE_NOOP("QObject", "Theme of the System")},
+        {ThemeChoice::Light, QT_TRANSLATE_NOOP("QObject", "Light Theme")},
+        {ThemeChoice::Dark, QT_TRANSLATE_NOOP("QObject", "Dark Theme")},
     };
     for (const auto& [theme, caption] : kThemes) {
-        QAction* action = menu->addAction(caption);
+        QAction* action = menu->addAction(QObject::tr(caption));
         action->setCheckable(true);
         action->setChecked(theme == now);
         group->addAction(action);
         connect(action, &QAction::triggered, this, [this, choose, chosen = theme] {
             choose(chosen);
             binder_.refreshAll();
+        });
+    }
+}
+
+void MainWindow::addLanguageMenu(const QString& now,
+                                 const std::function<void(const QString&)>& choose) {
+    QMenu* menu = menuOf(panel_.ViewMenu, binder_)->addMenu(QObject::tr("Language"));
+    auto* group = new QActionGroup(menu);
+    for (const UiLanguage& language : languages()) {
+        const QString code = language.code;
+        // A language bears its own name, whatever the texts around it.
+        QAction* action = menu->addAction(code.isEmpty() ? QObject::tr("Language of the System")
+                                                         : QString::fromUtf8(language.name));
+        action->setCheckable(true);
+        action->setChecked(code == now);
+        group->addAction(action);
+        connect(action, &QAction::triggered, this, [this, choose, code] {
+            choose(code);
+            status_->say(QObject::tr("The language changes with the next start"));
         });
     }
 }
@@ -264,10 +311,11 @@ void MainWindow::drawImage(const std::string& path, std::string& problem) {
 }
 
 void MainWindow::copyPicture() {
-    if (panel_.CWGraph1.values().empty()) return status_->say("There is no trace to copy yet");
+    if (panel_.CWGraph1.values().empty())
+        return status_->say(QObject::tr("There is no trace to copy yet"));
     graph().drawNow();
     QApplication::clipboard()->setPixmap(graph().grab());
-    status_->say("A picture of the graph is in the clipboard");
+    status_->say(QObject::tr("A picture of the graph is in the clipboard"));
 }
 
 void MainWindow::keyPressEvent(QKeyEvent* event) {

@@ -31,11 +31,15 @@ class MainWindow : public QMainWindow {
     StatusLine& status() { return *status_; }
     /// A menu of the themes; `choose` hears each choice, after which all is drawn again.
     void addThemeMenu(ThemeChoice now, const std::function<void(ThemeChoice)>& choose);
+    /// A menu of the languages; a choice counts from the next start on.
+    void addLanguageMenu(const QString& now, const std::function<void(const QString&)>& choose);
     /// Takes place, size, folded groups and the last connections from the settings, and keeps them.
     void useSettings(SettingsStore& settings);
     /// The simulated instrument is there, or is not: offers to connect, or says why not.
     void simulatorReady(const QString& device);
     void simulatorEnded(const QString& why);
+    /// Builds the windows of all forms, which else come with their first use.
+    void buildAll();
     /// Shows everything as the forms have it, at once.
     void showNow();
     void copyPicture();
@@ -49,6 +53,17 @@ class MainWindow : public QMainWindow {
   private:
     void buildCentre();
     void buildWindows();
+    /// A window that is built when its form is shown for the first time.
+    struct Offer {
+        Form& form;
+        std::function<void()> build;
+        bool built = false;
+    };
+    template <class Window, class Shown>
+    void offer(Form& form, Shown& shown);
+    template <class Window, class Shown>
+    void offer(Shown& form);
+    void build(Offer& offer);
     void buildViewKeys();
     void followState();
     void showState();
@@ -65,6 +80,7 @@ class MainWindow : public QMainWindow {
     TerminatorRow* terminators_ = nullptr;
     StatusLine* status_ = nullptr;
     ToolStrip* tools_ = nullptr;
+    std::vector<std::unique_ptr<Offer>> offers_;
     std::vector<std::unique_ptr<FormWindow>> windows_;
     std::unique_ptr<WindowMemory> memory_;
     std::unique_ptr<RecentConnections> recent_;

@@ -46,7 +46,7 @@ PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder&
       column_(new QWidget),
       layout_(new QVBoxLayout(column_)) {
     setObjectName("panel");
-    setAccessibleName("Panel");
+    setAccessibleName(QObject::tr("Panel"));
     setFixedWidth(kWidth);
     setWidgetResizable(true);
     setFrameShape(QFrame::NoFrame);
@@ -58,9 +58,9 @@ PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder&
     layout_->addWidget(runKeys());
     layout_->addWidget(softPositions(), 5);
     layout_->addWidget(hardKeys(), 3);
-    FoldGroup* modes = addGroup("Modes", "Mode", modeKeys());
-    FoldGroup* markers = addGroup("Markers", "Marker", markerKeys());
-    FoldGroup* command = addGroup("Command", "Command line", commandLine());
+    FoldGroup* modes = addGroup("Modes", QObject::tr("Mode"), modeKeys());
+    FoldGroup* markers = addGroup("Markers", QObject::tr("Marker"), markerKeys());
+    FoldGroup* command = addGroup("Command", QObject::tr("Command line"), commandLine());
     for (Button* control : {&panel_.ResetButton, &panel_.LocalButton, &panel_.OnOffButton})
         command->headingRow().addWidget(key(*control));
     groups_ = {markers, modes, command};
@@ -85,7 +85,8 @@ void PanelSide::resizeEvent(QResizeEvent* event) {
 }
 
 void PanelSide::showViewRuns(bool runs) {
-    reason_->setText(runs ? "Stop the view to use the grey keys" : "Soft key");
+    reason_->setText(runs ? QObject::tr("Stop the view to use the grey keys")
+                          : QObject::tr("Soft key"));
 }
 
 void PanelSide::foldByRoom() {
@@ -187,7 +188,7 @@ QWidget* PanelSide::softPositions() {
     auto* layout = layoutOf<QVBoxLayout>(group);
     auto* options = new QHBoxLayout;
     // Beside the key that stops: why keys are grey.
-    reason_ = smallCaption("Soft key");
+    reason_ = smallCaption(QObject::tr("Soft key"));
     options->addWidget(reason_);
     options->addStretch(1);
     for (OptionButton* control : {&panel_.GetOption, &panel_.SetOption}) {
@@ -272,7 +273,7 @@ QWidget* PanelSide::commandLine() {
     layout->addWidget(line, 0, 0);
     layout->addWidget(key(panel_.SendButton), 0, 1);
     auto* answer = new PanelLineEdit;
-    answer->setPlaceholderText("Answer");
+    answer->setPlaceholderText(QObject::tr("Answer"));
     binder_.bind(panel_.ManualCommandTextAnsw, answer);
     layout->addWidget(answer, 1, 0, 1, 2);
     layout->setColumnStretch(0, 1);

@@ -51,7 +51,7 @@ void PointerText::show() {
         const QString level = levelAt(*at_);
         readouts_.showPointer(
             QString::fromStdString(axisText(*at_, picture.resolution(), picture.view().xUnit)),
-            level.isEmpty() ? QString("no sample") : level);
+            level.isEmpty() ? QString(QObject::tr("no sample")) : level);
     } else {
         readouts_.showPointer({}, {});
     }

@@ -24,7 +24,7 @@ double shareOf(double level) {
 
 PowerDisplay::PowerDisplay(ControllerForm& panel, QWidget* parent)
     : QWidget(parent), panel_(panel) {
-    setAccessibleName("Power");
+    setAccessibleName(QObject::tr("Power"));
     hide();
 }
 
@@ -79,11 +79,13 @@ void PowerDisplay::drawHistory(QPainter& painter, const QRectF& place) const {
     painter.drawPolyline(line);
     painter.setPen(colors.text);
     const QRectF texts = place.adjusted(6, 3, -6, -3);
-    painter.drawText(texts, Qt::AlignLeft | Qt::AlignTop,
-                     "Highest " + QString::fromStdString(levelText(*high, "dBm")));
+    painter.drawText(
+        texts, Qt::AlignLeft | Qt::AlignTop,
+        QObject::tr("Highest %1").arg(QString::fromStdString(levelText(*high, "dBm"))));
     painter.drawText(texts, Qt::AlignLeft | Qt::AlignBottom,
-                     "Lowest " + QString::fromStdString(levelText(*low, "dBm")) +
-                         QString(" of the last %1 readings").arg(history_.size()));
+                     QObject::tr("Lowest %1 of the last %2 readings")
+                         .arg(QString::fromStdString(levelText(*low, "dBm")))
+                         .arg(history_.size()));
 }
 
 void PowerDisplay::paintEvent(QPaintEvent*) {

@@ -52,9 +52,9 @@ QString inTwoLines(const std::string& parts) {
 Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     : QWidget(parent),
       pointer_(value()),
-      pointerLevel_(small("Level of the trace under the pointer")),
-      atMarker_(small("Trace at the marker")),
-      atDelta_(small("Trace at the delta marker")) {
+      pointerLevel_(small(QObject::tr("Level of the trace under the pointer"))),
+      atMarker_(small(QObject::tr("Trace at the marker"))),
+      atDelta_(small(QObject::tr("Trace at the delta marker"))) {
     auto* row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(6);
@@ -74,7 +74,7 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     markers->setColumnStretch(0, 1);
     QGridLayout* pointer = card(*row, 0);
     pointer_->setMinimumWidth(kPointerWidth);
-    pointer_->setAccessibleName("Position of the pointer");
+    pointer_->setAccessibleName(QObject::tr("Position of the pointer"));
     pointer->addWidget(pointer_, 0, 0);
     pointer->addWidget(pointerLevel_, 1, 0);
     showPointer({}, {});
@@ -91,13 +91,15 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
 void Readouts::showPointer(const QString& position, const QString& level) {
     const bool there = !position.isEmpty();
     pointer_->setText(there ? position : QString::fromUtf8("\u2013"));
-    pointerLevel_->setText(there ? level : QString("Pointer"));
+    pointerLevel_->setText(there ? level : QObject::tr("Pointer"));
 }
 
 void Readouts::showTrace(const QString& atMarker, const QString& atDelta) {
     const bool room = width() >= kRoomForTrace;
-    atMarker_->setText(atMarker.isEmpty() || !room ? QString() : "trace " + atMarker);
-    atDelta_->setText(atDelta.isEmpty() || !room ? QString() : "trace " + atDelta);
+    atMarker_->setText(atMarker.isEmpty() || !room ? QString()
+                                                   : QObject::tr("trace %1").arg(atMarker));
+    atDelta_->setText(atDelta.isEmpty() || !room ? QString()
+                                                 : QObject::tr("trace %1").arg(atDelta));
 }
 
 }  // namespace zel

@@ -82,11 +82,11 @@ struct Light {
     const char* meaning;
     const char* color;
 };
-constexpr Light kIdle{"Not serving", "#7d8894"};
-constexpr Light kSearching{"Looking for the instrument", "#d8a32a"};
-constexpr Light kWaiting{"Waiting for a client", "#2e9e5b"};
-constexpr Light kServing{"A client is at work", "#2f80d8"};
-constexpr Light kBroken{"The TCP port is in error", "#c0392b"};
+constexpr Light kIdle{QT_TRANSLATE_NOOP("QObject", "Not serving"), "#7d8894"};
+constexpr Light kSearching{QT_TRANSLATE_NOOP("QObject", "Looking for the instrument"), "#d8a32a"};
+constexpr Light kWaiting{QT_TRANSLATE_NOOP("QObject", "Waiting for a client"), "#2e9e5b"};
+constexpr Light kServing{QT_TRANSLATE_NOOP("QObject", "A client is at work"), "#2f80d8"};
+constexpr Light kBroken{QT_TRANSLATE_NOOP("QObject", "The TCP port is in error"), "#c0392b"};
 
 Light lightFor(const ServerForm& form) {
     if (form.ServerConnecting) return kSearching;
@@ -284,10 +284,10 @@ QWidget* ServerWindow::happenings() {
 void ServerWindow::showLight() {
     const Light light = lightFor(server_);
     light_->setPixmap(lightOf(QColor(light.color)));
-    light_->setToolTip(light.meaning);
+    light_->setToolTip(QObject::tr(light.meaning));
     if (tray_ == nullptr) return;
     tray_->setIcon(QIcon(lightOf(QColor(light.color))));
-    tray_->setToolTip("ZELRemote Server: " + QString(light.meaning));
+    tray_->setToolTip("ZELRemote Server: " + QObject::tr(light.meaning));
     tray_->setVisible(server_.Visible);
 }
 

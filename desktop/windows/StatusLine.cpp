@@ -41,7 +41,7 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     busy_->setRange(0, 0);
     busy_->setFixedSize(90, 8);
     busy_->setTextVisible(false);
-    busy_->setAccessibleName("Work is under way");
+    busy_->setAccessibleName(QObject::tr("Work is under way"));
     auto* progress = new QLabel;
     auto* wait = new QLabel;
     for (QWidget* widget : {static_cast<QWidget*>(wait), static_cast<QWidget*>(progress),
@@ -51,10 +51,10 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     binder.bind(panel_.WaitLabel, wait);
 
     activity_->setTextFormat(Qt::RichText);
-    activity_->setToolTip("Traffic on the link");
-    activity_->setAccessibleName("Traffic on the link");
+    activity_->setToolTip(QObject::tr("Traffic on the link"));
+    activity_->setAccessibleName(QObject::tr("Traffic on the link"));
     state_->setTextFormat(Qt::PlainText);
-    state_->setAccessibleName("State of the connection");
+    state_->setAccessibleName(QObject::tr("State of the connection"));
     auto* clock = new QLabel;
     clock->setObjectName("caption");
     for (QLabel* label : {activity_, state_, clock}) bar->addPermanentWidget(label);
@@ -81,7 +81,7 @@ void StatusLine::showActivity(bool active) {
 QString StatusLine::stateText() const {
     if (!panel_.isConnected) {
         const bool connecting = forms_.main.IsConnecting && forms_.main.MousePointer == kHourglass;
-        return connecting ? "Connecting..." : "Not connected";
+        return connecting ? QObject::tr("Connecting...") : QObject::tr("Not connected");
     }
     const bool tcp = panel_.ConnectionState == ControllerForm::TCPCON;
     const QString id =
@@ -92,8 +92,8 @@ QString StatusLine::stateText() const {
             : QString::fromStdString(forms_.main.COMList.Text() + ", " +
                                      forms_.main.BaudList.Text() + " baud");
     state_->setToolTip(id + "\n" + where);
-    return (panel_.LinkLost ? "Connection lost: " : "") + shortIdentity(id) +
-           QString::fromUtf8(" · ") + where.section('/', -1);
+    return (panel_.LinkLost ? QObject::tr("Connection lost:") + " " : QString()) +
+           shortIdentity(id) + QString::fromUtf8(" · ") + where.section('/', -1);
 }
 
 void StatusLine::showState() {

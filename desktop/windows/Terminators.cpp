@@ -143,8 +143,10 @@ void TerminatorRow::refresh() {
         const Terminator& row = terminators[i];
         key.setText(row.caption);
         const QString keys = row.letter != 0 ? QString("Alt+") + row.letter : QString("Enter");
-        key.setToolTip("Ends the number in " + QString::fromUtf8(row.caption) + " (" + keys + ")");
-        if (std::string_view(row.caption) == "Enter") key.setToolTip("Sends the entry (Enter)");
+        key.setToolTip(
+            QObject::tr("Ends the number in %1 (%2)").arg(QString::fromUtf8(row.caption), keys));
+        if (std::string_view(row.caption) == "Enter")
+            key.setToolTip(QObject::tr("Sends the entry (Enter)"));
         key.setAccessibleName(row.caption);
     }
 }

@@ -19,41 +19,41 @@ ToolStrip::ToolStrip(Forms& forms, Binder& binder, Own own, QWidget* parent)
     : QToolBar(parent), forms_(forms), binder_(binder) {
     ControllerForm& panel = forms_.controller;
     setObjectName("Toolbar");
-    setWindowTitle("Toolbar");
-    setAccessibleName("Toolbar");
+    setWindowTitle(QObject::tr("Toolbar"));
+    setAccessibleName(QObject::tr("Toolbar"));
     setMovable(false);
     setFloatable(false);
     setContextMenuPolicy(Qt::PreventContextMenu);
     setIconSize({kIconSize, kIconSize});
     setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
 
-    connect_ = add("connect", "Connect");
+    connect_ = add("connect", QObject::tr("Connect"));
     binder_.twin(panel.Direct, connect_);
-    disconnect_ = add("disconnect", "Disconnect");
+    disconnect_ = add("disconnect", QObject::tr("Disconnect"));
     binder_.twin(panel.Disconnect, disconnect_);
     if (QToolButton* button = buttonOf(connect_); button != nullptr) {
         button->setMenu(menuOf(panel.Connection, binder_));
         button->setPopupMode(QToolButton::MenuButtonPopup);
     }
     addSeparator();
-    QAction* single = add("single", "Single");
+    QAction* single = add("single", QObject::tr("Single"));
     binder_.twin(panel.PlaySingleButton, single);
-    QAction* run = add("continuous", "Continuous");
+    QAction* run = add("continuous", QObject::tr("Continuous"));
     // What comes and goes on the panel is grey here: nothing moves.
     binder_.twin(panel.PlayContinuousButton, run, [&panel, run] {
         run->setEnabled(run->isEnabled() && panel.PlayContinuousButton.Visible);
     });
-    QAction* stop = add("stop", "Stop");
+    QAction* stop = add("stop", QObject::tr("Stop"));
     buttonOf(stop)->setObjectName("StopTool");
     binder_.twin(panel.StopButton, stop,
                  [&panel, stop] { stop->setEnabled(panel.StopButton.Visible); });
     addSeparator();
     addButton(panel.cmdZoom, "zoom");
-    QAction* whole = add("home", "Whole View");
-    whole->setToolTip("The whole range of both axes (Home)");
+    QAction* whole = add("home", QObject::tr("Whole View"));
+    whole->setToolTip(QObject::tr("The whole range of both axes (Home)"));
     QObject::connect(whole, &QAction::triggered, this, [act = own.wholeView] { act(); });
     addSeparator();
-    QAction* spectrogram = add("spectrogram", "Spectrogram");
+    QAction* spectrogram = add("spectrogram", QObject::tr("Spectrogram"));
     spectrogram->setCheckable(true);
     binder_.twin(panel.SpectrogramShow, spectrogram, [&panel, spectrogram] {
         spectrogram->setChecked(panel.SpectrogramPicture.Visible);
@@ -61,20 +61,20 @@ ToolStrip::ToolStrip(Forms& forms, Binder& binder, Own own, QWidget* parent)
     addButton(panel.cmd3D, "waterfall");
     addButton(panel.cmdSpecial, "script");
     addSeparator();
-    QAction* open = add("open", "Open");
+    QAction* open = add("open", QObject::tr("Open"));
     binder_.twin(panel.LoadData, open);
-    QAction* save = add("save", "Save");
+    QAction* save = add("save", QObject::tr("Save"));
     binder_.twin(panel.SaveCurrentView, save);
-    QAction* record = add("record", "Record");
+    QAction* record = add("record", QObject::tr("Record"));
     binder_.twin(panel.RecordData, record, [this, &panel, record] {
         const bool runs = forms_.time.ContinuousRecording || panel.RecordDataFlag;
         record->setIcon(runs ? themeIcon("recording", kLamp) : themeIcon("record"));
         record->setEnabled(record->isEnabled() && panel.RecordData.Visible);
     });
-    QAction* picture = add("picture", "Picture");
+    QAction* picture = add("picture", QObject::tr("Picture"));
     binder_.twin(panel.MenuFileSaveImage, picture);
-    QAction* copy = add("copy", "Copy");
-    copy->setToolTip("Copy a picture of the graph (Ctrl+C)");
+    QAction* copy = add("copy", QObject::tr("Copy"));
+    copy->setToolTip(QObject::tr("Copy a picture of the graph (Ctrl+C)"));
     QObject::connect(copy, &QAction::triggered, this, [act = own.copyPicture] { act(); });
     wordless_ = {single, run, stop, whole, spectrogram, open, save, record, picture, copy};
     showConnected(false);

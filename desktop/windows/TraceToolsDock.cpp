@@ -23,7 +23,7 @@ constexpr double kHeadroom = 0.05;  // of the levels' extent, above and below
 }  // namespace
 
 TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow& window)
-    : QDockWidget("Trace Tools", &window),
+    : QDockWidget(QObject::tr("Trace Tools"), &window),
       program_(program),
       panel_(program.forms().controller),
       graph_(graph),
@@ -34,13 +34,14 @@ TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow
     traces_ = new TracesPage(tools_, [this] { scaleLevelAxis(); });
     limits_ = new LimitsPage(tools_);
     const std::pair<const char*, TracePage*> pages[] = {
-        {"Traces", traces_},
-        {"Peaks", new PeaksPage(tools_, [this](std::size_t peak) { markers_->follow(peak); })},
-        {"Markers", markers_},
-        {"Power", new PowerPage(tools_)},
-        {"Limits", limits_},
-        {"Statistics", new StatisticsPage(tools_)}};
-    for (const auto& [name, page] : pages) pages_->addTab(page, name);
+        {QT_TRANSLATE_NOOP("QObject", "Traces"), traces_},
+        {QT_TRANSLATE_NOOP("QObject", "Peaks"),
+         new PeaksPage(tools_, [this](std::size_t peak) { markers_->follow(peak); })},
+        {QT_TRANSLATE_NOOP("QObject", "Markers"), markers_},
+        {QT_TRANSLATE_NOOP("QObject", "Power"), new PowerPage(tools_)},
+        {QT_TRANSLATE_NOOP("QObject", "Limits"), limits_},
+        {QT_TRANSLATE_NOOP("QObject", "Statistics"), new StatisticsPage(tools_)}};
+    for (const auto& [name, page] : pages) pages_->addTab(page, QObject::tr(name));
     connect(pages_, &QTabWidget::currentChanged, this, [this] { showLater(); });
     setWidget(pages_);
     resize(kUsualSize);
@@ -220,7 +221,7 @@ void TraceToolsDock::scaleLevelAxis() {
 
 void TraceToolsDock::fill(QMenu& menu) {
     QAction* shown = toggleViewAction();
-    shown->setText("Trace Tools");
+    shown->setText(QObject::tr("Trace Tools"));
     menu.addAction(shown);
     menu.addSeparator();
     for (std::size_t i = 0; i < kHolds; ++i) {
@@ -234,13 +235,13 @@ void TraceToolsDock::fill(QMenu& menu) {
         connect(&menu, &QMenu::aboutToShow, action,
                 [this, action, kind] { action->setChecked(tools_.traces().isOn(kind)); });
     }
-    menu.addAction("Clear Held Traces", this, [this] {
+    menu.addAction(QObject::tr("Clear Held Traces"), this, [this] {
         for (std::size_t i = 0; i < kHolds; ++i) tools_.traces().clear(static_cast<HoldKind>(i));
         tools_.traces().acknowledge();
         tools_.refresh();
     });
     menu.addSeparator();
-    menu.addAction("Scale Level Axis", this, [this] { scaleLevelAxis(); });
+    menu.addAction(QObject::tr("Scale Level Axis"), this, [this] { scaleLevelAxis(); });
 }
 
 TraceToolsDock* addTraceTools(QMainWindow& window, Program& program, GraphWidget& graph,
@@ -249,7 +250,7 @@ TraceToolsDock* addTraceTools(QMainWindow& window, Program& program, GraphWidget
     window.addDockWidget(Qt::BottomDockWidgetArea, dock);
     dock->setFloating(true);
     dock->hide();
-    auto* menu = new QMenu("&Trace", &window);
+    auto* menu = new QMenu(QObject::tr("&Trace"), &window);
     window.menuBar()->insertMenu(before.menuAction(), menu);
     dock->fill(*menu);
     return dock;

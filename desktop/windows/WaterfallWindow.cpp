@@ -41,8 +41,8 @@ class ColourBar : public QWidget {
     explicit ColourBar(const WaterfallForm& form) : form_(form) {
         setFixedWidth(kBarWidth);
         setMaximumHeight(420);
-        setToolTip("Colour by level");
-        setAccessibleName("Colour by level");
+        setToolTip(QObject::tr("Colour by level"));
+        setAccessibleName(QObject::tr("Colour by level"));
     }
 
   protected:

@@ -30,6 +30,10 @@ _zelremote() {
             mapfile -t COMPREPLY < <(compgen -W 'light dark system' -- "$current")
             return
             ;;
+        --language)
+            mapfile -t COMPREPLY < <(compgen -W 'en de' -- "$current")
+            return
+            ;;
         --connect | --words | --size | --baud | --listen | --allow | --count | --interval)
             return
             ;;

@@ -91,6 +91,14 @@ QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --connect "serial:$scratch/port@
     --home "$scratch/home2" --screenshot "$scratch/window.png"
 [ -s "$scratch/window.png" ] || fail "the window cannot be drawn"
 
+[ -n "$(find "$root/" -path '*/zelremote/translations/zelremote_de.qm' -size +8k)" ] ||
+    fail "the German texts are missing"
+QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --language en --home "$scratch/home2" \
+    --screenshot "$scratch/english.png"
+QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --language de --home "$scratch/home2" \
+    --screenshot "$scratch/german.png"
+! cmp -s "$scratch/english.png" "$scratch/german.png" || fail "the window speaks no German"
+
 if [ -e "$build/help/zelremote.qch" ]; then
     [ -n "$(find "$root/" -path '*/zelremote/help/zelremote.qch' -size +20k)" ] ||
         fail "the help book is missing"

@@ -28,6 +28,7 @@ Desk::Desk() {
     program = std::make_unique<Program>(platform.bundle(port), "");
     program->start();
     window = std::make_unique<MainWindow>(*program);
+    window->buildAll();
 }
 
 Desk::~Desk() { window.reset(); }

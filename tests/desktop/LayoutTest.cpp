@@ -1,5 +1,6 @@
 // The room of the graph, the folding panel, the tool bar, the empty screen and what is remembered.
 
+#include <QDialog>
 #include <QLabel>
 #include <QMenu>
 #include <QMenuBar>
@@ -17,6 +18,14 @@ QToolButton* toolOf(QWidget& window, const QString& name) {
     for (QToolButton* button : window.findChildren<QToolButton*>())
         if (button->accessibleName() == name) return button;
     return nullptr;
+}
+
+TEST_F(Desk, WindowOfAForm_IsBuiltWhenItIsShown) {
+    MainWindow fresh(*program);
+    EXPECT_EQ(fresh.findChild<QDialog*>("AboutForm"), nullptr);
+    program->forms().about.Show();
+    EXPECT_NE(fresh.findChild<QDialog*>("AboutForm"), nullptr);
+    program->forms().about.Hide();
 }
 
 struct Room {

@@ -36,6 +36,12 @@ TEST_F(StartOptionsTest, AllOptions_AreTaken) {
     EXPECT_EQ(options.screenshot, "a.png");
 }
 
+TEST_F(StartOptionsTest, Language_IsOneThatThereIs) {
+    EXPECT_FALSE(parse({"--language", "de"}));
+    EXPECT_EQ(options.language, "de");
+    EXPECT_EQ(parse({"--language", "xx"}), 2);
+}
+
 TEST_F(StartOptionsTest, NoOptions_LeaveEverythingOpen) {
     EXPECT_FALSE(parse({}));
     EXPECT_FALSE(options.address);

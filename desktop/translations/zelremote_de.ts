@@ -1,0 +1,805 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="de_DE" sourcelanguage="en">
+<context>
+    <name>QObject</name>
+    <message>
+        <source>Read one sweep</source>
+        <translation>Einen Sweep lesen</translation>
+    </message>
+    <message>
+        <source>Read sweep after sweep</source>
+        <translation>Sweep um Sweep lesen</translation>
+    </message>
+    <message>
+        <source>Stop the continuous view or the recording</source>
+        <translation>Dauerbetrieb oder Aufzeichnung anhalten</translation>
+    </message>
+    <message>
+        <source>Draw a rectangle to look closer; press again for the whole span</source>
+        <translation>Rechteck aufziehen, um näher heranzugehen; noch einmal drücken für den ganzen Span</translation>
+    </message>
+    <message>
+        <source>Waterfall: a hundred sweeps in depth</source>
+        <translation>Wasserfall: hundert Sweeps hintereinander</translation>
+    </message>
+    <message>
+        <source>Colours of the levels</source>
+        <translation>Farben der Pegel</translation>
+    </message>
+    <message>
+        <source>How many of the newest sweeps the picture shows</source>
+        <translation>Wie viele der neuesten Sweeps das Bild zeigt</translation>
+    </message>
+    <message>
+        <source>Where the lowest and the highest level come from</source>
+        <translation>Woher der niedrigste und der höchste Pegel kommen</translation>
+    </message>
+    <message>
+        <source>Lowest level</source>
+        <translation>Niedrigster Pegel</translation>
+    </message>
+    <message>
+        <source>Highest level</source>
+        <translation>Höchster Pegel</translation>
+    </message>
+    <message>
+        <source>Frequency, time and level under the pointer</source>
+        <translation>Frequenz, Zeit und Pegel unter dem Mauszeiger</translation>
+    </message>
+    <message>
+        <source>Scripts of measurements</source>
+        <translation>Messskripte</translation>
+    </message>
+    <message>
+        <source>Centre frequency</source>
+        <translation>Mittenfrequenz</translation>
+    </message>
+    <message>
+        <source>Span</source>
+        <translation>Span</translation>
+    </message>
+    <message>
+        <source>Marker: position and level</source>
+        <translation>Marker: Ort und Pegel</translation>
+    </message>
+    <message>
+        <source>Delta marker or pointer: position and level</source>
+        <translation>Deltamarker oder Mauszeiger: Ort und Pegel</translation>
+    </message>
+    <message>
+        <source>Age of the trace, sweeps a second, and what sets the pace</source>
+        <translation>Alter der Kurve, Sweeps je Sekunde und was das Tempo bestimmt</translation>
+    </message>
+    <message>
+        <source>Last step of the exchange with the instrument</source>
+        <translation>Letzter Schritt des Austauschs mit dem Messgerät</translation>
+    </message>
+    <message>
+        <source>A soft key asks the instrument</source>
+        <translation>Ein Softkey fragt das Messgerät ab</translation>
+    </message>
+    <message>
+        <source>A soft key changes the instrument</source>
+        <translation>Ein Softkey stellt das Messgerät ein</translation>
+    </message>
+    <message>
+        <source>Frequency menu</source>
+        <translation>Menü Frequenz</translation>
+    </message>
+    <message>
+        <source>Span menu</source>
+        <translation>Menü Span</translation>
+    </message>
+    <message>
+        <source>Amplitude menu</source>
+        <translation>Menü Amplitude</translation>
+    </message>
+    <message>
+        <source>Bandwidth menu</source>
+        <translation>Menü Bandbreite</translation>
+    </message>
+    <message>
+        <source>Sweep menu</source>
+        <translation>Menü Sweep</translation>
+    </message>
+    <message>
+        <source>Trace menu</source>
+        <translation>Menü Messkurve</translation>
+    </message>
+    <message>
+        <source>Measurement menu</source>
+        <translation>Menü Messung</translation>
+    </message>
+    <message>
+        <source>Tracking generator menu</source>
+        <translation>Menü Mitlaufgenerator</translation>
+    </message>
+    <message>
+        <source>Marker menu</source>
+        <translation>Menü Marker</translation>
+    </message>
+    <message>
+        <source>Analyzer mode</source>
+        <translation>Betriebsart Analysator</translation>
+    </message>
+    <message>
+        <source>Tracking generator mode</source>
+        <translation>Betriebsart Mitlaufgenerator</translation>
+    </message>
+    <message>
+        <source>Power sensor mode</source>
+        <translation>Betriebsart Leistungsmesskopf</translation>
+    </message>
+    <message>
+        <source>Channel power mode</source>
+        <translation>Betriebsart Kanalleistung</translation>
+    </message>
+    <message>
+        <source>Occupied bandwidth mode</source>
+        <translation>Betriebsart belegte Bandbreite</translation>
+    </message>
+    <message>
+        <source>TDMA power mode</source>
+        <translation>Betriebsart TDMA-Leistung</translation>
+    </message>
+    <message>
+        <source>Distance to fault mode</source>
+        <translation>Betriebsart Fehlerort</translation>
+    </message>
+    <message>
+        <source>Switch the marker on or off</source>
+        <translation>Marker ein- oder ausschalten</translation>
+    </message>
+    <message>
+        <source>Switch the delta marker on or off</source>
+        <translation>Deltamarker ein- oder ausschalten</translation>
+    </message>
+    <message>
+        <source>Marker to the highest peak</source>
+        <translation>Marker auf die höchste Spitze</translation>
+    </message>
+    <message>
+        <source>Marker to the next peak</source>
+        <translation>Marker auf die nächste Spitze</translation>
+    </message>
+    <message>
+        <source>Marker to the minimum</source>
+        <translation>Marker auf das Minimum</translation>
+    </message>
+    <message>
+        <source>The marker&apos;s frequency becomes the centre</source>
+        <translation>Die Frequenz des Markers wird zur Mittenfrequenz</translation>
+    </message>
+    <message>
+        <source>The marker&apos;s level becomes the reference level</source>
+        <translation>Der Pegel des Markers wird zum Referenzpegel</translation>
+    </message>
+    <message>
+        <source>Preset the instrument</source>
+        <translation>Messgerät auf Grundeinstellung setzen</translation>
+    </message>
+    <message>
+        <source>Give the instrument&apos;s own keys back</source>
+        <translation>Die Tasten am Messgerät wieder freigeben</translation>
+    </message>
+    <message>
+        <source>Toggle remote (R) and local (L) control; the key shows the next state</source>
+        <translation>Zwischen Fernbedienung (R) und Bedienung am Gerät (L) wechseln; die Taste zeigt den nächsten Zustand</translation>
+    </message>
+    <message>
+        <source>A line of the instrument&apos;s protocol</source>
+        <translation>Eine Zeile im Protokoll des Messgeräts</translation>
+    </message>
+    <message>
+        <source>Send the line</source>
+        <translation>Zeile senden</translation>
+    </message>
+    <message>
+        <source>The instrument&apos;s answer</source>
+        <translation>Antwort des Messgeräts</translation>
+    </message>
+    <message>
+        <source>Length of the session</source>
+        <translation>Dauer der Sitzung</translation>
+    </message>
+    <message>
+        <source>Serial port: choose one or type a device name</source>
+        <translation>Serielle Schnittstelle: auswählen oder Gerätenamen eintippen</translation>
+    </message>
+    <message>
+        <source>Baud rate: the instrument&apos;s own</source>
+        <translation>Baudrate: die des Messgeräts</translation>
+    </message>
+    <message>
+        <source>Open the port and connect</source>
+        <translation>Schnittstelle öffnen und verbinden</translation>
+    </message>
+    <message>
+        <source>Identity of the instrument</source>
+        <translation>Kennung des Messgeräts</translation>
+    </message>
+    <message>
+        <source>Telephone number of the far modem</source>
+        <translation>Rufnummer des fernen Modems</translation>
+    </message>
+    <message>
+        <source>The modem&apos;s answer</source>
+        <translation>Antwort des Modems</translation>
+    </message>
+    <message>
+        <source>Lower end of the vertical axis</source>
+        <translation>Unteres Ende der senkrechten Achse</translation>
+    </message>
+    <message>
+        <source>Upper end of the vertical axis</source>
+        <translation>Oberes Ende der senkrechten Achse</translation>
+    </message>
+    <message>
+        <source>Name or address of the computer at the instrument</source>
+        <translation>Name oder Adresse des Rechners am Messgerät</translation>
+    </message>
+    <message>
+        <source>TCP port of the server</source>
+        <translation>TCP-Port des Servers</translation>
+    </message>
+    <message>
+        <source>State of the connection</source>
+        <translation>Zustand der Verbindung</translation>
+    </message>
+    <message>
+        <source>TCP port on which the server listens</source>
+        <translation>TCP-Port, an dem der Server wartet</translation>
+    </message>
+    <message>
+        <source>State of the server</source>
+        <translation>Zustand des Servers</translation>
+    </message>
+    <message>
+        <source>Progress of the recording or of the file that loads</source>
+        <translation>Fortschritt der Aufzeichnung oder der Datei, die geladen wird</translation>
+    </message>
+    <message>
+        <source>One trace back</source>
+        <translation>Eine Messkurve zurück</translation>
+    </message>
+    <message>
+        <source>Play the recording from here; the same key pauses</source>
+        <translation>Aufzeichnung von hier an abspielen; dieselbe Taste hält an</translation>
+    </message>
+    <message>
+        <source>One trace forward</source>
+        <translation>Eine Messkurve vor</translation>
+    </message>
+    <message>
+        <source>The trace on the graph</source>
+        <translation>Die Messkurve im Diagramm</translation>
+    </message>
+    <message>
+        <source>Position in the recording and time of the trace</source>
+        <translation>Stelle in der Aufzeichnung und Zeit der Messkurve</translation>
+    </message>
+    <message>
+        <source>Begin again at the end</source>
+        <translation>Am Ende von vorn beginnen</translation>
+    </message>
+    <message>
+        <source>As quick as it was recorded, by the times in the file</source>
+        <translation>So schnell wie aufgezeichnet, nach den Zeiten in der Datei</translation>
+    </message>
+    <message>
+        <source>Close the recording; its last trace stays</source>
+        <translation>Aufzeichnung schließen; die letzte Messkurve bleibt stehen</translation>
+    </message>
+    <message>
+        <source>Set the speed for loading traces.</source>
+        <translation>Tempo, in dem geladene Messkurven gezeigt werden.</translation>
+    </message>
+    <message>
+        <source>Seconds from one trace to the next</source>
+        <translation>Sekunden von einer Messkurve zur nächsten</translation>
+    </message>
+    <message>
+        <source>The sweep. With a marker on, drag it or move it with the arrow keys</source>
+        <translation>Der Sweep. Ein eingeschalteter Marker lässt sich ziehen oder mit den Pfeiltasten bewegen</translation>
+    </message>
+    <message>
+        <source>Graph</source>
+        <translation>Diagramm</translation>
+    </message>
+    <message>
+        <source>Spectrogram</source>
+        <translation>Spektrogramm</translation>
+    </message>
+    <message>
+        <source>Command</source>
+        <translation>Befehl</translation>
+    </message>
+    <message>
+        <source>Answer</source>
+        <translation>Antwort</translation>
+    </message>
+    <message>
+        <source>Last step</source>
+        <translation>Letzter Schritt</translation>
+    </message>
+    <message>
+        <source>Port</source>
+        <translation>Schnittstelle</translation>
+    </message>
+    <message>
+        <source>Baud rate</source>
+        <translation>Baudrate</translation>
+    </message>
+    <message>
+        <source>Instrument</source>
+        <translation>Messgerät</translation>
+    </message>
+    <message>
+        <source>Number</source>
+        <translation>Nummer</translation>
+    </message>
+    <message>
+        <source>Modem</source>
+        <translation>Modem</translation>
+    </message>
+    <message>
+        <source>Progress</source>
+        <translation>Fortschritt</translation>
+    </message>
+    <message>
+        <source>Position in the recording</source>
+        <translation>Stelle in der Aufzeichnung</translation>
+    </message>
+    <message>
+        <source>Speed</source>
+        <translation>Tempo</translation>
+    </message>
+    <message>
+        <source>Wait</source>
+        <translation>Wartezeit</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Zurück</translation>
+    </message>
+    <message>
+        <source>Play</source>
+        <translation>Abspielen</translation>
+    </message>
+    <message>
+        <source>Pause</source>
+        <translation>Anhalten</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Vor</translation>
+    </message>
+    <message>
+        <source>Repeat</source>
+        <translation>Wiederholen</translation>
+    </message>
+    <message>
+        <source>Real time</source>
+        <translation>Echtzeit</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
+    </message>
+    <message>
+        <source>View</source>
+        <translation>Ansicht</translation>
+    </message>
+    <message>
+        <source>Pause Spectrogram</source>
+        <translation>Spektrogramm anhalten</translation>
+    </message>
+    <message>
+        <source>Save Spectrogram as Recording...</source>
+        <translation>Spektrogramm als Aufzeichnung speichern...</translation>
+    </message>
+    <message>
+        <source>Connection Doctor...</source>
+        <translation>Verbindung prüfen...</translation>
+    </message>
+    <message>
+        <source>Record Session...</source>
+        <translation>Sitzung aufzeichnen...</translation>
+    </message>
+    <message>
+        <source>Recent Files</source>
+        <translation>Zuletzt geöffnete Dateien</translation>
+    </message>
+    <message>
+        <source>Soft key</source>
+        <translation>Softkey</translation>
+    </message>
+    <message>
+        <source>Value: type a number with its prefix, then Enter</source>
+        <translation>Wert: Zahl mit Vorsatz eintippen, dann Eingabetaste</translation>
+    </message>
+    <message>
+        <source>Choice</source>
+        <translation>Auswahl</translation>
+    </message>
+    <message>
+        <source>Soft key %1</source>
+        <translation>Softkey %1</translation>
+    </message>
+    <message>
+        <source>Value %1</source>
+        <translation>Wert %1</translation>
+    </message>
+    <message>
+        <source>Choice %1</source>
+        <translation>Auswahl %1</translation>
+    </message>
+    <message>
+        <source>Earlier sweeps; the wheel goes back, a click shows a sweep as the trace</source>
+        <translation>Frühere Sweeps; das Rad geht zurück, ein Klick zeigt einen Sweep als Messkurve</translation>
+    </message>
+    <message>
+        <source>%1 sweeps back</source>
+        <translation>%1 Sweeps zurück</translation>
+    </message>
+    <message>
+        <source>No sweeps yet</source>
+        <translation>Noch keine Sweeps</translation>
+    </message>
+    <message>
+        <source>No sweeps yet: start the continuous view
+or load a recording</source>
+        <translation>Noch keine Sweeps: Dauerbetrieb starten
+oder eine Aufzeichnung laden</translation>
+    </message>
+    <message>
+        <source>ZELRemote Help</source>
+        <translation>ZELRemote – Hilfe</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Inhalt</translation>
+    </message>
+    <message>
+        <source>Index</source>
+        <translation>Stichwörter</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Suche</translation>
+    </message>
+    <message>
+        <source>Pages</source>
+        <translation>Seiten</translation>
+    </message>
+    <message>
+        <source>First page</source>
+        <translation>Erste Seite</translation>
+    </message>
+    <message>
+        <source>Key, statement, control</source>
+        <translation>Taste, Anweisung, Bedienelement</translation>
+    </message>
+    <message>
+        <source>Words, then Enter</source>
+        <translation>Wörter, dann Eingabetaste</translation>
+    </message>
+    <message>
+        <source>No page holds all of these words.</source>
+        <translation>Keine Seite enthält alle diese Wörter.</translation>
+    </message>
+    <message>
+        <source>Nothing to show yet</source>
+        <translation>Noch nichts zu zeigen</translation>
+    </message>
+    <message>
+        <source>Connect...</source>
+        <translation>Verbinden...</translation>
+    </message>
+    <message>
+        <source>Try it on a simulated instrument</source>
+        <translation>Simuliertes Gerät ausprobieren</translation>
+    </message>
+    <message>
+        <source>Open a file...</source>
+        <translation>Datei öffnen...</translation>
+    </message>
+    <message>
+        <source>Connect to %1</source>
+        <translation>Mit %1 verbinden</translation>
+    </message>
+    <message>
+        <source>Copy Picture</source>
+        <translation>Bild kopieren</translation>
+    </message>
+    <message>
+        <source>Save Picture...</source>
+        <translation>Bild speichern...</translation>
+    </message>
+    <message>
+        <source>Save View...</source>
+        <translation>Ansicht speichern...</translation>
+    </message>
+    <message>
+        <source>Add Marker Here</source>
+        <translation>Marker hier setzen</translation>
+    </message>
+    <message>
+        <source>Zoom Back	Alt+Left</source>
+        <translation>Zoom zurück	Alt+Links</translation>
+    </message>
+    <message>
+        <source>Zoom Forward	Alt+Right</source>
+        <translation>Zoom vor	Alt+Rechts</translation>
+    </message>
+    <message>
+        <source>Whole View	Home</source>
+        <translation>Ganze Ansicht	Pos1</translation>
+    </message>
+    <message>
+        <source>Manual Scale...</source>
+        <translation>Skala von Hand...</translation>
+    </message>
+    <message>
+        <source>Panel</source>
+        <translation>Bedienfeld</translation>
+    </message>
+    <message>
+        <source>Full Screen</source>
+        <translation>Vollbild</translation>
+    </message>
+    <message>
+        <source>The simulated instrument runs at %1</source>
+        <translation>Das simulierte Messgerät läuft an %1</translation>
+    </message>
+    <message>
+        <source>The simulated instrument runs. Connect to it now?</source>
+        <translation>Das simulierte Messgerät läuft. Jetzt verbinden?</translation>
+    </message>
+    <message>
+        <source>Theme of the System</source>
+        <translation>Farben des Systems</translation>
+    </message>
+    <message>
+        <source>Light Theme</source>
+        <translation>Helle Farben</translation>
+    </message>
+    <message>
+        <source>Dark Theme</source>
+        <translation>Dunkle Farben</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Sprache</translation>
+    </message>
+    <message>
+        <source>Language of the System</source>
+        <translation>Sprache des Systems</translation>
+    </message>
+    <message>
+        <source>The language changes with the next start</source>
+        <translation>Die Sprache wechselt mit dem nächsten Start</translation>
+    </message>
+    <message>
+        <source>There is no trace to copy yet</source>
+        <translation>Noch keine Messkurve zum Kopieren</translation>
+    </message>
+    <message>
+        <source>A picture of the graph is in the clipboard</source>
+        <translation>Ein Bild des Diagramms liegt in der Zwischenablage</translation>
+    </message>
+    <message>
+        <source>Mode</source>
+        <translation>Betriebsart</translation>
+    </message>
+    <message>
+        <source>Marker</source>
+        <translation>Marker</translation>
+    </message>
+    <message>
+        <source>Command line</source>
+        <translation>Befehlszeile</translation>
+    </message>
+    <message>
+        <source>Stop the view to use the grey keys</source>
+        <translation>Für die grauen Tasten erst anhalten</translation>
+    </message>
+    <message>
+        <source>Speed:</source>
+        <translation>Tempo:</translation>
+    </message>
+    <message>
+        <source>%1 traces/s</source>
+        <translation>%1 Kurven/s</translation>
+    </message>
+    <message>
+        <source>all at once</source>
+        <translation>ohne Pause</translation>
+    </message>
+    <message>
+        <source>no sample</source>
+        <translation>kein Messwert</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>Leistung</translation>
+    </message>
+    <message>
+        <source>Highest %1</source>
+        <translation>Höchster Wert %1</translation>
+    </message>
+    <message>
+        <source>Lowest %1 of the last %2 readings</source>
+        <translation>Niedrigster Wert %1 der letzten %2 Ablesungen</translation>
+    </message>
+    <message>
+        <source>Level of the trace under the pointer</source>
+        <translation>Pegel der Messkurve unter dem Mauszeiger</translation>
+    </message>
+    <message>
+        <source>Trace at the marker</source>
+        <translation>Messkurve am Marker</translation>
+    </message>
+    <message>
+        <source>Trace at the delta marker</source>
+        <translation>Messkurve am Deltamarker</translation>
+    </message>
+    <message>
+        <source>Position of the pointer</source>
+        <translation>Ort des Mauszeigers</translation>
+    </message>
+    <message>
+        <source>Pointer</source>
+        <translation>Mauszeiger</translation>
+    </message>
+    <message>
+        <source>trace %1</source>
+        <translation>Kurve %1</translation>
+    </message>
+    <message>
+        <source>Not serving</source>
+        <translation>Server aus</translation>
+    </message>
+    <message>
+        <source>Looking for the instrument</source>
+        <translation>Messgerät wird gesucht</translation>
+    </message>
+    <message>
+        <source>Waiting for a client</source>
+        <translation>Wartet auf einen Client</translation>
+    </message>
+    <message>
+        <source>A client is at work</source>
+        <translation>Ein Client arbeitet</translation>
+    </message>
+    <message>
+        <source>The TCP port is in error</source>
+        <translation>Der TCP-Port ist gestört</translation>
+    </message>
+    <message>
+        <source>Work is under way</source>
+        <translation>Vorgang läuft</translation>
+    </message>
+    <message>
+        <source>Traffic on the link</source>
+        <translation>Verkehr auf der Leitung</translation>
+    </message>
+    <message>
+        <source>Connecting...</source>
+        <translation>Verbindet...</translation>
+    </message>
+    <message>
+        <source>Not connected</source>
+        <translation>Nicht verbunden</translation>
+    </message>
+    <message>
+        <source>Connection lost:</source>
+        <translation>Verbindung verloren:</translation>
+    </message>
+    <message>
+        <source>Ends the number in %1 (%2)</source>
+        <translation>Schließt die Zahl in %1 ab (%2)</translation>
+    </message>
+    <message>
+        <source>Sends the entry (Enter)</source>
+        <translation>Sendet die Eingabe (Eingabetaste)</translation>
+    </message>
+    <message>
+        <source>Toolbar</source>
+        <translation>Werkzeugleiste</translation>
+    </message>
+    <message>
+        <source>Connect</source>
+        <translation>Verbinden</translation>
+    </message>
+    <message>
+        <source>Disconnect</source>
+        <translation>Trennen</translation>
+    </message>
+    <message>
+        <source>Single</source>
+        <translation>Einmal</translation>
+    </message>
+    <message>
+        <source>Continuous</source>
+        <translation>Dauerbetrieb</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>Stopp</translation>
+    </message>
+    <message>
+        <source>Whole View</source>
+        <translation>Ganze Ansicht</translation>
+    </message>
+    <message>
+        <source>The whole range of both axes (Home)</source>
+        <translation>Der ganze Bereich beider Achsen (Pos1)</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Öffnen</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Speichern</translation>
+    </message>
+    <message>
+        <source>Record</source>
+        <translation>Aufzeichnen</translation>
+    </message>
+    <message>
+        <source>Picture</source>
+        <translation>Bild</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Kopieren</translation>
+    </message>
+    <message>
+        <source>Copy a picture of the graph (Ctrl+C)</source>
+        <translation>Bild des Diagramms kopieren (Strg+C)</translation>
+    </message>
+    <message>
+        <source>Trace Tools</source>
+        <translation>Kurvenwerkzeuge</translation>
+    </message>
+    <message>
+        <source>Traces</source>
+        <translation>Kurven</translation>
+    </message>
+    <message>
+        <source>Peaks</source>
+        <translation>Spitzen</translation>
+    </message>
+    <message>
+        <source>Markers</source>
+        <translation>Marker</translation>
+    </message>
+    <message>
+        <source>Limits</source>
+        <translation>Grenzen</translation>
+    </message>
+    <message>
+        <source>Statistics</source>
+        <translation>Statistik</translation>
+    </message>
+    <message>
+        <source>Clear Held Traces</source>
+        <translation>Gehaltene Kurven löschen</translation>
+    </message>
+    <message>
+        <source>Scale Level Axis</source>
+        <translation>Pegelachse anpassen</translation>
+    </message>
+    <message>
+        <source>&amp;Trace</source>
+        <translation>&amp;Kurve</translation>
+    </message>
+    <message>
+        <source>Colour by level</source>
+        <translation>Farbe nach Pegel</translation>
+    </message>
+</context>
+</TS>

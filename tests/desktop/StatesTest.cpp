@@ -1,0 +1,145 @@
+// Pictures of the states that are rarer than the panel's menus, in both themes and at three sizes.
+
+#include <QDialog>
+#include <QDockWidget>
+
+#include "tests/desktop/Desk.h"
+
+namespace zel {
+namespace {
+
+struct Look {
+    const char* name;
+    ThemeChoice theme;
+    QSize size;
+};
+
+/// A recording of that many traces, a minute apart.
+std::string recordingOf(int count) {
+    std::string text;
+    for (int i = 0; i < count; ++i) {
+        text += "Trace Name;Trace\r\nTime;10:" + std::to_string(10 + i) +
+                ":00\r\nMeasurement Type;Analyzer\r\nReference Level;-20\r\n"
+                "Reference Range;10 dB/DIV\r\nReference Unit;dBm\r\nTrace Detector;Sample\r\n"
+                "Trace Write Pointer;0\r\nHz;dBm\r\n";
+        for (int k = 0; k < 301; ++k) {
+            const int carrier = std::max(0, 55 - std::abs(k - 60 - 4 * i) * 8);
+            const int level = -95 + carrier + (k * 7919 + i * 104729) % 5;
+            text +=
+                std::to_string(2400000000LL + k * 100000LL) + ";" + std::to_string(level) + "\r\n";
+        }
+    }
+    return text;
+}
+
+class LooksOfStates : public Desk, public testing::WithParamInterface<Look> {
+  protected:
+    void SetUp() override {
+        applyTheme(testApplication(), GetParam().theme);
+        window->resize(GetParam().size);
+        show();
+    }
+    ~LooksOfStates() override { applyTheme(testApplication(), ThemeChoice::Dark); }
+
+    void picture(QWidget& widget, const char* state) {
+        show();
+        EXPECT_TRUE(savePicture(widget, QString(GetParam().name) + "-" + state));
+    }
+    void sweeps(int count) {
+        for (int i = 0; i < count; ++i) panel().PlaySingleButton.Click();
+    }
+    void load(int traces) {
+        platform.files.put("/data/monitor.csv", recordingOf(traces));
+        panel().OpenFile("/data/monitor.csv");
+    }
+};
+
+TEST_P(LooksOfStates, SpectrogramAndTools_ArePictures) {
+    connect();
+    panel().SpectrogramShow.Click();
+    sweeps(40);
+    picture(*window, "spectrogram");
+    auto* tools = window->findChild<QDockWidget*>("TraceTools");
+    ASSERT_NE(tools, nullptr);
+    tools->show();
+    picture(*window, "tools");
+    EXPECT_TRUE(
+        window->rect().contains(QRect(tools->mapTo(window.get(), QPoint()), tools->size())));
+}
+
+TEST_P(LooksOfStates, LoadedFile_BearsItsNameAndHasNoBar) {
+    load(1);
+    picture(*window, "file");
+    EXPECT_FALSE(widgetOf<QWidget>(panel().PlaybackFrame)->isVisible());
+}
+
+TEST_P(LooksOfStates, LoadedRecording_HasTheBar) {
+    load(40);
+    panel().PlaybackBack.Click();
+    picture(*window, "recording-loaded");
+    EXPECT_TRUE(widgetOf<QWidget>(panel().PlaybackFrame)->isVisible());
+    EXPECT_EQ(widgetOf<QSlider>(panel().PlaybackPosition)->value(), 39);
+    EXPECT_EQ(widgetOf<QSlider>(panel().PlaybackPosition)->maximum(), 40);
+}
+
+TEST_P(LooksOfStates, PowerReading_IsLarge) {
+    connect();
+    panel().PwrButton.Click();
+    sweeps(3);
+    picture(*window, "power-reading");
+}
+
+TEST_P(LooksOfStates, LostLine_IsSaid) {
+    connect();
+    sweeps(1);
+    panel().LinkLost = true;
+    panel().CWGraph1.Old = true;
+    panel().ConnectedPic.noteChange();
+    picture(*window, "lost");
+}
+
+TEST_P(LooksOfStates, Recording_HasTheRedLamp) {
+    connect();
+    sweeps(1);
+    program->forms().time.ContinuousRecording = true;
+    panel().RecordData.noteChange();
+    panel().FileLabel.Caption = "trace.csv: 5 traces, 52 kB, 00:00:03, next in 0 s";
+    picture(*window, "recording");
+    program->forms().time.ContinuousRecording = false;
+}
+
+TEST_P(LooksOfStates, Windows_ArePictures) {
+    connect();
+    sweeps(20);
+    Forms& forms = program->forms();
+    const std::pair<Form*, const char*> windows[] = {{&forms.waterfall, "waterfall-window"},
+                                                     {&forms.specialMeas, "script-window"},
+                                                     {&forms.time, "record-window"},
+                                                     {&forms.doctor, "doctor-window"}};
+    for (const auto& [form, name] : windows) {
+        form->Show();
+        show();
+        QWidget* shown = nullptr;
+        for (QWidget* top : QApplication::topLevelWidgets())
+            if (top->objectName() == QString::fromStdString(form->name()) && top->isVisible())
+                shown = top;
+        ASSERT_NE(shown, nullptr) << name;
+        picture(*shown, name);
+        form->Hide();
+        window->binder().flush();
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(Sizes, LooksOfStates,
+                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
+                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
+                                         Look{"dark-1280x760", ThemeChoice::Dark, {1280, 760}},
+                                         Look{"light-1280x760", ThemeChoice::Light, {1280, 760}},
+                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
+                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
+                         [](const auto& look) {
+                             return QString(look.param.name).replace('-', '_').toStdString();
+                         });
+
+}  // namespace
+}  // namespace zel
