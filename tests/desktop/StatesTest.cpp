@@ -21,7 +21,7 @@ std::string recordingOf(int count) {
         text += "Trace Name;Trace\r\nTime;10:" + std::to_string(10 + i) +
                 ":00\r\nMeasurement Type;Analyzer\r\nReference Level;-20\r\n"
                 "Reference Range;10 dB/DIV\r\nReference Unit;dBm\r\nTrace Detector;Sample\r\n"
-                "Trace Write Pointer;0\r\nHz;dBm\r\n";
+                "Trace Write Pointer;0\r\nHz\r\n";
         for (int k = 0; k < 301; ++k) {
             const int carrier = std::max(0, 55 - std::abs(k - 60 - 4 * i) * 8);
             const int level = -95 + carrier + (k * 7919 + i * 104729) % 5;
