@@ -186,6 +186,22 @@ TEST_F(ScriptWindowTest, SaveAs_GoesOnWithTheOtherFile) {
     EXPECT_EQ(form.CurrScriptFile, folder.file("t.txt"));
 }
 
+TEST_F(ScriptWindowTest, SaveAsThatFails_StaysWithTheFileItHad) {
+    openThroughDialog(folder.write("s.txt", "DO\r\n"));
+    inEditor([this] {
+        editor.txtNotepad.Text = "LOOP\r\n";
+        platform.files.refuse(folder.file("t.txt"), "Permission denied");
+        platform.fileDialogs.answer(folder.file("t.txt"));
+        editor.cmdSaveAs.Click();
+        EXPECT_EQ(boxes.boxes().size(), 1U);
+        EXPECT_EQ(editor.FileName, folder.file("s.txt"));
+        EXPECT_EQ(editor.txtNotepad.Text.get(), "LOOP\r\n");
+        editor.cmdClose.Click();
+    });
+    EXPECT_EQ(folder.read("s.txt"), "LOOP\r\n");
+    EXPECT_EQ(form.CurrScriptFile, folder.file("s.txt"));
+}
+
 TEST_F(ScriptWindowTest, CommandPairs_AreChecked) {
     load({"A", "B"});
     int index = 0;
