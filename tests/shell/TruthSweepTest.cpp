@@ -12,6 +12,8 @@ namespace {
 // Later than the time-out of an answer.
 constexpr int kLateMs = 12'000;
 constexpr int kLateOverTcpMs = 20'000;
+// The server looks once a second whether its line still stands.
+constexpr int kNoticedMs = 1100;
 
 constexpr const char* kKinds[] = {"serial", "TCP", "served"};
 
@@ -24,6 +26,9 @@ void sweepSession(LineKind kind, long first, long stride) {
     ASSERT_EQ(good.wholeTraces, 6);
     ASSERT_EQ(good.incompleteTraces, 0);
     const long bytes = good.tap.passed();
+    if (good.served) {
+        EXPECT_EQ(good.served->bridge().relay().bytesToClient(), static_cast<std::uint64_t>(bytes));
+    }
     long runs = 0;
     long incomplete = 0;
     long whole = 0;
@@ -38,6 +43,7 @@ void sweepSession(LineKind kind, long first, long stride) {
             EXPECT_EQ(run.findings, std::vector<std::string>{})
                 << nameOf(fault) << " at byte " << byte;
             if (run.served) {
+                run.platform.events.runFor(kNoticedMs);
                 // The line of the instrument is never blocked, and serves on where it did not end.
                 EXPECT_EQ(run.served->bridge().relay().waiting(), 0U);
                 EXPECT_EQ(run.served->bridge().bridging(), run.lineIsUp());
