@@ -78,7 +78,7 @@ void Playback::showState() {
     std::string text;
     if (frames_)
         text = std::to_string(position_ + 1) + " of " + std::to_string(count) + "   " +
-               frames_->at(position_).label;
+               frames_->at(position_).time;
     panel_.PlaybackLabel.Caption = text;
 }
 

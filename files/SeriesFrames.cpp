@@ -43,8 +43,8 @@ int secondOfDay(std::string_view time) {
     return (parts[0] * 60 + parts[1]) * 60 + parts[2];
 }
 
-SeriesFrames::SeriesFrames(std::shared_ptr<const std::string> text, FieldList lines,
-                           int start, std::string_view markWord, const std::string& fileTime)
+SeriesFrames::SeriesFrames(std::shared_ptr<const std::string> text, FieldList lines, int start,
+                           std::string_view markWord, const std::string& fileTime)
     : text_(std::move(text)),
       lines_(std::move(lines)),
       markWord_(markWord),
@@ -63,9 +63,11 @@ void SeriesFrames::add(int start, int time) {
     if (time >= 0) {
         const std::string stamp(lines_[time + 1]);
         frame.label = stamp + " " + fileTime_.substr(0, kDayLength);
+        frame.time = stamp;
         frame.second = secondOfDay(stamp);
     } else if (!frames_.empty()) {
         frame.label = frames_.back().label;
+        frame.time = frames_.back().time;
         frame.second = frames_.back().second;
     }
     frames_.push_back(std::move(frame));

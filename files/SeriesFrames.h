@@ -15,6 +15,7 @@ class SeriesFrames {
     struct Frame {
         int start = 0;      ///< entry of the first row
         std::string label;  ///< time of day of the trace and day of the file
+        std::string time;   ///< of day, as it stands in the file
         int second = -1;    ///< of the day; -1 without a time
     };
 

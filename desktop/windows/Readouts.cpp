@@ -7,7 +7,8 @@
 namespace zel {
 namespace {
 
-constexpr int kPaceWidth = 152;
+constexpr int kPaceWidth = 146;
+constexpr int kRangeWidth = 138;  // "Center: 2.415 GHz"
 constexpr int kPointerWidth = 92;
 constexpr int kLineHeight = 17;
 constexpr int kRoomForTrace = 760;  // else the marker's own text on the graph says it
@@ -64,6 +65,7 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
         return label;
     };
     QGridLayout* range = card(*row, 2);
+    range->setColumnMinimumWidth(0, kRangeWidth);
     range->addWidget(bound(panel.CFLabel), 0, 0);
     range->addWidget(bound(panel.SpanLabel), 1, 0);
     QGridLayout* markers = card(*row, 5);

@@ -51,7 +51,7 @@ TEST_F(PlaybackTest, AfterTheSeries_TheKeysStay) {
     EXPECT_TRUE(panel.PlaybackFrame.Visible);
     EXPECT_EQ(panel.PlaybackPosition.Max, 5);
     EXPECT_EQ(panel.PlaybackPosition.Value, 5);
-    EXPECT_EQ(panel.PlaybackLabel.Caption.get().substr(0, 18), "5 of 5   10:00:05 ");
+    EXPECT_EQ(panel.PlaybackLabel.Caption.get(), "5 of 5   10:00:05");
     EXPECT_EQ(panel.PlaybackPlay.Caption.get(), "Play");
     EXPECT_FALSE(panel.PlaybackForward.Enabled);
     EXPECT_TRUE(panel.PlaybackBack.Enabled);
@@ -80,7 +80,7 @@ TEST_F(PlaybackTest, Scrub_ShowsTheTraceAndTheWaterfallUpToIt) {
     scrub(4);
     EXPECT_EQ(levels, (Levels{-31, -33}));
     EXPECT_EQ(rows(), all - 1);
-    EXPECT_EQ(panel.PlaybackLabel.Caption.get().substr(0, 17), "4 of 5   10:00:04");
+    EXPECT_EQ(panel.PlaybackLabel.Caption.get(), "4 of 5   10:00:04");
 }
 
 TEST_F(PlaybackTest, Play_AtTheEndBeginsAgain) {
