@@ -7,7 +7,7 @@
 namespace zel {
 namespace {
 
-constexpr int kPaceWidth = 146;
+constexpr int kPaceWidth = 152;
 constexpr int kRangeWidth = 138;  // "Center: 2.415 GHz"
 constexpr int kPointerWidth = 92;
 constexpr int kLineHeight = 17;
@@ -34,7 +34,7 @@ QGridLayout* card(QHBoxLayout& row, int stretch) {
     auto* frame = new QFrame;
     frame->setObjectName("group");
     auto* grid = new QGridLayout(frame);
-    grid->setContentsMargins(8, 4, 8, 4);
+    grid->setContentsMargins(6, 4, 6, 4);
     grid->setHorizontalSpacing(8);
     grid->setVerticalSpacing(0);
     row.addWidget(frame, stretch);
