@@ -32,7 +32,8 @@ QPushButton[face="blue"] { background: @accent; color: @accentText; font-weight:
 QPushButton[face]:disabled { color: @dim; background: @window; font-weight: normal; }
 QPushButton[face]:focus { border: 2px solid @text; }
 QPushButton#StopButton { background: @red; color: #ffffff; font-weight: bold; }
-QLineEdit, QComboBox { background: @base; color: @text; border: 1px solid @border;
+QComboBox { color: @text; }
+QLineEdit, QComboBox { background: @base; border: 1px solid @border;
     border-radius: 4px; padding: 1px 4px; min-height: 18px; }
 QLineEdit:focus, QComboBox:focus { border: 2px solid @focus; padding: 0px 3px; }
 QComboBox QAbstractItemView { background: @base; color: @text; border: 1px solid @border;

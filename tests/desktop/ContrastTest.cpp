@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <QLineEdit>
 #include <cmath>
 
 #include "desktop/binders/ToolTips.h"
@@ -82,6 +83,12 @@ TEST_P(Contrast, ColouredTextsOfThePanel_AreReadable) {
 
 TEST_P(Contrast, Placeholders_AreReadable) {
     applyTheme(testApplication(), GetParam() ? ThemeChoice::Dark : ThemeChoice::Light);
+    // A style sheet that gives boxes a colour makes their placeholders half transparent.
+    QLineEdit box;
+    box.ensurePolished();
+    EXPECT_EQ(box.palette().color(QPalette::PlaceholderText).alpha(), 255);
+    EXPECT_GE(contrast(box.palette().color(QPalette::PlaceholderText), colors().base), kText);
+    EXPECT_GE(contrast(box.palette().color(QPalette::Text), colors().base), kText);
     const QPalette palette = QApplication::palette();
     EXPECT_GE(contrast(palette.color(QPalette::PlaceholderText), palette.color(QPalette::Base)),
               kText);
