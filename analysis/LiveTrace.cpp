@@ -1,12 +1,12 @@
 #include "analysis/LiveTrace.h"
 
-#include <algorithm>
 #include <chrono>
 #include <cmath>
 #include <stdexcept>
 
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "trace/PointPairs.h"
 
 namespace zel {
 namespace {
@@ -54,8 +54,7 @@ SpectrumTrace spectrumOf(const Sweep& sweep) {
     trace.level.reserve(points);
     for (std::size_t i = 0; i < points; ++i) {
         trace.x.push_back(sweep.axis.start + static_cast<double>(i) * step);
-        const auto first = sweep.physical.begin() + static_cast<std::ptrdiff_t>(i * each);
-        const double value = *std::max_element(first, first + static_cast<std::ptrdiff_t>(each));
+        const double value = each == 2 ? levelsOfPoint(sweep.physical, i).high : sweep.physical[i];
         if (linear && value <= 0)
             throw std::runtime_error("a level of 0 " + std::string(named->saved) +
                                      " or below has no value in dBm");

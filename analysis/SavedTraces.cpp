@@ -4,6 +4,7 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <limits>
 #include <optional>
 #include <stdexcept>
 #include <system_error>
@@ -13,6 +14,7 @@
 #include "model/Numeric.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/PointPairs.h"
 
 namespace zel {
 namespace {
@@ -136,7 +138,9 @@ class Cutter {
         trace.rbw = header_.rbw;
         trace.time = isoTime(header_.date, header_.time, order_);
         trace.x = std::move(rows_.x);
-        trace.level = std::move(rows_.level);
+        trace.level.resize(trace.x.size());
+        for (std::size_t i = 0; i < trace.level.size(); ++i)
+            trace.level[i] = rows_.paired ? levelsOfPoint(rows_.pairs, i).high : rows_.pairs[2 * i];
         rows_ = {};
         const double whole = header_.distance ? header_.cableLength : header_.sweepTime;
         if (header_.zeroSpan)  // the file's column holds no x then
@@ -159,7 +163,8 @@ class Cutter {
   private:
     struct Rows {
         std::vector<double> x;
-        std::vector<double> level;
+        std::vector<double> pairs;  ///< two a row, the second NaN where there is none
+        bool paired = false;
     };
 
     std::string unitName() const { return header_.unit == UNITV ? "V" : "W"; }
@@ -167,8 +172,10 @@ class Cutter {
     bool take(const Row& row) {
         if (rows_.x.size() == kRows && !finish()) return false;
         rows_.x.push_back(row.x);
-        rows_.level.push_back(row.columns > 1 ? std::max(row.values[0], row.values[1])
-                                              : row.values[0]);
+        const bool pair = row.columns > 1;
+        rows_.pairs.push_back(row.values[0]);
+        rows_.pairs.push_back(pair ? row.values[1] : std::numeric_limits<double>::quiet_NaN());
+        rows_.paired = rows_.paired || pair;
         return true;
     }
 

@@ -8,7 +8,7 @@
 namespace zel {
 
 /// `x` rises by `step` and has as many entries as `level`. Pairs of the auto peak detector count
-/// with their maxima. A trace of one sample has the step 0.
+/// with the highest level of each point (trace/PointPairs.h). A trace of one sample has the step 0.
 struct SpectrumTrace {
     std::vector<double> x;      ///< in `xUnit`
     std::vector<double> level;  ///< in `unit`, never infinite and always a number

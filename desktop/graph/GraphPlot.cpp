@@ -1,5 +1,6 @@
 #include "desktop/graph/GraphPlot.h"
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 
@@ -7,6 +8,7 @@
 #include "desktop/graph/DivisionTicker.h"
 #include "desktop/graph/PolylineClip.h"
 #include "support/NumberText.h"
+#include "trace/PointPairs.h"
 
 namespace zel {
 namespace {
@@ -195,7 +197,7 @@ void GraphPlot::takeTrace(const Graph& graph) {
         gap = missing;
         points_ << QPointF(xOf(i), values[i]);
     }
-    const bool band = band_ && paired_;
+    const bool band = paired_;
     low_->setVisible(band);
     trace_->setChannelFillGraph(band ? low_ : nullptr);
     QVector<double> keys;
@@ -209,13 +211,11 @@ void GraphPlot::takeTrace(const Graph& graph) {
         low_->data()->clear();
         return trace_->setData(keys, highs, true);
     }
-    for (std::size_t i = 0; i + 1 < values.size(); i += 2) {
-        // In the array the maximum of a point stands in the pair after its own, and that of the
-        // last point is not there. fmin and fmax pass over a value that is missing.
-        const double high = i + 3 < values.size() ? values[i + 3] : qQNaN();
-        keys << xOf(i);
-        lows << std::fmin(values[i], high);
-        highs << std::fmax(values[i], high);
+    for (std::size_t point = 0; 2 * point + 1 < values.size(); ++point) {
+        const PointLevels levels = levelsOfPoint(values, point);
+        keys << xOf(2 * point);
+        lows << levels.low;
+        highs << levels.high;
     }
     trace_->setData(keys, highs, true);
     low_->setData(keys, lows, true);
@@ -376,21 +376,40 @@ void GraphPlot::strike(const ViewAnnotations& view) {
     strikeLabels(plot_.yAxis, view.yUnsure);
 }
 
+/// The fill of the band, by two lines that no pen draws and that stay in the view.
+void GraphPlot::fillWithin(const QRectF& view) {
+    const auto edge = [&](const QCPGraph& line) {
+        QVector<double> keys;
+        QVector<double> values;
+        for (const QPointF& point : linePoints(line)) {
+            if (point.x() < view.left() || point.x() > view.right()) continue;
+            keys << point.x();
+            values << std::clamp(point.y(), view.top(), view.bottom());
+        }
+        QCPGraph* added = plot_.addGraph(plot_.xAxis, plot_.yAxis);
+        added->setPen(Qt::NoPen);
+        added->setAdaptiveSampling(false);
+        added->setData(keys, values, true);
+        return added;
+    };
+    QCPGraph* high = edge(*trace_);
+    high->setChannelFillGraph(edge(*low_));
+    high->setBrush(trace_->brush());
+    trace_->setBrush(Qt::NoBrush);
+    trace_->setChannelFillGraph(nullptr);
+}
+
 void GraphPlot::clipToView() {
     const QCPRange x = plot_.xAxis->range();
     const QCPRange y = plot_.yAxis->range();
-    const QPolygonF line(points_);
-    QVector<double> keys;
-    QVector<double> values;
-    for (const QPolygonF& part : clipPolyline(line, {x.lower, y.lower, x.size(), y.size()})) {
-        for (const QPointF& point : part) {
-            keys << point.x();
-            values << point.y();
-        }
-        keys << part.back().x();
-        values << qQNaN();  // the pen is lifted
+    const QRectF view(x.lower, y.lower, x.size(), y.size());
+    if (low_->visible()) {
+        fillWithin(view);
+        clipLine(*low_, linePoints(*low_), view);
+        clipLine(*trace_, linePoints(*trace_), view);
+    } else {
+        clipLine(*trace_, QPolygonF(points_), view);
     }
-    trace_->setData(keys, values, true);
     drawn_ = false;
     for (const CursorItems& cursor : cursors_) {
         const QPointF at = cursor.point->position->coords();

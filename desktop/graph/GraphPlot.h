@@ -27,7 +27,8 @@ struct GraphColors {
 GraphColors darkGraph();
 GraphColors lightGraph();  ///< for paper
 
-/// Owns the items of the plot; the plot itself belongs to the caller.
+/// Owns the items of the plot; the plot itself belongs to the caller. Pairs of the auto peak
+/// detector are a band from the lowest to the highest level of each point.
 class GraphPlot {
   public:
     explicit GraphPlot(QCustomPlot& plot, const GraphColors& colors = {});
@@ -36,9 +37,6 @@ class GraphPlot {
     void update(const Graph& graph, const ViewAnnotations& view);
     /// In pixels of the plot. One pixel of the device is what Qt draws fast.
     void setTraceWidth(double width) { width_ = width; }
-    /// Draws pairs of a minimum and a maximum as a band between two lines. Without it the pairs are
-    /// one line up and down, which every format of pictures has.
-    void setBand(bool band) { band_ = band; }
     /// What the trace was loaded from; empty for a sweep of the instrument.
     void setSource(const QString& name);
     /// Shades a stretch of the x axis; nothing where both ends are the same.
@@ -74,6 +72,7 @@ class GraphPlot {
     void styleAxes();
     void setRanges(const Graph& graph);
     void strike(const ViewAnnotations& view);
+    void fillWithin(const QRectF& view);
     void placeCursors(const Graph& graph);
     void writeCursor(std::size_t index, const QPointF& point);
     QColor bandInk(const QColor& line) const;
@@ -96,7 +95,6 @@ class GraphPlot {
     ViewAnnotations view_;
     double resolution_ = 0;
     double width_ = 1;
-    bool band_ = false;
     bool paired_ = false;
     bool markerTexts_ = false;
     unsigned long serial_ = 0;

@@ -57,4 +57,24 @@ std::vector<QPolygonF> clipPolyline(const QPolygonF& line, const QRectF& box) {
     return parts;
 }
 
+QPolygonF linePoints(const QCPGraph& graph) {
+    QPolygonF points;
+    for (const QCPGraphData& point : *graph.data()) points << QPointF(point.key, point.value);
+    return points;
+}
+
+void clipLine(QCPGraph& graph, const QPolygonF& line, const QRectF& view) {
+    QVector<double> keys;
+    QVector<double> values;
+    for (const QPolygonF& part : clipPolyline(line, view)) {
+        for (const QPointF& point : part) {
+            keys << point.x();
+            values << point.y();
+        }
+        keys << part.back().x();
+        values << qQNaN();  // the pen is lifted
+    }
+    graph.setData(keys, values, true);
+}
+
 }  // namespace zel

@@ -24,9 +24,9 @@ Sweep sweepOf(std::vector<double> physical, int detector, int unit) {
     return sweep;
 }
 
-TEST(SpectrumOf, PairsCountWithTheirMaxima) {
-    const SpectrumTrace trace = spectrumOf(sweepOf({-90, -80, -60, -70}, DETAUTOPEAK, UNITDBUV));
-    EXPECT_EQ(trace.level, (std::vector<double>{-80, -60}));
+TEST(SpectrumOf, PairsCountWithTheHighestLevelOfTheirPoint) {
+    const SpectrumTrace trace = spectrumOf(sweepOf({-90, -20, -60, -70}, DETAUTOPEAK, UNITDBUV));
+    EXPECT_EQ(trace.level, (std::vector<double>{-70, -60}));
     EXPECT_EQ(trace.x, (std::vector<double>{100, 101}));
     EXPECT_EQ(trace.unit, "dBuV");
     EXPECT_EQ(trace.rbw, 1000);

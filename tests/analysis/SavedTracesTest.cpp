@@ -74,10 +74,13 @@ TEST(ReadTraces, RowsAlone_AreCutEvery301) {
     EXPECT_EQ(traces[1].level.front(), -2);
 }
 
-TEST(ReadTraces, Pairs_CountWithTheirMaxima) {
-    const std::vector<SpectrumTrace> traces = all(kHeader + "1.000;-80;-20\r\n2.000;-10;-70\r\n");
+TEST(ReadTraces, Pairs_CountWithTheHighestLevelOfTheirPoint) {
+    // The second value of a row belongs to the point before; the first row's to none.
+    const std::vector<SpectrumTrace> traces =
+        all(kHeader + "1.000;-80;-20\r\n2.000;-75;-30\r\n3.000;-10;-70\r\n");
     ASSERT_EQ(traces.size(), 1u);
-    EXPECT_EQ(traces[0].level, (std::vector<double>{-20, -10}));
+    EXPECT_EQ(traces[0].level, (std::vector<double>{-30, -70, -10}));
+    EXPECT_EQ(traces[0].x, (std::vector<double>{1, 2, 3}));
 }
 
 TEST(ReadTraces, ZeroSpan_RunsOverTheSweepTime) {
