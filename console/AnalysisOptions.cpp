@@ -10,6 +10,7 @@ namespace zel {
 namespace {
 
 constexpr int kMostPeaks = 1000;
+constexpr int kMostAfter = 100'000;
 constexpr double kLargestDecibels = 1000;
 constexpr double kSmallestWidth = 1e-6;
 
@@ -35,6 +36,12 @@ std::string channelProblem(const std::string& text) {
 std::string holdProblem(const std::string& text) {
     return kHolds.count(text) != 0 ? std::string()
                                    : "takes max, min, average or power, not " + text;
+}
+
+std::string commandProblem(const std::string& text) {
+    const auto words = commandWords(text);
+    if (!words) return "has a quote without an end: " + text;
+    return words->empty() ? "takes a program and its arguments" : std::string();
 }
 
 /// A number option into an optional number.
@@ -96,10 +103,32 @@ void addAnalysisOptions(CLI::App& app, AnalysisOptions& options) {
         ->excludes(json);
 }
 
+namespace {
+
+void addWatchOptions(CLI::App& app, AnalysisOptions& options) {
+    app.add_option("--save-failed", options.watch.file,
+                   "Sweeps that fail the mask are added to this file")
+        ->type_name("FILE");
+    app.add_option("--save-after", options.watch.after,
+                   "So many sweeps after a failing one are added as well")
+        ->type_name("N")
+        ->check(CLI::Range(0, kMostAfter));
+    app.add_option_function<std::string>(
+           "--run-failed",
+           [&options](const std::string& text) { options.watch.command = *commandWords(text); },
+           "A sweep that fails the mask starts this program; {x}, {margin}, {time}, {file} are "
+           "filled in")
+        ->type_name("COMMAND")
+        ->check(commandProblem, "");
+}
+
+}  // namespace
+
 std::string parseAnalysisText(const std::string& text, AnalysisOptions& options) {
     CLI::App app("Analysis of live sweeps", "--analyse");
     app.set_help_flag();
     addAnalysisOptions(app, options);
+    addWatchOptions(app, options);
     try {
         app.parse(text, false);
     } catch (const CLI::ParseError& problem) {
@@ -114,6 +143,13 @@ std::string analysisProblem(const AnalysisOptions& options) {
                         request.occupied || !options.maskFile.empty();
     if (request.occupancy && single && !request.hold)
         return "--occupancy goes with the other figures only where --hold makes one trace of all";
+    const WatchSettings& watch = options.watch;
+    if (watch.any() && options.maskFile.empty())
+        return "--save-failed and --run-failed need --mask";
+    if (watch.any() && request.hold)
+        return "--save-failed and --run-failed do not go with --hold, which judges all sweeps at "
+               "the end";
+    if (watch.after > 0 && watch.file.empty()) return "--save-after needs --save-failed";
     return {};
 }
 

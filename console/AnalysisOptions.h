@@ -5,6 +5,7 @@
 #include <string>
 
 #include "analysis/AnalysisText.h"
+#include "analysis/MaskWatch.h"
 #include "analysis/TraceAnalysis.h"
 
 namespace zel {
@@ -13,13 +14,15 @@ struct AnalysisOptions {
     AnalysisRequest request;
     std::string maskFile;  ///< table of the mask; empty for none
     AnalysisFormat format = AnalysisFormat::Text;
+    WatchSettings watch;  ///< of live sweeps: what happens when one fails the mask
 };
 
 /// Adds --peaks, --threshold, --excursion, --bandwidth, --channel, --occupied, --mask, --hold,
 /// --occupancy, --json and --csv.
 void addAnalysisOptions(CLI::App& app, AnalysisOptions& options);
 
-/// Reads the same options out of one text, for live sweeps: "--peaks 3 --json". What is wrong with
+/// Reads the same options out of one text, for live sweeps: "--peaks 3 --json"; they have
+/// --save-failed, --save-after and --run-failed as well. What is wrong with
 /// them, else an empty text.
 std::string parseAnalysisText(const std::string& text, AnalysisOptions& options);
 

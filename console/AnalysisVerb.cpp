@@ -33,10 +33,13 @@ std::string AnalysisPrinter::readMaskFile(FileService& files) {
     return {};
 }
 
-void AnalysisPrinter::add(const SpectrumTrace& trace, const std::string& file,
-                          std::uint64_t number) {
+std::optional<MaskVerdict> AnalysisPrinter::add(const SpectrumTrace& trace, const std::string& file,
+                                                std::uint64_t number) {
     if (!run_) run_.emplace(options_.request);
-    if (const auto result = run_->add(trace, file, number)) print(*result);
+    const auto result = run_->add(trace, file, number);
+    if (!result) return std::nullopt;
+    print(*result);
+    return result->mask;
 }
 
 int AnalysisPrinter::finish() {

@@ -26,8 +26,10 @@ class AnalysisPrinter {
     /// Reads the table of the mask, if one is asked for. What is wrong with it, else an empty text.
     std::string readMaskFile(FileService& files);
     /// Throws std::runtime_error, with a text for the user, for a trace that does not fit the
-    /// others where one result is made of all.
-    void add(const SpectrumTrace& trace, const std::string& file, std::uint64_t number);
+    /// others where one result is made of all. The verdict on the trace, where a mask is asked for.
+    std::optional<MaskVerdict> add(const SpectrumTrace& trace, const std::string& file,
+                                   std::uint64_t number);
+    const AnalysisOptions& options() const { return options_; }
     /// Writes what stands out; the exit status: `kDone` or `kMaskFailed`.
     int finish();
 

@@ -7,8 +7,10 @@
 #include <vector>
 
 #include "analysis/LiveTrace.h"
+#include "analysis/MaskWatch.h"
 #include "console/GraphText.h"
 #include "console/PanelSession.h"
+#include "desktop/platform/SystemCommand.h"
 #include "link/CommandExchange.h"
 #include "support/NumberText.h"
 #include "trace/TraceReader.h"
@@ -91,12 +93,41 @@ std::shared_ptr<int> tellIncompleteTraces(const Run& run) {
     return count;
 }
 
+/// What happens to sweeps that fail the mask.
+class Watch {
+  public:
+    explicit Watch(const Run& run)
+        : run_(run), watch_(run.program().files(), command_, run.program().clock()) {
+        if (run.stage.analysis != nullptr) watch_.set(run.stage.analysis->options().watch);
+        watch_.Problem = [this](const std::string& problem) {
+            failed_ = true;
+            run_.stage.errors.line("zelctl: " + problem);
+        };
+    }
+    void take(const Sweep& sweep, const MaskVerdict& verdict) { watch_.take(sweep, verdict); }
+    /// Waits for the last command, which goes on by itself where it takes too long. False when
+    /// something could not be done.
+    bool finish() {
+        constexpr int kLongestMs = 10'000;
+        command_.waitForEnd(kLongestMs);
+        watch_.follow();
+        return !failed_;
+    }
+
+  private:
+    const Run& run_;
+    SystemCommand command_;
+    MaskWatch watch_;
+    bool failed_ = false;
+};
+
 /// Hands a sweep to the analysis. False, with the reason on the error output, where it cannot be
 /// analysed; an incomplete one was reported before.
-bool analyse(const Run& run, const Sweep& sweep, std::uint64_t number) {
+bool analyse(const Run& run, Watch& watch, const Sweep& sweep, std::uint64_t number) {
     if (!sweep.whole()) return true;
     try {
-        run.stage.analysis->add(spectrumOf(sweep), {}, number);
+        const auto verdict = run.stage.analysis->add(spectrumOf(sweep), {}, number);
+        watch.take(sweep, verdict.value_or(MaskVerdict{}));
     } catch (const std::runtime_error& wrong) {
         run.fail(wrong.what());
         return false;
@@ -108,6 +139,7 @@ int sweep(const Run& run) {
     ControllerForm& panel = run.panel();
     WaterfallForm& waterfall = run.program().forms().waterfall;
     const auto incomplete = tellIncompleteTraces(run);
+    Watch watch(run);
     for (int i = 0; i < run.options.count && run.output().problem().empty(); ++i) {
         bool success = false;
         // As passes of one view the sweeps stand one after the other in the waterfall.
@@ -118,7 +150,7 @@ int sweep(const Run& run) {
         if (run.wantsRows()) waterfall.styleLastRow();
         const Sweep& sweep = run.program().traces().lastSweep();
         if (run.stage.analysis != nullptr) {
-            if (!analyse(run, sweep, static_cast<std::uint64_t>(i) + 1)) return kLinkFailed;
+            if (!analyse(run, watch, sweep, static_cast<std::uint64_t>(i) + 1)) return kLinkFailed;
         } else if (sweep.wanted > 0) {
             run.output().line(i == 0 ? sweepHeader(sweep.autoPeak()) : std::string());
             run.output().lines(sweepRows(sweep));
@@ -132,7 +164,7 @@ int sweep(const Run& run) {
     }
     const int verdict = run.stage.analysis != nullptr ? run.stage.analysis->finish() : kDone;
     const int drawn = run.drawImage();
-    if (*incomplete > 0 || drawn != kDone) return kLinkFailed;
+    if (!watch.finish() || *incomplete > 0 || drawn != kDone) return kLinkFailed;
     return verdict;
 }
 

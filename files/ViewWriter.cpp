@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <iterator>
 
+#include "files/SweepFile.h"
 #include "files/ViewFormat.h"
 #include "files/ViewHeader.h"
 #include "model/CodeTables.h"
@@ -14,8 +15,6 @@ namespace zel {
 namespace {
 
 using CF = ControllerForm;
-
-constexpr const char* kXFormat = "#.000";
 
 struct AutoBandwidth {
     const char* word;
@@ -118,27 +117,8 @@ void ViewWriter::WriteViewHeader(OutputFile& file, bool withHeader) {
 }
 
 void ViewWriter::WriteViewData(OutputFile& file) {
-    const SweepAxis& axis = onGraph_.axis;
-    const bool zeroSpan = onGraph_.settings.Span == 0;
-    const double step =
-        zeroSpan || axis.intervals == 0 ? 0 : (axis.stop - axis.start) / axis.intervals;
-    const std::vector<double>& values = onGraph_.physical;
-    const bool pairs = onGraph_.autoPeak();
-    double x = zeroSpan ? 0 : axis.start;
-    for (std::size_t i = 0; i < values.size(); i += pairs ? 2 : 1) {
-        if (i > 0) x += step;
-        panel_.ViewXOffset = x;
-        std::string& text = file.text();
-        text += formatPattern(x, kXFormat);
-        text += ';';
-        text += generalNumber(values[i]);
-        if (!pairs) {
-            file.line("; ");
-        } else {
-            text += ';';
-            file.line(i + 1 < values.size() ? generalNumber(values[i + 1]) : "0");
-        }
-    }
+    const double last = writeSweepRows(file, onGraph_);
+    if (!onGraph_.physical.empty()) panel_.ViewXOffset = last;
 }
 
 void ViewWriter::finish(OutputFile& file) {

@@ -351,6 +351,8 @@ RoboHelp_CSH& Program::help() { return rooms_->help; }
 ErrorReport& Program::errorReport() { return rooms_->report; }
 Doctor& Program::doctor() { return rooms_->doctor; }
 Clipboard& Program::clipboard() { return guards_->platform.clipboard; }
+FileService& Program::files() { return guards_->platform.files; }
+Clock& Program::clock() { return guards_->platform.clock; }
 
 Forms& Program::forms() { return rooms_->forms; }
 ZEL3Variables& Program::variables() { return rooms_->mirror; }

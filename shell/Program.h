@@ -51,6 +51,8 @@ class Program {
     ErrorReport& errorReport();
     Doctor& doctor();
     Clipboard& clipboard();
+    FileService& files();
+    Clock& clock();
     Interlock& interlock();
     Scripts& scripts();
     /// The sweep on the graph, be it read or loaded.

@@ -2,45 +2,14 @@
 
 #include <gtest/gtest.h>
 
-#include <sstream>
-
 #include "console/AnalysisVerb.h"
-#include "console/Fronts.h"
-#include "console/Tool.h"
 #include "support/ExitStatus.h"
-#include "tests/files/DiskFolder.h"
-#include "tests/files/FileSession.h"
+#include "tests/console/ToolRun.h"
 
 namespace zel {
 namespace {
 
-struct AnalyseVerbTest : ::testing::Test {
-    int run(std::vector<std::string> words) {
-        words.insert(words.begin(), {"zelctl", "--home", folder.file("home")});
-        std::vector<const char*> list;
-        list.reserve(words.size());
-        for (const std::string& word : words) list.push_back(word.c_str());
-        out.str("");
-        errors.str("");
-        Options options;
-        if (const auto status =
-                parseOptions(static_cast<int>(list.size()), list.data(), options, out, errors))
-            return *status;
-        const bool simulated = options.address && options.address->simulated;
-        const auto front =
-            simulated ? makeSimulatorFront(options.home) : makePortFront(options.home);
-        return runTool(options, *front, {out, errors});
-    }
-    int runConnected(std::vector<std::string> words) {
-        words.insert(words.begin(), {"--connect", "sim:"});
-        return run(std::move(words));
-    }
-    Texts printed() const {
-        Texts lines;
-        std::istringstream in(out.str());
-        for (std::string line; std::getline(in, line);) lines.push_back(line);
-        return lines;
-    }
+struct AnalyseVerbTest : ToolRun {
     /// A table of 5 rows with one peak, in two traces.
     std::string recording() {
         const std::string header = "Trace Name;Analyzer\r\nSpan;4\r\nReference Unit;dBm\r\n\r\n";
@@ -50,9 +19,6 @@ struct AnalyseVerbTest : ::testing::Test {
                                     "3.000;-60; \r\n4.000;-90; \r\n5.000;-90; \r\n");
         return folder.file("two.csv");
     }
-    DiskFolder folder;
-    std::ostringstream out;
-    std::ostringstream errors;
 };
 
 TEST_F(AnalyseVerbTest, EveryTraceOfAFile_GetsAnObject) {
@@ -157,6 +123,50 @@ TEST_F(AnalyseVerbTest, MaskThatCoversNothing_PassesWithAWord) {
     EXPECT_NE(out.str().find(R"("mask": {"pass": true, "margin": null, "x": null})"),
               std::string::npos);
     EXPECT_NE(errors.str().find("covers no sample"), std::string::npos);
+}
+
+TEST_F(AnalyseVerbTest, FailingSweeps_AreSavedAndStartTheCommand) {
+    folder.write("mask.csv", "x;upper;lower\n0;-150;\n3e9;-150;\n");
+    const std::string saved = folder.file("failed.csv");
+    const std::string mark = folder.file("mark of it");
+    ASSERT_EQ(runConnected({"sweep", "--count", "3", "--analyse",
+                            "--mask " + folder.file("mask.csv") + " --save-failed " + saved +
+                                " --run-failed 'touch \"" + mark + "\"'"}),
+              kMaskFailed);
+    EXPECT_EQ(errors.str(), "");
+    EXPECT_EQ(linesOf(folder.read("mark of it")), Texts{});
+    ASSERT_EQ(run({"analyse", saved, "--peaks", "1", "--json"}), kDone);
+    EXPECT_EQ(printed().size(), 3U);
+}
+
+TEST_F(AnalyseVerbTest, PassingSweeps_AreNotSaved) {
+    folder.write("mask.csv", "x;upper;lower\n0;50;\n3e9;50;\n");
+    ASSERT_EQ(runConnected({"sweep", "--analyse",
+                            "--mask " + folder.file("mask.csv") + " --save-failed " +
+                                folder.file("failed.csv") + " --run-failed false"}),
+              kDone);
+    EXPECT_EQ(run({"analyse", folder.file("failed.csv")}), kLinkFailed) << "there is no such file";
+}
+
+TEST_F(AnalyseVerbTest, SaveOrCommandThatFails_IsReportedAndTheSweepsGoOn) {
+    folder.write("mask.csv", "x;upper;lower\n0;-150;\n3e9;-150;\n");
+    EXPECT_EQ(
+        runConnected({"sweep", "--count", "3", "--analyse",
+                      "--mask " + folder.file("mask.csv") + " --save-failed " +
+                          folder.file("no/folder/x.csv") + " --run-failed no-such-command-here"}),
+        kLinkFailed);
+    EXPECT_EQ(printed().size(), 6U) << out.str();
+    EXPECT_NE(errors.str().find("no/folder/x.csv"), std::string::npos) << errors.str();
+    EXPECT_NE(errors.str().find("zelctl: The command no-such-command-here cannot be started"),
+              std::string::npos)
+        << errors.str();
+}
+
+TEST_F(AnalyseVerbTest, WatchOptionsThatDoNotGoTogether_AreWrongUse) {
+    for (const char* options :
+         {"--save-failed a.csv", "--mask m.csv --save-after 2", "--mask m.csv --run-failed \"\"",
+          "--mask m.csv --hold max --save-failed a.csv"})
+        EXPECT_EQ(runConnected({"sweep", "--analyse", options}), kWrongUse) << options;
 }
 
 }  // namespace

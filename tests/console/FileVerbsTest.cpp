@@ -2,48 +2,13 @@
 
 #include <gtest/gtest.h>
 
-#include <sstream>
-
-#include "console/Fronts.h"
 #include "console/PanelSession.h"
-#include "console/Tool.h"
-#include "tests/files/DiskFolder.h"
-#include "tests/files/FileSession.h"
+#include "tests/console/ToolRun.h"
 
 namespace zel {
 namespace {
 
-struct FileVerbsTest : ::testing::Test {
-    int run(std::vector<std::string> words) {
-        words.insert(words.begin(), {"zelctl", "--home", folder.file("home")});
-        std::vector<const char*> list;
-        list.reserve(words.size());
-        for (const std::string& word : words) list.push_back(word.c_str());
-        out.str("");
-        errors.str("");
-        Options options;
-        if (const auto status =
-                parseOptions(static_cast<int>(list.size()), list.data(), options, out, errors))
-            return *status;
-        const bool simulated = options.address && options.address->simulated;
-        const auto front =
-            simulated ? makeSimulatorFront(options.home) : makePortFront(options.home);
-        return runTool(options, *front, {out, errors});
-    }
-    int runConnected(std::vector<std::string> words) {
-        words.insert(words.begin(), {"--connect", "sim:"});
-        return run(std::move(words));
-    }
-    Texts printed() const {
-        Texts lines;
-        std::istringstream in(out.str());
-        for (std::string line; std::getline(in, line);) lines.push_back(line);
-        return lines;
-    }
-    DiskFolder folder;
-    std::ostringstream out;
-    std::ostringstream errors;
-};
+using FileVerbsTest = ToolRun;
 
 TEST_F(FileVerbsTest, Sweep_SavesTheViewBesideTheRows) {
     EXPECT_EQ(runConnected({"sweep", "--output", folder.file("view.csv")}), kDone);
