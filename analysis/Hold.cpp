@@ -1,6 +1,7 @@
 #include "analysis/Hold.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace zel {
 namespace {
@@ -21,6 +22,16 @@ bool fits(const SpectrumTrace& axes, const SpectrumTrace& trace) {
 
 bool sameAxes(const SpectrumTrace& one, const SpectrumTrace& other) {
     return one.xUnit == other.xUnit && one.unit == other.unit && one.x == other.x;
+}
+
+bool closeAxes(const SpectrumTrace& one, const SpectrumTrace& other) {
+    if (one.xUnit != other.xUnit || one.unit != other.unit || one.x.size() != other.x.size())
+        return false;
+    if (one.x.empty()) return true;
+    constexpr double kShare = 0.01;  // of a step
+    const double close = kShare * std::max(std::fabs(one.step()), std::fabs(other.step()));
+    return std::fabs(one.x.front() - other.x.front()) <= close &&
+           std::fabs(one.x.back() - other.x.back()) <= close;
 }
 
 bool Hold::add(const SpectrumTrace& trace) {

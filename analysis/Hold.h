@@ -18,6 +18,9 @@ enum class HoldKind {
 /// Two traces can be put together: same axis and unit.
 bool sameAxes(const SpectrumTrace& one, const SpectrumTrace& other);
 
+/// The axes are the same but for the digits that a saved view cuts off.
+bool closeAxes(const SpectrumTrace& one, const SpectrumTrace& other);
+
 /// The hold over all traces that were added. Sums are exact to the last bits of a double for any
 /// number of traces (Kahan), so that a hold may run for days.
 class Hold {

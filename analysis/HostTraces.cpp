@@ -51,7 +51,7 @@ SpectrumTrace HostTraces::held(HoldKind kind) const {
 std::optional<SpectrumTrace> HostTraces::normalised(const SpectrumTrace& sweep,
                                                     std::size_t place) const {
     const auto& reference = memories_.at(place);
-    if (!reference || !sameAxes(*reference, sweep)) return std::nullopt;
+    if (!reference || !closeAxes(*reference, sweep)) return std::nullopt;
     SpectrumTrace less = sweep;
     less.unit = "dB";
     for (std::size_t i = 0; i < less.level.size(); ++i) less.level[i] -= reference->level[i];

@@ -66,13 +66,35 @@ std::string place(Graph3D& graph, const Numbers& numbers) {
     return {};
 }
 
+std::string moveCursor(Graph& graph, const Numbers& numbers) {
+    const bool there = numbers[0] == std::floor(numbers[0]) && numbers[0] >= 1 &&
+                       numbers[0] <= graph.cursorCount();
+    if (!there) return "there is no such cursor";
+    if (!graph.cursor(static_cast<int>(numbers[0])).Visible) return "the cursor is not shown";
+    graph.CursorMoved(static_cast<int>(numbers[0]), numbers[1], numbers[2]);
+    return {};
+}
+
+std::string drawRectangle(Graph& graph, const Numbers& numbers) {
+    if (!(numbers[1] > numbers[0]) || !(numbers[3] > numbers[2])) return "the rectangle is empty";
+    graph.setXRange(numbers[0], numbers[1]);
+    graph.setYRange(numbers[2], numbers[3]);
+    graph.ZoomFinished();
+    return {};
+}
+
+template <class G>
 struct Command {
     std::string_view word;
     std::size_t count;
     const char* use;
-    std::string (*run)(Graph3D& graph, const Numbers& numbers);
+    std::string (*run)(G& graph, const Numbers& numbers);
 };
-constexpr Command kCommands[] = {
+constexpr Command<Graph> kGraphCommands[] = {
+    {"move2d", 3, "move2d takes INDEX X Y", moveCursor},
+    {"zoom2d", 4, "zoom2d takes LEFT RIGHT BOTTOM TOP", drawRectangle},
+};
+constexpr Command<Graph3D> kCommands[] = {
     {"rotate3d", 2, "rotate3d takes LATITUDE LONGITUDE", rotate},
     {"zoom3d", 1, "zoom3d takes DISTANCE", zoom},
     {"pan3d", 3, "pan3d takes X Y Z", pan},
@@ -80,17 +102,28 @@ constexpr Command kCommands[] = {
     {"place3d", 2, "place3d takes PLOT POINT", place},
 };
 
-}  // namespace
-
-bool runGraph3DCommand(Graph3D& graph, std::string_view word, std::string_view numbers,
-                       std::string& problem) {
-    for (const Command& command : kCommands) {
+template <class G, std::size_t count>
+bool run(const Command<G> (&commands)[count], G& graph, std::string_view word,
+         std::string_view numbers, std::string& problem) {
+    for (const Command<G>& command : commands) {
         if (command.word != word) continue;
         Numbers values;
         problem = parse(numbers, command.count, values) ? command.run(graph, values) : command.use;
         return true;
     }
     return false;
+}
+
+}  // namespace
+
+bool runGraph3DCommand(Graph3D& graph, std::string_view word, std::string_view numbers,
+                       std::string& problem) {
+    return run(kCommands, graph, word, numbers, problem);
+}
+
+bool runGraphCommand(Graph& graph, std::string_view word, std::string_view numbers,
+                     std::string& problem) {
+    return run(kGraphCommands, graph, word, numbers, problem);
 }
 
 }  // namespace zel

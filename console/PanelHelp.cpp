@@ -59,6 +59,8 @@ const std::vector<std::string>& panelHelp() {
         "disconnect                      the menu's disconnect",
         "answer TEXT                     the answer to the next question, prompt or file dialog",
         "pump MS                         lets events run for MS milliseconds",
+        "move2d INDEX X Y                drags a cursor of the graph to that point",
+        "zoom2d LEFT RIGHT BOTTOM TOP    draws a zoom rectangle on the graph",
         "rotate3d LATITUDE LONGITUDE     turns the 3D graph",
         "zoom3d DISTANCE                 the distance of the eye",
         "pan3d X Y Z                     moves the 3D graph",

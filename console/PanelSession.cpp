@@ -182,7 +182,8 @@ void PanelSession::execute(std::string_view line) {
     program_.sessionLog().input(std::string(line));
     const auto [word, rest] = firstWord(line);
     std::string problem;
-    if (runGraph3DCommand(program_.forms().waterfall.Graph3D, word, rest, problem)) {
+    if (runGraph3DCommand(program_.forms().waterfall.Graph3D, word, rest, problem) ||
+        runGraphCommand(program_.forms().controller.CWGraph1, word, rest, problem)) {
         if (!problem.empty()) complain(problem);
         return;
     }

@@ -19,6 +19,8 @@
 #include "shell/Program.h"
 #include "support/ErrorReport.h"
 #include "support/ExitStatus.h"
+#include "support/LoggedDialogs.h"
+#include "support/SessionLog.h"
 #include "support/VersionInfo.h"
 
 namespace {
@@ -55,7 +57,10 @@ int main(int argc, char** argv) {
             ? QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Language", ""))
             : QString::fromStdString(options.language);
     zel::useLanguage(language, QString::fromStdString(platform.folder.programPath()));
-    zel::Program program(platform.bundle(), options.words);
+    zel::LoggedBoxes boxes(platform.boxes);
+    zel::LoggedFileDialogs dialogs(platform.fileDialogs);
+    zel::Program program(platform.bundle(boxes, dialogs), options.words);
+    boxes.log = dialogs.log = &program.sessionLog();
     zel::offerRehearsal(program, platform.boxes, platform.files);
     if (!options.log.empty()) program.recordSession(options.log, "zelremote " + options.given);
     application.catchInto([&program] { program.showFailure(); });
@@ -92,11 +97,16 @@ int main(int argc, char** argv) {
             program.errorReport().displayCrash(trace);
         zel::traceFaultsInto({program.crashFile(), program.logs().rootDebug.FileName});
         if (!options.file.empty()) program.forms().controller.OpenFile(options.file);
-        if (options.address) program.connect(*options.address, true);
+        if (options.address) {
+            program.sessionLog().input("connect");
+            program.connect(*options.address, true);
+        }
         if (program.ended()) return;
         if (options.screenshot.empty()) {
-            if (program.forms().controller.isConnected)
+            if (program.forms().controller.isConnected) {
+                program.sessionLog().clicked("PlayContinuousButton");
                 program.forms().controller.PlayContinuousButton.Click();
+            }
             return;
         }
         QApplication::processEvents();

@@ -105,20 +105,26 @@ void copyGraph(const Graph& graph, Graph& shown) {
 }
 
 QString save(const Graph& graph, const ViewAnnotations& view, const QString& path, QSize size,
-             bool dark) {
+             bool dark, const OverlayPicture& tools) {
     QString problem;
     const Kind* kind = kindOf(path, problem);
     if (kind == nullptr) return problem;
     if (qobject_cast<QApplication*>(QCoreApplication::instance()) == nullptr)
         return "Pictures cannot be drawn here";
     QCustomPlot plot;
-    GraphPlot picture(plot, dark && !kind->paper ? darkGraph() : lightGraph());
+    const bool paper = !dark || kind->paper;
+    GraphPlot picture(plot, paper ? lightGraph() : darkGraph());
     Form form("picture");
     Graph shown(form, "graph");
     copyGraph(graph, shown);
     picture.setTraceWidth(kind->pen);
     picture.update(shown, view);
     if (!kind->keepsClip) picture.clipToView();
+    if (!tools.empty()) {
+        TraceOverlay overlay(plot, paper);
+        overlay.show(tools);
+        if (!kind->keepsClip) overlay.clipToView();
+    }
     const QByteArray bytes = kind->write(plot, size);
     if (bytes.isEmpty()) return "Cannot draw " + path;
     return writePicture(path, bytes);
@@ -127,8 +133,8 @@ QString save(const Graph& graph, const ViewAnnotations& view, const QString& pat
 }  // namespace
 
 bool saveGraphImage(const Graph& graph, const ViewAnnotations& view, const QString& path,
-                    QString* error, QSize size, bool dark) {
-    const QString problem = save(graph, view, path, size, dark);
+                    QString* error, QSize size, bool dark, const OverlayPicture& tools) {
+    const QString problem = save(graph, view, path, size, dark, tools);
     if (error != nullptr) *error = problem;
     return problem.isEmpty();
 }

@@ -7,6 +7,7 @@
 #include <cmath>
 
 #include "desktop/platform/KeyCodes.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {
@@ -24,7 +25,6 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
       annotate_(std::move(annotate)),
       band_(new QRubberBand(QRubberBand::Rectangle, this)) {
     picture_ = std::make_unique<GraphPlot>(*this);
-    picture_->setBand(true);
     picture_->setMarkerTexts(true);
     setAccessibleName(QObject::tr("Graph"));
     setMouseTracking(true);
@@ -51,6 +51,8 @@ void GraphWidget::showPointer(const QPointF& pixel) {
         setCursor(panFrom_ ? Qt::ClosedHandCursor : Qt::OpenHandCursor);
     } else if (zooming()) {
         setCursor(Qt::CrossCursor);
+    } else if (hostDragged_ > 0 || (hostMarkerAt && hostMarkerAt(pixel) > 0)) {
+        setCursor(Qt::SizeHorCursor);
     } else if (movable && (dragged_ > 0 || picture_->cursorAt(pixel) > 0)) {
         setCursor(Qt::SplitHCursor);
     } else {
@@ -78,6 +80,8 @@ void GraphWidget::mousePressEvent(QMouseEvent* event) {
         return showPointer(event->position());
     }
     if (event->button() != Qt::LeftButton) return;
+    hostDragged_ = zooming() || !hostMarkerAt ? 0 : hostMarkerAt(event->position());
+    if (hostDragged_ > 0) return showPointer(event->position());
     if (zooming()) {
         bandStart_ = clamped(event->position()).toPoint();
         band_->setGeometry(QRect(bandStart_, QSize()));
@@ -94,6 +98,8 @@ void GraphWidget::mouseMoveEvent(QMouseEvent* event) {
         return;
     }
     if (panFrom_) return panTo(pixel);
+    if (hostDragged_ > 0)
+        return hostMarkerMoved(hostDragged_, xAxis->pixelToCoord(clamped(pixel).x()));
     showPointer(pixel);
     if (dragged_ > 0) return moveCursor(dragged_, xAxis->pixelToCoord(clamped(pixel).x()));
     if (!picture_->axisRect().rect().contains(pixel.toPoint()) || graph_.values().empty()) {
@@ -148,7 +154,7 @@ void GraphWidget::contextMenuEvent(QContextMenuEvent* event) {
 }
 
 void GraphWidget::mouseReleaseEvent(QMouseEvent* event) {
-    dragged_ = 0;
+    dragged_ = hostDragged_ = 0;
     if (panFrom_) {
         panFrom_.reset();
         return showPointer(event->position());
@@ -158,12 +164,20 @@ void GraphWidget::mouseReleaseEvent(QMouseEvent* event) {
     finishZoom(QRect(bandStart_, clamped(event->position()).toPoint()).normalized());
 }
 
+void GraphWidget::tell(const char* word, std::initializer_list<double> numbers) {
+    if (!told) return;
+    std::string line = word;
+    for (const double number : numbers) line += " " + shortestNumber(number);
+    told(line);
+}
+
 void GraphWidget::finishZoom(const QRect& rectangle) {
     if (rectangle.width() < kSmallestRectangle || rectangle.height() < kSmallestRectangle) return;
     const double left = xAxis->pixelToCoord(rectangle.left());
     const double right = xAxis->pixelToCoord(rectangle.right());
     const double bottom = yAxis->pixelToCoord(rectangle.bottom());
     const double top = yAxis->pixelToCoord(rectangle.top());
+    tell("zoom2d", {left, right, bottom, top});
     if (navigator_ != nullptr) {
         navigator_->showRectangle({left, right, bottom, top});
     } else {
@@ -175,6 +189,7 @@ void GraphWidget::finishZoom(const QRect& rectangle) {
 
 void GraphWidget::moveCursor(int index, double x) {
     const QPointF point = picture_->pointAt(x);
+    tell("move2d", {static_cast<double>(index), point.x(), point.y()});
     graph_.CursorMoved(index, point.x(), point.y());
 }
 

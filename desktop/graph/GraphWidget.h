@@ -37,6 +37,11 @@ class GraphWidget : public QCustomPlot {
     std::function<void(std::optional<double>)> pointed;
     /// Before and after the text of the pointer is written.
     std::function<void(bool before)> tracking;
+    /// The number of the host's marker within reach of a pixel, 0 for none; it is dragged to an x.
+    std::function<int(const QPointF&)> hostMarkerAt;
+    std::function<void(int number, double x)> hostMarkerMoved;
+    /// What the user does to the graph, as a line of a panel session: "move2d 1 9e8 -30".
+    std::function<void(const std::string&)> told;
     /// A menu is asked for at a place of the screen; x is where the pointer is on the axis.
     std::function<void(QPoint, double)> menuAsked;
 
@@ -58,6 +63,7 @@ class GraphWidget : public QCustomPlot {
     /// The pointer's shape: a cross while a rectangle is awaited, arrows over a cursor to drag.
     void showPointer(const QPointF& pixel);
     void moveCursor(int index, double x);
+    void tell(const char* word, std::initializer_list<double> numbers);
     void finishZoom(const QRect& rectangle);
     QPointF clamped(const QPointF& pixel);
 
@@ -68,6 +74,7 @@ class GraphWidget : public QCustomPlot {
     QRubberBand* band_;
     QPoint bandStart_;
     int dragged_ = 0;
+    int hostDragged_ = 0;  ///< marker of the host
     bool spaceHeld_ = false;
     std::optional<QPointF> panFrom_;  ///< pixel where the pan has got to
 };

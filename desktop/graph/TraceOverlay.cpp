@@ -2,6 +2,8 @@
 
 #include <array>
 
+#include "desktop/graph/PolylineClip.h"
+
 namespace zel {
 namespace {
 
@@ -34,15 +36,22 @@ QColor hostTraceColor(std::size_t place) {
 
 QColor limitColor() { return {0xff, 0x6b, 0x6b}; }
 
-TraceOverlay::TraceOverlay(QCustomPlot& plot) : plot_(plot) {
+// Pale on a dark ground, dark on paper.
+QColor TraceOverlay::ink(const QColor& color) const {
+    constexpr int kDarker = 190;  // percent
+    return paper_ ? color.darker(kDarker) : color;
+}
+
+TraceOverlay::TraceOverlay(QCustomPlot& plot, bool paper) : plot_(plot), paper_(paper) {
     plot_.addLayer(kLayer, plot_.layer("main"), QCustomPlot::limBelow);
     foot_ = addText(plot_, 0.01, 0.985, Qt::AlignLeft | Qt::AlignBottom);
     notice_ = addText(plot_, 0.5, 0.16, Qt::AlignHCenter | Qt::AlignTop);
-    notice_->setColor(kText);
+    const QColor words = paper_ ? QColor(Qt::black) : kText;
+    notice_->setColor(words);
     // The trace runs under these words.
-    for (QCPItemText* words : {foot_, notice_}) {
-        words->setBrush(QColor(0x06, 0x09, 0x0d, 0xd8));
-        words->setPadding(QMargins(4, 2, 4, 2));
+    for (QCPItemText* text : {foot_, notice_}) {
+        text->setBrush(paper_ ? QColor(Qt::white) : QColor(0x06, 0x09, 0x0d, 0xd8));
+        text->setPadding(QMargins(4, 2, 4, 2));
     }
 }
 
@@ -59,7 +68,7 @@ void TraceOverlay::show(const OverlayPicture& picture) {
     for (std::size_t i = 0; i < curves_.size(); ++i) {
         const OverlayCurve& curve = picture.curves[i];
         curves_[i]->setData(curve.x, curve.y, true);
-        curves_[i]->setPen(QPen(curve.color, 1, curve.dashed ? Qt::DashLine : Qt::SolidLine));
+        curves_[i]->setPen(QPen(ink(curve.color), 1, curve.dashed ? Qt::DashLine : Qt::SolidLine));
     }
     while (points_.size() > picture.markers.size()) {
         plot_.removeItem(points_.back());
@@ -71,10 +80,10 @@ void TraceOverlay::show(const OverlayPicture& picture) {
         auto* point = new QCPItemTracer(&plot_);
         point->setStyle(QCPItemTracer::tsSquare);
         point->setSize(6);
-        point->setPen(QPen(hostTraceColor(7), 1));
+        point->setPen(QPen(ink(hostTraceColor(7)), 1));
         auto* label = addText(plot_, 0, 0, Qt::AlignHCenter | Qt::AlignBottom);
         label->position->setType(QCPItemPosition::ptPlotCoords);
-        label->setColor(hostTraceColor(7));
+        label->setColor(ink(hostTraceColor(7)));
         label->setClipToAxisRect(false);  // a marker may stand at the edge
         label->setPadding(QMargins(0, 0, 0, 5));
         points_.push_back(point);
@@ -87,14 +96,21 @@ void TraceOverlay::show(const OverlayPicture& picture) {
         points_[i]->position->setCoords(marker.x, marker.y);
         points_[i]->setVisible(seen);
         labels_[i]->position->setCoords(marker.x, marker.y);
-        labels_[i]->setText(marker.label);
+        labels_[i]->setText("M" + QString::number(marker.number));
         labels_[i]->setVisible(seen);
     }
     foot_->setText(picture.foot);
-    foot_->setColor(picture.failed ? limitColor() : kText);
+    foot_->setColor(picture.failed ? ink(limitColor()) : paper_ ? QColor(Qt::black) : kText);
     foot_->setVisible(!picture.foot.isEmpty());
     notice_->setText(picture.notice);
     notice_->setVisible(!picture.notice.isEmpty());
+}
+
+void TraceOverlay::clipToView() {
+    const QCPRange x = plot_.xAxis->range();
+    const QCPRange y = plot_.yAxis->range();
+    for (QCPGraph* curve : curves_)
+        clipLine(*curve, linePoints(*curve), {x.lower, y.lower, x.size(), y.size()});
 }
 
 }  // namespace zel

@@ -17,7 +17,7 @@ struct OverlayCurve {
 struct OverlayMarker {
     double x = 0;
     double y = 0;
-    QString label;
+    int number = 0;  ///< from 1
 };
 
 struct OverlayPicture {
@@ -25,6 +25,9 @@ struct OverlayPicture {
     std::vector<OverlayMarker> markers;
     QString foot;  ///< verdict and corrections, at the lower left
     bool failed = false;
+    bool empty() const {
+        return curves.empty() && markers.empty() && foot.isEmpty() && notice.isEmpty();
+    }
     QString notice;  ///< what ended, at the top
 };
 
@@ -35,12 +38,18 @@ QColor limitColor();
 /// The items belong to the plot; all of them lie under the live trace.
 class TraceOverlay {
   public:
-    explicit TraceOverlay(QCustomPlot& plot);
+    /// `paper`: for a light ground.
+    explicit TraceOverlay(QCustomPlot& plot, bool paper = false);
     /// Replaces what is shown; the caller replots.
     void show(const OverlayPicture& picture);
+    /// Ends the curves at the edges of the graticule, for pictures whose format has no clip.
+    void clipToView();
 
   private:
+    QColor ink(const QColor& color) const;
+
     QCustomPlot& plot_;
+    bool paper_;
     std::vector<QCPGraph*> curves_;
     std::vector<QCPItemTracer*> points_;
     std::vector<QCPItemText*> labels_;

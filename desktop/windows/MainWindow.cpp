@@ -107,6 +107,7 @@ void MainWindow::buildWindows() {
         SessionLog& record = program_.sessionLog();
         act == "click" ? record.clicked(what) : record.input(act + " " + what);
     };
+    graph().told = [this](const std::string& line) { program_.sessionLog().input(line); };
     Forms& forms = program_.forms();
     offer<ConnectionWindow>(forms.main);
     offer<WaterfallWindow>(forms.waterfall, forms);
@@ -234,6 +235,7 @@ void MainWindow::greyWhatRefuses() {
 
 void MainWindow::connectTo(const LinkAddress& address) {
     if (panel_.isConnected || program_.forms().main.IsConnecting) return;
+    program_.sessionLog().input("connect");
     program_.connect(address, true);
 }
 
@@ -306,7 +308,8 @@ void MainWindow::addLanguageMenu(const QString& now,
 void MainWindow::drawImage(const std::string& path, std::string& problem) {
     QString error;
     saveGraphImage(panel_.CWGraph1, annotateView(panel_, program_.variables()),
-                   QString::fromStdString(path), &error, graph().size().expandedTo(kSmallestImage));
+                   QString::fromStdString(path), &error, graph().size().expandedTo(kSmallestImage),
+                   true, findChild<TraceToolsDock*>()->picture());
     problem = error.toStdString();
 }
 

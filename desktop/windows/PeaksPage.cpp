@@ -16,6 +16,7 @@ namespace zel {
 namespace {
 
 constexpr int kMostPeaks = 50;
+constexpr int kPlaceColumn = 3;
 constexpr int kFollowed = 10;  // peaks that a marker may follow
 constexpr int kFixed = kFollowed + 1;
 constexpr double kMostDecibels = 1000;
@@ -35,7 +36,10 @@ QTableWidget* makeTable(const QStringList& names, const QString& name) {
 
 void put(QTableWidget& table, int row, int column, const QString& text) {
     QTableWidgetItem* item = table.item(row, column);
-    if (item == nullptr) table.setItem(row, column, item = new QTableWidgetItem);
+    if (item == nullptr) {
+        table.setItem(row, column, item = new QTableWidgetItem);
+        if (column != kPlaceColumn) item->setFlags(item->flags() & ~Qt::ItemIsEditable);
+    }
     if (item->text() != text) item->setText(text);
 }
 
@@ -166,7 +170,35 @@ MarkersPage::MarkersPage(TraceTools& tools) : TracePage(tools) {
         for (QComboBox* box : {follows_.at(i), delta_.at(i)})
             connect(box, &QComboBox::activated, this, [this] { takeSettings(); });
     }
+    table_->setEditTriggers(QAbstractItemView::DoubleClicked | QAbstractItemView::EditKeyPressed |
+                            QAbstractItemView::AnyKeyPressed);
+    table_->setToolTip("A place can be typed into the column x; the mouse drags a marker");
+    connect(table_, &QTableWidget::itemChanged, this, [this](QTableWidgetItem* item) {
+        if (item->column() == kPlaceColumn) takePlace(item->row(), item->text());
+    });
     layout->addWidget(table_);
+    word_ = new QLabel;
+    word_->setObjectName("MarkersWord");
+    word_->setWordWrap(true);
+    layout->addWidget(word_);
+    showState();
+}
+
+void MarkersPage::takePlace(int row, const QString& text) {
+    const auto& trace = tools_.trace();
+    const auto x = quantityOf(text);
+    word_->clear();
+    if (!x) {
+        word_->setText("This is no place: " + text + "; 935.2M is one");
+    } else if (trace && !trace->x.empty() && (*x < trace->x.front() || *x > trace->x.back())) {
+        word_->setText("The sweep does not reach " + placeText(x, trace->xUnit));
+    } else {
+        HostMarker& marker = tools_.markers.at(static_cast<std::size_t>(row));
+        marker.on = true;
+        marker.peak = 0;
+        marker.x = *x;
+    }
+    tools_.refresh();
     showState();
 }
 
@@ -205,6 +237,7 @@ void MarkersPage::follow(std::size_t peak) {
 }
 
 void MarkersPage::showState() {
+    const QSignalBlocker quiet(table_);  // what is written here was not typed
     const AnalysisResult& result = tools_.result();
     for (std::size_t i = 0; i < kHostMarkers; ++i) {
         const HostMarker& marker = tools_.markers.at(i);

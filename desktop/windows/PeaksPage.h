@@ -2,6 +2,7 @@
 // The page of the peaks, and the page of the markers that follow them.
 
 #include <QComboBox>
+#include <QLabel>
 #include <QLineEdit>
 #include <QTableWidget>
 #include <array>
@@ -37,8 +38,10 @@ class MarkersPage : public TracePage {
 
   private:
     void takeSettings();
+    void takePlace(int row, const QString& text);
 
     QTableWidget* table_;
+    QLabel* word_;
     std::array<QComboBox*, kHostMarkers> follows_{};
     std::array<QComboBox*, kHostMarkers> delta_{};
 };

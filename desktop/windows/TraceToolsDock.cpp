@@ -7,8 +7,10 @@
 #include <algorithm>
 #include <cmath>
 
+#include "desktop/windows/FaultPage.h"
 #include "desktop/windows/PowerPage.h"
 #include "desktop/windows/StatisticsPage.h"
+#include "desktop/windows/WatchPage.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
 #include "support/NumberText.h"
@@ -18,6 +20,7 @@ namespace zel {
 namespace {
 
 constexpr QSize kUsualSize(460, 430);
+constexpr int kTopic = 2112;        // of the help book
 constexpr double kHeadroom = 0.05;  // of the levels' extent, above and below
 
 }  // namespace
@@ -27,9 +30,11 @@ TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow
       program_(program),
       panel_(program.forms().controller),
       graph_(graph),
+      watch_(program.files(), command_, program.clock()),
       overlay_(graph),
       pages_(new QTabWidget) {
     setObjectName("TraceTools");
+    setProperty("topic", kTopic);
     markers_ = new MarkersPage(tools_);
     traces_ = new TracesPage(tools_, [this] { scaleLevelAxis(); });
     limits_ = new LimitsPage(tools_);
@@ -40,12 +45,15 @@ TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow
         {QT_TRANSLATE_NOOP("QObject", "Markers"), markers_},
         {QT_TRANSLATE_NOOP("QObject", "Power"), new PowerPage(tools_)},
         {QT_TRANSLATE_NOOP("QObject", "Limits"), limits_},
-        {QT_TRANSLATE_NOOP("QObject", "Statistics"), new StatisticsPage(tools_)}};
+        {QT_TRANSLATE_NOOP("QObject", "Watch"), new WatchPage(tools_, watch_)},
+        {QT_TRANSLATE_NOOP("QObject", "Statistics"), new StatisticsPage(tools_)},
+        {QT_TRANSLATE_NOOP("QObject", "Fault"), new FaultPage(tools_)}};
     for (const auto& [name, page] : pages) pages_->addTab(page, QObject::tr(name));
     connect(pages_, &QTabWidget::currentChanged, this, [this] { showLater(); });
     setWidget(pages_);
     resize(kUsualSize);
     follow();
+    letMarkersMove();
 }
 
 TraceToolsDock::~TraceToolsDock() = default;
@@ -77,6 +85,8 @@ void TraceToolsDock::takeSweep(bool loaded) {
     source.mode = panel_.InstrumentMode;
     if (panel_.Shown.fromFile) source.rbw = leadingNumber(panel_.Shown.rbw);
     tools_.take(program_.sweep(), source);
+    // What was saved once is not watched again.
+    if (!loaded) watch_.take(program_.sweep(), tools_.result().mask.value_or(MaskVerdict{}));
 }
 
 void TraceToolsDock::showLater() {
@@ -107,6 +117,38 @@ double TraceToolsDock::graphX(double x) const {
     const Graph& graph = panel_.CWGraph1;
     const double pairs = program_.sweep().autoPeak() ? 2 : 1;
     return graph.firstX() + (x - trace->x.front()) / step * pairs * graph.increment();
+}
+
+double TraceToolsDock::traceX(double graphX) const {
+    const auto& trace = tools_.trace();
+    const double step = trace ? trace->step() : 0;
+    const Graph& graph = panel_.CWGraph1;
+    const double width = graph.increment() * (program_.sweep().autoPeak() ? 2 : 1);
+    if (step <= 0 || width == 0) return graphX;
+    return std::clamp(trace->x.front() + (graphX - graph.firstX()) / width * step, trace->x.front(),
+                      trace->x.back());
+}
+
+void TraceToolsDock::letMarkersMove() {
+    graph_.hostMarkerAt = [this](const QPointF& pixel) {
+        constexpr double kReach = 8;  // pixels
+        int nearest = 0;
+        double distance = kReach;
+        for (const OverlayMarker& marker : picture().markers) {
+            const double away = std::hypot(graph_.xAxis->coordToPixel(marker.x) - pixel.x(),
+                                           graph_.yAxis->coordToPixel(marker.y) - pixel.y());
+            if (away > distance) continue;
+            distance = away;
+            nearest = marker.number;
+        }
+        return nearest;
+    };
+    graph_.hostMarkerMoved = [this](int number, double x) {
+        HostMarker& marker = tools_.markers.at(static_cast<std::size_t>(number) - 1);
+        marker.peak = 0;
+        marker.x = traceX(x);
+        tools_.refresh();
+    };
 }
 
 std::optional<double> TraceToolsDock::graphY(double level) const {
@@ -145,29 +187,29 @@ OverlayPicture TraceToolsDock::picture() const {
     if (now) {
         for (std::size_t i = 0; i < kHolds; ++i)
             if (tools.traces().isOn(static_cast<HoldKind>(i)))
-                addCurve(picture, tools.traces().held(static_cast<HoldKind>(i)), hostTraceColor(i));
+                addCurve(picture, tools.traces().held(static_cast<HoldKind>(i)), traces_->color(i));
         for (std::size_t i = 0; i < kMemories; ++i) {
             const auto& memory = tools.traces().memory(i);
             if (!memory || !traces_->memoryShown(i)) continue;
-            if (sameAxes(*memory, *now)) {
-                addCurve(picture, *memory, hostTraceColor(kHolds + i));
+            if (closeAxes(*memory, *now)) {
+                addCurve(picture, *memory, traces_->color(kHolds + i));
             } else {
                 foot << "Reference " + QString::number(i + 1) + " has another span or unit";
             }
         }
         if (const auto less = traces_->normalisedBy()) {
             if (const auto trace = tools.traces().normalised(*now, *less)) {
-                addCurve(picture, *trace, hostTraceColor(kHolds + kMemories));
+                addCurve(picture, *trace, traces_->color(kHolds + kMemories));
                 foot << "Sweep less reference " + QString::number(*less + 1) + ", dB";
             }
         }
         if (!tools.corrections().empty())
-            addCurve(picture, *now, hostTraceColor(kHolds + kMemories));
+            addCurve(picture, *now, traces_->color(kHolds + kMemories));
         for (std::size_t i = 0; i < kHostMarkers; ++i) {
             const MarkerReading& reading = tools.readings().at(i);
             if (!reading.x || !reading.level) continue;
             if (const auto y = graphY(*reading.level))
-                picture.markers.push_back({graphX(*reading.x), *y, "M" + QString::number(i + 1)});
+                picture.markers.push_back({graphX(*reading.x), *y, static_cast<int>(i) + 1});
         }
     }
     if (const auto& mask = tools.request.mask) {

@@ -6,8 +6,10 @@
 #include <array>
 #include <memory>
 
+#include "analysis/MaskWatch.h"
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/graph/TraceOverlay.h"
+#include "desktop/platform/SystemCommand.h"
 #include "desktop/windows/LimitsPage.h"
 #include "desktop/windows/PeaksPage.h"
 #include "desktop/windows/TracesPage.h"
@@ -25,6 +27,10 @@ class TraceToolsDock : public QDockWidget {
 
     TraceTools& tools() { return tools_; }
     LimitsPage& limits() { return *limits_; }
+    TracesPage& traces() { return *traces_; }
+    MaskWatch& watch() { return watch_; }
+    /// What is drawn over the graph now.
+    OverlayPicture picture() const;
     QTabWidget& pages() { return *pages_; }
     /// The entries of the menu "Trace".
     void fill(QMenu& menu);
@@ -38,7 +44,8 @@ class TraceToolsDock : public QDockWidget {
     void follow();
     void takeSweep(bool loaded);
     void showLater();
-    OverlayPicture picture() const;
+    void letMarkersMove();
+    double traceX(double graphX) const;
     void addCurve(OverlayPicture& picture, const SpectrumTrace& trace, const QColor& color) const;
     double graphX(double x) const;
     std::optional<double> graphY(double level) const;
@@ -48,6 +55,8 @@ class TraceToolsDock : public QDockWidget {
     ControllerForm& panel_;
     GraphWidget& graph_;
     TraceTools tools_;
+    SystemCommand command_;
+    MaskWatch watch_;
     TraceOverlay overlay_;
     QTabWidget* pages_;
     TracesPage* traces_;

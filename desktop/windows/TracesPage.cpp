@@ -1,16 +1,20 @@
 #include "desktop/windows/TracesPage.h"
 
+#include <QColorDialog>
+#include <QFile>
+#include <QFileDialog>
+#include <QPainter>
+#include <stdexcept>
+
+#include "analysis/SavedTraces.h"
 #include "desktop/graph/TraceOverlay.h"
 
 namespace zel {
 namespace {
 
-QLabel* swatch(std::size_t place) {
-    auto* label = new QLabel;
-    label->setFixedSize(18, 3);
-    label->setStyleSheet("background: " + hostTraceColor(place).name());
-    return label;
-}
+constexpr QSize kSwatch(20, 20);
+constexpr int kSwatchLine = 4;
+constexpr qint64 kLargestView = 100'000'000;
 
 QPushButton* button(const QString& text, const QString& name) {
     auto* key = new QPushButton(text);
@@ -39,20 +43,22 @@ TracesPage::TracesPage(TraceTools& tools, std::function<void()> scale) : TracePa
             tools_.traces().clear(kind);
             tools_.refresh();
         });
-        grid->addWidget(swatch(i), row, 0);
+        grid->addWidget(swatch(i, name), row, 0);
         grid->addWidget(line.on, row, 1);
-        grid->addWidget(line.count, row, 2, 1, 2);
-        grid->addWidget(line.clear, row, 4);
+        grid->addWidget(line.count, row, 2, 1, 3);
+        grid->addWidget(line.clear, row, 5);
     }
     for (std::size_t i = 0; i < kMemories; ++i) buildMemory(*grid, static_cast<int>(kHolds + i), i);
     auto* fit = button("Scale Level Axis", "Scale Level Axis");
     fit->setToolTip("Fits the level axis to what is on the graph, until the next setting");
     connect(fit, &QPushButton::clicked, this, std::move(scale));
     const int last = static_cast<int>(kHolds + kMemories);
-    grid->addWidget(fit, last, 1);
+    grid->addWidget(swatch(kColors - 1, "Corrected sweep"), last, 0);
+    grid->addWidget(new QLabel("Corrected sweep"), last, 1);
+    grid->addWidget(fit, last, 2, 1, 4);
     word_ = new QLabel;
     word_->setWordWrap(true);
-    grid->addWidget(word_, last + 1, 0, 1, 5);
+    grid->addWidget(word_, last + 1, 0, 1, 6);
     grid->setRowStretch(last + 2, 1);
     showState();
 }
@@ -60,16 +66,23 @@ TracesPage::TracesPage(TraceTools& tools, std::function<void()> scale) : TracePa
 void TracesPage::buildMemory(QGridLayout& grid, int row, std::size_t place) {
     const QString name = "Reference " + QString::number(place + 1);
     MemoryRow& line = memories_.at(place);
-    line = {button("Store", "Store " + name), new QCheckBox(name), new QCheckBox("Subtract"),
-            button("Clear", "Clear " + name)};
+    line = {button("Store", "Store " + name), button("Load...", "Load " + name),
+            new QCheckBox(name), new QCheckBox("Subtract"), button("Clear", "Clear " + name)};
     line.show->setObjectName(name);
     line.less->setObjectName("Subtract " + name);
     line.less->setToolTip("Shows the sweep less this reference, in dB");
-    grid.addWidget(swatch(kHolds + place), row, 0);
+    line.load->setToolTip("Takes the first trace of a saved view or a recording");
+    grid.addWidget(swatch(kHolds + place, name), row, 0);
     grid.addWidget(line.show, row, 1);
     grid.addWidget(line.store, row, 2);
-    grid.addWidget(line.less, row, 3);
-    grid.addWidget(line.clear, row, 4);
+    grid.addWidget(line.load, row, 3);
+    grid.addWidget(line.less, row, 4);
+    grid.addWidget(line.clear, row, 5);
+    connect(line.load, &QPushButton::clicked, this, [this, place] {
+        const QString path = QFileDialog::getOpenFileName(this, "Load Reference", {},
+                                                          "Views (*.csv *.txt);;All Files (*)");
+        if (!path.isEmpty()) loadMemory(place, path);
+    });
     connect(line.store, &QPushButton::clicked, this, [this, place] {
         if (!tools_.trace()) return;
         tools_.traces().remember(place, *tools_.trace());
@@ -86,6 +99,57 @@ void TracesPage::buildMemory(QGridLayout& grid, int row, std::size_t place) {
             if (i != place) memories_.at(i).less->setChecked(false);
         tools_.refresh();
     });
+}
+
+void TracesPage::paint(std::size_t place, const QColor& color) {
+    colors_.at(place) = color;
+    QPixmap picture(kSwatch);
+    picture.fill(Qt::transparent);
+    QPainter(&picture).fillRect(0, (kSwatch.height() - kSwatchLine) / 2, kSwatch.width(),
+                                kSwatchLine, color);
+    swatches_.at(place)->setIcon(picture);
+}
+
+QToolButton* TracesPage::swatch(std::size_t place, const QString& name) {
+    auto* key = new QToolButton;
+    key->setAutoRaise(true);
+    key->setIconSize(kSwatch);
+    key->setObjectName("Colour of " + name);
+    key->setAccessibleName("Colour of " + name);
+    key->setToolTip("Chooses the colour");
+    swatches_.at(place) = key;
+    paint(place, hostTraceColor(place));
+    connect(key, &QToolButton::clicked, this, [this, place, name] {
+        const QColor color = QColorDialog::getColor(colors_.at(place), this, "Colour of " + name);
+        if (!color.isValid()) return;
+        paint(place, color);
+        tools_.refresh();
+    });
+    return key;
+}
+
+void TracesPage::loadMemory(std::size_t place, const QString& path) {
+    fileWord_.clear();
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly) || file.size() > kLargestView) {
+        fileWord_ = "The reference was not taken: " +
+                    (file.isOpen() ? "the file is too long" : file.errorString());
+        return showState();
+    }
+    try {
+        std::optional<SpectrumTrace> first;
+        readTraces(file.readAll().toStdString(), DateOrder::YearMonthDay,
+                   [&first](const SpectrumTrace& trace) {
+                       first = trace;
+                       return false;
+                   });
+        if (first) tools_.traces().remember(place, *first);
+        memories_.at(place).show->setChecked(true);
+    } catch (const std::runtime_error& wrong) {
+        fileWord_ = "The reference was not taken: " + QString::fromUtf8(wrong.what());
+    }
+    tools_.refresh();
+    showState();
 }
 
 std::optional<std::size_t> TracesPage::normalisedBy() const {
@@ -112,8 +176,9 @@ void TracesPage::showState() {
                              static_cast<QWidget*>(memories_.at(i).clear)})
             key->setEnabled(there);
     }
-    word_->setText(QString::fromStdString(
-        tools_.problem().empty() ? tools_.traces().ended() : "No figures: " + tools_.problem()));
+    const QString word = QString::fromStdString(
+        tools_.problem().empty() ? tools_.traces().ended() : "No figures: " + tools_.problem());
+    word_->setText(fileWord_.isEmpty() ? word : fileWord_);
 }
 
 }  // namespace zel

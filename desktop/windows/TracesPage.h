@@ -5,6 +5,7 @@
 #include <QGridLayout>
 #include <QLabel>
 #include <QPushButton>
+#include <QToolButton>
 #include <array>
 
 #include "desktop/windows/TracePage.h"
@@ -22,6 +23,10 @@ class TracesPage : public TracePage {
                                                                "Average, level", "Average, power"};
 
     bool memoryShown(std::size_t place) const { return memories_.at(place).show->isChecked(); }
+    /// Of a hold, then of a reference, then (the last) of the corrected or normalised sweep.
+    QColor color(std::size_t place) const { return colors_.at(place); }
+    /// Takes a trace of a saved view or a recording as a reference; what is wrong stands below.
+    void loadMemory(std::size_t place, const QString& path);
     /// The reference that is taken away from the sweep; nothing: none.
     std::optional<std::size_t> normalisedBy() const;
 
@@ -33,12 +38,19 @@ class TracesPage : public TracePage {
     };
     struct MemoryRow {
         QPushButton* store;
+        QPushButton* load;
         QCheckBox* show;
         QCheckBox* less;
         QPushButton* clear;
     };
+    QToolButton* swatch(std::size_t place, const QString& name);
+    void paint(std::size_t place, const QColor& color);
     void buildMemory(QGridLayout& grid, int row, std::size_t place);
 
+    static constexpr std::size_t kColors = kHolds + kMemories + 1;
+    std::array<QColor, kColors> colors_{};
+    std::array<QToolButton*, kColors> swatches_{};
+    QString fileWord_;  ///< what became of the last file
     std::array<HoldRow, kHolds> holds_{};
     std::array<MemoryRow, kMemories> memories_{};
     QLabel* word_;

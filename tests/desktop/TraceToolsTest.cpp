@@ -3,11 +3,13 @@
 #include <QApplication>
 #include <QCheckBox>
 #include <QClipboard>
+#include <QFile>
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenuBar>
 #include <QPushButton>
 #include <QTableWidget>
+#include <QTemporaryDir>
 #include <QTest>
 
 #include "analysis/SavedTraces.h"
@@ -41,7 +43,7 @@ struct TraceToolsWindow : Desk {
         emit box->editingFinished();
         dock().showNow();
     }
-    enum Page { Traces, Peaks, Markers, Power, Limits, Statistics };
+    enum Page { Traces, Peaks, Markers, Power, Limits, Watch, Statistics, Fault };
 };
 
 TEST_F(TraceToolsWindow, FiguresAreThoseOfTheSavedView) {
@@ -69,7 +71,9 @@ TEST_F(TraceToolsWindow, FiguresAreThoseOfTheSavedView) {
         EXPECT_DOUBLE_EQ(shown.peaks[i].x, file.peaks[i].x);
         EXPECT_DOUBLE_EQ(shown.peaks[i].level, file.peaks[i].level);
     }
-    EXPECT_DOUBLE_EQ(shown.width.width().value(), file.width.width().value());
+    // The strongest peak stands at the left border, where it has no edge.
+    EXPECT_FALSE(shown.width.low);
+    EXPECT_DOUBLE_EQ(shown.width.high.value(), file.width.high.value());
     EXPECT_DOUBLE_EQ(shown.occupied->low, file.occupied->low);
     EXPECT_DOUBLE_EQ(shown.channels[0].power.value(), file.channels[0].power.value());
     EXPECT_EQ(shown.mask->margin, file.mask->margin);
@@ -160,6 +164,152 @@ TEST_F(TraceToolsWindow, TypedChannel_GivesItsPower) {
     EXPECT_EQ(dock().findChild<QLabel*>("Channel result")->text(), "");
 }
 
+TEST_F(TraceToolsWindow, PeakOfPairs_StandsWhereTheInstrumentsMarkerStands) {
+    connect();
+    ASSERT_EQ(panel().CWGraph1.values().size(), 602U);
+    panel().MarkerCheckBox.Click();
+    panel().MarkPkButton.Click();
+    sweep();
+    const Peak& peak = dock().tools().result().peaks.at(0);
+    EXPECT_NEAR(peak.x, panel().CWGraph1.cursor(1).X, dock().tools().trace()->step());
+    EXPECT_NEAR(window->graph().picture().levelsAt(peak.x).second, peak.level, 3);
+}
+
+TEST_F(TraceToolsWindow, ReferenceFromAFile_FitsTheSweepItWasSavedFrom) {
+    connect();
+    sweep();
+    platform.fileDialogs.answer("/view.csv");
+    panel().SaveCurrentView.Click();
+    QTemporaryDir folder;
+    QFile file(folder.filePath("view.csv"));
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+    file.write(QByteArray::fromStdString(platform.files.bytes("/view.csv")));
+    file.close();
+    page(Traces);
+    dock().traces().loadMemory(1, file.fileName());
+    ASSERT_TRUE(dock().tools().traces().memory(1));
+    dock().findChild<QCheckBox*>("Subtract Reference 2")->setChecked(true);
+    const auto less = dock().tools().traces().normalised(*dock().tools().trace(), 1);
+    ASSERT_TRUE(less);
+    for (const double level : less->level) EXPECT_NEAR(level, 0, 1e-9);
+    EXPECT_EQ(dock().picture().curves.size(), 2U);
+    dock().traces().loadMemory(2, folder.filePath("none.csv"));
+    EXPECT_FALSE(dock().tools().traces().memory(2));
+}
+
+TEST_F(TraceToolsWindow, TypedPlace_PutsTheMarkerThere) {
+    connect();
+    sweep();
+    auto* table = page(Markers)->findChild<QTableWidget*>("MarkersTable");
+    table->item(2, 3)->setText("1.2 GHz");
+    EXPECT_TRUE(dock().tools().markers[2].on);
+    EXPECT_EQ(dock().tools().markers[2].x, 1.2e9);
+    table->item(2, 3)->setText("much");
+    EXPECT_EQ(dock().findChild<QLabel*>("MarkersWord")->text(),
+              "This is no place: much; 935.2M is one");
+    table->item(2, 3)->setText("90 GHz");
+    EXPECT_EQ(dock().tools().markers[2].x, 1.2e9) << "outside of the sweep";
+    dock().showNow();
+    EXPECT_EQ(table->item(2, 3)->text(), placeText(dock().tools().readings()[2].x, "Hz"));
+}
+
+TEST_F(TraceToolsWindow, MouseDragsAMarker) {
+    connect();
+    sweep();
+    dock().tools().markers[1] = {true, 0, 1, 0};
+    dock().tools().refresh();
+    settle();
+    window->showNow();
+    GraphWidget& graph = window->graph();
+    const auto from = *dock().tools().readings()[1].x;
+    const QPoint at(qRound(graph.xAxis->coordToPixel(from)),
+                    qRound(graph.yAxis->coordToPixel(*dock().tools().readings()[1].level)));
+    QTest::mousePress(&graph, Qt::LeftButton, {}, at);
+    QTest::mouseMove(&graph, at + QPoint(60, 20));
+    QTest::mouseRelease(&graph, Qt::LeftButton, {}, at + QPoint(60, 20));
+    EXPECT_EQ(dock().tools().markers[1].peak, 0U) << "it follows the peak no more";
+    EXPECT_NEAR(dock().tools().markers[1].x, graph.xAxis->pixelToCoord(at.x() + 60), 1e6);
+    const double there = dock().tools().markers[1].x;
+    QTest::mouseMove(&graph, at);
+    EXPECT_EQ(dock().tools().markers[1].x, there);
+}
+
+TEST_F(TraceToolsWindow, Watch_SavesFailingSweepsAndRunsTheCommand) {
+    connect();
+    dock().tools().setMask(readMask("x;upper;lower\n0;-150;\n3e9;-150;\n"));
+    QWidget* watch = page(Watch);
+    QTemporaryDir folder;
+    const QString mark = folder.filePath("mark with blank");
+    dock().findChild<QLineEdit*>("WatchFile")->setText("/failed.csv");
+    dock().findChild<QCheckBox*>("WatchSave")->click();
+    dock().findChild<QLineEdit*>("WatchCommand")->setText("touch \"" + mark + "\"");
+    dock().findChild<QCheckBox*>("WatchRun")->click();
+    sweep();
+    EXPECT_EQ(dock().watch().saved(), 1U);
+    EXPECT_NE(platform.files.bytes("/failed.csv"), "");
+    QTRY_VERIFY(QFile::exists(mark));
+    // One that was loaded from a file is not saved once more.
+    panel().OpenFile("/failed.csv");
+    settle();
+    EXPECT_EQ(dock().watch().saved(), 1U);
+    EXPECT_TRUE(
+        watch->findChild<QLabel*>("WatchCounts")->text().startsWith("Watching: 1 sweep saved"));
+    dock().findChild<QLineEdit*>("WatchCommand")->setText("touch \"open");
+    emit dock().findChild<QLineEdit*>("WatchCommand")->editingFinished();
+    EXPECT_EQ(dock().findChild<QLabel*>("WatchWord")->text(),
+              "The command has a quote without an end.");
+    EXPECT_TRUE(dock().watch().settings().command.empty());
+}
+
+TEST_F(TraceToolsWindow, Fault_IsWhereTheWaveOfThisCableSaysItIs) {
+    connect();
+    QWidget* fault = page(Fault);
+    auto* table = fault->findChild<QTableWidget*>("FaultTable");
+    EXPECT_EQ(table->rowCount(), 0) << "no distances in hertz";
+    Sweep sweep = program->sweep();
+    sweep.axis = {0, 100, 0, 0.5, 300, "m"};
+    dock().tools().take(sweep, {});
+    dock().showNow();
+    ASSERT_GT(table->rowCount(), 0);
+    fault->findChild<QLineEdit*>("CableFactor")->setText("0.33");
+    emit fault->findChild<QLineEdit*>("CableFactor")->textEdited("0.33");
+    const double shown = dock().tools().result().peaks[0].x;
+    EXPECT_NEAR(table->item(0, 2)->text().section(' ', 0, 0).toDouble(), shown / 2, 1e-3);
+    fault->findChild<QLineEdit*>("CableFactor")->setText("0");
+    emit fault->findChild<QLineEdit*>("CableFactor")->textEdited("0");
+    EXPECT_EQ(table->rowCount(), 0);
+}
+
+TEST_F(TraceToolsWindow, SavedPicture_HoldsTheTools) {
+    connect();
+    sweep();
+    QTemporaryDir folder;
+    const auto draw = [&](const QString& name) {
+        const QString path = folder.filePath(name);
+        std::string problem;
+        panel().DrawImage(path.toStdString(), problem);
+        EXPECT_EQ(problem, "");
+        QFile file(path);
+        EXPECT_TRUE(file.open(QIODevice::ReadOnly));
+        return file.readAll();
+    };
+    const QByteArray plain = draw("plain.svg");
+    dock().tools().traces().switchOn(HoldKind::Max, true);
+    dock().tools().setMask(readMask("x;upper;lower\n0;-15;\n3e9;-15;\n"));
+    dock().tools().markers[0] = {true, 0, 1, 0};
+    dock().tools().refresh();
+    const QByteArray drawn = draw("tools.svg");
+    EXPECT_FALSE(plain.contains("Mask: "));
+    EXPECT_TRUE(drawn.contains("Mask: pass"));
+    EXPECT_TRUE(drawn.contains(">M1<"));
+    EXPECT_TRUE(drawn.contains(hostTraceColor(0).name().toUtf8()));
+    for (const char* name : {"tools.png", "tools.pdf", "tools.wmf"})
+        EXPECT_GT(draw(name).size(), 1000);
+    for (const char* name : {"tools.png", "tools.svg"})
+        QFile::copy(folder.filePath(name),
+                    QCoreApplication::applicationDirPath() + "/pictures/" + name);
+}
+
 TEST_F(TraceToolsWindow, Pictures_OfAllPages) {
     for (const bool dark : {true, false}) {
         applyTheme(testApplication(), dark ? ThemeChoice::Dark : ThemeChoice::Light);
@@ -181,7 +331,7 @@ TEST_F(TraceToolsWindow, Pictures_OfAllPages) {
         type("Occupied", "99");
         type("Adjacent", "50M");
         type("Channel spacing", "50M");
-        for (int i = 0; i <= Statistics; ++i) {
+        for (int i = 0; i <= Fault; ++i) {
             page(i);
             dock().resize(460, 430);
             QApplication::processEvents();
