@@ -38,6 +38,13 @@ bool HelpKeyFilter::eventFilter(QObject* watched, QEvent* event) {
     const QVariant form = window->property("form");
     const bool panel =
         qobject_cast<const QMainWindow*>(window) != nullptr && !window->property("help").isValid();
+    // A tool window has a topic of its own, be it docked or not.
+    for (const QWidget* at = widget; at != nullptr; at = at->parentWidget()) {
+        const QVariant topic = at->property("topic");
+        if (!topic.isValid()) continue;
+        open_(topic.toInt());
+        return true;
+    }
     if (!form.isValid() && !panel) return false;
     open_(panel ? kPanel : helpContextOf(form.toString()));
     return true;

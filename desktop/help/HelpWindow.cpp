@@ -13,10 +13,11 @@
 #include <QLineEdit>
 #include <QListWidget>
 #include <QSplitter>
-#include <QStyle>
 #include <QTextDocument>
 #include <QToolBar>
 #include <QVBoxLayout>
+
+#include "desktop/windows/ThemeIcons.h"
 
 namespace zel {
 namespace {
@@ -108,18 +109,16 @@ bool HelpWindow::openBook(const QString& book, const QString& home) {
 void HelpWindow::buildTools() {
     QToolBar* bar = addToolBar(QObject::tr("Pages"));
     bar->setMovable(false);
-    const auto add = [&](QStyle::StandardPixmap icon, const QString& text, QKeySequence key) {
-        QAction* action = bar->addAction(style()->standardIcon(icon), text);
+    const auto add = [&](const char* icon, const QString& text, const QKeySequence& key) {
+        QAction* action = bar->addAction(themeIcon(icon), text);
         action->setShortcut(key);
         action->setToolTip(text + " (" + key.toString(QKeySequence::NativeText) + ")");
         return action;
     };
-    QAction* back =
-        add(QStyle::SP_ArrowBack, QObject::tr("Back"), QKeySequence(Qt::ALT | Qt::Key_Left));
+    QAction* back = add("back", QObject::tr("Back"), QKeySequence(Qt::ALT | Qt::Key_Left));
     QAction* forward =
-        add(QStyle::SP_ArrowForward, QObject::tr("Forward"), QKeySequence(Qt::ALT | Qt::Key_Right));
-    QAction* home = add(QStyle::SP_DirHomeIcon, QObject::tr("First page"),
-                        QKeySequence(Qt::ALT | Qt::Key_Home));
+        add("forward", QObject::tr("Forward"), QKeySequence(Qt::ALT | Qt::Key_Right));
+    QAction* home = add("home", QObject::tr("First page"), QKeySequence(Qt::ALT | Qt::Key_Home));
     back->setEnabled(false);
     forward->setEnabled(false);
     connect(back, &QAction::triggered, page_, &QTextBrowser::backward);
@@ -209,6 +208,12 @@ void HelpWindow::openContext(int context) {
     const QList<QHelpLink> links =
         engine_->documentsForIdentifier("context_" + QString::number(context));
     page_->setSource(links.isEmpty() ? QUrl(kFirstPage) : links.first().url);
+}
+
+void HelpWindow::changeEvent(QEvent* event) {
+    QMainWindow::changeEvent(event);
+    // The colours of the links were taken when the page was read.
+    if (event->type() == QEvent::PaletteChange && page_ != nullptr) page_->reload();
 }
 
 void HelpWindow::keyPressEvent(QKeyEvent* event) {

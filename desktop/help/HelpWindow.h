@@ -45,6 +45,7 @@ class HelpWindow : public QMainWindow {
 
   protected:
     void keyPressEvent(QKeyEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
   private:
     bool openBook(const QString& book, const QString& home);

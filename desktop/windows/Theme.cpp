@@ -144,6 +144,8 @@ QPalette paletteOf(const ThemeColors& c) {
     palette.setColor(QPalette::Highlight, c.accent);
     palette.setColor(QPalette::HighlightedText, c.accentText);
     palette.setColor(QPalette::PlaceholderText, c.caption);
+    palette.setColor(QPalette::Link, c.focus);
+    palette.setColor(QPalette::LinkVisited, c.focus);
     for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
         palette.setColor(QPalette::Disabled, role, c.dim);
     return palette;

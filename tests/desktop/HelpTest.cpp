@@ -5,6 +5,8 @@
 #include <QListWidget>
 #include <QRegularExpression>
 #include <QTemporaryDir>
+#include <QTextBlock>
+#include <cstdlib>
 #include <set>
 
 #include "desktop/help/HelpKeyFilter.h"
@@ -16,7 +18,7 @@
 namespace zel {
 namespace {
 
-constexpr int kContexts[] = {1110, 1112, 1113, 1114, 2111, 3113, 4111, 5111};
+constexpr int kContexts[] = {1110, 1112, 1113, 1114, 2111, 2112, 3113, 4111, 5111};
 
 struct Help : testing::Test {
     Help() : viewer(ZEL_PROGRAMS, home.path()) { testApplication(); }
@@ -155,6 +157,33 @@ TEST(HelpViewerTest, WithoutTheBook_NothingOpens) {
     EXPECT_EQ(viewer.window(), nullptr);
 }
 
+TEST_F(Help, LinksAndTexts_CanBeReadInEachTheme) {
+    for (const ThemeChoice theme : {ThemeChoice::Light, ThemeChoice::Dark}) {
+        applyTheme(testApplication(), theme);
+        HelpWindow& window = opened();
+        QApplication::processEvents();
+        const QPalette palette = window.page().palette();
+        const int ground = palette.color(QPalette::Base).lightness();
+        EXPECT_GT(std::abs(palette.color(QPalette::Text).lightness() - ground), 120);
+        int links = 0;
+        for (QTextBlock block = window.page().document()->begin(); block.isValid();
+             block = block.next())
+            for (auto part = block.begin(); !part.atEnd(); ++part) {
+                const QTextCharFormat format = part.fragment().charFormat();
+                if (!format.isAnchor() || format.anchorHref().isEmpty()) continue;
+                ++links;
+                EXPECT_GT(std::abs(format.foreground().color().lightness() - ground), 90)
+                    << part.fragment().text().toStdString();
+            }
+        EXPECT_GT(links, 10);
+        savePicture(window, theme == ThemeChoice::Dark ? "help-dark" : "help-light");
+        // The words of the instrument, as the console prints them.
+        window.page().setSource(QUrl("qthelp://example.zelremote.help/book/words.html"));
+        EXPECT_TRUE(window.page().toPlainText().contains("REFLVLOFFS"));
+        savePicture(window, theme == ThemeChoice::Dark ? "help-words-dark" : "help-words-light");
+    }
+}
+
 TEST(HelpKey, F1_OpensTheTopicOfTheWindowsForm) {
     testApplication();
     int context = 0;
@@ -179,6 +208,12 @@ TEST(HelpKey, F1_OpensTheTopicOfTheWindowsForm) {
     }
     QKeyEvent other(QEvent::KeyPress, Qt::Key_F2, Qt::NoModifier);
     EXPECT_FALSE(filter.eventFilter(&field, &other));
+    // A tool window has its own, also where it is no window.
+    QWidget tool;
+    tool.setProperty("topic", 2112);
+    QWidget inTool(&tool);
+    EXPECT_TRUE(filter.eventFilter(&inTool, &key));
+    EXPECT_EQ(context, 2112);
     QMainWindow panel;
     EXPECT_TRUE(filter.eventFilter(&panel, &key));
     EXPECT_EQ(context, 2111);
