@@ -5,13 +5,8 @@
 set -euo pipefail
 cmake=$1
 build=$2
-scratch=$(mktemp -d)
-simulator=
-finish() {
-    [ -z "$simulator" ] || kill "$simulator" 2> /dev/null || true
-    rm -rf "$scratch"
-}
-trap finish EXIT
+# shellcheck source=common.sh
+. "$(dirname "$0")/common.sh"
 unset DESTDIR
 
 "$cmake" --install "$build" --prefix "$scratch/root" > "$scratch/log" 2>&1 ||
@@ -20,27 +15,22 @@ unset DESTDIR
 mv "$scratch/root" "$scratch/moved"
 bin=$scratch/moved/bin
 
-for program in zelremote zelctl ZELSim; do
-    env -u DISPLAY "$bin/$program" --version > "$scratch/version"
-    grep -q "^$program [0-9]" "$scratch/version" || { echo "$program names no version"; exit 1; }
+for tool in zelremote zelctl ZELSim; do
+    env -u DISPLAY "$bin/$tool" --version > "$scratch/version"
+    grep -q "^$tool [0-9]" "$scratch/version" || fail "$tool names no version"
 done
 
 "$bin/zelctl" --connect sim: --home "$scratch/home" sweep --image "$scratch/graph.png" \
     > "$scratch/rows"
-[ "$(wc -l < "$scratch/rows")" = 302 ] || { echo "the sweep has not 302 lines"; exit 1; }
-[ -s "$scratch/graph.png" ] || { echo "the picture is missing"; exit 1; }
+[ "$(wc -l < "$scratch/rows")" = 302 ] || fail "the sweep has not 302 lines"
+[ -s "$scratch/graph.png" ] || fail "the picture is missing"
 
 companion=$(find "$scratch/moved/" -path '*/zelremote/ZELSim/ZELSim')
-[ -n "$companion" ] && [ -x "$companion" ] || { echo "the panel finds no simulator"; exit 1; }
-"$companion" --pty --link "$scratch/port" > "$scratch/simulator.log" &
-simulator=$!
-for _ in $(seq 100); do
-    [ ! -e "$scratch/port" ] || break
-    sleep 0.1
-done
+[ -n "$companion" ] && [ -x "$companion" ] || fail "the panel finds no simulator"
+run_simulator "$companion" "$scratch/port"
 "$bin/zelctl" --connect "serial:$scratch/port@57600" --home "$scratch/home" info | grep -q '^Model: '
 
 for document in README.md CHANGELOG.md LICENSE docs/file-formats.md; do
     find "$scratch/moved/share/doc" -path "*/$document" | grep -q . ||
-        { echo "$document is not installed"; exit 1; }
+        fail "$document is not installed"
 done

@@ -6,18 +6,9 @@
 set -euo pipefail
 cpack=$1
 build=$2
-scratch=$(mktemp -d)
-simulator=
-finish() {
-    [ -z "$simulator" ] || kill "$simulator" 2> /dev/null || true
-    rm -rf "$scratch"
-}
-trap finish EXIT
+# shellcheck source=common.sh
+. "$(dirname "$0")/common.sh"
 unset DESTDIR DISPLAY WAYLAND_DISPLAY
-fail() {
-    echo "$1"
-    exit 1
-}
 
 (cd "$build" && "$cpack" -G DEB -B "$scratch/packages" > "$scratch/log" 2>&1) ||
     { cat "$scratch/log"; exit 1; }
@@ -42,14 +33,14 @@ grep -q '^Depends:.*zelremote-cli' "$scratch/zelremote.control" || fail "the des
 grep -q '^Depends:.*zelremote-cli' "$scratch/zelremote-server.control" || fail "the server lacks it"
 
 root=$scratch/root/usr
-for program in zelremote zelctl zeldraw ZELSim; do
-    "$root/bin/$program" --version | grep -q "^$program [0-9]" || fail "$program names no version"
-    "$root/bin/$program" --help > "$scratch/help"
-    zcat "$root/share/man/man1/$program.1.gz" | sed 's/\\-/-/g' > "$scratch/page"
+for tool in zelremote zelctl zeldraw ZELSim; do
+    "$root/bin/$tool" --version | grep -q "^$tool [0-9]" || fail "$tool names no version"
+    "$root/bin/$tool" --help > "$scratch/help"
+    zcat "$root/share/man/man1/$tool.1.gz" | sed 's/\\-/-/g' > "$scratch/page"
     while read -r option; do
-        grep -q -e "$option" "$scratch/page" || fail "$program(1) does not name $option"
+        grep -q -e "$option" "$scratch/page" || fail "$tool(1) does not name $option"
     done < <(grep -oE -- '(^|[ ,])--[a-z-]+' "$scratch/help" | tr -d ' ,' | sort -u)
-    [ -s "$root/share/bash-completion/completions/$program" ] || fail "$program has no completion"
+    [ -s "$root/share/bash-completion/completions/$tool" ] || fail "$tool has no completion"
 done
 # Each verb stands in its manual page.
 zcat "$root/share/man/man1/zelctl.1.gz" | sed 's/\\-/-/g' > "$scratch/page"
@@ -81,12 +72,7 @@ ls "$scratch/home/specialMeas/"*.txt > /dev/null || fail "the example scripts ar
 
 companion=$(find "$root/" -path '*/zelremote/ZELSim/ZELSim')
 [ -x "$companion" ] || fail "the panel finds no simulator"
-"$companion" --pty --link "$scratch/port" > "$scratch/simulator.log" &
-simulator=$!
-for _ in $(seq 100); do
-    [ ! -e "$scratch/port" ] || break
-    sleep 0.1
-done
+run_simulator "$companion" "$scratch/port"
 QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --connect "serial:$scratch/port@57600" \
     --home "$scratch/home2" --screenshot "$scratch/window.png"
 [ -s "$scratch/window.png" ] || fail "the window cannot be drawn"

@@ -7,19 +7,8 @@ set -euo pipefail
 zelctl=$1
 zelsim=$2
 zelremote=${3:-}
-scratch=$(mktemp -d)
-simulator=
-program=
-cleanup() {
-    for pid in $program $simulator; do kill -9 "$pid" 2> /dev/null || true; done
-    rm -rf "$scratch"
-}
-trap cleanup EXIT
-fail() {
-    echo "FAILED: $*"
-    for log in "$scratch"/*.log; do echo "--- $log"; cat "$log"; done
-    exit 1
-}
+# shellcheck source=common.sh
+. "$(dirname "$0")/common.sh"
 
 # A simulator of its own for each case; its sweeps take as long as the case needs.
 start_simulator() {

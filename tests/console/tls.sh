@@ -7,19 +7,8 @@ set -euo pipefail
 zelctl=$1
 zelsim=$2
 make_certificates=$3
-scratch=$(mktemp -d)
-simulator=
-server=
-cleanup() {
-    for pid in $server $simulator; do kill -9 "$pid" 2> /dev/null || true; done
-    rm -rf "$scratch"
-}
-trap cleanup EXIT
-fail() {
-    echo "FAILED: $*"
-    for log in "$scratch"/*.log; do echo "--- $log"; cat "$log"; done
-    exit 1
-}
+# shellcheck source=common.sh
+. "$(dirname "$0")/common.sh"
 if ! command -v openssl > /dev/null; then
     echo "SKIPPED: openssl is missing, no certificates can be made"
     exit 77
