@@ -27,6 +27,17 @@ QPushButton* key(Binder& binder, Button& control) {
     return button;
 }
 
+/// The last row: what can be done at the left, the key that closes at the right.
+void addKeys(QVBoxLayout& layout, std::initializer_list<QPushButton*> work, QPushButton* close,
+             QPushButton* usual) {
+    auto* row = new QHBoxLayout;
+    for (QPushButton* button : work) row->addWidget(button);
+    row->addStretch(1);
+    row->addWidget(close);
+    usual->setDefault(true);
+    layout.addLayout(row);
+}
+
 QFont evenFont() {
     QFont font("Lucida Console");
     if (!QFontDatabase::hasFamily(font.family()))
@@ -96,14 +107,9 @@ AboutWindow::AboutWindow(AboutForm& form, Binder& binder, QWidget* parent)
         layout->addWidget(view, 1);
     }
     layout->addStretch(0);
-    auto* keys = new QHBoxLayout;
-    keys->addWidget(key(binder, form.CreateSupportString));
-    keys->addWidget(key(binder, form.StartNISpy));
-    keys->addStretch(1);
     QPushButton* close = key(binder, form.ButtonOK);
-    close->setDefault(true);
-    keys->addWidget(close);
-    layout->addLayout(keys);
+    addKeys(*layout, {key(binder, form.CreateSupportString), key(binder, form.StartNISpy)}, close,
+            close);
     setCancel(form.ButtonOK);
     setMinimumSize(580, 460);
     followForm();
@@ -154,19 +160,13 @@ ErrorWindow::ErrorWindow(ErrorForm& form, Binder& binder, QWidget* parent)
     auto* attach = new QCheckBox;
     binder.bind(form.chkAttachLog, attach);
     layout->addWidget(attach);
-    auto* keys = new QHBoxLayout;
     QPushButton* copy = key(binder, form.CopyToClipboard);
     binder.bindShow(form.CopyToClipboard, copy, [&form, copy] {
         copy->setText(QString::fromStdString(form.CopyToClipboard.Caption));  // with its key
         copy->setEnabled(form.CopyToClipboard.Enabled);
     });
-    keys->addWidget(copy);
-    keys->addWidget(key(binder, form.cmdSaveReport));
-    keys->addStretch(1);
     QPushButton* close = key(binder, form.ButtonOK);
-    close->setDefault(true);
-    keys->addWidget(close);
-    layout->addLayout(keys);
+    addKeys(*layout, {copy, key(binder, form.cmdSaveReport)}, close, close);
     setCancel(form.ButtonOK);
     setMinimumSize(620, 480);
     followForm();
@@ -193,14 +193,8 @@ DoctorWindow::DoctorWindow(DoctorForm& form, Binder& binder, QWidget* parent)
     QLabel* status = words(binder, form.StatusLabel);
     status->setMinimumHeight(status->fontMetrics().lineSpacing());
     layout->addWidget(status);
-    auto* keys = new QHBoxLayout;
     QPushButton* again = key(binder, form.cmdRunAgain);
-    again->setDefault(true);
-    keys->addWidget(again);
-    keys->addWidget(key(binder, form.cmdCopy));
-    keys->addStretch(1);
-    keys->addWidget(key(binder, form.cmdClose));
-    layout->addLayout(keys);
+    addKeys(*layout, {again, key(binder, form.cmdCopy)}, key(binder, form.cmdClose), again);
     setCancel(form.cmdClose);
     setMinimumSize(640, 440);
     followForm();

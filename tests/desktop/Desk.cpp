@@ -2,6 +2,8 @@
 
 #include <QDir>
 
+#include "desktop/windows/GuardedApplication.h"
+
 namespace zel {
 
 QApplication& testApplication() {
@@ -12,7 +14,7 @@ QApplication& testApplication() {
     static auto* application = [] {
         // The same fonts on every desk.
         qputenv("FONTCONFIG_FILE", ZEL_SOURCE_DIR "/tests/fonts.conf");
-        return new QApplication(count, arguments);
+        return new GuardedApplication(count, arguments);
     }();
     return *application;
 }
