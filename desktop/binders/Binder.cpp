@@ -174,6 +174,9 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
     widget->setControl(
         &control, [this, &control] { return refused(control); },
         [this, &control](std::function<void()> enter) {
+            // As it is read: the box may have put the typed number into the panel's form.
+            note(control, "set", control.Text);
+            note(control, "key", "enter");
             if (!defers || !defers(control)) return false;
             act(control, std::move(enter));
             return true;

@@ -98,6 +98,17 @@ echo "flood: at most $most kB of memory"
 stop_server TERM
 log=$(ls home/ELOG_*.log | head -1)
 grep -q 'listening 127.0.0.1' "$log" && grep -q 'client gone' "$log" || fail "no log of the server"
+# entry FILE HEAD TEXT: an entry that begins with that line, with its time and that description.
+entry() {
+    tr -d '\r' < "$1" | awk -v head="$2" -v text="          DESCRIPTION : $3" '
+        !/^          / { inside = $0 == head; timed = 0 }
+        inside && /^          TIME        : [0-9][0-9]*-[0-9][0-9]-[0-9][0-9] / { timed = 1 }
+        inside && timed && index($0, text) == 1 { found = 1 }
+        END { exit !found }' || fail "$1 has no entry \"$2\" with \"$3\""
+}
+entry "$log" '.      Info' 'listening 127.0.0.1'
+entry "$log" '.      Info' 'client gone'
+rm -f home/ELOG_*.log
 
 start_server --listen 127.0.0.1:0 --allow 10.0.0.0/8 --baud 57600
 status=0
@@ -108,6 +119,7 @@ grep -q 'The server closed the connection' client.errors.log || fail "it is not 
 [ ! -s client.log ] || fail "something was shown"
 grep -q '^refused 127.0.0.1' server.log || fail "no word of the refused client"
 stop_server INT
+entry "$(ls home/ELOG_*.log | head -1)" '****   Error' 'refused 127.0.0.1'
 echo "who is not on the list is refused"
 
 if [ -e /proc/net/if_inet6 ] && grep -q ' lo$' /proc/net/if_inet6; then
@@ -177,3 +189,13 @@ server=
 [ "$status" -eq 1 ] || fail "an instrument that goes: status $status"
 grep -q '^error ' server.log || fail "an instrument that goes is not told"
 echo "ports that fail"
+
+# A failure inside of a handler: the log is switched on for it.
+status=0
+printf 'fail 13 "Bridge" "type mismatch"\n' | "$zelctl" --home failed panel > failed.log 2>&1 || status=$?
+[ "$status" -eq 1 ] || fail "a failure gave the status $status"
+log=$(ls failed/ELOG_*.log | head -1)
+entry "$log" '*******Fatal' 'Program type mismatch'
+grep -q '^          ERROR NUMBER: D (13)' "$log" || fail "the failure's number is missing"
+grep -q '>ZELRemote.Program_EventHandler' "$log" || fail "the calls are missing"
+echo "entries of the log by their level"

@@ -1,6 +1,7 @@
 // What a handler throws in the window, and what an earlier run has left: the report on the screen.
 
 #include <QLineEdit>
+#include <QListWidget>
 #include <QPlainTextEdit>
 #include <QPushButton>
 #include <QTest>
@@ -38,12 +39,11 @@ struct FailureWindow : Desk {
     }
 };
 
-TEST_F(FailureWindow, HandlerThatThrows_OpensTheReportAndTheProgramEnds) {
+TEST_F(FailureWindow, TimerThatThrows_OpensTheReportAndTheProgramEnds) {
     connect();
     show();
-    QObject receiver;
     int shown = 0;
-    whenShown([&](QWidget& report) {
+    const auto look = [&](QWidget& report) {
         ++shown;
         const ErrorForm& form = program->forms().error;
         EXPECT_FALSE(program->ended()) << "not before the window is closed";
@@ -51,34 +51,38 @@ TEST_F(FailureWindow, HandlerThatThrows_OpensTheReportAndTheProgramEnds) {
         for (auto* line : report.findChildren<QLineEdit*>())
             described = described || line->text().contains("type mismatch");
         EXPECT_TRUE(described);
-        EXPECT_TRUE(form.CopyToClipboard.Enabled);
         widgetOf<QPushButton>(form.CopyToClipboard)->click();
         EXPECT_NE(platform.clipboard.text().find("type mismatch"), std::string::npos);
         EXPECT_TRUE(savePicture(report, "failure"));
+    };
+    QTimer::singleShot(0, window.get(), [&] {
+        whenShown(look);
+        throw RunTimeError(13, "Panel", "type mismatch");
     });
-    // As any event of the toolkit that reaches a handler.
-    QTimer::singleShot(0, &receiver, [] { throw RunTimeError(13, "Panel", "type mismatch"); });
-    QTRY_VERIFY(program->ended());
+    QApplication::processEvents();
+    QApplication::processEvents();
     EXPECT_EQ(shown, 1);
+    EXPECT_TRUE(program->ended());
     EXPECT_TRUE(program->failed());
     EXPECT_FALSE(panel().isConnected);
 }
 
 TEST_F(FailureWindow, KeyWhoseHandlerThrows_OpensTheReport) {
+    connect();
     show();
-    const auto handle = panel().Direct.Clicked.connect([] { throw std::runtime_error("lost"); });
     bool shown = false;
-    whenShown([&](QWidget& report) {
-        shown = true;
-        for (auto* line : report.findChildren<QLineEdit*>())
-            if (line->text().contains("lost")) return;
-        ADD_FAILURE() << "the failure's words are not there";
+    panel().FrequencyButton.Clicked.connect([&] {
+        whenShown([&](QWidget& report) {
+            shown = true;
+            for (auto* line : report.findChildren<QLineEdit*>())
+                if (line->text().contains("lost")) return;
+            ADD_FAILURE() << "the failure's words are not there";
+        });
+        throw std::runtime_error("lost");
     });
-    QTimer::singleShot(0, window.get(), [this] {
-        qobject_cast<QAction*>(window->binder().widgetOf(panel().Direct))->trigger();
-    });
-    QTRY_VERIFY(program->ended());
+    QTest::mouseClick(widgetOf<QPushButton>(panel().FrequencyButton), Qt::LeftButton);
     EXPECT_TRUE(shown);
+    EXPECT_TRUE(program->ended());
     EXPECT_TRUE(program->failed());
 }
 
@@ -88,8 +92,8 @@ TEST_F(FailureWindow, TraceOfAnEarlierRun_IsOfferedAndTheProgramGoesOn) {
     whenShown([&](QWidget& report) {
         shown = true;
         bool named = false;
-        for (auto* line : report.findChildren<QLineEdit*>())
-            named = named || line->text().contains("SIGSEGV");
+        for (auto* list : report.findChildren<QListWidget*>())
+            named = named || !list->findItems("SIGSEGV", Qt::MatchContains).isEmpty();
         EXPECT_TRUE(named);
         EXPECT_TRUE(savePicture(report, "crash"));
     });
