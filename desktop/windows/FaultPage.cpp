@@ -42,22 +42,23 @@ FaultPage::FaultPage(TraceTools& tools) : TracePage(tools) {
     for (const VelocityFactor& row : list)
         cable_->addItem(QString::fromUtf8(row.dielectric) + ", " +
                         QString::fromStdString(generalNumber(row.factor)));
-    cable_->addItem(tr("Another one"));
+    cable_->addItem(QObject::tr("Another one"));
     const auto caption = [grid](int row, const QString& text, QWidget* of) {
         auto* label = new QLabel(text);
         label->setBuddy(of);
         grid->addWidget(label, row, 0);
     };
-    caption(0, tr("The instrument counts with the velocity factor"), assumed_);
+    caption(0, QObject::tr("The instrument counts with the velocity factor"), assumed_);
     grid->addWidget(assumed_, 0, 1, Qt::AlignLeft);
-    caption(1, tr("The cable is of"), cable_);
+    caption(1, QObject::tr("The cable is of"), cable_);
     grid->addWidget(cable_, 1, 1);
-    caption(2, tr("with the velocity factor"), factor_);
+    caption(2, QObject::tr("with the velocity factor"), factor_);
     grid->addWidget(factor_, 2, 1, Qt::AlignLeft);
     table_ = new QTableWidget(0, 4);
     table_->setObjectName("FaultTable");
-    table_->setAccessibleName(tr("Faults"));
-    table_->setHorizontalHeaderLabels({tr("Peak"), tr("Shown"), tr("In this cable"), tr("Level")});
+    table_->setAccessibleName(QObject::tr("Faults"));
+    table_->setHorizontalHeaderLabels({QObject::tr("Peak"), QObject::tr("Shown"),
+                                       QObject::tr("In this cable"), QObject::tr("Level")});
     table_->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
     table_->verticalHeader()->setVisible(false);
     table_->verticalHeader()->setDefaultSectionSize(24);
@@ -89,9 +90,9 @@ void FaultPage::showState() {
     const bool distances = tools_.trace() && tools_.trace()->xUnit == "m";
     QString word;
     if (!assumed || !factor) {
-        word = tr("A velocity factor is above 0 and 1 at most.");
+        word = QObject::tr("A velocity factor is above 0 and 1 at most.");
     } else if (!distances) {
-        word = tr("There are distances when the instrument measures Distance to Fault.");
+        word = QObject::tr("There are distances when the instrument measures Distance to Fault.");
     }
     word_->setText(word);
     const bool shown = word.isEmpty();

@@ -11,8 +11,6 @@
 namespace zel {
 
 class FaultPage : public TracePage {
-    Q_OBJECT
-
   public:
     explicit FaultPage(TraceTools& tools);
     void showState() override;

@@ -12,8 +12,6 @@
 namespace zel {
 
 class WatchPage : public TracePage {
-    Q_OBJECT
-
   public:
     WatchPage(TraceTools& tools, MaskWatch& watch);
     void showState() override;
