@@ -13,19 +13,10 @@
 namespace zel {
 namespace {
 
-constexpr double kCursorReach = 8;  // pixels
-constexpr int kFontPoints = 9;
 /// Half of the last label of the x axis stands in it: one that does not fit is not drawn at all.
 constexpr int kRightMargin = 42;
 constexpr std::size_t kPairedValues = 602;
 constexpr double kBandShare = 0.35;  // of the line's ink in the band's
-constexpr double kLabelGap = 9;      // pixels from the point to its text
-
-QFont plotFont() {
-    QFont font;
-    font.setPointSize(kFontPoints);
-    return font;
-}
 
 QString text(const std::string& utf8) { return QString::fromStdString(utf8); }
 
@@ -37,28 +28,6 @@ QString joined(const QStringList& parts) {
 }
 
 }  // namespace
-
-GraphColors darkGraph() { return {}; }
-
-GraphColors lightGraph() {
-    GraphColors colors;
-    colors.background = Qt::white;
-    colors.plotArea = Qt::white;
-    colors.grid = QColor(0xc8, 0xce, 0xd4);
-    colors.frame = QColor(0x40, 0x48, 0x50);
-    colors.text = QColor(0x10, 0x14, 0x18);
-    colors.trace = QColor(0x0b, 0x4f, 0xa8);
-    colors.trigger = QColor(0xb0, 0x20, 0x20);
-    colors.file = QColor(0x1d, 0x5c, 0xa0);
-    colors.shade = QColor(0xe4, 0xec, 0xf6);
-    colors.cursorDarkness = 170;
-    return colors;
-}
-
-QColor colorOf(Color color) {
-    return {static_cast<int>(color & 0xFF), static_cast<int>(color >> 8 & 0xFF),
-            static_cast<int>(color >> 16 & 0xFF)};
-}
 
 GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot), colors_(colors) {
     plot_.setBackground(colors_.background);
@@ -100,19 +69,7 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     trace_ = plot_.addGraph();
     trace_->setPen(QPen(colors_.trace, 1));
     trace_->setAdaptiveSampling(false);
-    for (CursorItems& cursor : cursors_) {
-        cursor.line = new QCPItemStraightLine(&plot_);
-        cursor.point = new QCPItemTracer(&plot_);
-        cursor.point->setStyle(QCPItemTracer::tsCircle);
-        cursor.point->setSize(9);
-        cursor.line->setVisible(false);
-        cursor.point->setVisible(false);
-        cursor.text = new QCPItemText(&plot_);
-        cursor.text->position->setType(QCPItemPosition::ptAbsolute);
-        cursor.text->setFont(plotFont());
-        cursor.text->setClipToAxisRect(false);
-        cursor.text->setVisible(false);
-    }
+    cursors_ = std::make_unique<CursorMarks>(plot_, colors_);  // over the trace
     trigger_ = new QCPItemStraightLine(&plot_);
     trigger_->setPen(QPen(colors_.trigger, 1, Qt::DashLine));
     trigger_->setVisible(false);
@@ -275,7 +232,8 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
         drawn_ = true;
     }
     view_ = view;
-    placeCursors(graph);
+    cursors_->place(graph, {markerTexts_, resolution_, view.xUnit, view.unit,
+                            [this](double x) { return levelsAt(x).second; }});
     const std::string& note = graph.Note;
     old_->setText(note.empty() ? "OLD TRACE" : text(note));
     old_->setVisible(graph.Old || !note.empty());
@@ -308,53 +266,6 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
     bottom_[1]->setText(text(view.center));
     bottom_[2]->setText(text(view.right));
     strike(view);
-}
-
-void GraphPlot::placeCursors(const Graph& graph) {
-    for (std::size_t i = 0; i < cursors_.size(); ++i) {
-        CursorItems& items = cursors_.at(i);
-        const GraphCursor& cursor = graph.cursor(static_cast<int>(i) + 1);
-        items.visible = cursor.Visible;
-        items.x = cursor.X;
-        items.line->setVisible(cursor.Visible);
-        items.point->setVisible(cursor.Visible);
-        items.text->setVisible(false);
-        if (!cursor.Visible) continue;
-        const QColor color = colorOf(cursor.color).darker(colors_.cursorDarkness);
-        items.line->setPen(QPen(color, 1));
-        items.line->point1->setCoords(cursor.X, 0);
-        items.line->point2->setCoords(cursor.X, 1);
-        items.point->setPen(QPen(color, 2));
-        items.text->setColor(color);
-        // On the trace as it is now: the cursor's own level is that of an earlier sweep.
-        const double level = levelsAt(cursor.X).second;
-        const QPointF point(cursor.X, markerTexts_ && std::isfinite(level) ? level : cursor.Y);
-        items.point->position->setCoords(point);
-        if (markerTexts_ && std::isfinite(level)) writeCursor(i, point);
-    }
-}
-
-void GraphPlot::writeCursor(std::size_t index, const QPointF& point) {
-    const QPointF first = cursors_[0].point->position->coords();
-    const bool delta = index == 1 && cursors_[0].visible;
-    QCPItemText& label = *cursors_.at(index).text;
-    const double x = delta ? point.x() - first.x() : point.x();
-    const double y = delta ? point.y() - first.y() : point.y();
-    label.setText((delta ? QString::fromUtf8("Δ1  ") : QString("1  ")) +
-                  text(axisText(x, resolution_, view_.xUnit)) + "; " +
-                  text(levelText(y, delta ? "dB" : view_.unit)));
-    // Above its point, inside of the plot.
-    const QRectF area = axisRect_->rect();
-    const QPointF pixel(plot_.xAxis->coordToPixel(point.x()), plot_.yAxis->coordToPixel(point.y()));
-    label.setVisible(area.adjusted(-1, -1, 1, 1).contains(pixel));
-    const double half = QFontMetricsF(label.font()).horizontalAdvance(label.text()) / 2 + 4;
-    const double line = QFontMetricsF(label.font()).height();
-    const double right = std::max(area.left() + half, area.right() - half);
-    const double place = pixel.y() - kLabelGap - line;
-    label.setPositionAlignment(Qt::AlignHCenter | Qt::AlignTop);
-    // The second one goes a line lower where both would stand at one place.
-    label.position->setCoords(std::clamp(pixel.x(), area.left() + half, right),
-                              std::max(place, area.top() + 2 + (index == 1 ? line : 0)));
 }
 
 void GraphPlot::strike(const ViewAnnotations& view) {
@@ -411,21 +322,8 @@ void GraphPlot::clipToView() {
         clipLine(*trace_, QPolygonF(points_), view);
     }
     drawn_ = false;
-    for (const CursorItems& cursor : cursors_) {
-        const QPointF at = cursor.point->position->coords();
-        if (!x.contains(at.x()) || !y.contains(at.y())) cursor.point->setVisible(false);
-    }
+    cursors_->clipToView();
     if (!y.contains(triggerText_->position->coords().y())) triggerText_->setVisible(false);
-}
-
-int GraphPlot::cursorAt(const QPointF& pixel) const {
-    for (int i = 1; i >= 0; --i) {
-        const CursorItems& cursor = cursors_.at(static_cast<std::size_t>(i));
-        if (!cursor.visible) continue;
-        if (std::fabs(plot_.xAxis->coordToPixel(cursor.x) - pixel.x()) <= kCursorReach)
-            return i + 1;
-    }
-    return 0;
 }
 
 QPointF GraphPlot::pointAt(double x) const {

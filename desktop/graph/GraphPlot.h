@@ -4,28 +4,16 @@
 #include <qcustomplot.h>
 
 #include <array>
+#include <memory>
 #include <utility>
 
 #include "desktop/graph/AnnotationText.h"
+#include "desktop/graph/CursorMarks.h"
+#include "desktop/graph/GraphColors.h"
 #include "platform/Graph.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {
-
-struct GraphColors {
-    QColor background{0x0d, 0x12, 0x18};
-    QColor plotArea{0x06, 0x09, 0x0d};
-    QColor grid{0x35, 0x42, 0x50};
-    QColor frame{0x7a, 0x8a, 0x9a};
-    QColor text{0xd8, 0xe0, 0xe8};
-    QColor trace{0xff, 0xd8, 0x4d};
-    QColor trigger{0xff, 0x6b, 0x6b};
-    QColor file{0x8e, 0xc9, 0xff};   ///< the name of a loaded file
-    QColor shade{0x1d, 0x2b, 0x3d};  ///< a channel
-    int cursorDarkness = 100;        ///< percent: cursors are made for a dark ground
-};
-GraphColors darkGraph();
-GraphColors lightGraph();  ///< for paper
 
 /// Owns the items of the plot; the plot itself belongs to the caller. Pairs of the auto peak
 /// detector are a band from the lowest to the highest level of each point.
@@ -48,7 +36,7 @@ class GraphPlot {
     void clipToView();
     QCPAxisRect& axisRect() { return *axisRect_; }
     /// The 1-based index of the cursor within reach of a pixel, or 0.
-    int cursorAt(const QPointF& pixel) const;
+    int cursorAt(const QPointF& pixel) const { return cursors_->at(pixel); }
     /// The point of the trace that lies nearest to x; (x, 0) where there is no trace.
     QPointF pointAt(double x) const;
     /// The samples at x: the nearest one, of a pair its minimum and maximum. NaN where there is
@@ -59,13 +47,6 @@ class GraphPlot {
     const ViewAnnotations& view() const { return view_; }
 
   private:
-    struct CursorItems {
-        QCPItemStraightLine* line = nullptr;
-        QCPItemTracer* point = nullptr;
-        QCPItemText* text = nullptr;
-        bool visible = false;
-        double x = 0;
-    };
     AnnotationText* addText(QCPLayoutGrid& grid, int row, int column, Qt::Alignment alignment);
     QCPItemText* addNote(double height);
     void takeTrace(const Graph& graph);
@@ -73,8 +54,6 @@ class GraphPlot {
     void setRanges(const Graph& graph);
     void strike(const ViewAnnotations& view);
     void fillWithin(const QRectF& view);
-    void placeCursors(const Graph& graph);
-    void writeCursor(std::size_t index, const QPointF& point);
     QColor bandInk(const QColor& line) const;
 
     QCustomPlot& plot_;
@@ -83,7 +62,7 @@ class GraphPlot {
     QCPGraph* trace_ = nullptr;
     std::array<AnnotationText*, 4> top_{};
     std::array<AnnotationText*, 3> bottom_{};
-    std::array<CursorItems, 2> cursors_{};
+    std::unique_ptr<CursorMarks> cursors_;
     QCPItemStraightLine* trigger_ = nullptr;
     QCPItemText* triggerText_ = nullptr;
     QCPItemText* old_ = nullptr;
@@ -100,7 +79,5 @@ class GraphPlot {
     unsigned long serial_ = 0;
     bool drawn_ = false;
 };
-
-QColor colorOf(Color color);
 
 }  // namespace zel
