@@ -74,15 +74,13 @@ QStringList filtersOf(const std::string& filter) {
     return result;
 }
 
-QString& lastFolder() {
-    static QString folder;
-    return folder;
-}
+constexpr const char* kApplication = "ZELRemote";
+constexpr const char* kSection = "Desktop";
+constexpr const char* kFolderKey = "Folder";
 
-/// Where the user was last, as long as the program runs; else what is asked for, but never a folder
-/// that file managers hide: nobody would find the file again.
-QString startFolder(const QString& asked) {
-    if (!lastFolder().isEmpty() && QFileInfo(lastFolder()).isDir()) return lastFolder();
+/// In a folder that file managers hide nobody would find the file again.
+QString startFolder(const QString& last, const QString& asked) {
+    if (!last.isEmpty() && QFileInfo(last).isDir()) return last;
     const bool hidden = asked.isEmpty() || asked.contains("/.") || !QFileInfo(asked).isDir();
     if (!hidden) return asked;
     const QString documents = QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation);
@@ -95,9 +93,13 @@ QString endingOf(const QString& filter) {
     return at < 0 ? QString() : filter.mid(at + 2).section(')', 0, 0).section(' ', 0, 0);
 }
 
-std::optional<std::string> chosen(const FileDialogRequest& request, bool save) {
-    QFileDialog dialog(QApplication::activeWindow(), QString::fromStdString(request.title),
-                       startFolder(QString::fromStdString(request.folder)));
+}  // namespace
+
+std::optional<std::string> QtFileDialogs::chosen(const FileDialogRequest& request, bool save) {
+    const std::string last = settings_.get(kApplication, kSection, kFolderKey, "");
+    QFileDialog dialog(
+        QApplication::activeWindow(), QString::fromStdString(request.title),
+        startFolder(QString::fromStdString(last), QString::fromStdString(request.folder)));
     dialog.setAcceptMode(save ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
     dialog.setFileMode(save ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
     dialog.setOption(QFileDialog::DontConfirmOverwrite, !request.promptOverwrite);
@@ -115,9 +117,13 @@ std::optional<std::string> chosen(const FileDialogRequest& request, bool save) {
     }
     if (!request.fileName.empty()) dialog.selectFile(QString::fromStdString(request.fileName));
     if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty()) return std::nullopt;
-    lastFolder() = QFileInfo(dialog.selectedFiles().first()).absolutePath();
-    return dialog.selectedFiles().first().toStdString();
+    const QString file = dialog.selectedFiles().first();
+    if (const std::string folder = QFileInfo(file).absolutePath().toStdString(); folder != last)
+        settings_.set(kApplication, kSection, kFolderKey, folder);
+    return file.toStdString();
 }
+
+namespace {
 
 /// The wait cursor says that work goes on; a question is not work.
 class NormalPointer {

@@ -16,10 +16,18 @@ class QtMessageBoxes : public MessageBoxes {
                                       const std::string& preset) override;
 };
 
+/// A dialog begins in the folder of the last one, be it of an earlier run; the first of all in the
+/// folder that is asked for, but never in one that file managers hide: then in that of documents.
 class QtFileDialogs : public FileDialogs {
   public:
+    explicit QtFileDialogs(SettingsStore& settings) : settings_(settings) {}
     std::optional<std::string> save(const FileDialogRequest& request) override;
     std::optional<std::string> open(const FileDialogRequest& request) override;
+
+  private:
+    std::optional<std::string> chosen(const FileDialogRequest& request, bool save);
+
+    SettingsStore& settings_;
 };
 
 class QtClipboard : public Clipboard {
