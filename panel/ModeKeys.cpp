@@ -76,12 +76,21 @@ void ModeKeys::enterMode(std::int16_t mode) {
             if (row->waitMs > 0) events_.sleep(row->waitMs);
         }
         panel_.InstrumentMode = mode;
+        showPictureIsOld();
         mirror_.ReferenceRange = 0;
         mirror_.ReferenceUnit = 0;
         modeOption(panel_, mode).setValue(true);
         const std::string_view word = menuWord(row->menu);
         if (!word.empty() && panel_.isConnected) fill_.FillTextFields(word);
     }
+}
+
+/// The trace on the graph belongs to the mode before, until the next one is drawn.
+void ModeKeys::showPictureIsOld() {
+    const ShownView& shown = panel_.Shown;
+    if (!shown.fromFile && shown.instrumentMode != 0 &&
+        shown.instrumentMode != panel_.InstrumentMode)
+        panel_.CWGraph1.Old = true;
 }
 
 void ModeKeys::AnalyzerButton_Click() {
@@ -97,6 +106,7 @@ void ModeKeys::AnalyzerButton_Click() {
     const Hourglass busy(panel_, events_);
     if (exchange_.SetInstrument("MEAS,1")) {
         panel_.InstrumentMode = CF::ANALYZER;
+        showPictureIsOld();
         panel_.AnalyzerCheck.setValue(true);
     } else {
         boxes_.show({BoxIcon::Exclamation, "Analyzer Mode unsuccessful"});

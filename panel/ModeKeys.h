@@ -24,6 +24,7 @@ class ModeKeys {
     void ResetButton_Click();
 
   private:
+    void showPictureIsOld();
     void presetMirror();
 
     ControllerForm& panel_;
