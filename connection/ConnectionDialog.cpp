@@ -85,6 +85,8 @@ void ConnectionDialog::SetConnectionKind(std::int16_t kind) {
     // Ports come and go: the list is made again while nothing is connected.
     if (!panel_.isConnected) dialog_.unload(1);
     dialog_.load();
+    dialog_.AdviceLabel.Caption = "";
+    dialog_.SearchRatesButton.Visible = false;
     SetAllFramesInvisible();
     dialog_.DirectConnectionFrame.Visible = true;
     const bool direct = kind == CF::DIRECTCON;
@@ -132,6 +134,7 @@ void ConnectionDialog::ZELButton_Click() {
 
 void ConnectionDialog::connectDirect(bool readTrace) {
     dialog_.AdviceLabel.Caption = "";
+    dialog_.SearchRatesButton.Visible = false;
     link_.OpenPortFromDialog();
     if (panel_.ConnectionState != CF::DIRECTCON || !dialog_.IsConnectedToPort) return;
     start_.setClock("start");
@@ -139,6 +142,17 @@ void ConnectionDialog::connectDirect(bool readTrace) {
     profiles_.SaveSettings_Click();
     panel_.State = CF::Freq;
     if (readTrace) start_.readFirstSweep();
+}
+
+void ConnectionDialog::connectTo(const std::string& port, int baud, bool readTrace) {
+    const bool quick = panel_.immConnectState;
+    panel_.immConnectState = true;
+    SetConnectionKind(CF::DIRECTCON);
+    panel_.immConnectState = quick;
+    dialog_.COMList.setText(port);
+    dialog_.BaudList.setText(std::to_string(baud));
+    connectDirect(readTrace);
+    start_.showFirstMenu();
 }
 
 }  // namespace zel

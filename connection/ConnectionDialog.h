@@ -2,6 +2,7 @@
 // The connection dialog: the choice of the kind, the ports, and the direct link.
 
 #include <cstdint>
+#include <string>
 
 #include "connection/Profiles.h"
 #include "connection/SessionStart.h"
@@ -28,6 +29,8 @@ class ConnectionDialog {
     void ZELButton_Click();
     /// Opens the port of the dialog and does the handshake; one sweep after it with `readTrace`.
     void connectDirect(bool readTrace);
+    /// The same with that port and that baud rate in the dialog's fields, which stays hidden.
+    void connectTo(const std::string& port, int baud, bool readTrace);
 
   private:
     void showModal();

@@ -265,6 +265,21 @@ void Doctor::search(const LinkAddress& address) {
                  "lines.");
 }
 
+std::optional<int> Doctor::findRate(const std::string& port, const std::vector<int>& rates,
+                                    const std::function<void(int)>& trying) {
+    stopped_ = false;
+    std::optional<int> found;
+    if (s_.port.isOpen()) return found;
+    for (const int rate : rates) {
+        trying(rate);
+        if (stopped_ || !openPort(port, rate)) break;
+        if (!ask(portLine()).identity.empty() && !stopped_) found = rate;
+        if (found || stopped_) break;
+    }
+    s_.port.close();
+    return found;
+}
+
 void Doctor::askModem(const LinkAddress& address) {
     if (!openPort(address.port, address.number > 0 ? address.number : kUsualRate)) {
         const std::string why = s_.port.problem();

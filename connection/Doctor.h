@@ -44,7 +44,12 @@ class Doctor {
     /// False when one of them is a fault.
     bool examine(const std::optional<LinkAddress>& address,
                  const std::function<void(const Finding&)>& found);
-    /// Ends an examination that is under way.
+    /// The first of the rates at which an instrument answers on that port, without a word to the
+    /// user; `trying` hears each rate before it is tried. Nothing when none answers, when the port
+    /// cannot be had, or after `stop`.
+    std::optional<int> findRate(const std::string& port, const std::vector<int>& rates,
+                                const std::function<void(int)>& trying);
+    /// Ends an examination or a search that is under way.
     void stop() { stopped_ = true; }
 
   private:

@@ -54,12 +54,15 @@ void Handshake::InitConnection() {
     // For as long as the handshake lasts, the keys that close the dialog leave it.
     for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1})
         close->Caption = "Cancel";
+    dialog_.Attempting = true;
+    dialog_.SearchRatesButton.Visible = false;
     connect();
+    dialog_.Attempting = false;
     for (Button* close : {&dialog_.CancelConnButton, &dialog_.CancelConnButton1})
         close->Caption = "Close";
-    if (!panel_.isConnected && !state_.DialCancelled)
-        (link_.isTcp() ? forms_.tcpConnection.AdviceLabel : dialog_.AdviceLabel).Caption =
-            connectionAdvice(forms_);
+    const bool failed = !panel_.isConnected && !state_.DialCancelled;
+    if (failed && panel_.ConnectionState == CF::DIRECTCON) dialog_.SearchRatesButton.Visible = true;
+    showConnectingStep(forms_, failed ? connectionAdvice(forms_) : std::string());
 }
 
 void Handshake::connect() {
@@ -90,12 +93,18 @@ bool Handshake::wakeInstrument() {
         session_.DebugLine("...");
         session_.events.sleep(kRadioSettleMs);
     }
+    const std::int16_t way = panel_.ConnectionState;
+    showConnectingStep(forms_, std::string(way == CF::DIRECTCON ? "Port open"
+                                           : way == CF::TCPCON  ? "Server reached"
+                                                                : "Line up") +
+                                   ", waiting for the instrument");
     session_.DebugLine("Sending initializing <CR> ...");
     session_.events.sleep(kBeforeFirstCrMs);
     link_.WriteToLink("\r");
     session_.DebugLine("Reading the first response...");
     if (reader_.ReadAnswer().empty()) return false;
     session_.DebugLine("Successful");
+    showConnectingStep(forms_, "The instrument answers, reading its settings");
     mouse(11);
     return true;
 }

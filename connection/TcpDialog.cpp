@@ -135,8 +135,12 @@ void TcpDialog::connect(bool readTrace) {
     quit_ = false;
     dialog_.lblReason.Caption = "";
     dialog_.Connecting = true;
-    const bool found = open(trimmed(dialog_.IPAdressTextBox.Text.get()), portText);
+    const std::string host = trimmed(dialog_.IPAdressTextBox.Text.get());
+    const std::string step = "Connecting to " + host + ":" + portText;
+    dialog_.AdviceLabel.Caption = step;
+    const bool found = open(host, portText);
     dialog_.Connecting = false;
+    if (dialog_.AdviceLabel.Caption.get() == step) dialog_.AdviceLabel.Caption = "";
     if (!found) return;
     start_.connect();
     dialog_.Hide();

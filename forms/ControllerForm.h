@@ -162,6 +162,7 @@ class ControllerForm : public Form {
     MenuItem ConnectionLine{*this, "ConnectionLine", "-", &Connection};
     MenuItem SetDevice{*this, "SetDevice", "Set Communication Device...", &Connection};
     MenuItem Disconnect{*this, "Disconnect", "Disconnect", &Connection};
+    MenuItem ReconnectAlways{*this, "ReconnectAlways", "Reconnect by Itself", &Connection};
     MenuItem Utility{*this, "Utility", "Utility"};
     MenuItem UtilityGraphSettings{*this, "UtilityGraphSettings", "Graph Settings...", &Utility};
     MenuItem UtilityServer{*this, "UtilityServer", "Server Mode...", &Utility};
@@ -202,6 +203,10 @@ class ControllerForm : public Form {
     CheckBox PlaybackRepeat{*this, "PlaybackRepeat", "Repeat"};
     CheckBox PlaybackRealTime{*this, "PlaybackRealTime", "Real time"};
     Button PlaybackClose{*this, "PlaybackClose", "Close"};
+    Frame ReconnectFrame{*this, "ReconnectFrame"};  ///< shown while a port has gone or come back
+    Label ReconnectLabel{*this, "ReconnectLabel"};
+    Button ReconnectButton{*this, "ReconnectButton", "Reconnect"};
+    Button ReconnectCloseButton{*this, "ReconnectCloseButton", "Close"};
     Label FileLabel{*this, "FileLabel"};  ///< progress of a recording or of a file that loads
     Label WaitLabel{*this, "WaitLabel"};  ///< what is waited for, and how long at most
     TextBox DebugTextBox{*this, "DebugTextBox"};

@@ -16,7 +16,9 @@ class MainForm : public Form {
                       {"CommandIsIDN", &CommandIsIDN},
                       {"IsConnecting", &IsConnecting},
                       {"ModemConnected", &ModemConnected},
-                      {"Dialling", &Dialling}});
+                      {"Dialling", &Dialling},
+                      {"Searching", &Searching}});
+        SearchRatesButton.Visible = false;  // until an attempt has failed
     }
 
     std::vector<std::string> CommPorts;  ///< names of the serial ports
@@ -25,6 +27,8 @@ class MainForm : public Form {
     bool IsConnecting = false;    ///< the handshake runs
     bool ModemConnected = false;  ///< a dialled link is up
     bool Dialling = false;        ///< a dial is under way
+    bool Attempting = false;      ///< the instrument is woken and asked for its state
+    bool Searching = false;       ///< the baud rates are tried one by one
 
     DropDownList COMList{*this, "COMList", true};
     DropDownList BaudList{*this, "BaudList", true};
@@ -36,6 +40,7 @@ class MainForm : public Form {
     Picture OnPic{*this, "OnPic", "on"};
     Label AdviceLabel{*this, "AdviceLabel"};  ///< how long a wait lasts; what to check after it
     Button ZELButton{*this, "ZELButton", "Connect"};
+    Button SearchRatesButton{*this, "SearchRatesButton", "Search Baud Rates"};
     Button DisconnectButton{*this, "DisconnectButton", "Disconnect"};
     Button DialButton{*this, "DialButton", "Dial"};
     Button CancelButton{*this, "CancelButton", "Cancel"};

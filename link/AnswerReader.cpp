@@ -71,7 +71,7 @@ std::string AnswerReader::read(std::int64_t timeoutMs, const char* silenceText,
             if (link_.isTcp()) {
                 link_.tellLoss();
                 if (!panel_.isConnected) takeConnectionDown();
-            } else if (!state_.DialCancelled && !told) {
+            } else if (!state_.DialCancelled && !told && !saysLossInTheBar(panel_)) {
                 std::string text = "Port not open!";
                 if (!link_.problem().empty()) text += kCrLf + link_.problem();
                 session_.boxes.show({BoxIcon::Critical, text});

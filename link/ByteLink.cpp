@@ -132,7 +132,7 @@ std::string ByteLink::ReadFromLink(bool wait) {
         if (wait) result = takeFromSocket();
     } else if (dialog_.IsConnectedToPort && port_.isOpen()) {
         result = port_.input();
-    } else if (!panel_.ErrorFlag) {
+    } else if (!panel_.ErrorFlag && !saysLossInTheBar(panel_)) {
         boxes_.show({BoxIcon::Critical, "Not Connected To Port!"});
         panel_.ErrorFlag = true;
     }

@@ -21,6 +21,7 @@ Label& WaitNotice::dialogLabel() const {
 }
 
 void WaitNotice::tell(std::int64_t elapsedMs, std::int64_t timeoutMs) {
+    if (!panel_.isConnected) showStep(elapsedMs, timeoutMs);
     if (elapsedMs < kSilentMs) return;
     const std::int64_t left = (timeoutMs - elapsedMs + 999) / 1000;
     if (left == shownSeconds_) return;
@@ -31,14 +32,24 @@ void WaitNotice::tell(std::int64_t elapsedMs, std::int64_t timeoutMs) {
     shownSeconds_ = left;
     const std::string text = "Waiting for the instrument, at most " + lengthText(left) + " more";
     panel_.WaitLabel.Caption = text;
-    if (!panel_.isConnected) dialogLabel().Caption = text;
+}
+
+void WaitNotice::showStep(std::int64_t elapsedMs, std::int64_t timeoutMs) {
+    Label& label = dialogLabel();
+    if (!stepShown_) step_ = label.Caption;
+    stepShown_ = true;
+    const std::string what = step_.empty() ? "Waiting for the instrument" : step_;
+    const std::string text = what + ", " + std::to_string(elapsedMs / 1000) + " of " +
+                             lengthText((timeoutMs + 999) / 1000);
+    if (label.Caption.get() != text) label.Caption = text;
 }
 
 void WaitNotice::clear() {
+    if (stepShown_) dialogLabel().Caption = step_;
+    stepShown_ = false;
     if (shownSeconds_ < 0) return;
     shownSeconds_ = -1;
     panel_.WaitLabel.Caption = "";
-    if (!panel_.isConnected) dialogLabel().Caption = "";
     if (lentStop_) panel_.StopButton.Visible = false;
     lentStop_ = false;
 }
@@ -47,6 +58,15 @@ void showLinkLost(ControllerForm& panel, bool lost) {
     panel.LinkLost = lost;
     if (lost) panel.CWGraph1.Old = true;  // until the next trace is drawn
     panel.ConnectedPic.Image = lost ? "lost" : "connected";
+}
+
+bool saysLossInTheBar(const ControllerForm& panel) {
+    return panel.isConnected && panel.ReconnectAlways.Checked;
+}
+
+void showConnectingStep(Forms& forms, const std::string& step) {
+    const bool tcp = forms.controller.ConnectionState == ControllerForm::TCPCON;
+    (tcp ? forms.tcpConnection.AdviceLabel : forms.main.AdviceLabel).Caption = step;
 }
 
 std::string connectionAdvice(const Forms& forms) {

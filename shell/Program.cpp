@@ -9,6 +9,8 @@
 #include "connection/DoctorKeys.h"
 #include "connection/Handshake.h"
 #include "connection/Profiles.h"
+#include "connection/RateSearch.h"
+#include "connection/Reconnection.h"
 #include "connection/SessionClock.h"
 #include "connection/SessionStart.h"
 #include "connection/TcpDialog.h"
@@ -173,6 +175,9 @@ struct Program::Rooms {
           report(forms.error, {p.clipboard, p.fileDialogs, p.files, boxes, p.events}),
           doctor({p.portProbe, p.serialPort, p.tcpSocket, p.clock, p.events}),
           doctorKeys(forms, doctor, p.clipboard, p.events),
+          rateSearch(forms, line, doctor, dialog, session),
+          reconnection(forms, mirror, {p.serialPort, p.portProbe, p.settings, doctor}, dialog,
+                       disconnection, interlock),
           sessionKeys(panel, record, p.fileDialogs, boxes),
           failures(logs, report, [this] { endAfterFailure(); }) {
         panel.CommandLine = std::move(commandLine);
@@ -308,6 +313,8 @@ struct Program::Rooms {
     ErrorReport report;
     Doctor doctor;
     DoctorKeys doctorKeys;
+    RateSearch rateSearch;
+    Reconnection reconnection;
     SessionKeys sessionKeys;
     Failures failures;
     Handlers handlers;
@@ -387,6 +394,10 @@ bool Program::connect(const LinkAddress& address, bool readTrace) {
         rooms_->tcpDialog.connect(readTrace);
         return panel.isConnected;
     }
+    if (!address.dialled()) {
+        rooms_->dialog.connectTo(address.port, address.number, readTrace);
+        return panel.isConnected;
+    }
     const bool quick = panel.immConnectState;
     panel.immConnectState = true;
     rooms_->dialog.SetConnectionKind(connectionKind(address.kind));
@@ -394,12 +405,8 @@ bool Program::connect(const LinkAddress& address, bool readTrace) {
     MainForm& dialog = rooms_->forms.main;
     dialog.COMList.setText(address.port);
     dialog.BaudList.setText(std::to_string(address.number));
-    if (address.dialled()) {
-        dialog.TelNumberBox.Text = address.phone;
-        rooms_->dialling.dial(readTrace);
-    } else {
-        rooms_->dialog.connectDirect(readTrace);
-    }
+    dialog.TelNumberBox.Text = address.phone;
+    rooms_->dialling.dial(readTrace);
     rooms_->softPanel.SetButtonsStatus(ControllerForm::Freq);
     return panel.isConnected;
 }

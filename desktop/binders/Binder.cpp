@@ -43,6 +43,13 @@ QString faceOf(Color color) {
     return "plain";
 }
 
+void setMark(QWidget* widget, const char* name, bool on) {
+    if (widget->property(name).toBool() == on) return;
+    widget->setProperty(name, on);
+    widget->style()->unpolish(widget);
+    widget->style()->polish(widget);
+}
+
 void setFace(QWidget* widget, const QString& face) {
     if (widget->property("face").toString() == face) return;
     widget->setProperty("face", face);

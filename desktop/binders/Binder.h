@@ -132,6 +132,8 @@ class PanelLineEdit : public QLineEdit {
 
 /// The face of a control's colour for the style sheet: "plain", "red", "green", "gray".
 QString faceOf(Color color);
+/// A property that the style sheet asks for; the widget is drawn again when it changes.
+void setMark(QWidget* widget, const char* name, bool on);
 /// Puts the face on the widget and has it drawn again.
 void setFace(QWidget* widget, const QString& face);
 

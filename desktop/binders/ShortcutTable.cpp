@@ -82,6 +82,8 @@ const std::vector<ShortcutRow>& shortcutTable() {
         {"MenuFileSaveImage", "Ctrl+Shift+S"},
         {"RecordData", "Ctrl+R"},
         {"Disconnect", "Ctrl+D"},
+        {"ReconnectButton", "Ctrl+J"},
+        {"ReconnectCloseButton", "Ctrl+Shift+J"},
         {"ExitObject", "Ctrl+Q"},
     };
     return table;

@@ -17,6 +17,7 @@ class EmptyScreen : public QWidget {
         std::function<void(int)> connectAgain;  ///< by the place in the list
         std::function<void()> simulate;
         std::function<void()> open;
+        std::function<void()> again;  ///< the last attempt once more
     };
     EmptyScreen(Ways ways, QWidget* parent);
 

@@ -4,11 +4,15 @@
 #include <QFormLayout>
 #include <QHBoxLayout>
 #include <QKeyEvent>
+#include <QPointer>
 #include <QVBoxLayout>
 
 #include "desktop/binders/ToolTips.h"
+#include "desktop/windows/ConnectCard.h"
 #include "forms/MainForm.h"
 #include "panel/EntryText.h"
+#include "platform/LinkAddress.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {
@@ -174,11 +178,7 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
             fields->addRow(caption, row);
             caption = nullptr;
             binder.bind(static_cast<TextBox&>(*control), line);
-            connect(line, &QLineEdit::textChanged, this, [this, line, field](const QString& text) {
-                line->showProblem(problemOf(field, text));
-                checkFields();
-            });
-            checked_.push_back([line, field] { return problemOf(field, line->text()); });
+            checkField(*line, [field](const QString& text) { return problemOf(field, text); });
         } else if (control->kind() == ControlKind::OptionButton) {
             auto* option = new QRadioButton;
             layout->addWidget(option);
@@ -202,7 +202,25 @@ PlainFormWindow::PlainFormWindow(Form& form, Binder& binder, QWidget* parent)
     followForm();
 }
 
-void PlainFormWindow::checkFields() {
+void FormWindow::checkField(PanelLineEdit& line, std::function<QString(const QString&)> problem) {
+    connect(&line, &QLineEdit::textChanged, this,
+            [this, field = &line, problem](const QString& text) {
+                field->showProblem(problem(text));
+                checkFields();
+            });
+    checked_.push_back([field = &line, problem] { return problem(field->text()); });
+}
+
+void FormWindow::checkField(QComboBox& list, std::function<QString(const QString&)> problem) {
+    connect(&list, &QComboBox::editTextChanged, this,
+            [this, field = &list, problem](const QString& text) {
+                setMark(field, "refused", !problem(text).isEmpty());
+                checkFields();
+            });
+    checked_.push_back([field = &list, problem] { return problem(field->currentText()); });
+}
+
+void FormWindow::checkFields() {
     if (accept_ == nullptr) return;
     QString problem;
     for (const auto& check : checked_)
@@ -228,7 +246,10 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     const auto button = [&binder](Button& control) {
         auto* key = new QPushButton;
         key->setAutoDefault(false);
-        key->setMinimumWidth(100);
+        constexpr int kAroundText = 28;  // px
+        const QString words = QString::fromStdString(control.Caption.get());
+        key->setMinimumWidth(
+            std::max(100, key->fontMetrics().horizontalAdvance(words) + kAroundText));
         binder.bind(control, key);
         return key;
     };
@@ -236,7 +257,15 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     auto* serial = new QGroupBox("Serial port");
     auto* serialFields = new QFormLayout(serial);
     serialFields->addRow("Port", list(form.COMList));
-    serialFields->addRow("Baud rate", list(form.BaudList));
+    QComboBox* baud = list(form.BaudList);
+    setAccept(form.ZELButton);
+    checkField(*baud, [](const QString& text) {
+        const QString digits = text.trimmed().remove(',');
+        return digits.isEmpty() || wholeNumber(digits.toStdString(), 1, kFastestBaud)
+                   ? QString()
+                   : QString("The baud rate is a whole number");
+    });
+    serialFields->addRow("Baud rate", baud);
     auto* portState = new QLabel("The port is open");
     serialFields->addRow("", portState);
     serialFields->addRow("Instrument", box(form.IDText));
@@ -261,8 +290,9 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     for (Button* control : {&form.LoadSettingsButton, &form.SaveSettingsButton})
         keys->addWidget(button(*control));
     keys->addStretch(1);
-    for (Button* control : {&form.ZELButton, &form.DisconnectButton, &form.DisconnectButton2,
-                            &form.CancelConnButton, &form.CancelConnButton1})
+    for (Button* control :
+         {&form.SearchRatesButton, &form.ZELButton, &form.DisconnectButton, &form.DisconnectButton2,
+          &form.CancelConnButton, &form.CancelConnButton1})
         keys->addWidget(button(*control));
     static_cast<QPushButton*>(binder.widgetOf(form.ZELButton))->setDefault(true);
     // While it dials, Esc ends the dialling.
@@ -279,6 +309,9 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     policy.setRetainSizeWhenHidden(true);  // nothing moves when the work begins
     busy_->setSizePolicy(policy);
     layout->addWidget(busy_);
+    form.AdviceLabel.Changed.connect([bar = QPointer<QProgressBar>(busy_), &form] {
+        if (bar) showWait(*bar, form.AdviceLabel.Caption);
+    });
     layout->addLayout(keys);
     layout->setSizeConstraint(QLayout::SetMinimumSize);
     followForm();

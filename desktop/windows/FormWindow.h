@@ -20,6 +20,13 @@ class FormWindow : public QDialog {
     void followForm();
     /// The button that Esc stands for, while it can be pressed.
     void setCancel(const Button& button) { cancels_.push_back(&button); }
+    /// `problem` says why a text of the field cannot be taken, or nothing. Such a text is marked,
+    /// and the button that takes the fields over cannot be used meanwhile.
+    void checkField(PanelLineEdit& line, std::function<QString(const QString&)> problem);
+    /// The same for a list into which one can type.
+    void checkField(QComboBox& list, std::function<QString(const QString&)> problem);
+    void setAccept(const Control& control) { accept_ = &control; }
+    void checkFields();
     void closeEvent(QCloseEvent* event) override;
     void reject() override;
     void keyPressEvent(QKeyEvent* event) override;
@@ -32,6 +39,8 @@ class FormWindow : public QDialog {
     std::vector<const Button*> cancels_;
     QTimer shown_;
     bool putAway_ = false;
+    std::vector<std::function<QString()>> checked_;
+    const Control* accept_ = nullptr;
     QProgressBar* busy_ = nullptr;  ///< runs while the form shows the hourglass
 };
 
@@ -40,13 +49,6 @@ class FormWindow : public QDialog {
 class PlainFormWindow : public FormWindow {
   public:
     PlainFormWindow(Form& form, Binder& binder, QWidget* parent);
-
-  private:
-    /// The button that takes the fields over can be used while all of them can be read.
-    void checkFields();
-
-    std::vector<std::function<QString()>> checked_;
-    const Control* accept_ = nullptr;
 };
 
 /// The connection dialog.

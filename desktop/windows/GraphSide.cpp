@@ -8,6 +8,7 @@
 #include "desktop/graph/SpectrogramWidget.h"
 #include "desktop/windows/GraphMenu.h"
 #include "desktop/windows/PlaybackBar.h"
+#include "desktop/windows/ReconnectBar.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {
@@ -28,7 +29,10 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
     layout->setSpacing(kSpacing);
     graph_ = new GraphWidget(panel_.CWGraph1,
                              [this] { return annotateView(panel_, program_.variables()); });
+    connecting_ =
+        new ConnectCard(program.forms(), binder, {ways.again, [this] { showEmpty(); }}, graph_);
     empty_ = new EmptyScreen(std::move(ways), graph_);
+    connecting_->raise();
     power_ = new PowerDisplay(panel_, graph_);
     readouts_ = new Readouts(panel_, binder_);
     graph_->setNavigator(&navigator_);
@@ -43,6 +47,7 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
         if (self && self->power_->isVisibleTo(self->graph_)) self->power_->take();
     });
     graph_->installEventFilter(this);
+    layout->addWidget(new ReconnectBar(panel_, binder_));
     layout->addWidget(graph_, 2);
     layout->addWidget(spectrogram(), 1);
     layout->addWidget(new PlaybackBar(program_.forms(), binder_));
@@ -85,10 +90,15 @@ void GraphSide::showSource() {
         if (file.isFile()) source += file.lastModified().toString("   yyyy-MM-dd hh:mm");
     }
     graph_->setSource(source);
+    readouts_->showFile(panel_.Shown.fromFile);
 }
 
 void GraphSide::showChannel() {
     const ZEL3Variables& mirror = program_.variables();
+    // The stretch of a burst that is measured begins at the trigger.
+    if (panel_.isConnected && !panel_.Shown.fromFile && panel_.Shown.xUnit == "s" &&
+        panel_.InstrumentMode == ControllerForm::TDMAPOWERMODE)
+        return graph_->setChannel(0, mirror.TDMAMeasTime);
     double width = 0;
     if (panel_.isConnected && !panel_.Shown.fromFile) {
         if (panel_.InstrumentMode == ControllerForm::CHANNELPOWER)
@@ -109,15 +119,21 @@ void GraphSide::showPower() {
 }
 
 void GraphSide::showEmpty() {
-    const bool empty = !panel_.isConnected && panel_.CWGraph1.values().empty();
-    if (empty == empty_->isVisibleTo(graph_)) return;
+    const bool connecting = connecting_->wanted();
+    const bool empty = !panel_.isConnected && panel_.CWGraph1.values().empty() && !connecting;
+    if (empty == empty_->isVisibleTo(graph_) && connecting == connecting_->isVisibleTo(graph_))
+        return;
     empty_->setVisible(empty);
+    connecting_->setVisible(connecting);
     place();
 }
 
 void GraphSide::place() {
     empty_->setGeometry(graph_->rect());
     power_->setGeometry(graph_->rect());
+    connecting_->adjustSize();
+    connecting_->move((graph_->width() - connecting_->width()) / 2,
+                      (graph_->height() - connecting_->height()) / 2);
 }
 
 bool GraphSide::eventFilter(QObject* watched, QEvent* event) {

@@ -7,6 +7,7 @@
 
 #include "desktop/binders/Binder.h"
 #include "desktop/graph/GraphWidget.h"
+#include "desktop/windows/ConnectCard.h"
 #include "desktop/windows/EmptyScreen.h"
 #include "desktop/windows/PointerText.h"
 #include "desktop/windows/PowerDisplay.h"
@@ -43,6 +44,7 @@ class GraphSide : public QWidget {
     Binder& binder_;
     GraphWidget* graph_;
     EmptyScreen* empty_;
+    ConnectCard* connecting_;
     PowerDisplay* power_;
     Readouts* readouts_;
     GraphNavigator navigator_;

@@ -93,7 +93,10 @@ void MainWindow::buildCentre() {
                            connectToSimulator_ = true;
                            panel_.UtilityTrouble.Click();
                        },
-                       [this] { panel_.LoadData.Click(); }});
+                       [this] { panel_.LoadData.Click(); },
+                       [this] {
+                           if (LinkAddress last; addressOf(program_.forms(), last)) connectTo(last);
+                       }});
     graphSide_->copyPicture = [this] { copyPicture(); };
     layout->addWidget(graphSide_, 1);
     side_ = new PanelSide(panel_, program_.variables(), binder_);
@@ -227,14 +230,17 @@ void MainWindow::greyWhatRefuses() {
     const int state = (panel_.isConnected ? 1 : 0) + (view ? 2 : 0) +
                       (panel_.InstrumentMode == ControllerForm::POWERSENSOR ? 4 : 0) +
                       (panel_.RecordDataFlag ? 8 : 0);
+    side_->showState(view, panel_.isConnected && panel_.Shown.fromFile);
     if (state == lockState_) return;
     lockState_ = state;
-    side_->showViewRuns(view);
     for (const Control* control : panel_.controls()) binder_.refresh(*control);
 }
 
 void MainWindow::connectTo(const LinkAddress& address) {
-    if (panel_.isConnected || program_.forms().main.IsConnecting) return;
+    const Forms& forms = program_.forms();
+    if (panel_.isConnected || forms.main.Attempting || forms.main.Searching ||
+        forms.tcpConnection.Connecting)
+        return;
     program_.sessionLog().input("connect");
     program_.connect(address, true);
 }

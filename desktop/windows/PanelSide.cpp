@@ -1,5 +1,6 @@
 #include "desktop/windows/PanelSide.h"
 
+#include <QCoreApplication>
 #include <QGridLayout>
 #include <QHBoxLayout>
 #include <QVBoxLayout>
@@ -84,9 +85,12 @@ void PanelSide::resizeEvent(QResizeEvent* event) {
     foldByRoom();
 }
 
-void PanelSide::showViewRuns(bool runs) {
-    reason_->setText(runs ? QObject::tr("Stop the view to use the grey keys")
-                          : QObject::tr("Soft key"));
+void PanelSide::showState(bool viewRuns, bool fileShown) {
+    QString text = QObject::tr("Soft key");
+    if (fileShown) text = QObject::tr("Boxes: instrument, not file");
+    if (viewRuns) text = QObject::tr("Stop the view to use the grey keys");
+    reason_->setText(text);
+    setMark(reason_, "file", fileShown && !viewRuns);
 }
 
 void PanelSide::foldByRoom() {

@@ -27,8 +27,9 @@ class PanelSide : public QScrollArea {
     const std::vector<FoldGroup*>& groups() const { return groups_; }
     /// Opens and folds the groups that the user has not chosen for, so that the rest fits.
     void foldByRoom();
-    /// While the continuous view runs a line says why keys are grey.
-    void showViewRuns(bool runs);
+    /// A line says why keys are grey while the continuous view runs, else that the boxes show the
+    /// instrument while the graph shows a file.
+    void showState(bool viewRuns, bool fileShown);
 
   signals:
     /// The user has folded or opened a group.

@@ -1,5 +1,6 @@
 #include "desktop/windows/PowerDisplay.h"
 
+#include <QCoreApplication>
 #include <QPainter>
 #include <QPainterPath>
 #include <algorithm>
@@ -62,7 +63,13 @@ void PowerDisplay::drawHistory(QPainter& painter, const QRectF& place) const {
     painter.setPen(QPen(colors.grid, 1));
     painter.setBrush(colors.plotArea);
     painter.drawRect(place);
-    if (history_.size() < 2) return;
+    if (history_.size() < 2) {
+        painter.setPen(colors.text);
+        painter.drawText(place, Qt::AlignCenter,
+                         QCoreApplication::translate(
+                             "PowerDisplay", "Single reads the power once, Continuous goes on"));
+        return;
+    }
     const auto [low, high] = std::minmax_element(history_.begin(), history_.end());
     const double bottom = *low - 1;
     const double top = *high + 1;

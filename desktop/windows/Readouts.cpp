@@ -66,8 +66,10 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     };
     QGridLayout* range = card(*row, 2);
     range->setColumnMinimumWidth(0, kRangeWidth);
-    range->addWidget(bound(panel.CFLabel), 0, 0);
-    range->addWidget(bound(panel.SpanLabel), 1, 0);
+    centre_ = bound(panel.CFLabel);
+    span_ = bound(panel.SpanLabel);
+    range->addWidget(centre_, 0, 0);
+    range->addWidget(span_, 1, 0);
     QGridLayout* markers = card(*row, 5);
     markers->addWidget(bound(panel.MarkerLabel), 0, 0);
     markers->addWidget(atMarker_, 0, 1, Qt::AlignRight);
@@ -102,6 +104,10 @@ void Readouts::showTrace(const QString& atMarker, const QString& atDelta) {
                                                    : QObject::tr("trace %1").arg(atMarker));
     atDelta_->setText(atDelta.isEmpty() || !room ? QString()
                                                  : QObject::tr("trace %1").arg(atDelta));
+}
+
+void Readouts::showFile(bool fromFile) {
+    for (QLabel* label : {centre_, span_}) setMark(label, "file", fromFile);
 }
 
 }  // namespace zel

@@ -19,7 +19,12 @@ class Readouts : public QWidget {
     /// What the trace has at the markers, apart from the instrument's own answer.
     void showTrace(const QString& atMarker, const QString& atDelta);
 
+    /// Centre and span are those of a loaded file.
+    void showFile(bool fromFile);
+
   private:
+    QLabel* centre_;
+    QLabel* span_;
     QLabel* pointer_;
     QLabel* pointerLevel_;
     QLabel* atMarker_;

@@ -17,6 +17,7 @@
 
 #include "desktop/binders/Binder.h"
 #include "forms/Forms.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {
@@ -26,6 +27,7 @@ constexpr int kButtonWidth = 100;
 constexpr int kLightSize = 14;  // px
 constexpr int kBridging = 7;
 constexpr int kListening = 2;
+constexpr int kHighestPort = 65535;
 
 PanelLineEdit* box(Binder& binder, TextBox& control) {
     auto* line = new PanelLineEdit;
@@ -63,6 +65,12 @@ QCheckBox* check(Binder& binder, CheckBox& control) {
     auto* tick = new QCheckBox;
     binder.bind(control, tick);
     return tick;
+}
+
+/// An empty field is not marked: the button says in its own words what is missing.
+QString portProblem(const QString& text) {
+    const bool good = text.isEmpty() || wholeNumber(text.trimmed().toStdString(), 1, kHighestPort);
+    return good ? QString() : QString("The port is a whole number from 1 to 65535");
 }
 
 QPixmap lightOf(const QColor& color) {
@@ -104,7 +112,10 @@ TcpWindow::TcpWindow(TCPConnectionForm& form, Binder& binder, QWidget* parent)
     auto* fields = new QFormLayout;
     fields->addRow("Recent servers", list(binder, form.RecentServersList));
     fields->addRow("Address", box(binder, form.IPAdressTextBox));
-    fields->addRow("Port", box(binder, form.RemotePortTextBox));
+    PanelLineEdit* port = box(binder, form.RemotePortTextBox);
+    setAccept(form.ConnectTCPButton);
+    checkField(*port, portProblem);
+    fields->addRow("Port", port);
     fields->addRow("", check(binder, form.chkTls));
     PanelLineEdit* pinned = box(binder, form.FingerprintTextBox);
     pinned->setPlaceholderText("of the server's certificate; empty: by its authority");
@@ -229,7 +240,10 @@ QWidget* ServerWindow::settings() {
     address->addWidget(own, 1);
     address->addWidget(button(binder_, server_.cmdCopyAddress));
     networkFields->addRow("This machine", address);
-    networkFields->addRow("TCP port", box(binder_, server_.localPortTextBox));
+    PanelLineEdit* port = box(binder_, server_.localPortTextBox);
+    setAccept(server_.cmdConnect);
+    checkField(*port, portProblem);
+    networkFields->addRow("TCP port", port);
     PanelLineEdit* allowed = box(binder_, server_.txtAllowed);
     allowed->setPlaceholderText("private networks");
     allowed->setToolTip(

@@ -80,7 +80,7 @@ void StatusLine::showActivity(bool active) {
 
 QString StatusLine::stateText() const {
     if (!panel_.isConnected) {
-        const bool connecting = forms_.main.IsConnecting && forms_.main.MousePointer == kHourglass;
+        const bool connecting = forms_.main.Attempting || forms_.tcpConnection.Connecting;
         return connecting ? QObject::tr("Connecting...") : QObject::tr("Not connected");
     }
     const bool tcp = panel_.ConnectionState == ControllerForm::TCPCON;

@@ -47,7 +47,7 @@ QLineEdit[face="locked"] { background: transparent; border: 1px dashed @border; 
 QComboBox[face="locked"] { background: transparent; border: 1px dashed @border; }
 QComboBox[face="locked"]::down-arrow { border: none; }
 QLineEdit[face="locked"]:focus, QComboBox[face="locked"]:focus { border: 2px dashed @focus; }
-QLineEdit[refused="true"], QLineEdit[refused="true"]:focus { border: 2px solid @problem;
+QComboBox[refused="true"], QLineEdit[refused="true"], QLineEdit[refused="true"]:focus { border: 2px solid @problem;
     color: @problem; padding: 0px 3px; }
 QPushButton[face="terminator"] { background: @base; padding: 1px 2px; font-size: 11px; }
 QPushButton[face="terminator"]:hover { background: @buttonHover; }
@@ -55,13 +55,14 @@ QPushButton[face="terminator"]:pressed { background: @accent; color: @accentText
 QLineEdit:disabled, QComboBox:disabled { color: @dim; background: @window; }
 QLabel#caption { color: @caption; font-size: 11px; }
 QLabel[readout="true"] { font-size: 13px; font-weight: 600; }
+QLabel[file="true"] { color: @file; }
 QFrame#group, QScrollArea#panel { background: @panel; border: 1px solid @hairline;
     border-radius: 6px; }
 QWidget#column { background: transparent; }
 QFrame#card { background: @panel; border: 1px solid @border; border-radius: 6px; }
 QPushButton[soft="true"] { min-height: 28px; }
 QPushButton[way="true"] { text-align: left; padding: 4px 10px; min-height: 24px; }
-QPushButton[narrow="true"] { padding: 2px 0px; font-size: 11px; min-height: 20px; }
+QPushButton[narrow="true"] { padding: 2px 0px; font-size: 10px; min-height: 20px; }
 QPushButton[tool="true"] { padding: 2px 8px; min-height: 24px; }
 QLineEdit[flat="true"], QLineEdit[flat="true"]:read-only { background: transparent; border: none;
     color: @caption; }
@@ -124,6 +125,7 @@ QString styled(const ThemeColors& c) {
         {"@green", c.green},
         {"@focus", c.focus},
         {"@problem", c.problem},
+        {"@file", c.file},
     };
     QString sheet = kStyleSheet;
     for (const auto& [name, value] : names) sheet.replace(name, value);

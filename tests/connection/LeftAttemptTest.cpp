@@ -50,7 +50,7 @@ TEST_F(Connection, Waiting_IsShownInTheDialog) {
     std::string text;
     later(2500, [&] { text = dialog.AdviceLabel.Caption; });
     connect();
-    EXPECT_EQ(text, "Waiting for the instrument, at most 8 s more");
+    EXPECT_EQ(text, "Port open, waiting for the instrument, 1 of 9 s");
 }
 
 TEST_F(Connection, SilentInstrument_TheAdviceStandsBesideTheBox) {

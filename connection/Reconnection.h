@@ -1,0 +1,73 @@
+#pragma once
+// A serial port that disappears in a session and returns: offers to connect again with the same
+// port and rate, or does it by itself, and says which settings are other than before.
+
+#include <cstdint>
+#include <string>
+
+#include "connection/ConnectionDialog.h"
+#include "connection/Disconnection.h"
+#include "connection/Doctor.h"
+#include "connection/KeptSettings.h"
+#include "forms/Forms.h"
+#include "model/ZEL3Variables.h"
+#include "platform/PortProbe.h"
+#include "platform/SerialPort.h"
+#include "platform/Services.h"
+#include "trace/Interlock.h"
+
+namespace zel {
+
+class Reconnection {
+  public:
+    struct Services {
+        SerialPort& port;
+        PortProbe& probe;
+        SettingsStore& settings;
+        Doctor& doctor;
+    };
+    /// Looks at the port once a second; connects the bar's keys and the menu entry, whose tick is
+    /// kept between runs.
+    Reconnection(Forms& forms, ZEL3Variables& mirror, const Services& services,
+                 ConnectionDialog& dialog, Disconnection& disconnection,
+                 const Interlock& interlock);
+    ~Reconnection();
+    Reconnection(const Reconnection&) = delete;
+    Reconnection& operator=(const Reconnection&) = delete;
+
+  private:
+    enum class State : std::uint8_t {
+        Quiet,
+        Gone,    ///< the port is not there
+        Back,    ///< it is there again
+        Closed,  ///< the session was given up, and the attempt after it failed
+    };
+    void look();
+    void lost();
+    void lookForPort();
+    void offer(const std::string& text, bool button);
+    void reconnect();
+    void report();
+    void putAway();
+    void setAlways(bool always);
+
+    Forms& forms_;
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    Services s_;
+    ConnectionDialog& dialog_;
+    Disconnection& disconnection_;
+    const Interlock& interlock_;
+    State state_ = State::Quiet;
+    std::string port_;
+    int baud_ = 0;
+    KeptSettings before_;
+    bool viewRan_ = false;
+    bool recorded_ = false;
+    bool busy_ = false;       ///< connects, or asks whether an instrument answers
+    std::int64_t askAt_ = 0;  ///< microseconds of the clock
+    TaskId view_ = 0;
+    Handlers handlers_;
+};
+
+}  // namespace zel

@@ -1,0 +1,144 @@
+#include "desktop/windows/ConnectCard.h"
+
+#include <QHBoxLayout>
+#include <QPointer>
+#include <QRegularExpression>
+#include <QVBoxLayout>
+
+#include "desktop/platform/SimulatorChild.h"
+
+namespace zel {
+namespace {
+
+constexpr int kWidth = 440;
+constexpr int kBarHeight = 6;
+constexpr int kStepLines = 3;
+
+}  // namespace
+
+void showWait(QProgressBar& bar, const std::string& step) {
+    static const QRegularExpression seconds(", (\\d+) of (\\d+) s$");
+    const auto match = seconds.match(QString::fromStdString(step));
+    bar.setRange(0, match.hasMatch() ? match.captured(2).toInt() : 0);
+    bar.setValue(match.hasMatch() ? match.captured(1).toInt() : 0);
+}
+
+ConnectCard::ConnectCard(Forms& forms, Binder& binder, Ways ways, QWidget* parent)
+    : QFrame(parent),
+      forms_(forms),
+      binder_(binder),
+      ways_(std::move(ways)),
+      heading_(new QLabel),
+      step_(new QLabel),
+      wait_(new QProgressBar),
+      cancel_(new QPushButton(tr("Cancel"))),
+      again_(new QPushButton(tr("Try Again"))),
+      search_(new QPushButton(QString::fromStdString(forms.main.SearchRatesButton.Caption))),
+      close_(new QPushButton(tr("Close"))) {
+    setObjectName("card");
+    setFixedWidth(kWidth);
+    setAccessibleName(tr("Connecting"));
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(16, 14, 16, 16);
+    layout->setSpacing(8);
+    heading_->setProperty("readout", true);
+    for (QLabel* label : {heading_, step_}) {
+        label->setTextFormat(Qt::PlainText);
+        label->setWordWrap(true);
+        layout->addWidget(label);
+    }
+    step_->setAlignment(Qt::AlignLeft | Qt::AlignTop);
+    step_->setMinimumHeight(kStepLines * step_->fontMetrics().lineSpacing());
+    wait_->setTextVisible(false);
+    wait_->setFixedHeight(kBarHeight);
+    wait_->setAccessibleName(tr("Progress of the connection"));
+    layout->addWidget(wait_);
+    auto* keys = new QHBoxLayout;
+    keys->addStretch(1);
+    for (QPushButton* key : {again_, search_, close_, cancel_}) {
+        constexpr int kAroundText = 28;  // px
+        key->setMinimumWidth(
+            std::max(96, key->fontMetrics().horizontalAdvance(key->text()) + kAroundText));
+        keys->addWidget(key);
+    }
+    layout->addLayout(keys);
+    connect(cancel_, &QPushButton::clicked, this, [this] { cancel(); });
+    connect(again_, &QPushButton::clicked, this, [this] { ways_.again(); });
+    connect(search_, &QPushButton::clicked, this, [this] { click(forms_.main.SearchRatesButton); });
+    connect(close_, &QPushButton::clicked, this, [this] {
+        putAway_ = true;
+        take();
+    });
+    for (Control* control : {static_cast<Control*>(&forms.main.AdviceLabel),
+                             static_cast<Control*>(&forms.main.SearchRatesButton),
+                             static_cast<Control*>(&forms.tcpConnection.AdviceLabel),
+                             static_cast<Control*>(&forms.controller.ConnectedPic)})
+        control->Changed.connect([self = QPointer<ConnectCard>(this)] {
+            if (self) self->take();
+        });
+    for (Form* form : {static_cast<Form*>(&forms.main), static_cast<Form*>(&forms.tcpConnection)})
+        form->Changed.connect([self = QPointer<ConnectCard>(this)] {
+            if (self) self->take();
+        });
+    hide();
+}
+
+bool ConnectCard::connecting() const {
+    return forms_.main.Attempting || forms_.main.Searching || forms_.tcpConnection.Connecting;
+}
+
+QString ConnectCard::heading() const {
+    using CF = ControllerForm;
+    if (forms_.controller.ConnectionState == CF::TCPCON)
+        return QString::fromStdString(forms_.tcpConnection.IPAdressTextBox.Text.get() + ":" +
+                                      forms_.tcpConnection.RemotePortTextBox.Text.get());
+    const QString port = QString::fromStdString(forms_.main.COMList.Text());
+    if (port.contains(SimulatorChild::kLinkName)) return tr("Simulated instrument");
+    return tr("%1, %2 baud").arg(port, QString::fromStdString(forms_.main.BaudList.Text()));
+}
+
+void ConnectCard::take() {
+    const bool work = connecting();
+    const QWidget* at = window()->focusWidget();
+    const bool focused = at != nullptr && isAncestorOf(at);
+    if (work) putAway_ = false;
+    const bool dialog = forms_.main.Visible || forms_.tcpConnection.Visible;
+    const MainForm& form = forms_.main;
+    const bool failed = !work && form.SearchRatesButton.Visible && !putAway_ &&
+                        !form.AdviceLabel.Caption.get().empty();
+    const bool wanted = !forms_.controller.isConnected && !dialog && (work || failed);
+    if (wanted) {
+        const bool tcp = forms_.controller.ConnectionState == ControllerForm::TCPCON;
+        const std::string step =
+            tcp ? forms_.tcpConnection.AdviceLabel.Caption : form.AdviceLabel.Caption;
+        heading_->setText(failed           ? tr("No instrument was found")
+                          : form.Searching ? tr("Searching the baud rate")
+                                           : tr("Connecting to %1").arg(heading()));
+        step_->setText(QString::fromStdString(step));
+        showWait(*wait_, step);
+        for (QPushButton* key : {again_, search_, close_}) key->setVisible(failed);
+        cancel_->setVisible(work);
+        wait_->setVisible(work);
+    }
+    if (wanted != wanted_) {
+        wanted_ = wanted;
+        if (ways_.changed) ways_.changed();
+    }
+    // The focus stays on the key that helps now, and goes to the graph at the end.
+    if (wanted && failed != failed_) (failed ? search_ : cancel_)->setFocus(Qt::OtherFocusReason);
+    if (wanted && work && !focused) cancel_->setFocus(Qt::OtherFocusReason);
+    failed_ = failed;
+    if (!wanted && focused) parentWidget()->setFocus(Qt::OtherFocusReason);
+}
+
+void ConnectCard::cancel() {
+    const bool tcp = forms_.controller.ConnectionState == ControllerForm::TCPCON;
+    click(tcp ? forms_.tcpConnection.QuitTCPButton : forms_.main.CancelConnButton1);
+}
+
+void ConnectCard::click(Button& button) {
+    const auto act = [&button] { button.Click(); };
+    binder_.perform ? binder_.perform(button, act) : act();
+}
+
+}  // namespace zel
