@@ -801,5 +801,81 @@ oder eine Aufzeichnung laden</translation>
         <source>Colour by level</source>
         <translation>Farbe nach Pegel</translation>
     </message>
+    <message>
+        <source>Connect with the same port and baud rate</source>
+        <translation>Mit demselben Anschluss und derselben Baudrate verbinden</translation>
+    </message>
+    <message>
+        <source>Put this line away</source>
+        <translation>Diese Zeile schließen</translation>
+    </message>
+    <message>
+        <source>State of the lost port</source>
+        <translation>Zustand des verlorenen Anschlusses</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>Try Again</source>
+        <translation>Noch einmal</translation>
+    </message>
+    <message>
+        <source>Connecting</source>
+        <translation>Verbinden</translation>
+    </message>
+    <message>
+        <source>Progress of the connection</source>
+        <translation>Fortschritt der Verbindung</translation>
+    </message>
+    <message>
+        <source>Simulated instrument</source>
+        <translation>Simuliertes Gerät</translation>
+    </message>
+    <message>
+        <source>%1, %2 baud</source>
+        <translation>%1, %2 Baud</translation>
+    </message>
+    <message>
+        <source>No instrument was found</source>
+        <translation>Es wurde kein Gerät gefunden</translation>
+    </message>
+    <message>
+        <source>Searching the baud rate</source>
+        <translation>Die Baudrate wird gesucht</translation>
+    </message>
+    <message>
+        <source>Connecting to %1</source>
+        <translation>Verbinden mit %1</translation>
+    </message>
+    <message>
+        <source>The baud rate is a whole number</source>
+        <translation>Die Baudrate ist eine ganze Zahl</translation>
+    </message>
+    <message>
+        <source>Boxes: instrument, not file</source>
+        <translation>Felder: Gerät, nicht Datei</translation>
+    </message>
+    <message>
+        <source>Single reads the power once, Continuous goes on</source>
+        <translation>Single liest die Leistung einmal, Continuous fortlaufend</translation>
+    </message>
+    <message>
+        <source>Lost connection</source>
+        <translation>Verlorene Verbindung</translation>
+    </message>
+    <message>
+        <source>Connects again as soon as the port is back and the instrument answers</source>
+        <translation>Verbindet wieder, sobald der Anschluss zurück ist und das Gerät antwortet</translation>
+    </message>
+    <message>
+        <source>The port is a whole number from 1 to 65535</source>
+        <translation>Der Port ist eine ganze Zahl von 1 bis 65535</translation>
+    </message>
+    <message>
+        <source>simulated instrument</source>
+        <translation>simuliertes Gerät</translation>
+    </message>
 </context>
 </TS>

@@ -31,13 +31,13 @@ ConnectCard::ConnectCard(Forms& forms, Binder& binder, Ways ways, QWidget* paren
       heading_(new QLabel),
       step_(new QLabel),
       wait_(new QProgressBar),
-      cancel_(new QPushButton(tr("Cancel"))),
-      again_(new QPushButton(tr("Try Again"))),
+      cancel_(new QPushButton(QObject::tr("Cancel"))),
+      again_(new QPushButton(QObject::tr("Try Again"))),
       search_(new QPushButton(QString::fromStdString(forms.main.SearchRatesButton.Caption))),
-      close_(new QPushButton(tr("Close"))) {
+      close_(new QPushButton(QObject::tr("Close"))) {
     setObjectName("card");
     setFixedWidth(kWidth);
-    setAccessibleName(tr("Connecting"));
+    setAccessibleName(QObject::tr("Connecting"));
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(16, 14, 16, 16);
     layout->setSpacing(8);
@@ -51,7 +51,7 @@ ConnectCard::ConnectCard(Forms& forms, Binder& binder, Ways ways, QWidget* paren
     step_->setMinimumHeight(kStepLines * step_->fontMetrics().lineSpacing());
     wait_->setTextVisible(false);
     wait_->setFixedHeight(kBarHeight);
-    wait_->setAccessibleName(tr("Progress of the connection"));
+    wait_->setAccessibleName(QObject::tr("Progress of the connection"));
     layout->addWidget(wait_);
     auto* keys = new QHBoxLayout;
     keys->addStretch(1);
@@ -93,8 +93,9 @@ QString ConnectCard::heading() const {
         return QString::fromStdString(forms_.tcpConnection.IPAdressTextBox.Text.get() + ":" +
                                       forms_.tcpConnection.RemotePortTextBox.Text.get());
     const QString port = QString::fromStdString(forms_.main.COMList.Text());
-    if (port.contains(SimulatorChild::kLinkName)) return tr("Simulated instrument");
-    return tr("%1, %2 baud").arg(port, QString::fromStdString(forms_.main.BaudList.Text()));
+    if (port.contains(SimulatorChild::kLinkName)) return QObject::tr("Simulated instrument");
+    return QObject::tr("%1, %2 baud")
+        .arg(port, QString::fromStdString(forms_.main.BaudList.Text()));
 }
 
 void ConnectCard::take() {
@@ -111,14 +112,15 @@ void ConnectCard::take() {
         const bool tcp = forms_.controller.ConnectionState == ControllerForm::TCPCON;
         const std::string step =
             tcp ? forms_.tcpConnection.AdviceLabel.Caption : form.AdviceLabel.Caption;
-        heading_->setText(failed           ? tr("No instrument was found")
-                          : form.Searching ? tr("Searching the baud rate")
-                                           : tr("Connecting to %1").arg(heading()));
+        heading_->setText(failed           ? QObject::tr("No instrument was found")
+                          : form.Searching ? QObject::tr("Searching the baud rate")
+                                           : QObject::tr("Connecting to %1").arg(heading()));
         step_->setText(QString::fromStdString(step));
         showWait(*wait_, step);
         for (QPushButton* key : {again_, search_, close_}) key->setVisible(failed);
         cancel_->setVisible(work);
         wait_->setVisible(work);
+        layout()->activate();  // the keys that came are in their places with this frame
     }
     if (wanted != wanted_) {
         wanted_ = wanted;

@@ -2,7 +2,6 @@
 // Stands on the graph while the program connects without a dialog: the step, the seconds, Cancel;
 // after a failure what to check, another attempt and the search over the baud rates.
 
-#include <QCoreApplication>
 #include <QFrame>
 #include <QLabel>
 #include <QProgressBar>
@@ -19,8 +18,6 @@ namespace zel {
 void showWait(QProgressBar& bar, const std::string& step);
 
 class ConnectCard : public QFrame {
-    Q_DECLARE_TR_FUNCTIONS(ConnectCard)
-
   public:
     /// `again` makes the same attempt once more; `changed` hears that the card comes, goes or
     /// grows.

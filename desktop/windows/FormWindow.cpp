@@ -263,7 +263,7 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
         const QString digits = text.trimmed().remove(',');
         return digits.isEmpty() || wholeNumber(digits.toStdString(), 1, kFastestBaud)
                    ? QString()
-                   : QString("The baud rate is a whole number");
+                   : QObject::tr("The baud rate is a whole number");
     });
     serialFields->addRow("Baud rate", baud);
     auto* portState = new QLabel("The port is open");

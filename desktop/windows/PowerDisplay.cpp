@@ -66,8 +66,7 @@ void PowerDisplay::drawHistory(QPainter& painter, const QRectF& place) const {
     if (history_.size() < 2) {
         painter.setPen(colors.text);
         painter.drawText(place, Qt::AlignCenter,
-                         QCoreApplication::translate(
-                             "PowerDisplay", "Single reads the power once, Continuous goes on"));
+                         QObject::tr("Single reads the power once, Continuous goes on"));
         return;
     }
     const auto [low, high] = std::minmax_element(history_.begin(), history_.end());

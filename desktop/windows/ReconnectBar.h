@@ -1,7 +1,6 @@
 #pragma once
 // The line over the graph for a port that has gone or come back.
 
-#include <QCoreApplication>
 #include <QFrame>
 
 #include "desktop/binders/Binder.h"
@@ -10,8 +9,6 @@
 namespace zel {
 
 class ReconnectBar : public QFrame {
-    Q_DECLARE_TR_FUNCTIONS(ReconnectBar)
-
   public:
     ReconnectBar(ControllerForm& panel, Binder& binder, QWidget* parent = nullptr);
 };

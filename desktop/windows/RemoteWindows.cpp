@@ -70,7 +70,7 @@ QCheckBox* check(Binder& binder, CheckBox& control) {
 /// An empty field is not marked: the button says in its own words what is missing.
 QString portProblem(const QString& text) {
     const bool good = text.isEmpty() || wholeNumber(text.trimmed().toStdString(), 1, kHighestPort);
-    return good ? QString() : QString("The port is a whole number from 1 to 65535");
+    return good ? QString() : QObject::tr("The port is a whole number from 1 to 65535");
 }
 
 QPixmap lightOf(const QColor& color) {

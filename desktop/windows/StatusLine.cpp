@@ -1,7 +1,10 @@
 #include "desktop/windows/StatusLine.h"
 
+#include <QHBoxLayout>
 #include <QPointer>
 #include <QStatusBar>
+
+#include "desktop/platform/SimulatorChild.h"
 
 namespace zel {
 namespace {
@@ -37,7 +40,12 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     line->setProperty("flat", true);
     binder.bind(panel_.DebugTextBox, line);
     line->setFocusPolicy(Qt::ClickFocus);
-    bar->addWidget(line, 1);
+    // A message hides the place; the line itself is shown again with each of its texts.
+    auto* place = new QWidget;
+    auto* layout = new QHBoxLayout(place);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(line);
+    bar->addWidget(place, 1);
     busy_->setRange(0, 0);
     busy_->setFixedSize(90, 8);
     busy_->setTextVisible(false);
@@ -92,8 +100,10 @@ QString StatusLine::stateText() const {
             : QString::fromStdString(forms_.main.COMList.Text() + ", " +
                                      forms_.main.BaudList.Text() + " baud");
     state_->setToolTip(id + "\n" + where);
+    const bool simulated = where.contains(SimulatorChild::kLinkName);
     return (panel_.LinkLost ? QObject::tr("Connection lost:") + " " : QString()) +
-           shortIdentity(id) + QString::fromUtf8(" · ") + where.section('/', -1);
+           shortIdentity(id) + QString::fromUtf8(" · ") +
+           (simulated ? QObject::tr("simulated instrument") : where.section('/', -1));
 }
 
 void StatusLine::showState() {
