@@ -1,58 +1,97 @@
 #pragma once
 // The instrument's code tables: what each code on the wire is called in the program, once.
 
+#include <compare>
+#include <cstdint>
 #include <span>
 #include <string>
 #include <string_view>
+#include <type_traits>
 
 namespace zel {
 
-// Reference unit, UNIT.
-inline constexpr int UNITDBM = 0;
-inline constexpr int UNITDBMV = 1;
-inline constexpr int UNITDBUV = 2;
-inline constexpr int UNITDBUVM = 3;
-inline constexpr int UNITDBUAM = 4;
-inline constexpr int UNITDB = 5;
-inline constexpr int UNITV = 6;
-inline constexpr int UNITW = 7;
-// Range, RANGE.
-inline constexpr int RANGE10DB = 0;
-inline constexpr int RANGE5DB = 1;
-inline constexpr int RANGE2DB = 2;
-inline constexpr int RANGE1DB = 3;
-inline constexpr int RANGELIN = 4;
-inline constexpr int RANGEVSWR6 = 5;
-inline constexpr int RANGEVSWR2 = 6;
-inline constexpr int RANGEVSWR15 = 7;
-inline constexpr int RANGEVSWR11 = 8;
-// Detector, TRACEDET.
-inline constexpr int DETAUTOPEAK = 0;
-inline constexpr int DETMINPEAK = 1;
-inline constexpr int DETMAXPEAK = 2;
-inline constexpr int DETSAMPLE = 3;
-inline constexpr int DETRMS = 4;
-// Trace mode, TRACEMODE.
-inline constexpr int TRACECLEARWRITE = 0;
-inline constexpr int TRACEAVERAGE = 1;
-inline constexpr int TRACEMINHOLD = 2;
-inline constexpr int TRACEMAXHOLD = 3;
-inline constexpr int TRACEVIEW = 4;
-// Trigger source, TRIGSRC.
-inline constexpr int TRIGFREERUN = 0;
-inline constexpr int TRIGVIDEO = 1;
-inline constexpr int TRIGEXTRISE = 2;
-inline constexpr int TRIGEXTFALL = 3;
-// Standards, CHPWRSTD and OBWSTD; TDMASTD counts STDUSER and STDGSMEDGE.
-inline constexpr int STDUSER = 0;
-inline constexpr int STDWCDMA = 1;
-inline constexpr int STDCDMAONE = 2;
-inline constexpr int STDCDMA2000 = 3;
-inline constexpr int STDGSMEDGE = 1;
-// Distance to fault mode, DTFMODE.
-inline constexpr int DTFMODEDTF = 0;
-inline constexpr int DTFMODEREFLECTION = 1;
-inline constexpr int DTFMODESPECTRUM = 2;
+// The codes are numbers on the wire and in the mirror, where one may be none of these; so they
+// compare with any number and convert to one, but no number becomes a code by itself.
+
+/// UNIT: the reference unit.
+enum UnitCode : std::uint8_t {
+    UNITDBM = 0,
+    UNITDBMV = 1,
+    UNITDBUV = 2,
+    UNITDBUVM = 3,
+    UNITDBUAM = 4,
+    UNITDB = 5,
+    UNITV = 6,
+    UNITW = 7,
+};
+/// RANGE: decibels a division, or a linear range.
+enum RangeCode : std::uint8_t {
+    RANGE10DB = 0,
+    RANGE5DB = 1,
+    RANGE2DB = 2,
+    RANGE1DB = 3,
+    RANGELIN = 4,
+    RANGEVSWR6 = 5,
+    RANGEVSWR2 = 6,
+    RANGEVSWR15 = 7,
+    RANGEVSWR11 = 8,
+};
+/// TRACEDET.
+enum DetectorCode : std::uint8_t {
+    DETAUTOPEAK = 0,
+    DETMINPEAK = 1,
+    DETMAXPEAK = 2,
+    DETSAMPLE = 3,
+    DETRMS = 4,
+};
+/// TRACEMODE.
+enum TraceModeCode : std::uint8_t {
+    TRACECLEARWRITE = 0,
+    TRACEAVERAGE = 1,
+    TRACEMINHOLD = 2,
+    TRACEMAXHOLD = 3,
+    TRACEVIEW = 4,
+};
+/// TRIGSRC.
+enum TriggerCode : std::uint8_t {
+    TRIGFREERUN = 0,
+    TRIGVIDEO = 1,
+    TRIGEXTRISE = 2,
+    TRIGEXTFALL = 3,
+};
+/// CHPWRSTD and OBWSTD.
+enum StandardCode : std::uint8_t {
+    STDUSER = 0,
+    STDWCDMA = 1,
+    STDCDMAONE = 2,
+    STDCDMA2000 = 3,
+};
+/// TDMASTD; 0 is STDUSER.
+enum TdmaStandardCode : std::uint8_t { STDGSMEDGE = 1 };
+/// DTFMODE.
+enum DtfModeCode : std::uint8_t {
+    DTFMODEDTF = 0,
+    DTFMODEREFLECTION = 1,
+    DTFMODESPECTRUM = 2,
+};
+
+template <class T>
+concept WireCode = std::is_same_v<T, UnitCode> || std::is_same_v<T, RangeCode> ||
+    std::is_same_v<T, DetectorCode> || std::is_same_v<T, TraceModeCode> ||
+    std::is_same_v<T, TriggerCode> || std::is_same_v<T, StandardCode> ||
+    std::is_same_v<T, TdmaStandardCode> || std::is_same_v<T, DtfModeCode>;
+
+template <class Number, WireCode Code>
+requires std::is_arithmetic_v<Number>
+constexpr bool operator==(Number number, Code code) {
+    return static_cast<double>(number) == static_cast<double>(code);
+}
+
+template <class Number, WireCode Code>
+requires std::is_arithmetic_v<Number>
+constexpr std::partial_ordering operator<=>(Number number, Code code) {
+    return static_cast<double>(number) <=> static_cast<double>(code);
+}
 
 /// One code: the caption that a query writes (the code and ")" follow it), the entry of a choice
 /// list (empty: not offered), a further text (unit, soft key caption), a number (hertz of a
