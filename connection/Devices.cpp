@@ -5,6 +5,7 @@
 #include "link/ByteLink.h"
 #include "link/RS232Ops.h"
 #include "platform/ModalForm.h"
+#include "platform/Pointer.h"
 #include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
@@ -65,7 +66,7 @@ IniFile Devices::settings() const {
 }
 
 std::vector<std::string> Devices::ReadCommunicationDevices() {
-    panel_.MousePointer = 11;
+    panel_.MousePointer = kHourglass;
     std::vector<std::string> names;
     const IniFile file = settings();
     for (int n = 1; n <= kMostEntries; ++n) {
@@ -73,7 +74,7 @@ std::vector<std::string> Devices::ReadCommunicationDevices() {
         if (leadingNumber(name) == 1) break;
         names.push_back(name);
     }
-    panel_.MousePointer = 0;
+    panel_.MousePointer = kArrow;
     if (names.empty()) names.emplace_back("NONE");
     return names;
 }
@@ -142,10 +143,10 @@ bool Devices::SetCommunicationDevice() {
     cancelled_ = false;
     form_.Configuring = true;
     form_.SetDeviceButton.Enabled = false;
-    form_.MousePointer = 11;
+    form_.MousePointer = kHourglass;
     bool ok = false;
     ConfigureDevice(ok);
-    form_.MousePointer = 0;
+    form_.MousePointer = kArrow;
     form_.SetDeviceButton.Enabled = true;
     form_.Configuring = false;
     form_.DeviceStatusLabel.Caption = "";

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "platform/Pointer.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -92,8 +93,7 @@ void Dialling::dial(bool readTrace) {
     form_.DialButton.Visible = false;
     form_.CancelButton.Visible = true;
     form_.DisconnectButton2.Enabled = false;
-    form_.MousePointer = 11;
-    session_.events.pump();
+    showPointer(form_, session_.events, kHourglass);
     told_ = false;
     if (call(number)) session(collected_, readTrace);
     if (!link_.bytes.portOpen() && !panel_.isConnected && !told_) portLost();
@@ -104,8 +104,7 @@ void Dialling::dial(bool readTrace) {
 /// All failed ways end here; what a session needs is as it should be by then.
 void Dialling::dialOver() {
     form_.DisconnectButton2.Enabled = true;
-    form_.MousePointer = 0;
-    session_.events.pump();
+    showPointer(form_, session_.events, kArrow);
 }
 
 bool Dialling::call(const std::string& number) {
@@ -222,13 +221,11 @@ void Dialling::CheckAnswer(const std::string& text, bool& ok) {
     const char* problem = callProblem(text);
     ok = problem == nullptr;
     if (!ok) failed(std::string(problem) + kCrLf + "Please try again");
-    form_.MousePointer = 0;
-    session_.events.pump();
+    showPointer(form_, session_.events, kArrow);
 }
 
 void Dialling::session(const std::string& answer, bool readTrace) {
-    form_.MousePointer = 0;
-    session_.events.pump();
+    showPointer(form_, session_.events, kArrow);
     session_.DebugLine(bytesToUtf8(answer));
     if (!pause(kCarrierSettlesMs)) return;
     link_.bytes.ReadFromLink(true);

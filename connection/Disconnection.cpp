@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "link/WaitNotice.h"
+#include "platform/Pointer.h"
 #include "support/CommandWord.h"
 
 namespace zel {
@@ -38,11 +39,6 @@ Disconnection::Disconnection(Forms& forms, const InstrumentLink& link, Socket& T
     handlers_.on(link.reader.AttemptAbandoned, [this] { giveAttemptBack(); });
 }
 
-void Disconnection::pointer(int shape) {
-    panel_.MousePointer = shape;
-    session_.events.pump();
-}
-
 void Disconnection::DisconnectButton_Click() {
     if (interlock_.refuses(panel_.Disconnect)) return;
     if (!panel_.isConnected) return attemptOver();
@@ -50,9 +46,9 @@ void Disconnection::DisconnectButton_Click() {
         session_.boxes.show({BoxIcon::Question, "Are you sure you want to close the connection?",
                              "Disconnect", BoxButtons::OkCancel});
     if (answer != BoxAnswer::Ok) {
-        pointer(11);
+        showPointer(panel_, session_.events, kHourglass);
         exchange_.CmdInstrument("REMOTE");
-        panel_.MousePointer = 0;
+        panel_.MousePointer = kArrow;
         return;
     }
     endSession();
@@ -67,7 +63,7 @@ void Disconnection::attemptOver() {
 }
 
 void Disconnection::giveAttemptBack() {
-    pointer(0);
+    showPointer(panel_, session_.events, kArrow);
     if (link_.portOpen()) link_.CloseComPort();
     session_.DebugLine(" ");
 }
@@ -76,7 +72,7 @@ void Disconnection::endSession() {
     const bool tcp = panel_.ConnectionState == CF::TCPCON;
     const bool direct = panel_.ConnectionState == CF::DIRECTCON;
     if (link_.portOpen() || tcp) {
-        pointer(11);
+        showPointer(panel_, session_.events, kHourglass);
         if (exchange_.busy()) {
             // What is under way is left: no exchange begins inside another.
             exchange_.leaveWait(0);
@@ -85,7 +81,7 @@ void Disconnection::endSession() {
             exchange_.CmdInstrument("LOCAL");
         }
         socket_.close();
-        pointer(0);
+        showPointer(panel_, session_.events, kArrow);
     }
     if (!direct && !tcp && link_.portOpen()) HangUpModem();
     if (link_.portOpen()) ClosePortAndClearIdentity();
@@ -137,7 +133,7 @@ void Disconnection::notConnectedLook() {
     panel_.Utility.Enabled = true;
     if (panel_.StopButton.Visible) panel_.StopButton.Click();
     graph_.finishCursors();
-    panel_.MousePointer = 0;
+    panel_.MousePointer = kArrow;
 }
 
 void Disconnection::HangUpModem() {

@@ -32,7 +32,6 @@ class Disconnection {
     void giveAttemptBack();
     void notConnectedLook();
     void awaitModemAnswer();
-    void pointer(int shape);
 
     Forms& forms_;
     ControllerForm& panel_;

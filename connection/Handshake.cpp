@@ -6,6 +6,7 @@
 #include "link/WaitNotice.h"
 #include "panel/ModeOptions.h"
 #include "panel/SoftPanel.h"
+#include "platform/Pointer.h"
 #include "support/CommandWord.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
@@ -40,11 +41,6 @@ Handshake::Handshake(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& 
         handlers_.on(cancel->Clicked, [this] { exchange_.leaveWait(0); });
 }
 
-void Handshake::mouse(int shape) {
-    dialog_.MousePointer = shape;
-    session_.events.pump();
-}
-
 void Handshake::InitConnection() {
     const DialogueScope scope(state_);
     const bool dialled = panel_.ConnectionState != CF::DIRECTCON && !link_.isTcp();
@@ -66,7 +62,7 @@ void Handshake::InitConnection() {
 }
 
 void Handshake::connect() {
-    mouse(11);
+    showPointer(dialog_, session_.events, kHourglass);
     DeselectOptionBoxes(panel_);
     dialog_.IsConnecting = true;
     if (!wakeInstrument()) return noInstrument(reader_.absenceTold());
@@ -84,7 +80,7 @@ void Handshake::connect() {
     mirror_.Unsure.clear();
     connectedLook();
     fill_.FillTextFields("FREQ");
-    mouse(0);
+    showPointer(dialog_, session_.events, kArrow);
 }
 
 bool Handshake::wakeInstrument() {
@@ -105,7 +101,7 @@ bool Handshake::wakeInstrument() {
     if (reader_.ReadAnswer().empty()) return false;
     session_.DebugLine("Successful");
     showConnectingStep(forms_, "The instrument answers, reading its settings");
-    mouse(11);
+    showPointer(dialog_, session_.events, kHourglass);
     return true;
 }
 
@@ -136,7 +132,7 @@ bool Handshake::identify() {
     }
     const bool tcp = panel_.ConnectionState == CF::TCPCON;
     (tcp ? forms_.tcpConnection.IDTextBox : dialog_.IDText).Text = id;
-    mouse(0);
+    showPointer(dialog_, session_.events, kArrow);
     return true;
 }
 
@@ -209,7 +205,7 @@ void Handshake::connectedLook() {
 }
 
 void Handshake::noInstrument(bool told) {
-    dialog_.MousePointer = 0;
+    dialog_.MousePointer = kArrow;
     panel_.isConnected = false;
     panel_.Picture3.Visible = false;
     if (!told) {

@@ -34,7 +34,6 @@ class Handshake {
     bool query(const char* word, double& field);
     void connectedLook();
     void noInstrument(bool told);
-    void mouse(int shape);
 
     Forms& forms_;
     ControllerForm& panel_;

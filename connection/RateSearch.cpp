@@ -4,13 +4,13 @@
 
 #include "link/ByteLink.h"
 #include "platform/LinkAddress.h"
+#include "platform/Pointer.h"
 #include "support/AtEnd.h"
 #include "support/NumberText.h"
 
 namespace zel {
 namespace {
 
-constexpr int kHourglass = 11;
 constexpr int kSlowest = 9600;  // offered by no list, and what some instruments are delivered with
 
 }  // namespace

@@ -7,6 +7,7 @@
 #include "connection/Profiles.h"
 #include "link/WaitNotice.h"
 #include "platform/ModalForm.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
@@ -124,7 +125,7 @@ void TcpDialog::connect(bool readTrace) {
     const std::string portText = trimmed(dialog_.RemotePortTextBox.Text.get());
     const double port = leadingNumber(portText);
     if (!IsNumericText(portText) || port < 1 || port > kHighestPort) {
-        dialog_.MousePointer = 0;
+        dialog_.MousePointer = kArrow;
         session_.boxes.show({BoxIcon::Plain, "Please enter a valid TCP port!"});
         return;
     }

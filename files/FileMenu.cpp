@@ -13,8 +13,8 @@ constexpr const char* kImageExtension = "wmf";
 FileMenu::FileMenu(ControllerForm& panel, FileOps& files, ApplicationFolder& folder,
                    MessageBoxes& boxes)
     : panel_(panel), files_(files), folder_(folder), boxes_(boxes) {
-    panel_.MenuFileSaveImage.Clicked.connect([this] { MenuFileSaveImage_Click(); });
-    panel_.DelLogFile.Clicked.connect([this] { DelLogFile_Click(); });
+    handlers_.on(panel_.MenuFileSaveImage.Clicked, [this] { MenuFileSaveImage_Click(); });
+    handlers_.on(panel_.DelLogFile.Clicked, [this] { DelLogFile_Click(); });
 }
 
 void FileMenu::MenuFileSaveImage_Click() {

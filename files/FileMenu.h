@@ -3,6 +3,7 @@
 
 #include "files/FileOps.h"
 #include "forms/ControllerForm.h"
+#include "platform/Event.h"
 #include "platform/MessageBox.h"
 #include "platform/Services.h"
 
@@ -22,6 +23,7 @@ class FileMenu {
     FileOps& files_;
     ApplicationFolder& folder_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -16,7 +16,7 @@ std::string keyOf(int index) { return "File" + std::to_string(index); }
 RecentFiles::RecentFiles(ControllerForm& panel, SettingsStore& settings)
     : panel_(panel), settings_(settings) {
     for (int i = 0; i < panel_.RecentFile.count(); ++i) {
-        panel_.RecentFile(i).Clicked.connect([this, i] {
+        handlers_.on(panel_.RecentFile(i).Clicked, [this, i] {
             if (i >= static_cast<int>(paths_.size())) return;
             const std::string path = paths_[static_cast<std::size_t>(i)];
             panel_.OpenFile(path);

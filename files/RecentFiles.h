@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "forms/ControllerForm.h"
+#include "platform/Event.h"
 #include "platform/Services.h"
 
 namespace zel {
@@ -26,6 +27,7 @@ class RecentFiles {
     ControllerForm& panel_;
     SettingsStore& settings_;
     std::vector<std::string> paths_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -8,6 +8,7 @@
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
 #include "platform/KeyInput.h"
+#include "platform/Pointer.h"
 #include "support/AtEnd.h"
 #include "support/FileText.h"
 #include "support/NumberText.h"
@@ -18,7 +19,6 @@ namespace {
 
 using CF = ControllerForm;
 
-constexpr int kHourglass = 11;
 constexpr int kResyncMs = 300;
 constexpr int kRetryMs = 10;
 constexpr double kDaySeconds = 86400;
@@ -53,11 +53,6 @@ Recording::Recording(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& 
     handlers_.on(panel_.StopButton.Clicked, [this] {
         if (dialog_.X.Enabled && !inTick_) windUp();
     });
-}
-
-void Recording::pointer(int shape) {
-    panel_.MousePointer = shape;
-    session_.events.pump();
 }
 
 void Recording::ReadTriggerSource() {
@@ -196,11 +191,11 @@ void Recording::X_Timer() {
         inTick_ = true;
         const AtEnd over([this] {
             inTick_ = false;
-            panel_.MousePointer = 0;
+            panel_.MousePointer = kArrow;
         });
         // What a user does meanwhile waits for the end of the cycle.
         const DialogueScope cycle = exchange_.hold();
-        pointer(kHourglass);
+        showPointer(panel_, session_.events, kHourglass);
         if (!mirror_.ExternalTriggerActive) {
             exchange_.forgetFailure();
             taken = takeTrace();
@@ -232,7 +227,7 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
     panel_.STOPFlag = true;
     session_.events.pump();
     for (bool recording = true; recording;) {
-        pointer(kHourglass);
+        showPointer(panel_, session_.events, kHourglass);
         if (!good) {
             resynchronise();
             if (panel_.isSpecMeas) {
@@ -255,7 +250,7 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
                 countTrace();
                 dialog_.Ticked();
                 if (!success) {
-                    panel_.MousePointer = 0;
+                    panel_.MousePointer = kArrow;
                     break;
                 }
                 showProgress();
@@ -267,7 +262,7 @@ void Recording::RecordExtTrigger(std::int32_t timeout) {
         exchange_.giveTurn();
         if (!panel_.STOPFlag || panel_.isSpecMeas) {
             dialog_.ContinuousRecording = false;
-            pointer(0);
+            showPointer(panel_, session_.events, kArrow);
             recording = false;
         }
     }

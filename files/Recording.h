@@ -45,7 +45,6 @@ class Recording {
     void clearCounts();
     void resynchronise();
     void showProgress();
-    void pointer(int shape);
 
     Forms& forms_;
     ControllerForm& panel_;

@@ -8,6 +8,7 @@
 
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
+#include "platform/Pointer.h"
 #include "support/AtEnd.h"
 #include "support/FileText.h"
 #include "support/NumberText.h"
@@ -19,7 +20,6 @@ namespace {
 
 using CF = ControllerForm;
 
-constexpr int kHourglass = 11;
 /// What one trace's header and 301 rows come to.
 constexpr int kLargestSingle = 970;
 constexpr int kRowsBehindMark = 3;
@@ -49,20 +49,19 @@ std::string percentText(double part) { return generalNumber(std::floor(part * 10
 
 }  // namespace
 
-ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, FileOps& files,
-                       GraphScaling& scaling, const TraceConversion& conversion,
-                       const Interlock& interlock)
+ViewReader::ViewReader(Forms& forms, ZEL3Variables& mirror, const TraceOnGraph& onGraph,
+                       FileOps& files, const Interlock& interlock)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
-      onGraph_(onGraph),
+      onGraph_(onGraph.sweep),
       files_(files),
-      scaling_(scaling),
+      scaling_(onGraph.scaling),
       interlock_(interlock),
       clock_(interlock.session().clock),
       events_(interlock.session().events),
       boxes_(interlock.session().boxes),
-      conversion_(conversion),
+      conversion_(onGraph.conversion),
       rows_(forms.controller, mirror),
       playback_(forms, interlock) {
     handlers_.on(panel_.LoadData.Clicked, [this] { LoadData_Click(); });
@@ -207,7 +206,7 @@ void ViewReader::underStop(const std::function<void()>& work) {
         panel_.Utility.Enabled = true;
         panel_.PlayContinuousButton.Visible = true;
         panel_.StopButton.Visible = false;
-        panel_.MousePointer = 0;
+        panel_.MousePointer = kArrow;
     });
     work();
 }
@@ -359,7 +358,7 @@ void ViewReader::showTrace(const Header& header) {
     panel_.TraceIntervals = kIntervals;
     scaling_.setGraphXAxis(first, last);
     const double range = mirror_.ReferenceRange;
-    scaling_.setGraphYAxis(mirror_.ReferenceLevel, static_cast<int>(range), false);
+    scaling_.setGraphYAxis(mirror_.ReferenceLevel, LevelRange::ofDecibels(std::trunc(range)));
     scaling_.addWaterfallRowLimit();
     forms_.waterfall.stampRow(header.rowLabel);
     if (header.series) forms_.waterfall.styleLastRow();

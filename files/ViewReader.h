@@ -11,19 +11,16 @@
 #include "files/Playback.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
-#include "trace/GraphScaling.h"
 #include "trace/Interlock.h"
-#include "trace/Sweep.h"
-#include "trace/TraceConversion.h"
+#include "trace/TraceOnGraph.h"
 
 namespace zel {
 
 class ViewReader {
   public:
     /// Connects the menu entry and the front's request to open a file.
-    /// `onGraph` takes each trace that is shown.
-    ViewReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, FileOps& files,
-               GraphScaling& scaling, const TraceConversion& conversion,
+    /// The sweep of `onGraph` becomes each trace that is shown.
+    ViewReader(Forms& forms, ZEL3Variables& mirror, const TraceOnGraph& onGraph, FileOps& files,
                const Interlock& interlock);
 
     void LoadData_Click();

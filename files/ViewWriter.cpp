@@ -31,24 +31,22 @@ constexpr AutoBandwidth kAutoBandwidths[] = {
 }  // namespace
 
 ViewWriter::ViewWriter(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph,
-                       CommandExchange& exchange, FileOps& files, const Clock& clock,
-                       MessageBoxes& boxes)
+                       CommandExchange& exchange, FileOps& files, const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
       onGraph_(onGraph),
       exchange_(exchange),
       files_(files),
-      clock_(clock),
-      boxes_(boxes) {
-    panel_.SaveCurrentView.Clicked.connect([this] { SaveCurrentView_Click(); });
-    panel_.SaveView.connect([this](const std::string& kind) { SaveView(kind); });
+      session_(session) {
+    handlers_.on(panel_.SaveCurrentView.Clicked, [this] { SaveCurrentView_Click(); });
+    handlers_.on(panel_.SaveView, [this](const std::string& kind) { SaveView(kind); });
 }
 
 void ViewWriter::SaveCurrentView_Click() {
     const bool power = panel_.InstrumentMode == CF::POWERSENSOR;
     if (!power && onGraph_.incomplete()) {
-        boxes_.show(
+        session_.boxes.show(
             {BoxIcon::Exclamation, "The trace is incomplete, " + std::to_string(onGraph_.came) +
                                        " of " + std::to_string(onGraph_.wanted) +
                                        " samples came, and is not saved. Read a new one first."});
@@ -64,7 +62,7 @@ void ViewWriter::SaveCurrentView_Click() {
     // A script names its files itself, and a power log is never loaded.
     const std::string warning = oldLogWarning(panel_.DataFileName);
     if (!warning.empty() && !panel_.isSpecMeas && !power)
-        boxes_.show({BoxIcon::Exclamation, warning});
+        session_.boxes.show({BoxIcon::Exclamation, warning});
 }
 
 void ViewWriter::SaveView(const std::string& kind) {
@@ -103,7 +101,8 @@ void ViewWriter::bandwidth(const char* word) {
     }
     ofSweep = value = kUnknownBandwidth;
     for (const AutoBandwidth& row : kAutoBandwidths)
-        if (std::string_view(word) == row.word) boxes_.show({BoxIcon::Exclamation, row.message});
+        if (std::string_view(word) == row.word)
+            session_.boxes.show({BoxIcon::Exclamation, row.message});
 }
 
 void ViewWriter::WriteViewHeader(OutputFile& file, bool withHeader) {
@@ -111,7 +110,7 @@ void ViewWriter::WriteViewHeader(OutputFile& file, bool withHeader) {
     followMirror(onGraph_, mirror_);
     const bool read = onGraph_.wanted > 0;  // else there is only what the panel has now
     ViewHeader{read ? onGraph_.settings : mirror_,
-               read ? onGraph_.instrumentMode : panel_.InstrumentMode, mirror_, clock_,
+               read ? onGraph_.instrumentMode : panel_.InstrumentMode, mirror_, session_.clock,
                [this](const char* word) { bandwidth(word); }}
         .write(file);
 }
@@ -127,7 +126,7 @@ void ViewWriter::finish(OutputFile& file) {
     const bool recording = panel_.RecordDataFlag && !panel_.isSpecMeas;
     // Before the box, so that no further trace is begun after it.
     if (recording) panel_.StopButton.Click();
-    boxes_.show(
+    session_.boxes.show(
         {BoxIcon::Critical, recording ? problem + kCrLf + "The recording was stopped." : problem});
 }
 

@@ -8,8 +8,8 @@
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
-#include "platform/Clock.h"
-#include "platform/MessageBox.h"
+#include "platform/Event.h"
+#include "platform/Session.h"
 #include "trace/Sweep.h"
 
 namespace zel {
@@ -18,7 +18,7 @@ class ViewWriter {
   public:
     /// Connects the menu entry and the read cycle's request to save.
     ViewWriter(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, CommandExchange& exchange,
-               FileOps& files, const Clock& clock, MessageBoxes& boxes);
+               FileOps& files, const Session& session);
 
     /// Where the traces of a recording go; empty while none runs. A file dialog that is used
     /// meanwhile does not turn the recording aside.
@@ -50,7 +50,7 @@ class ViewWriter {
     void save(const std::string& kind);
     void bandwidth(const char* word);
     void finish(OutputFile& file);
-    std::string nowText() const { return clock_.dateTimeText(clock_.date()); }
+    std::string nowText() const { return session_.clock.dateTimeText(session_.clock.date()); }
 
     Forms& forms_;
     ControllerForm& panel_;
@@ -58,9 +58,9 @@ class ViewWriter {
     Sweep& onGraph_;
     CommandExchange& exchange_;
     FileOps& files_;
-    const Clock& clock_;
-    MessageBoxes& boxes_;
+    Session session_;
     bool fromMenu_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -87,6 +87,7 @@ class ControllerForm : public Form {
     /// A view or a single trace is under way, be it one that is to stop.
     bool AcquisitionRunning = false;
     bool SingleSweepModeActive = false;
+    bool TriggerKeyIsLevel = false;  ///< the trigger key and its box are the level, else the delay
     std::string mLoadOption;
     bool isConnected = false;  ///< the handshake is done
     bool LinkLost = false;     ///< the line has died: what is shown will not become newer

@@ -30,7 +30,7 @@ struct SavedFiles {
         forms,
         line,
         {platform.clock, platform.events, platform.boxes, forms.controller.DebugTextBox}};
-    ViewReader reader{forms, mirror, onGraph, files, scaling, conversion, interlock};
+    ViewReader reader{forms, mirror, {onGraph, conversion, scaling}, files, interlock};
 };
 
 inline std::string textOf(const std::uint8_t* data, std::size_t size) {

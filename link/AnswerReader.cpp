@@ -4,6 +4,7 @@
 #include <cmath>
 #include <utility>
 
+#include "platform/Pointer.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
 
@@ -181,7 +182,7 @@ void AnswerReader::takeConnectionDown() {
     if (panel_.ConnectionState == ControllerForm::DIRECTCON) link_.CloseComPort();
     AttemptAbandoned();
     dialog_.OnPic.Visible = false;
-    dialog_.MousePointer = 0;
+    dialog_.MousePointer = kArrow;
     session_.events.pump();
 }
 

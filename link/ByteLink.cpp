@@ -5,6 +5,7 @@
 
 #include "link/WaitNotice.h"
 #include "platform/LinkAddress.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
@@ -50,34 +51,30 @@ bool ByteLink::OpenSerialPort(const std::string& port, long baud) {
 }
 
 void ByteLink::OpenPortFromDialog() {
-    const auto pointer = [this](int shape) {
-        dialog_.MousePointer = shape;
-        events_.pump();
-    };
-    pointer(11);
+    showPointer(dialog_, events_, kHourglass);
     state_.DialCancelled = false;
     const std::string device = serialDeviceName(dialog_.COMList.Text(), dialog_.CommPorts);
     if (device.empty()) {
-        dialog_.MousePointer = 0;
+        dialog_.MousePointer = kArrow;
         boxes_.show({BoxIcon::Plain, "Please enter a valid COM port!"});
         return;
     }
     const std::string baudText = dialog_.BaudList.Text();
     if (!IsNumericText(baudText)) {
-        pointer(0);
+        showPointer(dialog_, events_, kArrow);
         boxes_.show({BoxIcon::Plain, "Please enter a valid baud rate!"});
         return;
     }
     if (port_.isOpen()) {
         boxes_.show({BoxIcon::Plain, "Port is already open!"});
-        pointer(0);
+        showPointer(dialog_, events_, kArrow);
         return;
     }
     const double baud = leadingNumber(replaceAll(baudText, ",", ""));
     const bool opened = baud >= 1 && baud <= static_cast<double>(kFastestBaud) &&
                         OpenSerialPort(device, static_cast<long>(baud));
     if (opened) dialog_.OnPic.Visible = true;
-    pointer(0);
+    showPointer(dialog_, events_, kArrow);
     if (opened) return;
     std::string text = "Could not connect to the specified port!";
     if (!port_.problem().empty()) text += kCrLf + port_.problem();

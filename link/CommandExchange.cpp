@@ -6,6 +6,7 @@
 
 #include "link/InstrumentErrors.h"
 #include "link/WireText.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
@@ -147,12 +148,8 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
 bool CommandExchange::CmdInstrumentTriggered(const std::string& keyword,
                                              std::int32_t timeoutSeconds) {
     const DialogueScope scope(state_);
-    panel_.MousePointer = 11;
-    session_.events.pump();
-    const bool success = triggeredDialogue(keyword, timeoutSeconds);
-    panel_.MousePointer = 0;
-    session_.events.pump();
-    return success;
+    const Hourglass busy(panel_, session_.events);
+    return triggeredDialogue(keyword, timeoutSeconds);
 }
 
 bool CommandExchange::triggeredDialogue(const std::string& keyword, std::int32_t timeoutSeconds) {

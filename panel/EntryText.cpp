@@ -45,6 +45,7 @@ constexpr UnitRow kUnits[] = {
     {U::WholeSeconds, "sec", "", 1, true},
     {U::Level, "dbm", "", 1, true},
     {U::Decibels, "db", "", 1, true},
+    {U::Percent, "%", "", 1},
     {U::Metres, "m", "", 1, true},
     {U::Metres, "cm", "", 0.01, true},
     {U::Metres, "mm", "", 0.001},
@@ -60,7 +61,7 @@ constexpr KindName kNames[] = {
     {U::Hertz, "a frequency", "2.4 GHz"},  {U::Seconds, "a time", "20 ms"},
     {U::WholeSeconds, "a time", "5 s"},    {U::Level, "a level", "-30 dBm"},
     {U::Decibels, "a difference", "3 dB"}, {U::Metres, "a length", "12.5 m"},
-    {U::Enter, "a number", "12.5"},
+    {U::Percent, "a height", "50 %"},      {U::Enter, "a number", "12.5"},
 };
 
 const KindName& nameOf(EntryUnit kind) {

@@ -4,7 +4,7 @@
 #include <string_view>
 
 #include "link/WireText.h"
-#include "panel/Hourglass.h"
+#include "platform/Pointer.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
 

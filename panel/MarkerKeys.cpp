@@ -1,7 +1,7 @@
 #include "panel/MarkerKeys.h"
 
 #include "model/Numeric.h"
-#include "panel/Hourglass.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "trace/FrequencyLabels.h"

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "model/Numeric.h"
+#include "panel/TriggerKey.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 
@@ -59,8 +60,7 @@ void MenuFill::choose(int index, double code) {
 }
 
 void MenuFill::showTriggerSource() {
-    const bool video = mirror_.TriggerSource == TRIGVIDEO;
-    panel_.SoftKey(4).Caption = video ? "TRIGGER\r\nLEVEL" : "TRIGGER\r\nDELAY";
+    showTriggerKey(panel_, mirror_.TriggerSource == TRIGVIDEO);
     mirror_.ExternalTriggerActive =
         mirror_.TriggerSource == TRIGEXTRISE || mirror_.TriggerSource == TRIGEXTFALL;
 }

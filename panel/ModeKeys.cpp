@@ -1,9 +1,9 @@
 #include "panel/ModeKeys.h"
 
 #include "model/Numeric.h"
-#include "panel/Hourglass.h"
 #include "panel/ModeOptions.h"
 #include "panel/SoftPositions.h"
+#include "platform/Pointer.h"
 #include "trace/FrequencyLabels.h"
 
 namespace zel {

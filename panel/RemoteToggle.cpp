@@ -1,6 +1,6 @@
 #include "panel/RemoteToggle.h"
 
-#include "panel/Hourglass.h"
+#include "platform/Pointer.h"
 
 namespace zel {
 

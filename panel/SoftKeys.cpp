@@ -1,6 +1,6 @@
 #include "panel/SoftKeys.h"
 
-#include "panel/Hourglass.h"
+#include "platform/Pointer.h"
 
 namespace zel {
 

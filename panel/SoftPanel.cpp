@@ -166,6 +166,7 @@ void SoftPanel::SetButtonsStatus(std::int16_t state) {
 }
 
 void SoftPanel::setKeyCaptions(std::int16_t state) {
+    panel_.TriggerKeyIsLevel = false;  // until the menu knows the source
     for (const SoftPosition& position : softPositions(state)) {
         panel_.SoftKey(position.key).Caption = std::string(position.caption.text);
         panel_.SoftKey(position.key).Visible = position.caption.visible;

@@ -103,9 +103,10 @@ enum class EntryUnit {
     WholeSeconds,
     Level,
     Decibels,
+    Percent,  ///< of the height of the display
     Metres,
     MarkerX,       ///< of the x axis
-    TriggerValue,  ///< of what the key's caption says
+    TriggerValue,  ///< level or delay, as the key has it
 };
 
 /// How the position gets its value when its menu is filled.

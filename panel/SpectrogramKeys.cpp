@@ -7,10 +7,10 @@ namespace zel {
 SpectrogramKeys::SpectrogramKeys(ControllerForm& panel, const SweepHistory& history, FileOps& files,
                                  MessageBoxes& boxes)
     : panel_(panel), history_(history), files_(files), boxes_(boxes) {
-    panel_.SpectrogramShow.Clicked.connect([this] { SpectrogramShow_Click(); });
-    panel_.SpectrogramPause.Clicked.connect([this] { SpectrogramPause_Click(); });
-    panel_.SpectrogramSave.Clicked.connect([this] { SpectrogramSave_Click(); });
-    panel_.SpectrogramRow.connect([this](int back) { showRow(back); });
+    handlers_.on(panel_.SpectrogramShow.Clicked, [this] { SpectrogramShow_Click(); });
+    handlers_.on(panel_.SpectrogramPause.Clicked, [this] { SpectrogramPause_Click(); });
+    handlers_.on(panel_.SpectrogramSave.Clicked, [this] { SpectrogramSave_Click(); });
+    handlers_.on(panel_.SpectrogramRow, [this](int back) { showRow(back); });
     panel_.SpectrogramPicture.Visible = false;
     panel_.SpectrogramPause.Enabled = false;
 }

@@ -3,6 +3,7 @@
 
 #include "files/FileOps.h"
 #include "forms/ControllerForm.h"
+#include "platform/Event.h"
 #include "platform/MessageBox.h"
 #include "waterfall/SweepHistory.h"
 
@@ -25,6 +26,7 @@ class SpectrogramKeys {
     const SweepHistory& history_;
     FileOps& files_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -4,10 +4,10 @@ namespace zel {
 
 WaterfallKeys::WaterfallKeys(WaterfallForm& form, FileOps& files, MessageBoxes& boxes)
     : form_(form), files_(files), boxes_(boxes) {
-    form_.PictureSave.Clicked.connect([this] { PictureSave_Click(); });
-    form_.PictureCopy.Clicked.connect([this] { form_.CopyImage(); });
-    form_.ViewFullScreen.Clicked.connect(
-        [this] { form_.ViewFullScreen.Checked = !form_.ViewFullScreen.Checked; });
+    handlers_.on(form_.PictureSave.Clicked, [this] { PictureSave_Click(); });
+    handlers_.on(form_.PictureCopy.Clicked, [this] { form_.CopyImage(); });
+    handlers_.on(form_.ViewFullScreen.Clicked,
+                 [this] { form_.ViewFullScreen.Checked = !form_.ViewFullScreen.Checked; });
 }
 
 void WaterfallKeys::PictureSave_Click() {

@@ -3,6 +3,7 @@
 
 #include "files/FileOps.h"
 #include "forms/WaterfallForm.h"
+#include "platform/Event.h"
 #include "platform/MessageBox.h"
 
 namespace zel {
@@ -18,6 +19,7 @@ class WaterfallKeys {
     WaterfallForm& form_;
     FileOps& files_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

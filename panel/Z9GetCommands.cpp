@@ -5,6 +5,7 @@
 #include <optional>
 
 #include "model/Numeric.h"
+#include "panel/TriggerKey.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "trace/FrequencyLabels.h"
@@ -18,7 +19,6 @@ using T = CodeTable;
 
 constexpr double kFullCentre = 1.5e9;  // fixed numbers of the instrument family
 constexpr double kFullSpan = 3e9;
-constexpr const char* kTriggerLevel = "TRIGGER\r\nLEVEL";
 
 struct BandwidthPrompt {
     const char* word;
@@ -34,18 +34,9 @@ double wholeNumber(double value, double lowest, double highest) {
 }  // namespace
 
 Z9GetCommands::Z9GetCommands(ControllerForm& panel, ZEL3Variables& mirror,
-                             CommandExchange& exchange, SoftPanel& softPanel, MenuFill& fill,
-                             MarkerReadout& markers, TraceReader& traces, GraphScaling& scaling,
+                             CommandExchange& exchange, const KeyRoutines& routines,
                              MessageBoxes& boxes)
-    : panel_(panel),
-      mirror_(mirror),
-      exchange_(exchange),
-      softPanel_(softPanel),
-      fill_(fill),
-      markers_(markers),
-      traces_(traces),
-      scaling_(scaling),
-      boxes_(boxes) {}
+    : panel_(panel), mirror_(mirror), exchange_(exchange), routines_(routines), boxes_(boxes) {}
 
 Z9GetCommands::Quirk Z9GetCommands::quirk(KeyQuirk which) {
     using Z = Z9GetCommands;
@@ -94,7 +85,7 @@ void Z9GetCommands::press(int index) {
 bool Z9GetCommands::QueryToSoftBox(const std::string& word, int index, const std::string& unit) {
     std::string answer;
     if (!exchange_.GetInstrument(word, answer)) return false;
-    if (word == "PWR") fill_.LastPowerAnswer = answer;
+    if (word == "PWR") routines_.fill.LastPowerAnswer = answer;
     if (word == "REFL") LastReflAnswer = answer;
     LastQueryAnswer = answer;
     panel_.SoftTextBox(index).Text = word == "LENUNIT" ? answer : FormatValue(answer, unit);
@@ -129,7 +120,7 @@ void Z9GetCommands::runQuery(const SoftPosition& query) {
 
 void Z9GetCommands::readTrace() {
     bool success = false;
-    traces_.ReadSingleTrace2({}, success);
+    routines_.traces.ReadSingleTrace2({}, success);
 }
 
 void Z9GetCommands::edgeFrequency(int index, double direction) {
@@ -146,7 +137,7 @@ void Z9GetCommands::startFrequency(int index) { edgeFrequency(index, -1); }
 void Z9GetCommands::stopFrequency(int index) { edgeFrequency(index, 1); }
 
 void Z9GetCommands::fullSpan(int index) {
-    softPanel_.SetSoftButtonsColor(index);
+    routines_.softPanel.SetSoftButtonsColor(index);
     const bool accepted = exchange_.SetInstrument("SPAN," + WireNumber(kFullSpan));
     mirror_.CenterFrequency = kFullCentre;
     mirror_.Span = kFullSpan;
@@ -158,7 +149,7 @@ void Z9GetCommands::fullSpan(int index) {
 }
 
 void Z9GetCommands::zeroSpan(int index) {
-    softPanel_.SetSoftButtonsColor(index);
+    routines_.softPanel.SetSoftButtonsColor(index);
     const bool accepted = exchange_.SetInstrument("SPAN,0");
     mirror_.Span = 0;
     mirror_.Unsure.sent("SPAN", accepted);
@@ -167,7 +158,7 @@ void Z9GetCommands::zeroSpan(int index) {
 }
 
 void Z9GetCommands::lastSpan(int index) {
-    softPanel_.SetSoftButtonsColor(index);
+    routines_.softPanel.SetSoftButtonsColor(index);
     const bool accepted = exchange_.SetInstrument("SPAN," + WireNumber(panel_.LastSpan));
     mirror_.Span = panel_.LastSpan;
     mirror_.Unsure.sent("SPAN", accepted);
@@ -185,8 +176,8 @@ void Z9GetCommands::referenceLevel(int index) {
 void Z9GetCommands::bandwidth(int index) {
     const SoftPosition& position = *row(index);
     if (getSelected()) return runQuery(position);
-    softPanel_.SetSoftButtonsColor(index);
-    if (index == 0) softPanel_.SetButtonColor(3, "green");
+    routines_.softPanel.SetSoftButtonsColor(index);
+    if (index == 0) routines_.softPanel.SetButtonColor(3, "green");
     const BandwidthPrompt& prompt = index == 0 ? kResolutionPrompt : kVideoPrompt;
     const std::optional<std::string> reply = boxes_.prompt(prompt.text, "Enter Value", "");
     if (!reply || !IsNumericText(*reply)) return;  // nothing to convert: nothing is sent
@@ -208,8 +199,8 @@ void Z9GetCommands::autoBandwidth(int index) {
 }
 
 void Z9GetCommands::autoSweepTime(int index) {
-    softPanel_.SetButtonColor(0, "gray");
-    softPanel_.SetButtonColor(1, "green");
+    routines_.softPanel.SetButtonColor(0, "gray");
+    routines_.softPanel.SetButtonColor(1, "green");
     exchange_.SetInstrument("SWPTIME,0");
     std::string answer;
     if (exchange_.GetInstrument("SWPTIME", answer)) mirror_.SweepTime = leadingNumber(answer);
@@ -223,15 +214,15 @@ void Z9GetCommands::autoSweepTime(int index) {
 
 void Z9GetCommands::triggerSource(int index) {
     runQuery(*row(index));
-    const CodeRow* code = findCode(T::TriggerSource, mirror_.TriggerSource);
-    if (code != nullptr) panel_.SoftKey(4).Caption = std::string(code->text);
+    if (findCode(T::TriggerSource, mirror_.TriggerSource) != nullptr)
+        showTriggerKey(panel_, mirror_.TriggerSource == TRIGVIDEO);
 }
 
 void Z9GetCommands::triggerValue(int index) {
     if (!getSelected()) return;
-    if (panel_.SoftKey(4).Caption.get() == kTriggerLevel) {
+    if (panel_.TriggerKeyIsLevel) {
         if (!QueryToSoftBox("TRIGLVL", index, "%")) return;
-        scaling_.SetAnnotation(wholeNumber(leadingNumber(LastQueryAnswer), -32768, 32767));
+        routines_.scaling.SetAnnotation(wholeNumber(leadingNumber(LastQueryAnswer), -32768, 32767));
     } else {
         SoftPosition query = *row(index);
         query.word = "TRIGDEL";
@@ -243,9 +234,9 @@ void Z9GetCommands::triggerValue(int index) {
 
 void Z9GetCommands::singleTrace(int /*index*/) { panel_.PlaySingleButton.Click(); }
 
-void Z9GetCommands::transducerMenu(int /*index*/) { softPanel_.layTransducerMenu(); }
+void Z9GetCommands::transducerMenu(int /*index*/) { routines_.softPanel.layTransducerMenu(); }
 
-void Z9GetCommands::limitMenu(int /*index*/) { softPanel_.layLimitMenu(); }
+void Z9GetCommands::limitMenu(int /*index*/) { routines_.softPanel.layLimitMenu(); }
 
 void Z9GetCommands::transducerOff(int index) {
     if (getSelected()) exchange_.SetInstrument(index == 2 ? "TRD1,NONE" : "TRD2,NONE");
@@ -254,15 +245,15 @@ void Z9GetCommands::transducerOff(int index) {
 void Z9GetCommands::leaveSubMenu(int /*index*/) { panel_.MeasButton.Click(); }
 
 void Z9GetCommands::channelPower(int index) {
-    fill_.ChannelPowerUnitName = ChannelPowerUnitText(mirror_.ChannelPowerUnit, "CHNPWR");
+    routines_.fill.ChannelPowerUnitName = ChannelPowerUnitText(mirror_.ChannelPowerUnit, "CHNPWR");
     SoftPosition query = *row(index);
-    query.unit = fill_.ChannelPowerUnitName.c_str();
+    query.unit = routines_.fill.ChannelPowerUnitName.c_str();
     runQuery(query);
 }
 
 void Z9GetCommands::channelPowerUnit(int index) {
     runQuery(*row(index));
-    fill_.ChannelPowerUnitName = ChannelPowerUnitText(mirror_.ChannelPowerUnit, "CHNPWR");
+    routines_.fill.ChannelPowerUnitName = ChannelPowerUnitText(mirror_.ChannelPowerUnit, "CHNPWR");
 }
 
 void Z9GetCommands::levelAdjust(int index) {
@@ -279,7 +270,8 @@ void Z9GetCommands::marker(int index) {
     if (index == 2) return runQuery(position);
     if (!getSelected()) return;
     if (!QueryToSoftBox(position.word, index, position.unit)) return;
-    markers_.showAnswer(index == 0 ? MarkerKind::Marker : MarkerKind::Delta, LastQueryAnswer);
+    routines_.markers.showAnswer(index == 0 ? MarkerKind::Marker : MarkerKind::Delta,
+                                 LastQueryAnswer);
 }
 
 }  // namespace zel

@@ -1,27 +1,21 @@
 #pragma once
 // The press of a soft key: asks the instrument for one value, or carries out an action.
 
-#include <functional>
 #include <string>
 
 #include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
-#include "panel/MarkerReadout.h"
-#include "panel/MenuFill.h"
-#include "panel/SoftPanel.h"
+#include "panel/KeyRoutines.h"
 #include "panel/SoftPositions.h"
 #include "platform/MessageBox.h"
-#include "trace/GraphScaling.h"
-#include "trace/TraceReader.h"
 
 namespace zel {
 
 class Z9GetCommands {
   public:
     Z9GetCommands(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
-                  SoftPanel& softPanel, MenuFill& fill, MarkerReadout& markers, TraceReader& traces,
-                  GraphScaling& scaling, MessageBoxes& boxes);
+                  const KeyRoutines& routines, MessageBoxes& boxes);
 
     /// Runs the operations of all menus in their order for the key of that index; each clause
     /// looks at the state as the clauses before it left it.
@@ -70,11 +64,7 @@ class Z9GetCommands {
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
     CommandExchange& exchange_;
-    SoftPanel& softPanel_;
-    MenuFill& fill_;  ///< holds the readouts that the menus share
-    MarkerReadout& markers_;
-    TraceReader& traces_;
-    GraphScaling& scaling_;
+    KeyRoutines routines_;
     MessageBoxes& boxes_;
 };
 

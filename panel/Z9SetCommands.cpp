@@ -7,6 +7,8 @@
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
 #include "panel/ModeOptions.h"
+#include "panel/TriggerKey.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 
@@ -17,25 +19,18 @@ using CF = ControllerForm;
 using ZV = ZEL3Variables;
 
 constexpr double kZeroSpanCentre = 1.5e9;
-constexpr const char* kTriggerLevel = "TRIGGER\r\nLEVEL";
-constexpr const char* kTriggerDelay = "TRIGGER\r\nDELAY";
 constexpr int kReceiverChoice = 8;
 
 }  // namespace
 
-Z9SetCommands::Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
-                             SoftPanel& softPanel, Z9GetCommands& queries, MarkerReadout& markers,
-                             FrequencyLabels& labels, TraceReader& traces, GraphScaling& scaling,
-                             const Session& session)
-    : panel_(forms.controller),
+Z9SetCommands::Z9SetCommands(ControllerForm& panel, ZEL3Variables& mirror,
+                             CommandExchange& exchange, const KeyRoutines& routines,
+                             Z9GetCommands& queries, const Session& session)
+    : panel_(panel),
       mirror_(mirror),
       exchange_(exchange),
-      softPanel_(softPanel),
+      routines_(routines),
       queries_(queries),
-      markers_(markers),
-      labels_(labels),
-      traces_(traces),
-      scaling_(scaling),
       session_(session) {}
 
 Z9SetCommands::Quirk Z9SetCommands::quirk(EntryQuirk which) {
@@ -78,11 +73,6 @@ void Z9SetCommands::enter(int index) {
     }
 }
 
-void Z9SetCommands::pointer(int shape) {
-    panel_.MousePointer = shape;
-    session_.events.pump();
-}
-
 double Z9SetCommands::boxValue(int index) const {
     std::string prefix;
     return ParseValue(panel_.SoftTextBox(index).Text, prefix);
@@ -120,20 +110,19 @@ bool Z9SetCommands::valueText(const SoftPosition& position, std::string& text) c
 }
 
 void Z9SetCommands::send(const SoftPosition& position) {
-    softPanel_.SetSoftButtonsColor(position.key);
+    routines_.softPanel.SetSoftButtonsColor(position.key);
     std::string text;
     if (!valueText(position, text)) {
         session_.boxes.show({BoxIcon::Plain, "Out of Range!"});
         return;
     }
-    pointer(11);
+    const Hourglass busy(panel_, session_.events);
     const std::string word = position.wordToSet();
     const bool accepted = exchange_.SetInstrument(word + "," + text);
     // The mirror takes the number as it was written in the command.
     storeField(mirror_, position.fieldToSet(), leadingNumber(text), text);
     if (position.fieldToSet().index() != 0) mirror_.Unsure.sent(word, accepted);
     if (const Quirk after = quirk(position.onEntry)) (this->*after)(position.key);
-    pointer(0);
 }
 
 void Z9SetCommands::showEdges() {
@@ -146,7 +135,7 @@ void Z9SetCommands::showSpan() { panel_.SpanLabel.Caption = spanLabelText(mirror
 
 void Z9SetCommands::readTrace() {
     bool success = false;
-    traces_.ReadSingleTrace2({}, success);
+    routines_.traces.ReadSingleTrace2({}, success);
 }
 
 void Z9SetCommands::afterCentre(int /*index*/) {
@@ -162,9 +151,9 @@ void Z9SetCommands::afterCentre(int /*index*/) {
 }
 
 void Z9SetCommands::manualSpan(int index) {
-    softPanel_.SetSoftButtonsColor(index);
+    routines_.softPanel.SetSoftButtonsColor(index);
     const std::string text = WireNumber(boxValue(index));
-    pointer(11);
+    const Hourglass busy(panel_, session_.events);
     panel_.LastSpan = mirror_.Span;
     const bool accepted = exchange_.SetInstrument("SPAN," + text);
     mirror_.Span = leadingNumber(text);
@@ -172,11 +161,10 @@ void Z9SetCommands::manualSpan(int index) {
     showSpan();
     showEdges();
     readTrace();
-    pointer(0);
 }
 
 void Z9SetCommands::edgeFrequency(double span, double centre) {
-    pointer(11);
+    showPointer(panel_, session_.events, kHourglass);
     if (span < 0) return;  // quietly; the pointer stays as it was set
     mirror_.Span = span;
     mirror_.CenterFrequency = centre;
@@ -185,18 +173,18 @@ void Z9SetCommands::edgeFrequency(double span, double centre) {
     panel_.CFLabel.Caption = centerLabelText(centre);
     showSpan();
     readTrace();
-    pointer(0);
+    showPointer(panel_, session_.events, kArrow);
 }
 
 void Z9SetCommands::startFrequency(int index) {
-    softPanel_.SetSoftButtonsColor(index);
+    routines_.softPanel.SetSoftButtonsColor(index);
     const double start = boxValue(index);
     const double span = mirror_.CenterFrequency + mirror_.Span / 2 - start;
     edgeFrequency(span, start + span / 2);
 }
 
 void Z9SetCommands::stopFrequency(int index) {
-    softPanel_.SetSoftButtonsColor(index);
+    routines_.softPanel.SetSoftButtonsColor(index);
     const double start = mirror_.CenterFrequency - mirror_.Span / 2;
     const double span = boxValue(index) - start;
     edgeFrequency(span, start + span / 2);
@@ -204,12 +192,12 @@ void Z9SetCommands::stopFrequency(int index) {
 
 void Z9SetCommands::afterOffset(int /*index*/) {
     bool ok = false;
-    labels_.GetFreqForLabel(ok);
+    routines_.labels.GetFreqForLabel(ok);
 }
 
 void Z9SetCommands::zeroSpan(int index) {
-    softPanel_.SetSoftButtonsColor(index);
-    pointer(11);
+    routines_.softPanel.SetSoftButtonsColor(index);
+    const Hourglass busy(panel_, session_.events);
     const bool accepted = exchange_.SetInstrument("SPAN,0");
     panel_.SpanLabel.Caption = spanLabelText(0);
     mirror_.Span = 0;
@@ -219,11 +207,10 @@ void Z9SetCommands::zeroSpan(int index) {
     if (!accepted) mirror_.Unsure.sent("FREQ", false);
     panel_.CFLabel.Caption = centerLabelText(mirror_.CenterFrequency);
     readTrace();
-    pointer(0);
 }
 
 void Z9SetCommands::afterBandwidth(int index) {
-    if (index == 0) softPanel_.SetButtonColor(3, "green");
+    if (index == 0) routines_.softPanel.SetButtonColor(3, "green");
     const double code = index == 0 ? mirror_.ResolutionBandwidth : mirror_.VideoBandwidth;
     panel_.SoftTextBox(index + 1).Text = code == 0 ? "Auto" : "Manual";
 }
@@ -233,72 +220,68 @@ void Z9SetCommands::afterSweepTime(int /*index*/) {
 }
 
 void Z9SetCommands::autoSweepTime(int /*index*/) {
-    softPanel_.SetButtonColor(0, "gray");
-    softPanel_.SetButtonColor(1, "green");
+    routines_.softPanel.SetButtonColor(0, "gray");
+    routines_.softPanel.SetButtonColor(1, "green");
     queries_.QueryToSoftBox("SWPTIME", 0, "s");
 }
 
 void Z9SetCommands::sweepMode(int index) {
     const int choice = panel_.ChoiceBox(index).ListIndex();
-    pointer(11);
+    const Hourglass busy(panel_, session_.events);
     exchange_.SetInstrument(choice != 0 ? "SWPCONT,1" : "SWPCONT,0");
-    softPanel_.SetButtonColor(2, "green");
-    softPanel_.SetButtonColor(3, "gray");
+    routines_.softPanel.SetButtonColor(2, "green");
+    routines_.softPanel.SetButtonColor(3, "gray");
     mirror_.SweepContinuous = choice;
     panel_.SingleSweepModeActive = choice == 0;
-    pointer(0);
 }
 
 void Z9SetCommands::triggerSource(int index) {
-    softPanel_.SetButtonColor(3, "red");
+    routines_.softPanel.SetButtonColor(3, "red");
     const int choice = panel_.ChoiceBox(index).ListIndex();
     const bool external = choice == TRIGEXTRISE || choice == TRIGEXTFALL;
     mirror_.ExternalTriggerActive = external;
     if (choice == TRIGVIDEO || choice == 4) {
-        panel_.SoftKey(4).Caption = kTriggerLevel;
-        scaling_.showAnnotation();
+        showTriggerKey(panel_, true);
+        routines_.scaling.showAnnotation();
     } else if (external) {
-        panel_.SoftKey(4).Caption = kTriggerDelay;
+        showTriggerKey(panel_, false);
     } else if (choice == TRIGFREERUN) {
-        panel_.SoftKey(4).Caption = kTriggerDelay;
-        scaling_.hideAnnotation();
+        showTriggerKey(panel_, false);
+        routines_.scaling.hideAnnotation();
     }
     if (choice >= 4) {  // only the caption of the key changes
-        panel_.SoftKey(4).Caption = kTriggerDelay;
+        showTriggerKey(panel_, false);
         return;
     }
-    pointer(11);
+    const Hourglass busy(panel_, session_.events);
     exchange_.SetInstrument("TRIGSRC," + WireNumber(choice));
     mirror_.TriggerSource = static_cast<std::int16_t>(choice);
-    pointer(0);
 }
 
 void Z9SetCommands::triggerValue(int index) {
-    softPanel_.SetSoftButtonsColor(index);
+    routines_.softPanel.SetSoftButtonsColor(index);
     const double value = boxValue(index);
-    pointer(11);
-    const bool delay = panel_.SoftKey(4).Caption.get() == kTriggerDelay;
-    exchange_.SetInstrument((delay ? "TRIGDEL," : "TRIGLVL,") + WireNumber(value));
-    scaling_.SetAnnotation(value);
-    pointer(0);
+    const Hourglass busy(panel_, session_.events);
+    exchange_.SetInstrument((panel_.TriggerKeyIsLevel ? "TRIGLVL," : "TRIGDEL,") +
+                            WireNumber(value));
+    routines_.scaling.SetAnnotation(value);
 }
 
 void Z9SetCommands::measurementMode(int index) {
     DeselectOptionBoxes(panel_);
-    softPanel_.SetButtonColor(0, "red");
+    routines_.softPanel.SetButtonColor(0, "red");
     const int choice = std::max(panel_.ChoiceBox(index).ListIndex(), 0);
     mirror_.MeasModeText = std::to_string(choice);
-    pointer(11);
+    const Hourglass busy(panel_, session_.events);
     if (choice == kReceiverChoice) {
         if (exchange_.SetInstrument("MEAS,8")) panel_.InstrumentMode = CF::RECEIVER;
     } else {
         modeButton(panel_, choice).Click();
     }
-    pointer(0);
 }
 
 void Z9SetCommands::marker(int index) {
-    softPanel_.SetButtonColor(index, "red");
+    routines_.softPanel.SetButtonColor(index, "red");
     double value = 0;
     std::string unit;
     if (panel_.InstrumentMode == CF::DISTTOFAULTMEASURE) {
@@ -310,14 +293,13 @@ void Z9SetCommands::marker(int index) {
     } else {
         value = boxValue(index);
     }
-    pointer(11);
+    const Hourglass busy(panel_, session_.events);
     exchange_.SetInstrument((index == 0 ? "MARK1," : "DELTA1,") + WireNumber(value));
     if (index == 0) {
-        markers_.MakeMarkerReadout();
+        routines_.markers.MakeMarkerReadout();
     } else {
-        markers_.readDelta();
+        routines_.markers.readDelta();
     }
-    pointer(0);
 }
 
 }  // namespace zel

@@ -3,17 +3,13 @@
 
 #include <string>
 
-#include "forms/Forms.h"
+#include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
-#include "panel/MarkerReadout.h"
-#include "panel/SoftPanel.h"
+#include "panel/KeyRoutines.h"
 #include "panel/SoftPositions.h"
 #include "panel/Z9GetCommands.h"
 #include "platform/Session.h"
-#include "trace/FrequencyLabels.h"
-#include "trace/GraphScaling.h"
-#include "trace/TraceReader.h"
 
 namespace zel {
 
@@ -22,10 +18,8 @@ namespace zel {
 /// refused in a box and nothing is sent.
 class Z9SetCommands {
   public:
-    Z9SetCommands(Forms& forms, ZEL3Variables& mirror, CommandExchange& exchange,
-                  SoftPanel& softPanel, Z9GetCommands& queries, MarkerReadout& markers,
-                  FrequencyLabels& labels, TraceReader& traces, GraphScaling& scaling,
-                  const Session& session);
+    Z9SetCommands(ControllerForm& panel, ZEL3Variables& mirror, CommandExchange& exchange,
+                  const KeyRoutines& routines, Z9GetCommands& queries, const Session& session);
 
     /// Runs the operations of all menus in their order for the position of that index; each
     /// clause looks at the state as the clauses before it left it.
@@ -59,17 +53,12 @@ class Z9SetCommands {
     void showEdges();
     void showSpan();
     void readTrace();
-    void pointer(int shape);
 
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
     CommandExchange& exchange_;
-    SoftPanel& softPanel_;
+    KeyRoutines routines_;
     Z9GetCommands& queries_;
-    MarkerReadout& markers_;
-    FrequencyLabels& labels_;
-    TraceReader& traces_;
-    GraphScaling& scaling_;
     Session session_;
 };
 

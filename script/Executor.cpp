@@ -3,13 +3,13 @@
 #include <algorithm>
 #include <exception>
 
+#include "platform/Pointer.h"
 #include "support/Text.h"
 #include "support/TimeText.h"
 
 namespace zel {
 namespace {
 
-constexpr int kHourglass = 11;
 constexpr int kStepWaitMs = 100;
 constexpr int kRetryMs = 10;
 /// Statements that need no instrument run at full speed; after so many the run rests for one
@@ -34,13 +34,13 @@ Executor::Executor(Forms& forms, const InstrumentLine& line, const PanelRoutines
       interlock_(interlock),
       session_(interlock.session()),
       elapsed_(session_.clock) {
-    form_.cmdExecute.Clicked.connect([this] { cmdExecute_Click(); });
-    form_.cmdNext.Clicked.connect([this] { cmdNext_Click(); });
-    form_.cmdStop.Clicked.connect([this] { cmdStop_Click(); });
-    form_.chkStep.Clicked.connect([this] { chkStep_Click(); });
-    form_.ReleaseWait.connect([this] { release(); });
+    handlers_.on(form_.cmdExecute.Clicked, [this] { cmdExecute_Click(); });
+    handlers_.on(form_.cmdNext.Clicked, [this] { cmdNext_Click(); });
+    handlers_.on(form_.cmdStop.Clicked, [this] { cmdStop_Click(); });
+    handlers_.on(form_.chkStep.Clicked, [this] { chkStep_Click(); });
+    handlers_.on(form_.ReleaseWait, [this] { release(); });
     // The end of the program must not find a run that waits.
-    panel_.Unload.connect([this](int) {
+    handlers_.on(panel_.Unload, [this](int) {
         if (run_ != nullptr) cmdStop_Click();
         release();
     });
@@ -204,7 +204,7 @@ void Executor::finish() {
 void Executor::fail(const std::string& text) {
     run_->ended = true;
     session_.boxes.show({BoxIcon::Plain, text});
-    panel_.MousePointer = 0;
+    panel_.MousePointer = kArrow;
 }
 
 /// The panel's keys that would disturb a run.

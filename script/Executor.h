@@ -4,6 +4,7 @@
 #include <string>
 
 #include "forms/Forms.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 #include "script/ComplexMeasurement.h"
 #include "script/Language.h"
@@ -112,6 +113,7 @@ class Executor : private StatementRoutines {
     int statementsSinceWait_ = 0;
     bool continuousWasEnabled_ = true;
     bool startPending_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -6,6 +6,7 @@
 
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "platform/Pointer.h"
 #include "script/Executor.h"
 #include "script/ResultNames.h"
 #include "script/ScriptFailure.h"
@@ -64,7 +65,7 @@ void Executor::quickTrace(const Line& line) {
         return;
     }
     if (!cmd("INIT")) {
-        panel_.MousePointer = 0;
+        panel_.MousePointer = kArrow;
         run_->ended = true;
         return;
     }

@@ -26,12 +26,12 @@ void addValue(RichText& box, const std::string& name, const std::string& value) 
 
 PhaseDisplay::PhaseDisplay(STDForm& form, SpecialMeasForm& script, Events& events)
     : form_(form), script_(script), events_(events) {
-    form_.cmdExecute.Clicked.connect([this] { cmdExecute_Click(); });
-    form_.cmdStop.Clicked.connect([this] { cmdStop_Click(); });
-    form_.cmdClear.Clicked.connect([this] { cmdClear_Click(); });
-    form_.optDegrees.Clicked.connect([this] { optDegrees_Click(); });
-    form_.optRadians.Clicked.connect([this] { optRadians_Click(); });
-    form_.Unload.connect([this](int) { cmdClear_Click(); });
+    handlers_.on(form_.cmdExecute.Clicked, [this] { cmdExecute_Click(); });
+    handlers_.on(form_.cmdStop.Clicked, [this] { cmdStop_Click(); });
+    handlers_.on(form_.cmdClear.Clicked, [this] { cmdClear_Click(); });
+    handlers_.on(form_.optDegrees.Clicked, [this] { optDegrees_Click(); });
+    handlers_.on(form_.optRadians.Clicked, [this] { optRadians_Click(); });
+    handlers_.on(form_.Unload, [this](int) { cmdClear_Click(); });
 }
 
 void PhaseDisplay::cmdExecute_Click() {

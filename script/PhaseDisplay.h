@@ -4,6 +4,7 @@
 #include <string>
 
 #include "forms/ScriptForms.h"
+#include "platform/Event.h"
 #include "platform/Events.h"
 
 namespace zel {
@@ -29,6 +30,7 @@ class PhaseDisplay {
     STDForm& form_;
     SpecialMeasForm& script_;
     Events& events_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -57,9 +57,9 @@ ResultOutput::ResultOutput(Forms& forms, FileOps& files, const Session& session)
       statistics_(forms.std),
       files_(files),
       session_(session) {
-    form_.cmdSave.Clicked.connect([this] { cmdSave_Click(); });
-    form_.chkSave.Clicked.connect([this] { chkSave_Click(); });
-    form_.ResolveName.connect([this](std::string& name) {
+    handlers_.on(form_.cmdSave.Clicked, [this] { cmdSave_Click(); });
+    handlers_.on(form_.chkSave.Clicked, [this] { chkSave_Click(); });
+    handlers_.on(form_.ResolveName, [this](std::string& name) {
         name = resolveName(files_.service(), name, form_.ScriptFolder, form_.DataFileNameTyped)
                    .value_or("");
     });

@@ -6,6 +6,7 @@
 
 #include "files/FileOps.h"
 #include "forms/Forms.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 
 namespace zel {
@@ -46,6 +47,7 @@ class ResultOutput {
     STDForm& statistics_;
     FileOps& files_;
     Session session_;
+    Handlers handlers_;
 };
 
 /// "15.11.2026; 17:05:12.345; " out of one reading of the clock.

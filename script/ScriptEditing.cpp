@@ -15,12 +15,12 @@ constexpr const char* kEnding = ".txt";
 
 ScriptEditing::ScriptEditing(ScriptEditor& form, FileOps& files, MessageBoxes& boxes)
     : form_(form), files_(files), boxes_(boxes) {
-    form_.cmdClose.Clicked.connect([this] { cmdClose_Click(); });
-    form_.cmdCancel.Clicked.connect([this] { cmdCancel_Click(); });
-    form_.cmdNew.Clicked.connect([this] { cmdNew_Click(); });
-    form_.cmdSave.Clicked.connect([this] { cmdSave_Click(); });
-    form_.cmdSaveAs.Clicked.connect([this] { cmdSaveAs_Click(); });
-    form_.cmdOpen.Clicked.connect([] {});  // has no function
+    handlers_.on(form_.cmdClose.Clicked, [this] { cmdClose_Click(); });
+    handlers_.on(form_.cmdCancel.Clicked, [this] { cmdCancel_Click(); });
+    handlers_.on(form_.cmdNew.Clicked, [this] { cmdNew_Click(); });
+    handlers_.on(form_.cmdSave.Clicked, [this] { cmdSave_Click(); });
+    handlers_.on(form_.cmdSaveAs.Clicked, [this] { cmdSaveAs_Click(); });
+    handlers_.on(form_.cmdOpen.Clicked, [] {});  // has no function
 }
 
 bool ScriptEditing::save() {

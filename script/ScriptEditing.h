@@ -5,6 +5,7 @@
 
 #include "files/FileOps.h"
 #include "forms/ScriptForms.h"
+#include "platform/Event.h"
 #include "platform/MessageBox.h"
 
 namespace zel {
@@ -31,6 +32,7 @@ class ScriptEditing {
     ScriptEditor& form_;
     FileOps& files_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

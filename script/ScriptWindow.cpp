@@ -28,17 +28,17 @@ ScriptWindow::ScriptWindow(Forms& forms, FileOps& files, ApplicationFolder& fold
       files_(files),
       folder_(folder),
       session_(session) {
-    panel_.cmdSpecial.Clicked.connect([this] { cmdSpecial_Click(); });
-    form_.Load.connect([this] { Form_Load(); });
-    form_.QueryUnload.connect([this](int& cancel) {
+    handlers_.on(panel_.cmdSpecial.Clicked, [this] { cmdSpecial_Click(); });
+    handlers_.on(form_.Load, [this] { Form_Load(); });
+    handlers_.on(form_.QueryUnload, [this](int& cancel) {
         cancel = -1;  // the list stays
         cmdCancel_Click();
     });
-    form_.cmdCancel.Clicked.connect([this] { cmdCancel_Click(); });
-    form_.cmdOpenCommandsFile.Clicked.connect([this] { cmdOpenCommandsFile_Click(); });
-    form_.cmboSpecialMeasList.Clicked.connect([this] { cmboSpecialMeasList_Click(); });
-    form_.cmdEdit.Clicked.connect([this] { cmdEdit_Click(); });
-    form_.cmdNew.Clicked.connect([this] { cmdNew_Click(); });
+    handlers_.on(form_.cmdCancel.Clicked, [this] { cmdCancel_Click(); });
+    handlers_.on(form_.cmdOpenCommandsFile.Clicked, [this] { cmdOpenCommandsFile_Click(); });
+    handlers_.on(form_.cmboSpecialMeasList.Clicked, [this] { cmboSpecialMeasList_Click(); });
+    handlers_.on(form_.cmdEdit.Clicked, [this] { cmdEdit_Click(); });
+    handlers_.on(form_.cmdNew.Clicked, [this] { cmdNew_Click(); });
 }
 
 void ScriptWindow::Form_Load() {

@@ -5,6 +5,7 @@
 
 #include "files/FileOps.h"
 #include "forms/Forms.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 
 namespace zel {
@@ -44,6 +45,7 @@ class ScriptWindow {
     FileOps& files_;
     ApplicationFolder& folder_;
     Session session_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

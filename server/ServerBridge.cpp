@@ -1,6 +1,7 @@
 #include "server/ServerBridge.h"
 
 #include "link/TCPIPOps.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
@@ -62,7 +63,7 @@ void ServerBridge::StartListening(bool& ok) {
     const std::string portText = trimmed(form_.localPortTextBox.Text.get());
     const double port = leadingNumber(portText);
     if (!IsNumericText(portText) || port < 0 || port > kHighestPort) {
-        form_.MousePointer = 0;
+        form_.MousePointer = kArrow;
         problem_ = "Please enter a valid TCP port!";
         services_.boxes.show({BoxIcon::Plain, problem_});
         return;

@@ -3,6 +3,7 @@
 #include <utility>
 
 #include "link/RS232Ops.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "support/TimeText.h"
@@ -145,9 +146,9 @@ void ServerDialog::cmdConnect_Click() {
     services_.events.cancel(retry_);
     retry_ = 0;
     form_.cmdConnect.Enabled = false;
-    form_.MousePointer = 11;
+    form_.MousePointer = kHourglass;
     const bool ok = bridge_.connect();
-    form_.MousePointer = 0;
+    form_.MousePointer = kArrow;
     bridgingLook(ok);
     if (ok) saveSettings();
 }

@@ -41,6 +41,7 @@
 #include "panel/WaterfallKeys.h"
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
+#include "platform/Pointer.h"
 #include "platform/TimerDriver.h"
 #include "script/Scripts.h"
 #include "server/ServerBridge.h"
@@ -124,14 +125,13 @@ struct Program::Rooms {
           history(forms),
           manualScale(panel, forms.manualScale, boxes),
           pace(panel, p.clock),
-          traces(forms, mirror, onGraph, line, exchange, binary, conversion, scaling, pace,
-                 p.events, boxes),
+          traces(forms, mirror, instrument, {onGraph, conversion, scaling}, pace, session),
           power(forms, exchange, p.events),
           interlock(forms, line, session),
           sweeps(forms, exchange, traces, power, session),
           files(panel, p.fileDialogs, p.folder, p.files, p.clock),
-          views(forms, mirror, onGraph, exchange, files, p.clock, boxes),
-          viewReader(forms, mirror, onGraph, files, scaling, conversion, interlock),
+          views(forms, mirror, onGraph, exchange, files, session),
+          viewReader(forms, mirror, {onGraph, conversion, scaling}, files, interlock),
           recording(forms, mirror, instrument, sweeps, views, session),
           recent(panel, p.settings),
           fileMenu(panel, files, p.folder, boxes),
@@ -140,9 +140,9 @@ struct Program::Rooms {
           softPanel(panel),
           fill(panel, mirror, exchange),
           markerReadout(panel, mirror, exchange),
-          queries(panel, mirror, exchange, softPanel, fill, markerReadout, traces, scaling, boxes),
-          settings(forms, mirror, exchange, softPanel, queries, markerReadout, labels, traces,
-                   scaling, session),
+          keys{softPanel, fill, markerReadout, labels, traces, scaling},
+          queries(panel, mirror, exchange, keys, boxes),
+          settings(panel, mirror, exchange, keys, queries, session),
           hardKeys(panel, mirror, exchange, MenuRoutines{softPanel, fill}, interlock),
           softKeys(panel, softPanel, queries, settings, interlock),
           modeKeys(forms, mirror, exchange, MenuRoutines{softPanel, fill}, scaling, interlock),
@@ -166,7 +166,7 @@ struct Program::Rooms {
           serverDialog(forms, bridge, p.serverSocket, {p.serialPorts, p.settings, p.clipboard},
                        session, logs.rootDebug),
           serverMode(forms, p.startup, p.events),
-          startUp(forms, mirror, softPanel, graph, serverMode, p.clock, p.settings),
+          startUp(forms, mirror, softPanel, graph, serverMode, {p.clock, p.settings}),
           second(panel, bridge, sessionClock),
           end(forms, boxes),
           about(forms.about,
@@ -202,14 +202,14 @@ struct Program::Rooms {
                 if (form->Modal) form->Hide();
         });
         report.sessionLines = [this] { return record.lastLines(); };
-        panel.HelpAbout.Clicked.connect([this] { about.show(); });
+        handlers.on(panel.HelpAbout.Clicked, [this] { about.show(); });
         timers.attach(panel.UpNow);
-        panel.ShowHelp.connect([this](int context) { help.showTopic(context); });
+        handlers.on(panel.ShowHelp, [this](int context) { help.showTopic(context); });
         timers.attach(panel.PaceTimer);
-        exchange.SettingBegins.connect([this] { keepSettings(onGraph, mirror); });
+        handlers.on(exchange.SettingBegins, [this] { keepSettings(onGraph, mirror); });
         timers.attach(forms.time.X);
-        viewReader.FileLoaded.connect([this](const std::string& path) { recent.add(path); });
-        panel.UtilityTrouble.Clicked.connect([this] {
+        handlers.on(viewReader.FileLoaded, [this](const std::string& path) { recent.add(path); });
+        handlers.on(panel.UtilityTrouble.Clicked, [this] {
             // It is a help on the side: a simulator that is not installed is no error.
             platform.launcher.start(platform.folder.programPath() + "/ZELSim/ZELSim", {"--pty"});
         });
@@ -217,7 +217,7 @@ struct Program::Rooms {
 
     /// In order, whatever failed: the recording stops, the port is released, the logs are closed.
     void endAfterFailure() {
-        panel.MousePointer = 0;
+        panel.MousePointer = kArrow;
         line.Ending = true;
         panel.RecordDataFlag = false;
         try {
@@ -283,6 +283,7 @@ struct Program::Rooms {
     SoftPanel softPanel;
     MenuFill fill;
     MarkerReadout markerReadout;
+    KeyRoutines keys;
     Z9GetCommands queries;
     Z9SetCommands settings;
     HardKeys hardKeys;
@@ -330,7 +331,7 @@ Program::Program(const Platform& platform, std::string commandLine)
 Program::~Program() { guards_->boxes.quiet = nullptr; }
 
 void Program::showFailure() {
-    rooms_->panel.MousePointer = 0;
+    rooms_->panel.MousePointer = kArrow;
     rooms_->failures.handle();
 }
 

@@ -9,9 +9,10 @@ constexpr int kUnloadArgument = 1;
 
 ProgramEnd::ProgramEnd(Forms& forms, MessageBoxes& boxes)
     : forms_(forms), panel_(forms.controller), boxes_(boxes) {
-    panel_.ExitObject.Clicked.connect([this] { ExitObject_Click(); });
-    panel_.QueryUnload.connect([this](int& cancel) { Form_QueryUnload(cancel); });
-    panel_.Unload.connect([this](int /*argument*/) { forms_.waterfall.unload(kUnloadArgument); });
+    handlers_.on(panel_.ExitObject.Clicked, [this] { ExitObject_Click(); });
+    handlers_.on(panel_.QueryUnload, [this](int& cancel) { Form_QueryUnload(cancel); });
+    handlers_.on(panel_.Unload,
+                 [this](int /*argument*/) { forms_.waterfall.unload(kUnloadArgument); });
 }
 
 bool ProgramEnd::confirmed() {

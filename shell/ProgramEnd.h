@@ -2,6 +2,7 @@
 // The two doors out of the program.
 
 #include "forms/Forms.h"
+#include "platform/Event.h"
 #include "platform/MessageBox.h"
 
 namespace zel {
@@ -27,6 +28,7 @@ class ProgramEnd {
     ControllerForm& panel_;
     MessageBoxes& boxes_;
     bool ended_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

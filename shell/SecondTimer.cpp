@@ -4,7 +4,7 @@ namespace zel {
 
 SecondTimer::SecondTimer(ControllerForm& panel, ServerBridge& server, SessionClock& sessionClock)
     : server_(server), sessionClock_(sessionClock) {
-    panel.UpNow.Tick.connect([this] { UpNow_Timer(); });
+    handlers_.on(panel.UpNow.Tick, [this] { UpNow_Timer(); });
 }
 
 void SecondTimer::UpNow_Timer() {

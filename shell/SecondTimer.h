@@ -3,6 +3,7 @@
 
 #include "connection/SessionClock.h"
 #include "forms/ControllerForm.h"
+#include "platform/Event.h"
 #include "server/ServerBridge.h"
 
 namespace zel {
@@ -16,6 +17,7 @@ class SecondTimer {
   private:
     ServerBridge& server_;
     SessionClock& sessionClock_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

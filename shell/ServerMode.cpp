@@ -11,8 +11,8 @@ constexpr const char* kLinkName = "ZELRemote.lnk";
 
 ServerMode::ServerMode(Forms& forms, StartupFolder& startup, Events& events)
     : forms_(forms), panel_(forms.controller), startup_(startup), events_(events) {
-    panel_.UtilityServer.Clicked.connect([this] { UtilityServer_Click(); });
-    panel_.UtilityStartup.Clicked.connect([this] { UtilityStartup_Click(); });
+    handlers_.on(panel_.UtilityServer.Clicked, [this] { UtilityServer_Click(); });
+    handlers_.on(panel_.UtilityStartup.Clicked, [this] { UtilityStartup_Click(); });
 }
 
 void ServerMode::UtilityServer_Click() {

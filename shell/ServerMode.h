@@ -2,6 +2,7 @@
 // The menu entries around server mode: its window, and running it at the user's start-up.
 
 #include "forms/Forms.h"
+#include "platform/Event.h"
 #include "platform/Events.h"
 #include "platform/Services.h"
 
@@ -22,6 +23,7 @@ class ServerMode {
     ControllerForm& panel_;
     StartupFolder& startup_;
     Events& events_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

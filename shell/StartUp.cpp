@@ -11,26 +11,25 @@ constexpr Color k3DKey = 0xE0E0E0;
 
 }  // namespace
 
-StartUp::StartUp(Forms& forms, ZEL3Variables& mirror, SoftPanel& softPanel, GraphInteraction& graph,
-                 ServerMode& server, const Clock& clock, SettingsStore& settings)
+StartUp::StartUp(Forms& forms, const ZEL3Variables& mirror, SoftPanel& softPanel,
+                 GraphInteraction& graph, ServerMode& server, const Services& services)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
       softPanel_(softPanel),
       graph_(graph),
       server_(server),
-      clock_(clock),
-      settings_(settings) {}
+      services_(services) {}
 
 bool StartUp::Form_Load(const VersionInfo& version) {
-    panel_.TimeLabel.Caption = timeOfDayText(clock_.date());
+    panel_.TimeLabel.Caption = timeOfDayText(services_.clock.date());
     panel_.UpNow.Enabled = true;
     panel_.State = 0;
     panel_.InstrumentMode = ControllerForm::ANALYZER;
     panel_.YVectorVal = 0;
     panel_.LastSpan = mirror_.Span;
     panel_.GetOption.setValue(true);
-    panel_.mLoadOption = settings_.get(kProgramName, "Properties", "Option", "");
+    panel_.mLoadOption = services_.settings.get(kProgramName, "Properties", "Option", "");
     if (panel_.mLoadOption.empty()) panel_.mLoadOption = "R";
     panel_.ConnectedPic.Visible = false;
     graph_.setUpCursors();

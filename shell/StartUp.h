@@ -14,8 +14,12 @@ namespace zel {
 
 class StartUp {
   public:
-    StartUp(Forms& forms, ZEL3Variables& mirror, SoftPanel& softPanel, GraphInteraction& graph,
-            ServerMode& server, const Clock& clock, SettingsStore& settings);
+    struct Services {
+        const Clock& clock;
+        SettingsStore& settings;
+    };
+    StartUp(Forms& forms, const ZEL3Variables& mirror, SoftPanel& softPanel,
+            GraphInteraction& graph, ServerMode& server, const Services& services);
 
     /// With the word "SERVER" it returns when the server's window is closed, and false: the
     /// program is at its end.
@@ -26,12 +30,11 @@ class StartUp {
 
     Forms& forms_;
     ControllerForm& panel_;
-    ZEL3Variables& mirror_;
+    const ZEL3Variables& mirror_;
     SoftPanel& softPanel_;
     GraphInteraction& graph_;
     ServerMode& server_;
-    const Clock& clock_;
-    SettingsStore& settings_;
+    Services services_;
 };
 
 }  // namespace zel

@@ -1,6 +1,7 @@
 #include "trace/FrequencyLabels.h"
 
 #include "model/Numeric.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 
 namespace zel {
@@ -25,8 +26,7 @@ void FrequencyLabels::GetSpanForLabel(bool& ok) {
 
 void FrequencyLabels::query(const char* word, double& field, Label& label,
                             std::string (*text)(const std::string&), bool& ok) {
-    dialog_.MousePointer = 11;
-    events_.pump();
+    const Hourglass busy(dialog_, events_);
     std::string answer;
     ok = exchange_.GetInstrument(word, answer);
     if (ok) {
@@ -34,8 +34,6 @@ void FrequencyLabels::query(const char* word, double& field, Label& label,
         field = leadingNumber(answer);
         mirror_.Unsure.known(word);
     }
-    dialog_.MousePointer = 0;
-    events_.pump();
 }
 
 }  // namespace zel

@@ -18,12 +18,12 @@ constexpr int kCursorDigits = 3;
 
 GraphInteraction::GraphInteraction(ControllerForm& panel, ZEL3Variables& mirror)
     : panel_(panel), mirror_(mirror) {
-    panel_.cmdZoom.Clicked.connect([this] { cmdZoom_Click(); });
-    panel_.CWGraph1.ZoomFinished.connect([this] { zoomFinished(); });
-    panel_.CWGraph1.PlotAreaTracking.connect(
-        [this](double x, double y) { plotAreaTracking(x, y); });
-    panel_.CWGraph1.CursorMoved.connect(
-        [this](int index, double x, double y) { ShowCursorLabels(index, x, y); });
+    handlers_.on(panel_.cmdZoom.Clicked, [this] { cmdZoom_Click(); });
+    handlers_.on(panel_.CWGraph1.ZoomFinished, [this] { zoomFinished(); });
+    handlers_.on(panel_.CWGraph1.PlotAreaTracking,
+                 [this](double x, double y) { plotAreaTracking(x, y); });
+    handlers_.on(panel_.CWGraph1.CursorMoved,
+                 [this](int index, double x, double y) { ShowCursorLabels(index, x, y); });
 }
 
 void GraphInteraction::setUpCursors() {

@@ -5,6 +5,7 @@
 
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Event.h"
 
 namespace zel {
 
@@ -32,6 +33,7 @@ class GraphInteraction {
 
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -44,10 +44,10 @@ std::string GetDimension(const ControllerForm& panel, const ZEL3Variables& mirro
     return mirror.Span == 0 ? "s" : "Hz";
 }
 
-void GraphScaling::setGraphAxes(double xStart, double xStop, double level, int rangeByte,
-                                bool useRangeCode) {
+void GraphScaling::setGraphAxes(double xStart, double xStop, double level,
+                                const LevelRange& range) {
     setGraphXAxis(xStart, xStop);
-    setGraphYAxis(level, rangeByte, useRangeCode);
+    setGraphYAxis(level, range);
     addWaterfallRowLimit();
     waterfall_.stampRow(timeOfDayText(clock_.date()));
     waterfall_.saveGraphView();
@@ -70,19 +70,19 @@ void GraphScaling::setLevelRange(double minimum, double maximum) {
     waterfall_.Graph3D.setRange(3, minimum, maximum);
 }
 
-void GraphScaling::setGraphYAxis(double level, int rangeByte, bool useRangeCode) {
+void GraphScaling::setGraphYAxis(double level, const LevelRange& range) {
     Graph3D& graph3D = waterfall_.Graph3D;
     graph3D.setLabelColor(3, graph3D.axis(2).LabelColor);
-    const double perDivision = useRangeCode ? decibelsPerDivision(rangeByte) : rangeByte;
-    if (!useRangeCode) {
+    const double perDivision = range.perDivision();
+    if (!range.isCode()) {
         for (int code = RANGE10DB; code <= RANGE1DB; ++code)
-            if (decibelsPerDivision(code) == rangeByte) mirror_.ReferenceRange = code;
+            if (decibelsPerDivision(code) == perDivision) mirror_.ReferenceRange = code;
     }
     const double unit = mirror_.ReferenceUnit;
     if (unit != UNITV && unit != UNITW) level = std::nearbyint(level);
-    const double range = mirror_.ReferenceRange;
+    const double code = mirror_.ReferenceRange;
     const bool logarithmic =
-        range == RANGE10DB || range == RANGE5DB || range == RANGE2DB || range == RANGE1DB;
+        code == RANGE10DB || code == RANGE5DB || code == RANGE2DB || code == RANGE1DB;
     if (!logarithmic) {
         panel_.CWGraph1.showYLabels(true);
         setLevelRange(0, 100);
@@ -99,7 +99,7 @@ void GraphScaling::setGraphYAxis(double level, int rangeByte, bool useRangeCode)
         panel_.isZELViewLinFile = false;
     }
     SetYAxisFormat();
-    if (!useRangeCode) mirror_.ReferenceRange = perDivision;
+    if (!range.isCode()) mirror_.ReferenceRange = perDivision;
     const GraphAxis& axis = graph3D.axis(3);
     // The numbers of volts and watts on a logarithmic range are dBm, whatever the format says.
     const bool inDbm = logarithmic && (unit == UNITV || unit == UNITW);

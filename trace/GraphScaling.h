@@ -6,6 +6,7 @@
 
 #include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "model/LevelRange.h"
 #include "model/ZEL3Variables.h"
 #include "platform/Clock.h"
 #include "trace/Sweep.h"
@@ -21,12 +22,11 @@ class GraphScaling {
                  const Clock& clock)
         : panel_(panel), waterfall_(waterfall), mirror_(mirror), clock_(clock) {}
 
-    /// Scales both graphs and stamps a row of the waterfall. `level` is in the reference unit;
-    /// `rangeByte` is a range code, or dB a division without `useRangeCode`.
-    void setGraphAxes(double xStart, double xStop, double level, int rangeByte, bool useRangeCode);
+    /// Scales both graphs and stamps a row of the waterfall. `level` is in the reference unit.
+    void setGraphAxes(double xStart, double xStop, double level, const LevelRange& range);
     /// Leaves the x axis alone while the user's zoom is on.
     void setGraphXAxis(double xStart, double xStop);
-    void setGraphYAxis(double level, int rangeByte, bool useRangeCode);
+    void setGraphYAxis(double level, const LevelRange& range);
     void SetYAxisFormat();
     void addWaterfallRowLimit();
     /// Plots a sweep; only a whole one goes into the waterfall.

@@ -4,10 +4,11 @@
 #include <array>
 #include <utility>
 
+#include "platform/Pointer.h"
+
 namespace zel {
 namespace {
 
-constexpr int kHourglass = 11;
 constexpr std::size_t kMostWaiting = 64;
 /// Places that stand for runs of scripts, one inside the wait of another.
 constexpr std::array<char, 64> kRuns{};

@@ -14,10 +14,10 @@ constexpr double kLargest = 1e15;
 
 ManualScale::ManualScale(ControllerForm& panel, ManualScaleForm& dialog, MessageBoxes& boxes)
     : panel_(panel), dialog_(dialog), boxes_(boxes) {
-    panel_.UtilityGraphSettings.Clicked.connect([this] { dialog_.Show(); });
-    dialog_.Load.connect([this] { Form_Load(); });
-    dialog_.cmdAccept.Clicked.connect([this] { cmdAccept_Click(); });
-    dialog_.cmdCancel.Clicked.connect([this] { dialog_.unload(1); });
+    handlers_.on(panel_.UtilityGraphSettings.Clicked, [this] { dialog_.Show(); });
+    handlers_.on(dialog_.Load, [this] { Form_Load(); });
+    handlers_.on(dialog_.cmdAccept.Clicked, [this] { cmdAccept_Click(); });
+    handlers_.on(dialog_.cmdCancel.Clicked, [this] { dialog_.unload(1); });
 }
 
 void ManualScale::Form_Load() {

@@ -2,6 +2,7 @@
 // The dialog that scales the y axis by hand, until the next trace scales it again.
 
 #include "forms/Forms.h"
+#include "platform/Event.h"
 #include "platform/MessageBox.h"
 
 namespace zel {
@@ -18,6 +19,7 @@ class ManualScale {
     ControllerForm& panel_;
     ManualScaleForm& dialog_;
     MessageBoxes& boxes_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -25,7 +25,7 @@ std::string ageText(double seconds, bool running) {
 }  // namespace
 
 PaceMonitor::PaceMonitor(ControllerForm& panel, const Clock& clock) : panel_(panel), clock_(clock) {
-    panel_.PaceTimer.Tick.connect([this] { show(); });
+    handlers_.on(panel_.PaceTimer.Tick, [this] { show(); });
 }
 
 void PaceMonitor::cycleBegins() {

@@ -6,6 +6,7 @@
 
 #include "forms/ControllerForm.h"
 #include "platform/Clock.h"
+#include "platform/Event.h"
 
 namespace zel {
 
@@ -41,6 +42,7 @@ class PaceMonitor {
     std::int64_t waited_ = 0;
     double sweepDate_ = 0;
     std::deque<std::int64_t> drawnAt_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

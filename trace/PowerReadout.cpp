@@ -1,6 +1,7 @@
 #include "trace/PowerReadout.h"
 
 #include "model/Numeric.h"
+#include "platform/Pointer.h"
 
 namespace zel {
 namespace {
@@ -13,20 +14,20 @@ constexpr const char* kUnit = "dBm";  // of every reading: the answers name none
 PowerReadout::PowerReadout(Forms& forms, CommandExchange& exchange, Events& events)
     : forms_(forms), panel_(forms.controller), exchange_(exchange), events_(events) {
     PowerAndReflForm& dialog = forms_.powerAndRefl;
-    dialog.Load.connect([&dialog] {
+    handlers_.on(dialog.Load, [&dialog] {
         dialog.ReadPowerOnly = true;
         dialog.ReadPowerAndRefl = false;
         dialog.PowerOnlyOption.setValue(true);
     });
-    dialog.PowerOnlyOption.Clicked.connect([&dialog] {
+    handlers_.on(dialog.PowerOnlyOption.Clicked, [&dialog] {
         dialog.ReadPowerOnly = true;
         dialog.ReadPowerAndRefl = false;
     });
-    dialog.PowerAndLeflOption.Clicked.connect([&dialog] {
+    handlers_.on(dialog.PowerAndLeflOption.Clicked, [&dialog] {
         dialog.ReadPowerOnly = false;
         dialog.ReadPowerAndRefl = true;
     });
-    dialog.ClosePwrForm.Clicked.connect([&dialog] { dialog.unload(1); });
+    handlers_.on(dialog.ClosePwrForm.Clicked, [&dialog] { dialog.unload(1); });
 }
 
 bool PowerReadout::ReadPowerValue(const std::string& query, int boxIndex, const std::string& unit) {
@@ -47,15 +48,12 @@ bool PowerReadout::readPowerSensor(int boxIndex) {
 }
 
 bool PowerReadout::ReadPowerReadings(std::string_view modeName, int boxIndex) {
-    panel_.MousePointer = 11;
-    events_.pump();
+    const Hourglass busy(panel_, events_);
     panel_.PlaySingleButton.Enabled = false;
     bool good = true;
     if (modeName == "PowerSensor") good = readPowerSensor(boxIndex);
     if (modeName == "TDMAPower") good = ReadPowerValue("TDMAPWR", boxIndex, kUnit);
     panel_.PlaySingleButton.Enabled = true;
-    panel_.MousePointer = 0;
-    events_.pump();
     return good;
 }
 

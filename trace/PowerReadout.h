@@ -6,6 +6,7 @@
 
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
+#include "platform/Event.h"
 #include "platform/Events.h"
 
 namespace zel {
@@ -29,6 +30,7 @@ class PowerReadout {
     ControllerForm& panel_;
     CommandExchange& exchange_;
     Events& events_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

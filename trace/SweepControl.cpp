@@ -2,6 +2,7 @@
 
 #include "link/WaitNotice.h"
 #include "platform/ModalForm.h"
+#include "platform/Pointer.h"
 
 namespace zel {
 namespace {
@@ -165,7 +166,7 @@ void SweepControl::StopButton_Click() {
     panel_.PlayContinuousButton.Enabled = true;
     panel_.RecordDataFlag = false;
     panel_.RecordData.Visible = true;
-    panel_.MousePointer = 0;
+    panel_.MousePointer = kArrow;
     events_.pump();
 }
 

@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "model/CodeTables.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "trace/FrequencyLabels.h"
 
@@ -23,27 +24,19 @@ std::uint8_t byteOf(double number) {
 
 }  // namespace
 
-TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, ZELBas& state,
-                         CommandExchange& exchange, BinaryTrace& binary,
-                         TraceConversion& conversion, GraphScaling& scaling, PaceMonitor& pace,
-                         Events& events, MessageBoxes& boxes)
+TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& link,
+                         const TraceOnGraph& onGraph, PaceMonitor& pace, const Session& session)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
-      onGraph_(onGraph),
-      state_(state),
-      exchange_(exchange),
-      binary_(binary),
-      conversion_(conversion),
-      scaling_(scaling),
+      onGraph_(onGraph.sweep),
+      state_(link.state),
+      exchange_(link.exchange),
+      binary_(link.binary),
+      conversion_(onGraph.conversion),
+      scaling_(onGraph.scaling),
       pace_(pace),
-      events_(events),
-      boxes_(boxes) {}
-
-void TraceReader::pointer(int shape) {
-    panel_.MousePointer = shape;
-    events_.pump();
-}
+      session_(session) {}
 
 TraceReader::Step TraceReader::query(const char* word, double& field) {
     if (!exchange_.GetInstrument(word, panel_.InstrumentAnswer))
@@ -123,7 +116,7 @@ void TraceReader::begin() {
     pace_.cycleBegins();
     silenceToldHere_ = panel_.ContinuosLoopActive && !state_.ExchangeFailed;
     panel_.RecordData.Visible = false;
-    pointer(11);
+    showPointer(panel_, session_.events, kHourglass);
     panel_.PlaySingleButton.Enabled = false;
 }
 
@@ -202,7 +195,7 @@ void TraceReader::writeForm() const {
 
 void TraceReader::scaleAndConvert() {
     scaling_.setGraphAxes(last_.axis.start, last_.axis.stop, mirror_.ReferenceLevel,
-                          byteOf(std::nearbyint(mirror_.ReferenceRange)), true);
+                          LevelRange::ofCode(byteOf(std::nearbyint(mirror_.ReferenceRange))));
     conversion_.ConvertTrace(last_);
     writeForm();
     onGraph_ = last_;
@@ -228,8 +221,9 @@ void TraceReader::abortView(bool& success) {
     panel_.PlaySingleButton.Enabled = true;
     // In the continuous view the silence itself was reported, and one box is enough.
     const bool known = state_.WaitLeft || state_.Ending || silenceToldHere_;
-    if (!state_.DialCancelled && !known) boxes_.show({BoxIcon::Information, "Unsuccessful View"});
-    pointer(0);
+    if (!state_.DialCancelled && !known)
+        session_.boxes.show({BoxIcon::Information, "Unsuccessful View"});
+    showPointer(panel_, session_.events, kArrow);
     success = false;
 }
 
@@ -239,7 +233,7 @@ void TraceReader::ReadSingleTrace(bool& success) {
     silenceToldHere_ = false;
     last_ = {};
     if (!panel_.isConnected) {
-        boxes_.show({BoxIcon::Information, "Please connect to the intrument first."});
+        session_.boxes.show({BoxIcon::Information, "Please connect to the intrument first."});
         return;
     }
     begin();
@@ -250,7 +244,7 @@ void TraceReader::ReadSingleTrace(bool& success) {
     if (step == Step::LinkFailed) return abortView(success);
     // The x values for the waterfall are those of the trace before.
     if (step == Step::Refused || !ReadTraceData(panel_.ViewStart, panel_.ViewStop)) {
-        panel_.MousePointer = 0;
+        panel_.MousePointer = kArrow;
         return;
     }
     if (!panel_.ContinuosLoopActive) {
@@ -263,7 +257,7 @@ void TraceReader::ReadSingleTrace(bool& success) {
     pace_.drawn();
     panel_.RecordData.Visible = true;
     success = true;
-    pointer(0);
+    showPointer(panel_, session_.events, kArrow);
     panel_.PlaySingleButton.Enabled = true;
     panel_.RecordData.Visible = true;
 }
@@ -275,14 +269,14 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     last_ = {};
     if (state_.ExchangeFailed) return abortView(success);
     const auto close = [this] {
-        pointer(0);
+        showPointer(panel_, session_.events, kArrow);
         panel_.PlaySingleButton.Enabled = true;
         panel_.PlayContinuousButton.Enabled = true;
         panel_.RecordData.Visible = true;
     };
     if (!panel_.isConnected) {
         if (!panel_.ErrorFlag)
-            boxes_.show({BoxIcon::Information, "Please connect to the intrument first."});
+            session_.boxes.show({BoxIcon::Information, "Please connect to the intrument first."});
         panel_.ErrorFlag = true;
         return close();
     }

@@ -4,15 +4,13 @@
 #include <string>
 
 #include "forms/Forms.h"
-#include "link/BinaryTrace.h"
-#include "link/CommandExchange.h"
+#include "link/InstrumentLink.h"
 #include "model/ZEL3Variables.h"
 #include "platform/Events.h"
-#include "platform/MessageBox.h"
-#include "trace/GraphScaling.h"
+#include "platform/Session.h"
 #include "trace/PaceMonitor.h"
 #include "trace/Sweep.h"
-#include "trace/TraceConversion.h"
+#include "trace/TraceOnGraph.h"
 
 namespace zel {
 
@@ -27,10 +25,9 @@ struct ReadAgain {
 
 class TraceReader {
   public:
-    /// `onGraph` takes each sweep that is drawn.
-    TraceReader(Forms& forms, ZEL3Variables& mirror, Sweep& onGraph, ZELBas& state,
-                CommandExchange& exchange, BinaryTrace& binary, TraceConversion& conversion,
-                GraphScaling& scaling, PaceMonitor& pace, Events& events, MessageBoxes& boxes);
+    /// The sweep of `onGraph` becomes each that is drawn.
+    TraceReader(Forms& forms, ZEL3Variables& mirror, const InstrumentLink& link,
+                const TraceOnGraph& onGraph, PaceMonitor& pace, const Session& session);
 
     /// The full cycle. True in `success` when a trace was read and drawn, be it incomplete.
     void ReadSingleTrace(bool& success);
@@ -60,7 +57,6 @@ class TraceReader {
     void writeForm() const;
     void waterfallRow();
     void abortView(bool& success);
-    void pointer(int shape);
     /// A script's window has the flag for itself.
     bool recordsTraces() const { return panel_.RecordDataFlag && !panel_.isSpecMeas; }
 
@@ -74,8 +70,7 @@ class TraceReader {
     TraceConversion& conversion_;
     GraphScaling& scaling_;
     PaceMonitor& pace_;
-    Events& events_;
-    MessageBoxes& boxes_;
+    Session session_;
     bool silenceToldHere_ = false;  ///< a failure of this cycle's line has a box of its own
     Sweep last_;
 };

@@ -12,12 +12,13 @@ constexpr const char* kBehindTime = "     ";
 
 Graph3dOps::Graph3dOps(WaterfallForm& form) : form_(form) {
     zel::Graph3D& graph = form_.Graph3D;
-    form_.resetRowCount.connect([this] { resetRowCount(); });
-    form_.limitRows.connect([this, &graph](int depth) { limitRows(graph, depth); });
-    form_.stampRow.connect([this, &graph](const std::string& text) { stampRow(graph, text); });
-    form_.styleLastRow.connect([this, &graph] { styleLastRow(graph); });
-    form_.saveGraphView.connect([this, &graph] { saveGraphView(graph, false); });
-    form_.clearGraph.connect([this, &graph] { clearGraph(graph); });
+    handlers_.on(form_.resetRowCount, [this] { resetRowCount(); });
+    handlers_.on(form_.limitRows, [this, &graph](int depth) { limitRows(graph, depth); });
+    handlers_.on(form_.stampRow,
+                 [this, &graph](const std::string& text) { stampRow(graph, text); });
+    handlers_.on(form_.styleLastRow, [this, &graph] { styleLastRow(graph); });
+    handlers_.on(form_.saveGraphView, [this, &graph] { saveGraphView(graph, false); });
+    handlers_.on(form_.clearGraph, [this, &graph] { clearGraph(graph); });
 }
 
 void Graph3dOps::resetRowCount() { form_.RowCount = 0; }

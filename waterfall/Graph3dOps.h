@@ -4,6 +4,7 @@
 #include <string>
 
 #include "forms/WaterfallForm.h"
+#include "platform/Event.h"
 
 namespace zel {
 
@@ -32,6 +33,7 @@ class Graph3dOps {
 
   private:
     WaterfallForm& form_;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -32,13 +32,13 @@ PictureOptions::PictureOptions(WaterfallForm& form) : form_(form) {
     for (DropDownList* list : {&form_.ColourMapList, &form_.DepthList, &form_.LevelsList}) {
         list->setListIndex(0);
         // The picture follows the lists.
-        list->Changed.connect([this] { form_.Graph3D.noteChange(); });
+        handlers_.on(list->Changed, [this] { form_.Graph3D.noteChange(); });
     }
     for (TextBox* box : {&form_.LevelMinBox, &form_.LevelMaxBox}) {
         box->Enabled = false;
-        box->Changed.connect([this] { form_.Graph3D.noteChange(); });
+        handlers_.on(box->Changed, [this] { form_.Graph3D.noteChange(); });
     }
-    form_.LevelsList.Clicked.connect([this] { LevelsList_Click(); });
+    handlers_.on(form_.LevelsList.Clicked, [this] { LevelsList_Click(); });
 }
 
 void PictureOptions::LevelsList_Click() {

@@ -2,6 +2,7 @@
 // The lists and boxes of the waterfall's window that say how its picture looks.
 
 #include "forms/WaterfallForm.h"
+#include "platform/Event.h"
 #include "waterfall/WaterfallPicture.h"
 
 namespace zel {
@@ -15,6 +16,7 @@ class PictureOptions {
     void LevelsList_Click();
 
     WaterfallForm& form_;
+    Handlers handlers_;
 };
 
 /// What the lists and boxes say. Limits that are no numbers, or equal, leave those of the axis.

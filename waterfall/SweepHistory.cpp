@@ -58,9 +58,9 @@ std::vector<double> HistoryRow::levels() const {
 }
 
 SweepHistory::SweepHistory(Forms& forms) : panel_(forms.controller), form_(forms.waterfall) {
-    form_.Graph3D.Plotted.connect([this] { take(); });
-    form_.clearGraph.connect([this] { clear(); });
-    form_.VewClear.Clicked.connect([this] { clear(); });
+    handlers_.on(form_.Graph3D.Plotted, [this] { take(); });
+    handlers_.on(form_.clearGraph, [this] { clear(); });
+    handlers_.on(form_.VewClear.Clicked, [this] { clear(); });
 }
 
 void SweepHistory::take() {

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "forms/Forms.h"
+#include "platform/Event.h"
 
 namespace zel {
 
@@ -85,6 +86,7 @@ class SweepHistory {
     WaterfallForm& form_;
     std::deque<HistoryRow> rows_;
     unsigned long added_ = 0;
+    Handlers handlers_;
 };
 
 }  // namespace zel

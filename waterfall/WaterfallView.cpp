@@ -24,14 +24,14 @@ WaterfallView::WaterfallView(Forms& forms, Graph3dOps& ops, ApplicationFolder& f
       panel_(forms.controller),
       ops_(ops),
       settings_(forms.waterfall, folder, files) {
-    form_.Load.connect([this] { Form_Load(); });
-    form_.Unload.connect([this](int /*argument*/) { Form_Unload(); });
-    form_.QueryUnload.connect([this](int& cancel) {
+    handlers_.on(form_.Load, [this] { Form_Load(); });
+    handlers_.on(form_.Unload, [this](int /*argument*/) { Form_Unload(); });
+    handlers_.on(form_.QueryUnload, [this](int& cancel) {
         // The frame's cross hides the window as the key does; its rows stay.
         cancel = -1;
         if (form_.Visible) cmd3D_Click();
     });
-    panel_.cmd3D.Clicked.connect([this] { cmd3D_Click(); });
+    handlers_.on(panel_.cmd3D.Clicked, [this] { cmd3D_Click(); });
 
     struct Entry {
         MenuItem& item;
@@ -49,25 +49,25 @@ WaterfallView::WaterfallView(Forms& forms, Graph3dOps& ops, ApplicationFolder& f
         {form_.MarkersDelete, &WaterfallView::MarkersDelete_Click},
     };
     for (const Entry& entry : entries)
-        entry.item.Clicked.connect([this, handler = entry.handler] { (this->*handler)(); });
+        handlers_.on(entry.item.Clicked, [this, handler = entry.handler] { (this->*handler)(); });
 
     zel::Graph3D& graph = form_.Graph3D;
-    graph.Clicked.connect([this, &graph] {
+    handlers_.on(graph.Clicked, [this, &graph] {
         if (form_.ActionMarkers.Checked) graph.addCursor();
     });
-    graph.CursorPlaced.connect([this](int plot, int point) { place(plot, point); });
-    graph.RotationEnded.connect([this, &graph] {
+    handlers_.on(graph.CursorPlaced, [this](int plot, int point) { place(plot, point); });
+    handlers_.on(graph.RotationEnded, [this, &graph] {
         GraphView3D& set = form_.IsSpectrogram ? form_.SpectrogramView : form_.WaterfallView;
         set.Latitude = graph.view().Latitude;
         set.Longitude = graph.view().Longitude;
         (form_.IsSpectrogram ? form_.spectrogramRotated : form_.waterfallRotated) = true;
     });
-    graph.ZoomEnded.connect([this, &graph] {
+    handlers_.on(graph.ZoomEnded, [this, &graph] {
         (form_.IsSpectrogram ? form_.SpectrogramView : form_.WaterfallView).Distance =
             graph.view().Distance;
         (form_.IsSpectrogram ? form_.spectrogramZoomed : form_.waterfallZoomed) = true;
     });
-    graph.TranslationEnded.connect([this, &graph] {
+    handlers_.on(graph.TranslationEnded, [this, &graph] {
         GraphView3D& set = form_.IsSpectrogram ? form_.SpectrogramView : form_.WaterfallView;
         set.TransX = graph.view().TransX;
         set.TransY = graph.view().TransY;

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "forms/Forms.h"
+#include "platform/Event.h"
 #include "platform/Files.h"
 #include "platform/Services.h"
 #include "waterfall/Graph3dOps.h"
@@ -50,6 +51,7 @@ class WaterfallView {
     Graph3dOps& ops_;
     ViewSettings settings_;
     bool loading_ = false;
+    Handlers handlers_;
 };
 
 }  // namespace zel

@@ -12,6 +12,7 @@
 #include "forms/MainForm.h"
 #include "panel/EntryText.h"
 #include "platform/LinkAddress.h"
+#include "platform/Pointer.h"
 #include "support/NumberText.h"
 
 namespace zel {
@@ -50,7 +51,6 @@ constexpr const char* kCancels[] = {"cmdCancel", "CancelTimeButton", "ClosePwrFo
 
 constexpr int kFieldWidth = 260;
 constexpr int kAdviceWidth = 380;
-constexpr int kHourglass = 11;
 
 /// A line of more than one row, which needs its room from the start.
 QLabel* adviceLine(Label& control, Binder& binder) {

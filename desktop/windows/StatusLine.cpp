@@ -5,13 +5,13 @@
 #include <QStatusBar>
 
 #include "desktop/platform/SimulatorChild.h"
+#include "platform/Pointer.h"
 
 namespace zel {
 namespace {
 
 constexpr int kActivityMs = 150;
 constexpr int kSaidMs = 12000;
-constexpr int kHourglass = 11;
 constexpr const char* kDot = "<span style='color:%1'>●</span>";
 constexpr const char* kQuiet = "#77818b";
 constexpr const char* kThere = "#27ae60";

@@ -20,12 +20,11 @@ const std::vector<Terminator> kHertz = {
 const std::vector<Terminator> kSeconds = {{"s", "", 0}, {"ms", "m", 'M'}, {"µs", "u", 'U'}};
 const std::vector<Terminator> kWholeSeconds = {{"s", "", 0}};
 const std::vector<Terminator> kLevel = {{"dBm", "", 0}};
+const std::vector<Terminator> kPercent = {{"%", "", 0}};
 const std::vector<Terminator> kDecibels = {{"dB", "", 0}};
 const std::vector<Terminator> kMetres = {{"m", "", 0}};
 const std::vector<Terminator> kLengths = {{"m", "", 0}, {"cm", "cm", 'C'}, {"mm", "mm", 'M'}};
 const std::vector<Terminator> kEnter = {{"Enter", "", 0}};
-
-constexpr const char* kLevelCaption = "TRIGGER\r\nLEVEL";
 
 }  // namespace
 
@@ -37,8 +36,7 @@ EntryUnit entryUnitOf(const ControllerForm& panel, const ZEL3Variables& mirror, 
             if (panel.InstrumentMode == CF::DISTTOFAULTMEASURE) return EntryUnit::Metres;
             return mirror.Span != 0 ? EntryUnit::Hertz : EntryUnit::Seconds;
         case EntryUnit::TriggerValue:
-            return panel.SoftKey(position).Caption.get() == kLevelCaption ? EntryUnit::Level
-                                                                          : EntryUnit::Seconds;
+            return panel.TriggerKeyIsLevel ? EntryUnit::Percent : EntryUnit::Seconds;
         default:
             return row->entryUnit;
     }
@@ -56,6 +54,8 @@ const std::vector<Terminator>& terminatorsOf(const ControllerForm& panel,
             return kWholeSeconds;
         case EntryUnit::Level:
             return kLevel;
+        case EntryUnit::Percent:
+            return kPercent;
         case EntryUnit::Decibels:
             return kDecibels;
         case EntryUnit::Metres:

@@ -4,6 +4,7 @@
 #include <QTest>
 
 #include "desktop/windows/Terminators.h"
+#include "panel/TriggerKey.h"
 #include "tests/desktop/Desk.h"
 
 namespace zel {
@@ -116,11 +117,11 @@ TEST_F(EntryDesk, MarkerInDistanceToFault_IsALength) {
     EXPECT_EQ(texts, QStringList({"m", "cm", "mm"}));
 }
 
-TEST_F(EntryDesk, TriggerLevel_IsALevelAndTriggerDelayATime) {
+TEST_F(EntryDesk, TriggerLevel_IsAPercentageAndTriggerDelayATime) {
     panel().SweepButton.Click();
-    panel().SoftKey(4).Caption = "TRIGGER\r\nLEVEL";
-    EXPECT_STREQ(terminatorsOf(panel(), program->variables(), 4)[0].caption, "dBm");
-    panel().SoftKey(4).Caption = "TRIGGER\r\nDELAY";
+    showTriggerKey(panel(), true);
+    EXPECT_STREQ(terminatorsOf(panel(), program->variables(), 4)[0].caption, "%");
+    showTriggerKey(panel(), false);
     EXPECT_STREQ(terminatorsOf(panel(), program->variables(), 4)[0].caption, "s");
 }
 

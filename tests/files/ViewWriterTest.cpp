@@ -158,8 +158,8 @@ struct LogHead {
 TEST_F(ViewWriterTest, OldLog_NamesSpanDetectorAndRange) {
     // A writer beside the program's own: no menu reaches the older format.
     FileOps files(panel, platform.fileDialogs, platform.folder, platform.files, platform.clock);
-    ViewWriter writer(forms, mirror, program.sweep(), program.exchange(), files, platform.clock,
-                      boxes);
+    ViewWriter writer(forms, mirror, program.sweep(), program.exchange(), files,
+                      {platform.clock, platform.events, boxes, panel.DebugTextBox});
     const LogHead heads[] = {{3, 3, 1, "Data at;"},
                              {3, 4, 1, "Data(LIN) at;"},
                              {0, 3, 1, "Data(MinMax) at;"},

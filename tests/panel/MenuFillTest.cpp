@@ -6,6 +6,7 @@
 #include <ostream>
 #include <string>
 
+#include "panel/TriggerKey.h"
 #include "tests/panel/Panel.h"
 
 namespace zel {
@@ -210,7 +211,7 @@ TEST_F(MenuFillTest, ChannelPower_IsAskedInTheUnitOfTheMirror) {
 TEST_F(MenuFillTest, TriggerLevel_IsReadAsAWholeNumber) {
     open(kSweep);
     mirror.ReferenceRange = 4;
-    panel.SoftKey(4).Caption = "TRIGGER\r\nLEVEL";
+    showTriggerKey(panel, true);
     get("TRIGLVL", "30.6");
     panel.SoftKey(4).Click();
     expectPlayed();

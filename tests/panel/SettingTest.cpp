@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "panel/TriggerKey.h"
 #include "platform/KeyInput.h"
 #include "tests/panel/Panel.h"
 
@@ -314,7 +315,7 @@ INSTANTIATE_TEST_SUITE_P(Picks, TriggerChoice,
 TEST_F(SettingTest, TriggerLevel_GoesOutUnderItsWordAndMovesTheLine) {
     open(kSweep);
     mirror.ReferenceRange = 4;
-    panel.SoftKey(4).Caption = "TRIGGER\r\nLEVEL";
+    showTriggerKey(panel, true);
     type(4, "40");
     set("TRIGLVL,40");
     enter(4);

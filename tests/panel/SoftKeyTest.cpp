@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "panel/TriggerKey.h"
 #include "tests/panel/Panel.h"
 
 namespace zel {
@@ -324,7 +325,7 @@ INSTANTIATE_TEST_SUITE_P(Codes, TriggerSourceKey,
 TEST_F(SoftKeyTest, TriggerLevel_MovesTheLineOfTheGraph) {
     open(kSweep);
     mirror.ReferenceRange = 4;
-    panel.SoftKey(4).Caption = "TRIGGER\r\nLEVEL";
+    showTriggerKey(panel, true);
     get("TRIGLVL", "30");
     panel.SoftKey(4).Click();
     expectPlayed();

@@ -93,7 +93,7 @@ TEST_P(VersionCaption, RevisionZero_IsLeftOut) {
     SoftPanel softPanel(panel);
     GraphInteraction graph(panel, mirror);
     ServerMode server(forms, platform.startup, platform.events);
-    StartUp startUp(forms, mirror, softPanel, graph, server, platform.clock, platform.settings);
+    StartUp startUp(forms, mirror, softPanel, graph, server, {platform.clock, platform.settings});
     EXPECT_TRUE(startUp.Form_Load(GetParam().version));
     EXPECT_EQ(panel.Caption.get(), GetParam().caption);
 }

@@ -94,14 +94,14 @@ class LogarithmicRange : public GraphScalingTest, public ::testing::WithParamInt
 
 TEST_P(LogarithmicRange, SetGraphYAxis_ByCode_ShowsTenDivisionsBelowTheLevel) {
     mirror.ReferenceRange = GetParam().code;
-    scaling.setGraphYAxis(-20, GetParam().code, true);
+    scaling.setGraphYAxis(-20, LevelRange::ofCode(GetParam().code));
     expectLevels(-20 - 10 * GetParam().decibels, -20);
     EXPECT_TRUE(graph.yAxis().ShowLabels);
 }
 
 TEST_P(LogarithmicRange, SetGraphYAxis_ByDecibels_LeavesTheDecibelsAsTheRange) {
     mirror.ReferenceRange = RANGELIN;
-    scaling.setGraphYAxis(-20, static_cast<int>(GetParam().decibels), false);
+    scaling.setGraphYAxis(-20, LevelRange::ofDecibels(GetParam().decibels));
     expectLevels(-20 - 10 * GetParam().decibels, -20);
     EXPECT_EQ(mirror.ReferenceRange, GetParam().decibels);
 }
@@ -116,7 +116,7 @@ TEST_P(LinearRange, SetGraphYAxis_RunsFromZeroToHundredWhateverTheLevel) {
     mirror.ReferenceRange = GetParam();
     graph.showYLabels(false);
     for (const double level : {-20.0, 0.0, 130.0}) {
-        scaling.setGraphYAxis(level, GetParam(), true);
+        scaling.setGraphYAxis(level, LevelRange::ofCode(GetParam()));
         expectLevels(0, 100);
     }
     EXPECT_TRUE(graph.yAxis().ShowLabels);
@@ -126,7 +126,7 @@ TEST_P(LinearRange, SetGraphYAxis_RunsFromZeroToHundredWhateverTheLevel) {
 TEST_P(LinearRange, SetGraphYAxis_KeepsTheFlagOfALinearFile) {
     mirror.ReferenceRange = GetParam();
     panel.isZELViewLinFile = true;
-    scaling.setGraphYAxis(-20, GetParam(), true);
+    scaling.setGraphYAxis(-20, LevelRange::ofCode(GetParam()));
     EXPECT_TRUE(panel.isZELViewLinFile);
 }
 
@@ -134,14 +134,14 @@ INSTANTIATE_TEST_SUITE_P(Codes, LinearRange, ::testing::Values(4, 5, 6, 7, 8));
 
 TEST_F(GraphScalingTest, SetGraphYAxis_DecibelRange_ClearsTheFlagOfALinearFile) {
     panel.isZELViewLinFile = true;
-    scaling.setGraphYAxis(-20, RANGE10DB, true);
+    scaling.setGraphYAxis(-20, LevelRange::ofCode(RANGE10DB));
     EXPECT_FALSE(panel.isZELViewLinFile);
 }
 
 TEST_F(GraphScalingTest, SetGraphYAxis_DecibelLevel_IsRoundedToAWholeNumberHalfToEven) {
-    scaling.setGraphYAxis(-20.5, RANGE10DB, true);
+    scaling.setGraphYAxis(-20.5, LevelRange::ofCode(RANGE10DB));
     expectLevels(-120, -20);
-    scaling.setGraphYAxis(-21.5, RANGE10DB, true);
+    scaling.setGraphYAxis(-21.5, LevelRange::ofCode(RANGE10DB));
     expectLevels(-122, -22);
 }
 
@@ -149,7 +149,7 @@ TEST_F(GraphScalingTest, SetGraphYAxis_Volts_ScalesInDbmAndHidesTheLabels) {
     mirror.ReferenceUnit = UNITV;
     graph3D.setLabelColor(2, 123);
     graph3D.BackColor = 456;
-    scaling.setGraphYAxis(1, RANGE10DB, true);
+    scaling.setGraphYAxis(1, LevelRange::ofCode(RANGE10DB));
     expectLevels(kOneVoltDbm - 100, kOneVoltDbm);
     EXPECT_FALSE(graph.yAxis().ShowLabels);
     EXPECT_EQ(graph3D.axis(3).LabelColor, 456U);
@@ -157,14 +157,14 @@ TEST_F(GraphScalingTest, SetGraphYAxis_Volts_ScalesInDbmAndHidesTheLabels) {
 
 TEST_F(GraphScalingTest, SetGraphYAxis_Watts_ScalesInDbmAndHidesTheLabels) {
     mirror.ReferenceUnit = UNITW;
-    scaling.setGraphYAxis(0.001, RANGE5DB, true);
+    scaling.setGraphYAxis(0.001, LevelRange::ofCode(RANGE5DB));
     expectLevels(-50, 0);
     EXPECT_FALSE(graph.yAxis().ShowLabels);
 }
 
 TEST_F(GraphScalingTest, SetGraphYAxis_VoltsAMetre_HidesTheLabelsAndKeepsTheLevel) {
     mirror.ReferenceUnit = 8;
-    scaling.setGraphYAxis(50.4, RANGE10DB, true);
+    scaling.setGraphYAxis(50.4, LevelRange::ofCode(RANGE10DB));
     expectLevels(-50, 50);
     EXPECT_FALSE(graph.yAxis().ShowLabels);
 }
@@ -172,9 +172,9 @@ TEST_F(GraphScalingTest, SetGraphYAxis_VoltsAMetre_HidesTheLabelsAndKeepsTheLeve
 TEST_F(GraphScalingTest, SetGraphYAxis_BackInDecibels_ShowsTheLabelsAgain) {
     mirror.ReferenceUnit = UNITV;
     graph3D.setLabelColor(2, 123);
-    scaling.setGraphYAxis(1, RANGE10DB, true);
+    scaling.setGraphYAxis(1, LevelRange::ofCode(RANGE10DB));
     mirror.ReferenceUnit = UNITDBM;
-    scaling.setGraphYAxis(-20, RANGE10DB, true);
+    scaling.setGraphYAxis(-20, LevelRange::ofCode(RANGE10DB));
     EXPECT_TRUE(graph.yAxis().ShowLabels);
     EXPECT_EQ(graph3D.axis(3).LabelColor, 123U);
 }
@@ -202,7 +202,7 @@ TEST_P(UnitFormat, SetYAxisFormat_OnALinearRange_IsPercent) {
 
 TEST_P(UnitFormat, SetGraphYAxis_WritesTheBoundsWithTheUnitOfTheFormat) {
     mirror.ReferenceUnit = GetParam().unit;
-    scaling.setGraphYAxis(10, RANGE10DB, true);
+    scaling.setGraphYAxis(10, LevelRange::ofCode(RANGE10DB));
     const std::string low = generalNumber(roundHalfEven(graph.yAxis().Minimum, 9));
     const std::string high = generalNumber(roundHalfEven(graph.yAxis().Maximum, 9));
     EXPECT_EQ(waterfall.lblMin.Caption.get(), low + " " + GetParam().shown);
@@ -210,14 +210,14 @@ TEST_P(UnitFormat, SetGraphYAxis_WritesTheBoundsWithTheUnitOfTheFormat) {
 }
 
 TEST_F(GraphScalingTest, SetGraphYAxis_InDbm_WritesTheBoundsAsTexts) {
-    scaling.setGraphYAxis(-20, RANGE10DB, true);
+    scaling.setGraphYAxis(-20, LevelRange::ofCode(RANGE10DB));
     EXPECT_EQ(waterfall.lblMin.Caption.get(), "-120 dBm");
     EXPECT_EQ(waterfall.lblMAX.Caption.get(), "-20 dBm");
 }
 
 TEST_F(GraphScalingTest, SetGraphYAxis_InVolts_WritesRoundBoundsInDbm) {
     mirror.ReferenceUnit = UNITV;
-    scaling.setGraphYAxis(0.0223606797749979, RANGE10DB, true);
+    scaling.setGraphYAxis(0.0223606797749979, LevelRange::ofCode(RANGE10DB));
     EXPECT_EQ(waterfall.lblMin.Caption.get(), "-120 dBm");
     EXPECT_EQ(waterfall.lblMAX.Caption.get(), "-20 dBm");
 }
@@ -242,7 +242,7 @@ TEST_F(GraphScalingTest, SetYAxisFormat_UnknownUnit_LeavesTheFormat) {
 
 TEST_F(GraphScalingTest, SetGraphYAxis_LinearRange_WritesTheBoundsInPercent) {
     mirror.ReferenceRange = RANGELIN;
-    scaling.setGraphYAxis(-20, RANGELIN, true);
+    scaling.setGraphYAxis(-20, LevelRange::ofCode(RANGELIN));
     EXPECT_EQ(waterfall.lblMin.Caption.get(), "0 %");
     EXPECT_EQ(waterfall.lblMAX.Caption.get(), "100 %");
 }
@@ -254,7 +254,7 @@ TEST_F(GraphScalingTest, SetGraphAxes_CallsTheWaterfallInItsOrder) {
     waterfall.stampRow.connect([&](const std::string& time) { calls.push_back("stamp " + time); });
     waterfall.saveGraphView.connect([&] { calls.emplace_back("saveGraphView"); });
     clock.setDate(dateOf(2026, 3, 4, 9, 8, 7));
-    scaling.setGraphAxes(1, 2, -20, RANGE10DB, true);
+    scaling.setGraphAxes(1, 2, -20, LevelRange::ofCode(RANGE10DB));
     EXPECT_EQ(calls,
               (std::vector<std::string>{"limitRows 100", "stamp 09:08:07", "saveGraphView"}));
     EXPECT_EQ(graph.xAxis().Minimum, 1);
