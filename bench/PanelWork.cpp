@@ -21,8 +21,9 @@ constexpr int kUnpacedPasses = 300;  // a round
 constexpr double kAllowed = 5e-3;    // seconds
 
 /// The program with its window, connected.
-struct Desk {
-    explicit Desk(const std::string& device) : session(device, kBaud), window(session.program()) {
+struct OpenPanel {
+    explicit OpenPanel(const std::string& device)
+        : session(device, kBaud), window(session.program()) {
         window.resize(1280, 760);
         window.show();
         QApplication::processEvents();
@@ -45,14 +46,14 @@ struct Passes {
 };
 
 /// The window of the waterfall and the spectrogram, both seen.
-void openRows(Desk& desk) {
+void openRows(OpenPanel& desk) {
     desk.panel.SpectrogramShow.Click();
     desk.panel.cmd3D.Click();
     QApplication::processEvents();
 }
 
 /// Runs the continuous view for so many passes after the warm-up.
-Passes runView(Desk& desk, int passes) {
+Passes runView(OpenPanel& desk, int passes) {
     int plots = 0;
     double start = 0;
     double end = 0;
@@ -101,7 +102,7 @@ Figure settingCost(const std::string& simulator) {
             });
             leastBytes = line.bytes() - before;
         }
-        Desk desk(instrument.device());
+        OpenPanel desk(instrument.device());
         desk.panel.FrequencyButton.Click();
         zel::TextBox& box = desk.panel.SoftTextBox(0);
         const std::size_t before = desk.session.bytes();
@@ -132,7 +133,7 @@ Figure settingCost(const std::string& simulator) {
 
 Figure menusAgain(const std::string& simulator) {
     const Simulator instrument(simulator, {"--speed", "1000000"});
-    Desk desk(instrument.device());
+    OpenPanel desk(instrument.device());
     zel::ControllerForm& panel = desk.panel;
     // The sweep key and the marker key ask how things stand each time they are pressed.
     zel::Button* const keys[] = {&panel.FrequencyButton, &panel.SpanButton,  &panel.AmplitudeButton,
@@ -158,7 +159,7 @@ Figure menusAgain(const std::string& simulator) {
 
 Figure continuousPaced(const std::string& simulator) {
     const Simulator instrument(simulator, {"--baud", std::to_string(kBaud), "--speed", "1000000"});
-    Desk desk(instrument.device());
+    OpenPanel desk(instrument.device());
     const Passes passes = runView(desk, kPacedPasses);
     const double possible = passes.bytes * 10 / kBaud;
     return {"(i) continuous view at 57,600 baud, drawn",
@@ -185,7 +186,7 @@ Figure continuousUnpaced(const std::string& simulator) {
                     }) /
                     kUnpacedPasses;
         }
-        Desk desk(instrument.device());
+        OpenPanel desk(instrument.device());
         const Passes passes = runView(desk, kUnpacedPasses);
         core.push_back(1 / passes.seconds);
         bare.push_back(1 / least);
@@ -202,7 +203,7 @@ Figure continuousUnpaced(const std::string& simulator) {
 
 Figure rowsPaced(const std::string& simulator) {
     const Simulator instrument(simulator, {"--baud", std::to_string(kBaud), "--speed", "1000000"});
-    Desk desk(instrument.device());
+    OpenPanel desk(instrument.device());
     openRows(desk);
     const Passes passes = runView(desk, kPacedPasses);
     const double possible = passes.bytes * 10 / kBaud;
@@ -222,10 +223,10 @@ Figure rowsUnpaced(const std::string& simulator) {
     std::vector<double> closed;
     for (int round = 0; round < kRounds; ++round) {
         {
-            Desk desk(instrument.device());
+            OpenPanel desk(instrument.device());
             closed.push_back(1 / runView(desk, kUnpacedPasses).seconds);
         }
-        Desk desk(instrument.device());
+        OpenPanel desk(instrument.device());
         openRows(desk);
         open.push_back(1 / runView(desk, kUnpacedPasses).seconds);
         ratios.push_back(open.back() / closed.back());

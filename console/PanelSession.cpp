@@ -51,7 +51,8 @@ const PanelSession::CommandRow PanelSession::kCommands[] = {
     {"help", &PanelSession::help},       {"list", &PanelSession::list},
 };
 
-PanelSession::PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address)
+PanelSession::PanelSession(Program& program, const Services& means,
+                           std::optional<LinkAddress> address)
     : program_(program), m_(means), address_(std::move(address)), interlock_(program.interlock()) {
     m_.events.whileWaiting = [this](int ms) { return whileWaiting(ms); };
     program_.Ended.connect([this] { ended_ = true; });

@@ -24,7 +24,7 @@ namespace zel {
 /// a recording or a script runs.
 class PanelSession {
   public:
-    struct Means {
+    struct Services {
         const Clock& clock;
         ServingEvents& events;
         LineInput& input;
@@ -33,7 +33,7 @@ class PanelSession {
         AnswerQueue& answers;
         bool virtualTime = false;  ///< no time passes while a line is awaited
     };
-    PanelSession(Program& program, const Means& means, std::optional<LinkAddress> address);
+    PanelSession(Program& program, const Services& means, std::optional<LinkAddress> address);
     ~PanelSession();
     PanelSession(const PanelSession&) = delete;
     PanelSession& operator=(const PanelSession&) = delete;
@@ -81,7 +81,7 @@ class PanelSession {
     void tell(Done done, std::string_view name);
 
     Program& program_;
-    Means m_;
+    Services m_;
     std::optional<LinkAddress> address_;
     Interlock& interlock_;
     long line_ = 0;                    ///< number of the line at hand

@@ -18,7 +18,7 @@ class ReplyWatch {
     /// The client's next bytes, split anywhere.
     void asked(std::string_view bytes);
     /// The instrument's next bytes, split anywhere. True when they end the whole reply to what the
-    /// client asked, and nothing stands behind it.
+    /// client asked, and nothing stands after it.
     bool answered(std::string_view bytes);
     /// The line has been quiet, and what came has gone on.
     void quiet();

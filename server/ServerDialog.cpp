@@ -34,7 +34,7 @@ std::string typedText(const DropDownList& list) {
 }  // namespace
 
 ServerDialog::ServerDialog(Forms& forms, ServerBridge& bridge, const ServerSocket& TCPSocket,
-                           const Means& means, const Session& services, RootDebug& log)
+                           const Services& means, const Session& services, RootDebug& log)
     : panel_(forms.controller),
       form_(forms.server),
       bridge_(bridge),

@@ -16,14 +16,14 @@ namespace zel {
 class ServerDialog {
   public:
     /// What the window needs of the platform beside the bundle.
-    struct Means {
+    struct Services {
         SerialPortList& ports;
         SettingsStore& settings;
         Clipboard& clipboard;
     };
     /// Connects the form's events and buttons.
     ServerDialog(Forms& forms, ServerBridge& bridge, const ServerSocket& TCPSocket,
-                 const Means& means, const Session& services, RootDebug& log);
+                 const Services& means, const Session& services, RootDebug& log);
     ~ServerDialog();
     ServerDialog(const ServerDialog&) = delete;
     ServerDialog& operator=(const ServerDialog&) = delete;
@@ -48,7 +48,7 @@ class ServerDialog {
     ServerForm& form_;
     ServerBridge& bridge_;
     const ServerSocket& socket_;
-    Means means_;
+    Services means_;
     Session services_;
     RootDebug& log_;
     TaskId retry_ = 0;

@@ -7,7 +7,7 @@
 #include <vector>
 
 #include "tests/Session.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 
 namespace zel {
 
@@ -79,7 +79,7 @@ struct Bench : TestSession {
     /// Opens the port and does the handshake without a trace after it.
     bool connect() { return program.connect({LinkAddress::Kind::Serial, "COM3", 57600}, false); }
     bool connectTcp() { return program.connect({LinkAddress::Kind::Tcp, "host", 2277}, false); }
-    Texts shown() const { return told(platform.boxes); }
+    Texts shown() const { return shownBoxes(platform.boxes); }
     std::int64_t now() const { return platform.clock.micros() / 1000; }
     template <class Work>
     std::int64_t time(const Work& work) const {

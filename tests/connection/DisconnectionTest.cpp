@@ -226,7 +226,7 @@ TEST_F(Connected, LocalKey_SendsLocalAndNothingElse) {
 }
 
 /// A dialled link, brought up by no dialog.
-struct Dialled : LineRig, ::testing::Test {
+struct Dialled : LineSetup, ::testing::Test {
     Dialled() { panel.ConnectionState = CF::MODEMCON; }
     ZEL3Variables mirror;
     GraphInteraction graph{panel, mirror};

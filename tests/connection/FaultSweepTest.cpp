@@ -1,6 +1,6 @@
 #include <gtest/gtest.h>
 
-#include "tests/connection/FaultRig.h"
+#include "tests/connection/FaultSetup.h"
 
 namespace zel {
 namespace {
@@ -29,7 +29,7 @@ void sweep(long count, const Body& body) {
 
 /// An exchange on the good line after a fault. A fault in the answer to the mode word leaves the
 /// instrument waiting for a keyword: it refuses the next mode word once, and is in step then.
-void expectNextExchangeWorks(FaultRig& rig, Fault fault, bool inModeWordAnswer) {
+void expectNextExchangeWorks(FaultSetup& rig, Fault fault, bool inModeWordAnswer) {
     rig.goodLine();
     rig.platform.events.runFor(kStallMs);  // what comes late has come then, and is drained
     if (fault == Fault::Dies) {
@@ -44,10 +44,10 @@ void expectNextExchangeWorks(FaultRig& rig, Fault fault, bool inModeWordAnswer) 
 }
 
 TEST(FaultSweep, Handshake_EveryByte_TheNextAttemptWorks) {
-    FaultRig good;
+    FaultSetup good;
     const long count = good.bytesOf([&] { ASSERT_TRUE(good.connect()); });
     sweep(count, [](Fault fault, long byte) {
-        FaultRig rig;
+        FaultSetup rig;
         rig.arm(fault, byte);
         bool connected = false;
         const std::int64_t ms = rig.time([&] { connected = rig.connect(); });
@@ -56,24 +56,24 @@ TEST(FaultSweep, Handshake_EveryByte_TheNextAttemptWorks) {
             EXPECT_TRUE(connected);
         }
         if (fault == Fault::Splits) {
-            EXPECT_EQ(told(rig.platform.boxes), Texts{});
+            EXPECT_EQ(shownBoxes(rig.platform.boxes), Texts{});
         }
         rig.goodLine();
         rig.program.disconnect();
         rig.platform.boxes.clear();
         EXPECT_TRUE(rig.connect());
-        EXPECT_EQ(told(rig.platform.boxes), Texts{});
+        EXPECT_EQ(shownBoxes(rig.platform.boxes), Texts{});
         EXPECT_TRUE(rig.asksRightCentre());
     });
 }
 
 TEST(FaultSweep, Set_EveryByte_TheNextExchangeWorks) {
-    FaultRig good;
+    FaultSetup good;
     ASSERT_TRUE(good.connect());
     const long count = good.bytesOf([&] { ASSERT_TRUE(good.set("FREQ,1000000000")); });
     EXPECT_EQ(count, 2 * kStatusBytes);
     sweep(count, [](Fault fault, long byte) {
-        FaultRig rig;
+        FaultSetup rig;
         ASSERT_TRUE(rig.connect());
         rig.arm(fault, byte);
         bool done = false;
@@ -89,13 +89,13 @@ TEST(FaultSweep, Set_EveryByte_TheNextExchangeWorks) {
 }
 
 TEST(FaultSweep, Get_EveryByte_TheNextExchangeWorks) {
-    FaultRig good;
+    FaultSetup good;
     std::string value;
     ASSERT_TRUE(good.connect());
     const long count = good.bytesOf([&] { ASSERT_TRUE(good.get("FREQ", value)); });
     EXPECT_EQ(count, 2 * kStatusBytes + static_cast<long>(value.size()) + 1);
     sweep(count, [&](Fault fault, long byte) {
-        FaultRig rig;
+        FaultSetup rig;
         ASSERT_TRUE(rig.connect());
         rig.arm(fault, byte);
         std::string got = "old";
@@ -112,14 +112,14 @@ TEST(FaultSweep, Get_EveryByte_TheNextExchangeWorks) {
 }
 
 /// A session whose instrument has that detector.
-void begin(FaultRig& rig, const std::string& detector) {
+void begin(FaultSetup& rig, const std::string& detector) {
     ASSERT_TRUE(rig.connect());
     ASSERT_TRUE(rig.set("TRACEDET," + detector));
     rig.program.variables().TraceDetector = static_cast<std::uint8_t>(leadingNumber(detector));
 }
 
 void sweepTrace(const std::string& detector, long blockBytes, std::size_t samples) {
-    FaultRig rig;
+    FaultSetup rig;
     begin(rig, detector);
     const long wait = 2 * kStatusBytes;  // WAIT goes before the transfer
     const long count = rig.bytesOf([&] { ASSERT_TRUE(rig.readTrace()); });
@@ -151,7 +151,7 @@ TEST(FaultSweep, Trace_EveryByte_TheNextTraceWorks) { sweepTrace("3", 1205, 301)
 TEST(FaultSweep, DoubleTrace_EveryByte_TheNextTraceWorks) { sweepTrace("0", 2410, 602); }
 
 TEST(FaultSweep, ManyFaultsInARow_LeaveTheSessionUsable) {
-    FaultRig rig;
+    FaultSetup rig;
     ASSERT_TRUE(rig.connect());
     for (long byte = 0; byte < 60; ++byte) {
         rig.arm(kFaults[byte % 5], byte % 12);

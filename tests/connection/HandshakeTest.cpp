@@ -292,7 +292,7 @@ TEST_F(Connection, Handshake_IdentityWithFieldsThatAreNoNumbers_IsAccepted) {
 }
 
 /// The handshake on its own, on a link that some other kind of dialog has brought up.
-struct BareHandshake : LineRig {
+struct BareHandshake : LineSetup {
     BareHandshake() { whileConnecting(); }
     ZEL3Variables mirror;
     FrequencyLabels labels{panel, dialog, mirror, exchange, events};

@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/connection/FaultRig.h"
+#include "tests/connection/FaultSetup.h"
 
 namespace zel {
 namespace {
@@ -11,7 +11,7 @@ constexpr std::int64_t kLongestEndMs = 2000;
 constexpr std::int64_t kLongestHangUpMs = 15'000;
 
 TEST(Signal, Idle_LeavesTheInstrumentInLocalStateAtOnce) {
-    FaultRig rig;
+    FaultSetup rig;
     ASSERT_TRUE(rig.connect());
     ASSERT_TRUE(rig.instrument.device().remote());
     EXPECT_LE(rig.time([&] { rig.platform.endSignals.EndRequested("SIGHUP"); }), kLongestEndMs);
@@ -22,7 +22,7 @@ TEST(Signal, Idle_LeavesTheInstrumentInLocalStateAtOnce) {
 
 TEST(Signal, AtEachMomentOfASweep_LeavesTheInstrumentInLocalStateAtOnce) {
     for (int ms = 0; ms < 400; ms += 7) {
-        FaultRig rig;
+        FaultSetup rig;
         ASSERT_TRUE(rig.connect());
         std::int64_t asked = 0;
         rig.platform.events.schedule(ms, [&] {
@@ -39,7 +39,7 @@ TEST(Signal, AtEachMomentOfASweep_LeavesTheInstrumentInLocalStateAtOnce) {
 }
 
 TEST(Signal, SilentLine_EndsWithinTwoSeconds) {
-    FaultRig rig;
+    FaultSetup rig;
     ASSERT_TRUE(rig.connect());
     LineFaults silent;
     silent.splitAt = 0;
@@ -48,11 +48,11 @@ TEST(Signal, SilentLine_EndsWithinTwoSeconds) {
     rig.platform.boxes.clear();
     EXPECT_LE(rig.time([&] { rig.platform.endSignals.EndRequested("SIGINT"); }), kLongestEndMs);
     EXPECT_TRUE(rig.program.ended());
-    EXPECT_EQ(told(rig.platform.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(rig.platform.boxes), Texts{});
 }
 
 TEST(Signal, DialledLine_IsHungUpWithinFifteenSeconds) {
-    FaultRig rig;
+    FaultSetup rig;
     const LinkAddress modem{LinkAddress::Kind::TwoModems, zelsim::InProcessPort::kModemPort, 57600,
                             "555"};
     ASSERT_TRUE(rig.program.connect(modem, false));

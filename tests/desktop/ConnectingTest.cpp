@@ -7,7 +7,7 @@
 
 #include "desktop/windows/ConnectCard.h"
 #include "desktop/windows/ReconnectBar.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {

@@ -8,7 +8,7 @@
 #include "desktop/binders/ToolTips.h"
 #include "desktop/graph/GraphPlot.h"
 #include "desktop/windows/ThemeColors.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {

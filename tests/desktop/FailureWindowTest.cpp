@@ -12,12 +12,12 @@
 #include "shell/Logs.h"
 #include "support/ErrorReport.h"
 #include "support/RunTimeError.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
-struct FailureWindow : Desk {
+struct FailureWindow : WindowTest {
     FailureWindow() {
         guarded().catchInto([this] { program->showFailure(); });
     }

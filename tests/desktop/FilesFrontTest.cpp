@@ -9,12 +9,12 @@
 #include <QTest>
 #include <QUrl>
 
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
-class FilesDesk : public Desk {
+class FilesFrontTest : public WindowTest {
   protected:
     void SetUp() override {
         show();
@@ -48,13 +48,13 @@ class FilesDesk : public Desk {
     std::vector<std::string> opened_;
 };
 
-TEST_F(FilesDesk, DroppedFile_IsOpened) {
+TEST_F(FilesFrontTest, DroppedFile_IsOpened) {
     const QString path = makeFile("view.txt");
     EXPECT_TRUE(drop({QUrl::fromLocalFile(path)}));
     EXPECT_EQ(opened_, std::vector<std::string>{path.toStdString()});
 }
 
-TEST_F(FilesDesk, DropOfAnythingElse_IsRefused) {
+TEST_F(FilesFrontTest, DropOfAnythingElse_IsRefused) {
     const QString path = makeFile("view.txt");
     EXPECT_FALSE(drop({}));
     EXPECT_FALSE(drop({QUrl("http://localhost/view.txt")}));
@@ -64,7 +64,7 @@ TEST_F(FilesDesk, DropOfAnythingElse_IsRefused) {
     EXPECT_TRUE(opened_.empty());
 }
 
-TEST_F(FilesDesk, DropWhileWorkIsUnderWay_IsRefused) {
+TEST_F(FilesFrontTest, DropWhileWorkIsUnderWay_IsRefused) {
     const QString path = makeFile("view.txt");
     panel().MousePointer = 11;
     EXPECT_FALSE(drop({QUrl::fromLocalFile(path)}));
@@ -73,19 +73,19 @@ TEST_F(FilesDesk, DropWhileWorkIsUnderWay_IsRefused) {
     EXPECT_TRUE(drop({QUrl::fromLocalFile(path)}));
 }
 
-TEST_F(FilesDesk, EntryBoxes_LeaveDropsToTheWindow) {
+TEST_F(FilesFrontTest, EntryBoxes_LeaveDropsToTheWindow) {
     EXPECT_TRUE(window->acceptDrops());
     EXPECT_FALSE(widgetOf<QLineEdit>(panel().SoftTextBox(0))->acceptDrops());
     EXPECT_FALSE(widgetOf<QLineEdit>(panel().ManualCommandText)->acceptDrops());
 }
 
-TEST_F(FilesDesk, RecentMenu_WithoutFiles_IsDisabled) {
+TEST_F(FilesFrontTest, RecentMenu_WithoutFiles_IsDisabled) {
     const QAction* menu = actionOf(panel().RecentMenu);
     ASSERT_NE(menu->menu(), nullptr);
     EXPECT_FALSE(menu->isEnabled());
 }
 
-TEST_F(FilesDesk, RecentMenu_ShowsNamesWithTheirPathsAndRunsThem) {
+TEST_F(FilesFrontTest, RecentMenu_ShowsNamesWithTheirPathsAndRunsThem) {
     panel().RecentMenu.Enabled = true;
     for (int i = 0; i < panel().RecentFile.count(); ++i) panel().RecentFile(i).Visible = i < 2;
     panel().RecentFile(1).Caption = "R&D.txt";
@@ -105,7 +105,7 @@ TEST_F(FilesDesk, RecentMenu_ShowsNamesWithTheirPathsAndRunsThem) {
     EXPECT_EQ(clicks, 1);
 }
 
-TEST_F(FilesDesk, PlaybackBar_IsSeenWhileASeriesPlays) {
+TEST_F(FilesFrontTest, PlaybackBar_IsSeenWhileASeriesPlays) {
     const Slider& speed = program->forms().specialMeas.sldSpeed;
     const auto* bar = widgetOf<QWidget>(panel().PlaybackFrame);
     ASSERT_NE(bar, nullptr);
@@ -120,7 +120,7 @@ TEST_F(FilesDesk, PlaybackBar_IsSeenWhileASeriesPlays) {
     EXPECT_FALSE(bar->isVisible());
 }
 
-TEST_F(FilesDesk, SpeedSlider_WorksUnderTheHourglass) {
+TEST_F(FilesFrontTest, SpeedSlider_WorksUnderTheHourglass) {
     Slider& speed = program->forms().specialMeas.sldSpeed;
     panel().PlaybackFrame.Visible = true;
     show();
@@ -141,7 +141,7 @@ TEST_F(FilesDesk, SpeedSlider_WorksUnderTheHourglass) {
     panel().MousePointer = 0;
 }
 
-TEST_F(FilesDesk, Progress_IsSeenAsLongAsThereIsAny) {
+TEST_F(FilesFrontTest, Progress_IsSeenAsLongAsThereIsAny) {
     auto* label = widgetOf<QLabel>(panel().FileLabel);
     EXPECT_TRUE(label->text().isEmpty());
     panel().FileLabel.Caption = "Trace 3 of 9";
@@ -151,7 +151,7 @@ TEST_F(FilesDesk, Progress_IsSeenAsLongAsThereIsAny) {
     EXPECT_GE(label->width(), label->fontMetrics().horizontalAdvance(label->text()));
 }
 
-TEST_F(FilesDesk, RecordingDialog_HasItsControlsAndTheFocusInItsField) {
+TEST_F(FilesFrontTest, RecordingDialog_HasItsControlsAndTheFocusInItsField) {
     TimeForm& form = program->forms().time;
     form.Show();
     show();
@@ -172,7 +172,7 @@ TEST_F(FilesDesk, RecordingDialog_HasItsControlsAndTheFocusInItsField) {
     window->binder().flush();
 }
 
-TEST_F(FilesDesk, EnterInTheRecordingDialog_PressesOkAndEscCancel) {
+TEST_F(FilesFrontTest, EnterInTheRecordingDialog_PressesOkAndEscCancel) {
     TimeForm& form = program->forms().time;
     form.Show();
     show();
@@ -192,7 +192,7 @@ TEST_F(FilesDesk, EnterInTheRecordingDialog_PressesOkAndEscCancel) {
     window->binder().flush();
 }
 
-TEST_F(FilesDesk, EscInTheGraphSettings_LeavesTheScaleAlone) {
+TEST_F(FilesFrontTest, EscInTheGraphSettings_LeavesTheScaleAlone) {
     panel().UtilityGraphSettings.Click();
     show();
     ManualScaleForm& form = program->forms().manualScale;
@@ -207,7 +207,7 @@ TEST_F(FilesDesk, EscInTheGraphSettings_LeavesTheScaleAlone) {
     EXPECT_EQ(panel().CWGraph1.yAxis().Maximum, before.Maximum);
 }
 
-TEST_F(FilesDesk, PowerSensorDialog_OffersBothReadings) {
+TEST_F(FilesFrontTest, PowerSensorDialog_OffersBothReadings) {
     PowerAndReflForm& form = program->forms().powerAndRefl;
     form.Show();
     show();

@@ -13,7 +13,7 @@
 #include "desktop/help/HelpViewer.h"
 #include "desktop/help/HelpWindow.h"
 #include "script/Language.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {

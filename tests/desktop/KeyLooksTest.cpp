@@ -3,7 +3,7 @@
 #include <QTest>
 
 #include "desktop/windows/KeyPictures.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -21,7 +21,7 @@ int pixelsOf(const QImage& image, const QColor& ink) {
     return count;
 }
 
-TEST_F(Desk, EveryHardKey_HasAPictureInBothForms) {
+TEST_F(WindowTest, EveryHardKey_HasAPictureInBothForms) {
     panel().FrequencyButton.Click();
     for (Button CF::*key : kHardKeys)
         EXPECT_TRUE(hasKeyPicture(QString::fromStdString((panel().*key).Picture)))
@@ -47,7 +47,7 @@ TEST(KeyPicture, Symbols_AreDrawnInTheirInkAndAllDiffer) {
     }
 }
 
-TEST_F(Desk, KeyOfTheMenu_IsBlueAndTheOthersYellow) {
+TEST_F(WindowTest, KeyOfTheMenu_IsBlueAndTheOthersYellow) {
     connect();
     panel().SweepButton.Click();
     show();
@@ -59,7 +59,7 @@ TEST_F(Desk, KeyOfTheMenu_IsBlueAndTheOthersYellow) {
     }
 }
 
-TEST_F(Desk, FormOfAPicture_ChangesWhatIsDrawn) {
+TEST_F(WindowTest, FormOfAPicture_ChangesWhatIsDrawn) {
     connect();
     show();
     auto* key = widgetOf<QPushButton>(panel().SpanButton);
@@ -71,7 +71,7 @@ TEST_F(Desk, FormOfAPicture_ChangesWhatIsDrawn) {
     EXPECT_GT(pixelsOf(blue, Qt::white), 20);
 }
 
-TEST_F(Desk, KeyWithoutAPicture_ShowsItsCaptionAlone) {
+TEST_F(WindowTest, KeyWithoutAPicture_ShowsItsCaptionAlone) {
     show();
     auto* key = widgetOf<QPushButton>(panel().SpanButton);
     panel().SpanButton.Picture = "span_y";
@@ -83,7 +83,7 @@ TEST_F(Desk, KeyWithoutAPicture_ShowsItsCaptionAlone) {
     EXPECT_NE(key->grab().toImage(), with);
 }
 
-TEST_F(Desk, PressedMarkerKey_IsRedUntilAnotherOneIs) {
+TEST_F(WindowTest, PressedMarkerKey_IsRedUntilAnotherOneIs) {
     connect();
     show();
     panel().MarkerCheckBox.Click();
@@ -94,7 +94,7 @@ TEST_F(Desk, PressedMarkerKey_IsRedUntilAnotherOneIs) {
     EXPECT_EQ(widgetOf<QWidget>(panel().NextPeakButton)->property("face").toString(), "red");
 }
 
-TEST_F(Desk, LockedBox_LooksUnlikeAnEntryBox) {
+TEST_F(WindowTest, LockedBox_LooksUnlikeAnEntryBox) {
     connect();
     show();
     auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(1));
@@ -107,7 +107,7 @@ TEST_F(Desk, LockedBox_LooksUnlikeAnEntryBox) {
     EXPECT_TRUE(box->isReadOnly());
 }
 
-TEST_F(Desk, LockedList_ShowsItsChoiceAndTakesNone) {
+TEST_F(WindowTest, LockedList_ShowsItsChoiceAndTakesNone) {
     connect();
     panel().SweepButton.Click();
     show();
@@ -127,7 +127,7 @@ TEST_F(Desk, LockedList_ShowsItsChoiceAndTakesNone) {
     EXPECT_EQ(panel().ChoiceBox(1).ListIndex(), 1);
 }
 
-TEST_F(Desk, WheelOverAListWithoutTheFocus_ChangesNothing) {
+TEST_F(WindowTest, WheelOverAListWithoutTheFocus_ChangesNothing) {
     connect();
     panel().AmplitudeButton.Click();
     show();
@@ -142,7 +142,7 @@ TEST_F(Desk, WheelOverAListWithoutTheFocus_ChangesNothing) {
     EXPECT_EQ(program->variables().ReferenceRange, before);
 }
 
-TEST_F(Desk, FocusOfAKey_CanBeSeen) {
+TEST_F(WindowTest, FocusOfAKey_CanBeSeen) {
     show();
     auto* key = widgetOf<QPushButton>(panel().AnalyzerButton);
     window->activateWindow();
@@ -152,7 +152,7 @@ TEST_F(Desk, FocusOfAKey_CanBeSeen) {
     EXPECT_NE(key->grab().toImage(), before);
 }
 
-TEST_F(Desk, ManualAnswers_AlternateInColour) {
+TEST_F(WindowTest, ManualAnswers_AlternateInColour) {
     connect();
     show();
     auto* answer = widgetOf<QLineEdit>(panel().ManualCommandTextAnsw);

@@ -6,7 +6,7 @@
 
 #include "desktop/binders/ToolTips.h"
 #include "desktop/platform/Language.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -51,7 +51,7 @@ TEST_F(LanguageTest, EveryLanguage_NamesItself) {
     EXPECT_EQ(std::string(languages()[2].name), "Deutsch");
 }
 
-TEST_F(Desk, LanguageMenu_StoresTheChoiceAndSaysWhenItCounts) {
+TEST_F(WindowTest, LanguageMenu_StoresTheChoiceAndSaysWhenItCounts) {
     QString chosen = "none";
     window->addLanguageMenu("", [&chosen](const QString& code) { chosen = code; });
     show();

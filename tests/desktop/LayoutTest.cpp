@@ -9,7 +9,7 @@
 
 #include "desktop/windows/FoldGroup.h"
 #include "desktop/windows/MainMenus.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -20,7 +20,7 @@ QToolButton* toolOf(QWidget& window, const QString& name) {
     return nullptr;
 }
 
-TEST_F(Desk, WindowOfAForm_IsBuiltWhenItIsShown) {
+TEST_F(WindowTest, WindowOfAForm_IsBuiltWhenItIsShown) {
     MainWindow fresh(*program);
     EXPECT_EQ(fresh.findChild<QDialog*>("AboutForm"), nullptr);
     program->forms().about.Show();
@@ -33,7 +33,7 @@ struct Room {
     double share;
 };
 
-TEST_F(Desk, Graph_HasItsShareOfTheWidth) {
+TEST_F(WindowTest, Graph_HasItsShareOfTheWidth) {
     connect();
     for (const Room& room : {Room{{1024, 600}, 0.65}, Room{{1920, 1080}, 0.75}}) {
         window->resize(room.size);
@@ -43,7 +43,7 @@ TEST_F(Desk, Graph_HasItsShareOfTheWidth) {
     }
 }
 
-TEST_F(Desk, LowWindow_FoldsTheCommandLineAndTheModesFirst) {
+TEST_F(WindowTest, LowWindow_FoldsTheCommandLineAndTheModesFirst) {
     const auto open = [this] {
         QStringList names;
         for (const FoldGroup* group : window->side().groups())
@@ -61,7 +61,7 @@ TEST_F(Desk, LowWindow_FoldsTheCommandLineAndTheModesFirst) {
     EXPECT_EQ(open(), "Markers Modes Command");
 }
 
-TEST_F(Desk, GroupThatTheUserFolded_StaysFoldedInTheNextWindow) {
+TEST_F(WindowTest, GroupThatTheUserFolded_StaysFoldedInTheNextWindow) {
     window->resize(1280, 1000);
     window->useSettings(platform.settings);
     show();
@@ -77,7 +77,7 @@ TEST_F(Desk, GroupThatTheUserFolded_StaysFoldedInTheNextWindow) {
     EXPECT_TRUE(next.side().groups()[0]->isOpen());
 }
 
-TEST_F(Desk, ShortcutOfAFoldedBox_OpensItsGroup) {
+TEST_F(WindowTest, ShortcutOfAFoldedBox_OpensItsGroup) {
     window->resize(1280, 1000);
     show();
     FoldGroup* command = window->side().groups()[2];
@@ -87,7 +87,7 @@ TEST_F(Desk, ShortcutOfAFoldedBox_OpensItsGroup) {
     EXPECT_EQ(window->focusWidget(), widgetOf<QWidget>(panel().ManualCommandText));
 }
 
-TEST_F(Desk, F12_TakesThePanelAway) {
+TEST_F(WindowTest, F12_TakesThePanelAway) {
     show();
     EXPECT_TRUE(window->side().isVisible());
     QTest::keyClick(window.get(), Qt::Key_F12);
@@ -96,7 +96,7 @@ TEST_F(Desk, F12_TakesThePanelAway) {
     EXPECT_TRUE(window->side().isVisible());
 }
 
-TEST_F(Desk, ToolOfSingle_WorksTheSameControl) {
+TEST_F(WindowTest, ToolOfSingle_WorksTheSameControl) {
     connect();
     show();
     const auto before = panel().CWGraph1.plotSerial();
@@ -106,7 +106,7 @@ TEST_F(Desk, ToolOfSingle_WorksTheSameControl) {
     EXPECT_EQ(panel().CWGraph1.plotSerial(), before + 1);
 }
 
-TEST_F(Desk, ToolOfStop_CanBeUsedWhileTheKeyIsShown) {
+TEST_F(WindowTest, ToolOfStop_CanBeUsedWhileTheKeyIsShown) {
     show();
     QToolButton* stop = toolOf(*window, "Stop");
     EXPECT_FALSE(stop->isEnabled());
@@ -115,7 +115,7 @@ TEST_F(Desk, ToolOfStop_CanBeUsedWhileTheKeyIsShown) {
     EXPECT_TRUE(stop->isEnabled());
 }
 
-TEST_F(Desk, ToolsOfTheConnection_TakeTurns) {
+TEST_F(WindowTest, ToolsOfTheConnection_TakeTurns) {
     show();
     EXPECT_TRUE(toolOf(*window, "Connect")->isVisible());
     EXPECT_FALSE(toolOf(*window, "Disconnect")->isVisible());
@@ -125,7 +125,7 @@ TEST_F(Desk, ToolsOfTheConnection_TakeTurns) {
     EXPECT_TRUE(toolOf(*window, "Disconnect")->isVisible());
 }
 
-TEST_F(Desk, EmptyScreen_GoesWithTheConnection) {
+TEST_F(WindowTest, EmptyScreen_GoesWithTheConnection) {
     show();
     auto* words = [this]() -> QLabel* {
         for (QLabel* label : window->graph().findChildren<QLabel*>())
@@ -139,7 +139,7 @@ TEST_F(Desk, EmptyScreen_GoesWithTheConnection) {
     EXPECT_FALSE(words->isVisible());
 }
 
-TEST_F(Desk, Connection_IsOfferedAtTheNextStart) {
+TEST_F(WindowTest, Connection_IsOfferedAtTheNextStart) {
     window->useSettings(platform.settings);
     connect();
     show();
@@ -157,7 +157,7 @@ TEST(RecentConnections, FourthOne_TakesThePlaceOfTheOldest) {
     EXPECT_EQ(read.names().join(" ").toStdString(), "host:2 host:4 host:3");
 }
 
-TEST_F(Desk, KeyThatWouldOnlyRefuse_IsGreyWithTheReason) {
+TEST_F(WindowTest, KeyThatWouldOnlyRefuse_IsGreyWithTheReason) {
     show();
     const auto* key = widgetOf<QPushButton>(panel().MarkPkButton);
     EXPECT_FALSE(key->isEnabled());
@@ -176,7 +176,7 @@ TEST_F(Desk, KeyThatWouldOnlyRefuse_IsGreyWithTheReason) {
     panel().ContinuosLoopActive = false;
 }
 
-TEST_F(Desk, Title_SaysFirstWhatIsOnTheScreen) {
+TEST_F(WindowTest, Title_SaysFirstWhatIsOnTheScreen) {
     show();
     const QString caption = QString::fromStdString(panel().Caption);
     EXPECT_EQ(window->windowTitle(), caption);
@@ -186,7 +186,7 @@ TEST_F(Desk, Title_SaysFirstWhatIsOnTheScreen) {
     EXPECT_TRUE(window->windowTitle().contains("Analyzer")) << window->windowTitle().toStdString();
 }
 
-TEST_F(Desk, EntriesOfAMenu_HaveLettersOfTheirOwn) {
+TEST_F(WindowTest, EntriesOfAMenu_HaveLettersOfTheirOwn) {
     show();
     for (const MenuItem* item : {&panel().FileMenu, &panel().Connection, &panel().ViewMenu}) {
         QMenu* menu = menuOf(*item, window->binder());

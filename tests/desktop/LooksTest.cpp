@@ -5,7 +5,7 @@
 #include <QTest>
 #include <QWheelEvent>
 
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -40,7 +40,7 @@ const Scene kScenes[] = {
     {"fault", &CF::DistFaultButton, CF::DISTFAULT},
 };
 
-class Looks : public Desk, public testing::WithParamInterface<Look> {
+class Looks : public WindowTest, public testing::WithParamInterface<Look> {
   protected:
     void SetUp() override {
         applyTheme(testApplication(), GetParam().theme);

@@ -6,7 +6,7 @@
 #include <QTest>
 
 #include "desktop/windows/FoldGroup.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -17,24 +17,24 @@ bool needsNoWidget(const Control& control) {
     return control.kind() == ControlKind::Timer || separator;
 }
 
-TEST_F(Desk, Panel_EveryControl_HasItsWidget) {
+TEST_F(WindowTest, Panel_EveryControl_HasItsWidget) {
     for (const Control* control : panel().controls()) {
         if (needsNoWidget(*control)) continue;
         EXPECT_NE(window->binder().widgetOf(*control), nullptr) << control->name();
     }
 }
 
-TEST_F(Desk, ConnectionDialog_EveryControl_HasItsWidget) {
+TEST_F(WindowTest, ConnectionDialog_EveryControl_HasItsWidget) {
     for (const Control* control : program->forms().main.controls())
         EXPECT_NE(window->binder().widgetOf(*control), nullptr) << control->name();
 }
 
-TEST_F(Desk, ManualScaleDialog_EveryControl_HasItsWidget) {
+TEST_F(WindowTest, ManualScaleDialog_EveryControl_HasItsWidget) {
     for (const Control* control : program->forms().manualScale.controls())
         EXPECT_NE(window->binder().widgetOf(*control), nullptr) << control->name();
 }
 
-TEST_F(Desk, Widgets_AreVisibleWhereTheFormSaysSo) {
+TEST_F(WindowTest, Widgets_AreVisibleWhereTheFormSaysSo) {
     connect();
     show();
     int looked = 0;
@@ -49,14 +49,14 @@ TEST_F(Desk, Widgets_AreVisibleWhereTheFormSaysSo) {
     EXPECT_GT(looked, 50);
 }
 
-TEST_F(Desk, StopKey_IsHiddenUntilAViewRuns) {
+TEST_F(WindowTest, StopKey_IsHiddenUntilAViewRuns) {
     show();
     EXPECT_FALSE(widgetOf<QWidget>(panel().StopButton)->isVisible());
     panel().StopButton.Visible = true;
     EXPECT_TRUE(widgetOf<QWidget>(panel().StopButton)->isVisible());
 }
 
-TEST_F(Desk, EntryWithoutAHandler_IsDisabled) {
+TEST_F(WindowTest, EntryWithoutAHandler_IsDisabled) {
     show();
     // The binder knows them to its end.
     static Form form("Form");
@@ -69,7 +69,7 @@ TEST_F(Desk, EntryWithoutAHandler_IsDisabled) {
     EXPECT_TRUE(widgetOf<QWidget>(panel().FrequencyButton)->isEnabled());
 }
 
-TEST_F(Desk, EnabledKeysAndBoxes_AreReachedByTab) {
+TEST_F(WindowTest, EnabledKeysAndBoxes_AreReachedByTab) {
     connect();
     show();
     QSet<const QWidget*> chain;
@@ -89,7 +89,7 @@ TEST_F(Desk, EnabledKeysAndBoxes_AreReachedByTab) {
     }
 }
 
-TEST_F(Desk, ClickOnSingle_ReadsASweep) {
+TEST_F(WindowTest, ClickOnSingle_ReadsASweep) {
     connect();
     show();
     const auto before = panel().CWGraph1.plotSerial();
@@ -97,7 +97,7 @@ TEST_F(Desk, ClickOnSingle_ReadsASweep) {
     EXPECT_EQ(panel().CWGraph1.plotSerial(), before + 1);
 }
 
-TEST_F(Desk, TypingInASoftBox_ReplacesTheValueAndEnterSendsIt) {
+TEST_F(WindowTest, TypingInASoftBox_ReplacesTheValueAndEnterSendsIt) {
     connect();
     show();
     auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
@@ -110,7 +110,7 @@ TEST_F(Desk, TypingInASoftBox_ReplacesTheValueAndEnterSendsIt) {
     EXPECT_EQ(widgetOf<QLabel>(panel().CFLabel)->text(), "Center: 900 MHz");
 }
 
-TEST_F(Desk, ArrowAheadOfTyping_KeepsTheText) {
+TEST_F(WindowTest, ArrowAheadOfTyping_KeepsTheText) {
     connect();
     show();
     auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
@@ -120,7 +120,7 @@ TEST_F(Desk, ArrowAheadOfTyping_KeepsTheText) {
     EXPECT_EQ(panel().SoftTextBox(0).Text.get(), "12.5 GHz");
 }
 
-TEST_F(Desk, LockedBox_TakesNoKeys) {
+TEST_F(WindowTest, LockedBox_TakesNoKeys) {
     show();
     auto* line = widgetOf<QLineEdit>(panel().DebugTextBox);
     const QString before = line->text();
@@ -129,7 +129,7 @@ TEST_F(Desk, LockedBox_TakesNoKeys) {
     EXPECT_TRUE(line->isReadOnly());
 }
 
-TEST_F(Desk, PickInAList_SendsTheChoice) {
+TEST_F(WindowTest, PickInAList_SendsTheChoice) {
     connect();
     panel().AmplitudeButton.Click();
     show();
@@ -140,7 +140,7 @@ TEST_F(Desk, PickInAList_SendsTheChoice) {
     EXPECT_EQ(list->currentText(), "2dB/DIV");
 }
 
-TEST_F(Desk, ClickWhileWorkIsUnderWay_IsDropped) {
+TEST_F(WindowTest, ClickWhileWorkIsUnderWay_IsDropped) {
     connect();
     show();
     auto* key = widgetOf<QPushButton>(panel().SpanButton);
@@ -152,7 +152,7 @@ TEST_F(Desk, ClickWhileWorkIsUnderWay_IsDropped) {
     EXPECT_EQ(panel().State, ControllerForm::SPAN);
 }
 
-TEST_F(Desk, SoftKeyShortcut_PressesTheKey) {
+TEST_F(WindowTest, SoftKeyShortcut_PressesTheKey) {
     connect();
     panel().AmplitudeButton.Click();
     show();
@@ -162,7 +162,7 @@ TEST_F(Desk, SoftKeyShortcut_PressesTheKey) {
     EXPECT_EQ(panel().SoftTextBox(1).Text.get(), "10dB/DIV (0)");
 }
 
-TEST_F(Desk, ModalForm_ShowsAWindowThatClosesWithTheForm) {
+TEST_F(WindowTest, ModalForm_ShowsAWindowThatClosesWithTheForm) {
     show();
     MainForm& form = program->forms().main;
     form.Modal = true;
@@ -177,7 +177,7 @@ TEST_F(Desk, ModalForm_ShowsAWindowThatClosesWithTheForm) {
     EXPECT_FALSE(dialog->isVisible());
 }
 
-TEST_F(Desk, DialogClosedByTheUser_UnloadsItsForm) {
+TEST_F(WindowTest, DialogClosedByTheUser_UnloadsItsForm) {
     show();
     ManualScaleForm& form = program->forms().manualScale;
     panel().UtilityGraphSettings.Click();
@@ -189,7 +189,7 @@ TEST_F(Desk, DialogClosedByTheUser_UnloadsItsForm) {
     EXPECT_FALSE(form.loaded());
 }
 
-TEST_F(Desk, ClosingTheWindow_AsksAndStaysOnNo) {
+TEST_F(WindowTest, ClosingTheWindow_AsksAndStaysOnNo) {
     show();
     platform.boxes.answer(BoxAnswer::No);
     EXPECT_FALSE(window->close());
@@ -198,7 +198,7 @@ TEST_F(Desk, ClosingTheWindow_AsksAndStaysOnNo) {
     EXPECT_TRUE(program->ended());
 }
 
-TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
+TEST_F(WindowTest, ConnectionDialog_ShowsTheDirectLinkAlone) {
     show();
     platform.ports.ports = {"/dev/ttyUSB0", "/dev/ttyS0"};
     platform.events.schedule(10, [this] {
@@ -216,7 +216,7 @@ TEST_F(Desk, ConnectionDialog_ShowsTheDirectLinkAlone) {
     EXPECT_FALSE(program->forms().main.Visible);
 }
 
-TEST_F(Desk, ToolTipOfTheForm_TakesTheWidgetsPlace) {
+TEST_F(WindowTest, ToolTipOfTheForm_TakesTheWidgetsPlace) {
     auto* key = widgetOf<QPushButton>(panel().SpanButton);
     EXPECT_EQ(key->toolTip(), "Span menu (Ctrl+Shift+F)");
     EXPECT_EQ(key->accessibleName(), "SPAN, Span menu");
@@ -226,7 +226,7 @@ TEST_F(Desk, ToolTipOfTheForm_TakesTheWidgetsPlace) {
     EXPECT_EQ(key->accessibleName(), "not now");
 }
 
-TEST_F(Desk, EveryBoundWidget_HasAnAccessibleName) {
+TEST_F(WindowTest, EveryBoundWidget_HasAnAccessibleName) {
     int looked = 0;
     for (const Control* control : panel().controls()) {
         const auto* widget = widgetOf<QWidget>(*control);
@@ -239,7 +239,7 @@ TEST_F(Desk, EveryBoundWidget_HasAnAccessibleName) {
     EXPECT_GT(looked, 50);
 }
 
-TEST_F(Desk, KeyOnAButton_IsToldToItsControl) {
+TEST_F(WindowTest, KeyOnAButton_IsToldToItsControl) {
     show();
     std::vector<int> codes;
     panel().SpanButton.KeyDown.connect([&codes](int code, int) { codes.push_back(code); });
@@ -247,7 +247,7 @@ TEST_F(Desk, KeyOnAButton_IsToldToItsControl) {
     EXPECT_EQ(codes, std::vector<int>{kKeyF1});
 }
 
-TEST_F(Desk, PasteWhileWorkIsUnderWay_IsDropped) {
+TEST_F(WindowTest, PasteWhileWorkIsUnderWay_IsDropped) {
     connect();
     show();
     auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
@@ -261,7 +261,7 @@ TEST_F(Desk, PasteWhileWorkIsUnderWay_IsDropped) {
     panel().MousePointer = 0;
 }
 
-TEST_F(Desk, MenusOfAllKinds_LeaveTheKeysWhereTheyAre) {
+TEST_F(WindowTest, MenusOfAllKinds_LeaveTheKeysWhereTheyAre) {
     connect();
     window->resize(1024, 600);
     show();
@@ -275,7 +275,7 @@ TEST_F(Desk, MenusOfAllKinds_LeaveTheKeysWhereTheyAre) {
     }
 }
 
-TEST_F(Desk, EnterInTheConnectionDialog_PressesConnect) {
+TEST_F(WindowTest, EnterInTheConnectionDialog_PressesConnect) {
     show();
     MainForm& form = program->forms().main;
     form.Show();
@@ -291,7 +291,7 @@ TEST_F(Desk, EnterInTheConnectionDialog_PressesConnect) {
     window->binder().flush();
 }
 
-TEST_F(Desk, HourglassOfTheDialog_ShowsThatWorkGoesOn) {
+TEST_F(WindowTest, HourglassOfTheDialog_ShowsThatWorkGoesOn) {
     show();
     MainForm& form = program->forms().main;
     form.Show();
@@ -308,7 +308,7 @@ TEST_F(Desk, HourglassOfTheDialog_ShowsThatWorkGoesOn) {
     window->binder().flush();
 }
 
-TEST_F(Desk, ThemeMenu_DrawsColouredTextsAnew) {
+TEST_F(WindowTest, ThemeMenu_DrawsColouredTextsAnew) {
     std::vector<ThemeChoice> chosen;
     window->addThemeMenu(ThemeChoice::Dark, [&chosen](ThemeChoice theme) {
         chosen.push_back(theme);

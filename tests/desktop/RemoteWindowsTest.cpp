@@ -4,14 +4,14 @@
 #include <QPushButton>
 
 #include "server/ServerBridge.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
 constexpr QSize kSmallScreen(1024, 600);
 
-struct RemoteWindowsTest : Desk {
+struct RemoteWindowsTest : WindowTest {
     MainForm& dial = program->forms().main;
     TCPConnectionForm& tcp = program->forms().tcpConnection;
     DevicesChoiceForm& devices = program->forms().devicesChoice;

@@ -5,13 +5,13 @@
 
 #include "desktop/windows/ScriptEditorWindow.h"
 #include "support/Text.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 #include "tests/files/FileSession.h"
 
 namespace zel {
 namespace {
 
-struct ScriptWindowsTest : Desk {
+struct ScriptWindowsTest : WindowTest {
     SpecialMeasForm& form = program->forms().specialMeas;
     ScriptEditor& editor = program->forms().scriptEditor;
     STDForm& statistics = program->forms().std;

@@ -6,7 +6,7 @@
 #include <QTest>
 
 #include "desktop/binders/ShortcutTable.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -53,7 +53,7 @@ TEST(ShortcutTable, TwoControls_ShareKeysOnlyAtOnePlace) {
         EXPECT_EQ(users.count(QString("Alt+") + *letter), 0U) << *letter;
 }
 
-TEST_F(Desk, EveryKeyOfThePanel_HasAShortcutInItsToolTip) {
+TEST_F(WindowTest, EveryKeyOfThePanel_HasAShortcutInItsToolTip) {
     for (const Control* control : panel().controls()) {
         const bool key = control->kind() == ControlKind::Button ||
                          control->kind() == ControlKind::CheckBox ||
@@ -72,7 +72,7 @@ struct Press {
     Button ControllerForm::*button;
 };
 
-TEST_F(Desk, ShortcutsOfTheKeys_PressThem) {
+TEST_F(WindowTest, ShortcutsOfTheKeys_PressThem) {
     connect();
     using CF = ControllerForm;
     const Press presses[] = {
@@ -116,7 +116,7 @@ TEST_F(Desk, ShortcutsOfTheKeys_PressThem) {
     }
 }
 
-TEST_F(Desk, ShortcutOfAHiddenSoftKey_DoesNothing) {
+TEST_F(WindowTest, ShortcutOfAHiddenSoftKey_DoesNothing) {
     connect();
     panel().SpanButton.Click();
     show();
@@ -126,7 +126,7 @@ TEST_F(Desk, ShortcutOfAHiddenSoftKey_DoesNothing) {
     EXPECT_EQ(clicks, 0);
 }
 
-TEST_F(Desk, ShortcutWhileWorkIsUnderWay_DoesNothing) {
+TEST_F(WindowTest, ShortcutWhileWorkIsUnderWay_DoesNothing) {
     connect();
     show();
     panel().MousePointer = 11;
@@ -137,7 +137,7 @@ TEST_F(Desk, ShortcutWhileWorkIsUnderWay_DoesNothing) {
     EXPECT_EQ(panel().State, ControllerForm::SPAN);
 }
 
-TEST_F(Desk, ShiftWithASoftKeysKey_GoesToWhatStandsAtItsPlace) {
+TEST_F(WindowTest, ShiftWithASoftKeysKey_GoesToWhatStandsAtItsPlace) {
     connect();
     panel().AmplitudeButton.Click();
     show();
@@ -148,7 +148,7 @@ TEST_F(Desk, ShiftWithASoftKeysKey_GoesToWhatStandsAtItsPlace) {
     EXPECT_EQ(window->focusWidget(), widgetOf<QWidget>(panel().ChoiceBox(1)));
 }
 
-TEST_F(Desk, MarkerShortcut_SwitchesTheMarker) {
+TEST_F(WindowTest, MarkerShortcut_SwitchesTheMarker) {
     connect();
     show();
     QTest::keySequence(window.get(), QKeySequence("Ctrl+Shift+M"));
@@ -157,7 +157,7 @@ TEST_F(Desk, MarkerShortcut_SwitchesTheMarker) {
     EXPECT_FALSE(panel().MarkerCheckBox.Value());
 }
 
-TEST_F(Desk, CommandAndGraphShortcuts_GoThere) {
+TEST_F(WindowTest, CommandAndGraphShortcuts_GoThere) {
     show();
     QTest::keyClick(window.get(), Qt::Key_F7);
     EXPECT_EQ(window->focusWidget(), widgetOf<QWidget>(panel().ManualCommandText));
@@ -165,7 +165,7 @@ TEST_F(Desk, CommandAndGraphShortcuts_GoThere) {
     EXPECT_EQ(window->focusWidget(), &window->graph());
 }
 
-TEST_F(Desk, MenusOfTheMenuBar_OpenByTheirLetters) {
+TEST_F(WindowTest, MenusOfTheMenuBar_OpenByTheirLetters) {
     show();
     QStringList letters;
     for (const QAction* action : window->menuBar()->actions()) {
@@ -176,7 +176,7 @@ TEST_F(Desk, MenusOfTheMenuBar_OpenByTheirLetters) {
     EXPECT_EQ(letters, QStringList({"F", "N", "V", "T", "I", "H"}));
 }
 
-TEST_F(Desk, MenuEntryWithAShortcut_ShowsIt) {
+TEST_F(WindowTest, MenuEntryWithAShortcut_ShowsIt) {
     window->binder().flush();
     const auto* action = qobject_cast<QAction*>(window->binder().widgetOf(panel().LoadData));
     EXPECT_EQ(action->shortcut(), QKeySequence("Ctrl+O"));

@@ -3,7 +3,7 @@
 #include <QDialog>
 #include <QDockWidget>
 
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -32,7 +32,7 @@ std::string recordingOf(int count) {
     return text;
 }
 
-class LooksOfStates : public Desk, public testing::WithParamInterface<Look> {
+class LooksOfStates : public WindowTest, public testing::WithParamInterface<Look> {
   protected:
     void SetUp() override {
         applyTheme(testApplication(), GetParam().theme);

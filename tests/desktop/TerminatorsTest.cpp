@@ -5,12 +5,12 @@
 
 #include "desktop/windows/Terminators.h"
 #include "panel/TriggerKey.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
-class EntryDesk : public Desk {
+class EntryTest : public WindowTest {
   protected:
     void SetUp() override {
         connect();
@@ -30,7 +30,7 @@ class EntryDesk : public Desk {
     void press(const char* keys) { QTest::keySequence(window.get(), QKeySequence(keys)); }
 };
 
-TEST_F(EntryDesk, NumberAndAltM_SendMegahertz) {
+TEST_F(EntryTest, NumberAndAltM_SendMegahertz) {
     box(0)->setFocus();
     QTest::keyClicks(box(0), "900");
     press("Alt+M");
@@ -39,7 +39,7 @@ TEST_F(EntryDesk, NumberAndAltM_SendMegahertz) {
     EXPECT_EQ(widgetOf<QLabel>(panel().CFLabel)->text(), "Center: 900 MHz");
 }
 
-TEST_F(EntryDesk, EachTerminator_HasItsFactor) {
+TEST_F(EntryTest, EachTerminator_HasItsFactor) {
     const struct {
         const char* number;
         const char* keys;
@@ -53,7 +53,7 @@ TEST_F(EntryDesk, EachTerminator_HasItsFactor) {
     }
 }
 
-TEST_F(EntryDesk, ClickedTerminator_SendsAndLeavesTheFocusInTheBox) {
+TEST_F(EntryTest, ClickedTerminator_SendsAndLeavesTheFocusInTheBox) {
     box(0)->setFocus();
     QTest::keyClicks(box(0), "1.25");
     QTest::mouseClick(row().keys()[0], Qt::LeftButton);
@@ -61,7 +61,7 @@ TEST_F(EntryDesk, ClickedTerminator_SendsAndLeavesTheFocusInTheBox) {
     EXPECT_EQ(window->focusWidget(), box(0));
 }
 
-TEST_F(EntryDesk, TerminatorWithoutANumber_SendsNothing) {
+TEST_F(EntryTest, TerminatorWithoutANumber_SendsNothing) {
     const double before = program->variables().CenterFrequency;
     panel().SpanButton.Click();
     show();
@@ -72,7 +72,7 @@ TEST_F(EntryDesk, TerminatorWithoutANumber_SendsNothing) {
     EXPECT_EQ(window->focusWidget(), box(0));
 }
 
-TEST_F(EntryDesk, TerminatorBehindANumberWithAUnit_SendsNothing) {
+TEST_F(EntryTest, TerminatorBehindANumberWithAUnit_SendsNothing) {
     box(0)->setFocus();
     QTest::keyClicks(box(0), "900M");
     press("Alt+G");
@@ -80,7 +80,7 @@ TEST_F(EntryDesk, TerminatorBehindANumberWithAUnit_SendsNothing) {
     EXPECT_EQ(panel().SoftTextBox(0).Text.get(), "900M");
 }
 
-TEST_F(EntryDesk, TimesLevelsAndTexts_HaveTerminatorsOfTheirOwn) {
+TEST_F(EntryTest, TimesLevelsAndTexts_HaveTerminatorsOfTheirOwn) {
     EXPECT_EQ(captions(), QStringList({"GHz", "MHz", "kHz", "Hz"}));
     panel().SweepButton.Click();
     show();
@@ -99,7 +99,7 @@ TEST_F(EntryDesk, TimesLevelsAndTexts_HaveTerminatorsOfTheirOwn) {
     EXPECT_EQ(captions(), QStringList());
 }
 
-TEST_F(EntryDesk, AltMInATime_SendsMilliseconds) {
+TEST_F(EntryTest, AltMInATime_SendsMilliseconds) {
     panel().SweepButton.Click();
     show();
     box(0)->setFocus();
@@ -108,7 +108,7 @@ TEST_F(EntryDesk, AltMInATime_SendsMilliseconds) {
     EXPECT_NEAR(program->variables().SweepTime, 0.05, 1e-12);
 }
 
-TEST_F(EntryDesk, MarkerInDistanceToFault_IsALength) {
+TEST_F(EntryTest, MarkerInDistanceToFault_IsALength) {
     panel().State = ControllerForm::Marker;
     panel().InstrumentMode = ControllerForm::DISTTOFAULTMEASURE;
     QStringList texts;
@@ -117,7 +117,7 @@ TEST_F(EntryDesk, MarkerInDistanceToFault_IsALength) {
     EXPECT_EQ(texts, QStringList({"m", "cm", "mm"}));
 }
 
-TEST_F(EntryDesk, TriggerLevel_IsAPercentageAndTriggerDelayATime) {
+TEST_F(EntryTest, TriggerLevel_IsAPercentageAndTriggerDelayATime) {
     panel().SweepButton.Click();
     showTriggerKey(panel(), true);
     EXPECT_STREQ(terminatorsOf(panel(), program->variables(), 4)[0].caption, "%");
@@ -125,7 +125,7 @@ TEST_F(EntryDesk, TriggerLevel_IsAPercentageAndTriggerDelayATime) {
     EXPECT_STREQ(terminatorsOf(panel(), program->variables(), 4)[0].caption, "s");
 }
 
-TEST_F(EntryDesk, DigitsTypedAnywhere_GoToTheBoxOfTheRedKey) {
+TEST_F(EntryTest, DigitsTypedAnywhere_GoToTheBoxOfTheRedKey) {
     panel().SoftKey(1).Click();
     show();
     widgetOf<QWidget>(panel().SpanButton)->setFocus();
@@ -137,14 +137,14 @@ TEST_F(EntryDesk, DigitsTypedAnywhere_GoToTheBoxOfTheRedKey) {
     EXPECT_EQ(program->variables().Span, 50e6);
 }
 
-TEST_F(EntryDesk, LettersTypedAnywhere_BeginNoEntry) {
+TEST_F(EntryTest, LettersTypedAnywhere_BeginNoEntry) {
     const std::string before = panel().SoftTextBox(0).Text;
     QTest::keyClick(&window->graph(), Qt::Key_X);
     EXPECT_EQ(panel().SoftTextBox(0).Text.get(), before);
     EXPECT_EQ(window->focusWidget(), &window->graph());
 }
 
-TEST_F(EntryDesk, DigitWithoutAnyBox_IsDropped) {
+TEST_F(EntryTest, DigitWithoutAnyBox_IsDropped) {
     panel().TrackButton1.Click();
     show();
     window->graph().setFocus();
@@ -152,7 +152,7 @@ TEST_F(EntryDesk, DigitWithoutAnyBox_IsDropped) {
     EXPECT_EQ(window->focusWidget(), &window->graph());
 }
 
-TEST_F(EntryDesk, PastedValue_StaysForItsEnter) {
+TEST_F(EntryTest, PastedValue_StaysForItsEnter) {
     box(0)->setFocus();
     box(0)->selectAll();
     QApplication::clipboard()->setText("850M");

@@ -14,12 +14,12 @@
 
 #include "analysis/SavedTraces.h"
 #include "desktop/windows/TraceToolsDock.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
-struct TraceToolsWindow : Desk {
+struct TraceToolsWindow : WindowTest {
     TraceToolsDock& dock() { return *window->findChild<TraceToolsDock*>("TraceTools"); }
     void sweep() {
         panel().PlaySingleButton.Click();

@@ -8,14 +8,14 @@
 #include "desktop/graph/SpectrogramWidget.h"
 #include "desktop/graph/WaterfallImage.h"
 #include "desktop/windows/WaterfallWindow.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
 constexpr int kNever = 3600'000;
 
-struct WaterfallWindowTest : Desk {
+struct WaterfallWindowTest : WindowTest {
     WaterfallForm& form() { return program->forms().waterfall; }
     WaterfallWindow& waterfall() { return *window->findChild<WaterfallWindow*>("WaterfallForm"); }
     WaterfallCanvas& canvas() { return waterfall().canvas(); }

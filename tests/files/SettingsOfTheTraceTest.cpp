@@ -20,7 +20,7 @@ constexpr Change kChanges[] = {{kFreq, 0, "1.7G"},      {kSpan, 0, "40M"},      
                                {kBW, 0, nullptr, 4},    {kBW, 2, nullptr, 5},   {kSweep, 0, "3"},
                                {kTrace, 0, nullptr, 2}, {kTrace, 1, nullptr, 1}};
 
-struct SettingsOfTheTrace : DeadLineRig, ::testing::Test {
+struct SettingsOfTheTrace : DeadLineSetup, ::testing::Test {
     Folder folder{platform.files};
     ZEL3Variables& mirror = program.variables();
 

@@ -21,7 +21,7 @@ std::vector<double> asDoubles(const std::vector<std::int32_t>& samples) {
 
 std::string doubleBlock() { return traceBlock(ramp(-1000)) + traceBlock(ramp(70000)); }
 
-struct TraceRig : LineRig {
+struct TraceSetup : LineSetup {
     RawTrace trace;
     std::vector<double>& values = trace.values;
     /// One round; the dialogue is given back for its timing.
@@ -32,7 +32,7 @@ struct TraceRig : LineRig {
     bool read(bool doubled = false) { return binary.GetTraceBinary(trace, doubled); }
 };
 
-struct Trace : TraceRig, ::testing::Test {};
+struct Trace : TraceSetup, ::testing::Test {};
 
 TEST_F(Trace, SingleBlock_Gives301Values) {
     script("0\r" + traceBlock(ramp(-150)));
@@ -177,7 +177,7 @@ TEST_F(Trace, LastBytesLaterThanTheTailsWait_AreAShortTransfer) {
 TEST_F(Trace, EverySplitPoint_GivesTheSameTrace) {
     const std::string bytes = "0\r" + traceBlock(ramp(-20));
     for (std::size_t at = 1; at < bytes.size(); ++at) {
-        TraceRig rig;
+        TraceSetup rig;
         rig.script(bytes).chunks({at}, 30);
         EXPECT_TRUE(rig.read()) << at;
         ASSERT_EQ(rig.values, asDoubles(ramp(-20))) << at;
@@ -188,7 +188,7 @@ TEST_F(Trace, EverySplitPoint_GivesTheSameTrace) {
 TEST_F(Trace, EverySplitPointOverTcp_GivesTheSameTrace) {
     const std::string bytes = "0\r" + traceBlock(ramp(-20));
     for (std::size_t at = 1; at < bytes.size(); ++at) {
-        TraceRig rig;
+        TraceSetup rig;
         rig.overTcp();
         rig.socket.expect("GET\r").answer("0\r");
         rig.socket.expect("TRACEBIN\r").answer(bytes).chunks({at}, 30);
@@ -203,7 +203,7 @@ TEST_F(Trace, EveryChunkSize_GivesTheSameDoubleTrace) {
     for (const double value : asDoubles(ramp(70000))) wanted.push_back(value);
     for (const std::size_t size : {1U, 2U, 3U, 4U, 5U, 7U, 16U, 64U, 255U, 1204U, 1205U, 1206U,
                                    1207U, 2408U, 2409U, 2410U, 2411U}) {
-        TraceRig rig;
+        TraceSetup rig;
         rig.port.expect("GET\r").answer("0\r");
         Dialogue& second = rig.port.expect("TRACEBIN\r");
         for (std::size_t at = 0; at < bytes.size(); at += size) {
@@ -233,7 +233,7 @@ TEST_F(Trace, RefusalWith2To7_IsReportedAndFalse) {
                          "",
                          "ERROR: The baud rate is incorrect.\r\n"};
     for (int status = 2; status <= 7; ++status) {
-        TraceRig rig;
+        TraceSetup rig;
         rig.values.assign(301, 42);
         rig.script(std::to_string(status) + "\r");
         EXPECT_FALSE(rig.read()) << status;
@@ -306,7 +306,7 @@ TEST_F(Trace, SocketDiesInTheMiddle_IsFalseAndKeepsWhatCame) {
 
 /// What came of a transfer that brings the first `bytes` bytes of its block, or of both blocks.
 std::size_t cameOf(std::size_t bytes, bool doubled) {
-    TraceRig rig;
+    TraceSetup rig;
     const std::string block = doubled ? doubleBlock() : traceBlock(ramp(0));
     rig.script("0\r" + block.substr(0, bytes));
     EXPECT_TRUE(rig.read(doubled));

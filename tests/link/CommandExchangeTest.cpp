@@ -84,7 +84,7 @@ TEST_F(Line, Cmd_KeywordStatus2_IsTold) {
 
 TEST_F(Line, Cmd_AnyOtherKeywordStatus_IsShownInTheLineOnly) {
     for (const char* answer : {"1", "3", "4", "5", "6", "7", "42"}) {
-        LineRig rig;
+        LineSetup rig;
         rig.exchangeOf("cmd", "INIT", std::string(answer) + "\r");
         Texts lines;
         rig.panel.DebugTextBox.Changed.connect([&] { lines.push_back(rig.status()); });
@@ -248,7 +248,7 @@ TEST_F(Line, Set_SilenceOnEitherLine_IsOneBoxAndFalse) {
     port.expect("set\r").silence();
     EXPECT_LE(time([&] { EXPECT_FALSE(exchange.SetInstrument("RBW,1")); }), 9200);
     EXPECT_EQ(shown(), Texts{kSilence});
-    LineRig second;
+    LineSetup second;
     second.port.expect("set\r").answer("0\r");
     second.port.expect("RBW,1\r").silence();
     EXPECT_LE(second.time([&] { EXPECT_FALSE(second.exchange.SetInstrument("RBW,1")); }), 9200);

@@ -49,7 +49,7 @@ TEST_F(Complex, Lines_EndWithTheFinishedLine) {
 
 TEST_F(Complex, Chunks_OfAnySize_GiveTheSameValues) {
     for (const std::size_t size : {1U, 2U, 3U, 100U, 1206U, 2411U}) {
-        LineRig rig;
+        LineSetup rig;
         rig.port.expect("GET\r").answer("0\r");
         Dialogue& second = rig.port.expect("CTRACEBIN\r");
         const std::string bytes = "0\r" + block;

@@ -14,7 +14,7 @@ template <class Prepare, class Work>
 std::vector<std::int64_t> timesByKind(const Prepare& prepare, const Work& work) {
     std::vector<std::int64_t> times;
     for (const std::int16_t kind : kSerialKinds) {
-        LineRig rig;
+        LineSetup rig;
         rig.panel.ConnectionState = kind;
         prepare(rig);
         times.push_back(rig.time([&] { work(rig); }));
@@ -27,29 +27,29 @@ std::vector<std::int64_t> timesByKind(const Prepare& prepare, const Work& work) 
 using Times = std::vector<std::int64_t>;
 
 TEST(Delays, Cmd_OnlyTwoModemsNeedThem) {
-    const Times times = timesByKind([](LineRig& rig) { rig.exchangeOf("cmd", "INIT", "0\r"); },
-                                    [](LineRig& rig) { rig.exchange.CmdInstrument("INIT"); });
+    const Times times = timesByKind([](LineSetup& rig) { rig.exchangeOf("cmd", "INIT", "0\r"); },
+                                    [](LineSetup& rig) { rig.exchange.CmdInstrument("INIT"); });
     EXPECT_EQ(times, (Times{0, 300, 0, 0, 0}));
 }
 
 TEST(Delays, TriggeredCmd_AreThoseOfCmd) {
     const Times times =
-        timesByKind([](LineRig& rig) { rig.exchangeOf("cmd", "WAIT", "0\r"); },
-                    [](LineRig& rig) { rig.exchange.CmdInstrumentTriggered("WAIT", 5); });
+        timesByKind([](LineSetup& rig) { rig.exchangeOf("cmd", "WAIT", "0\r"); },
+                    [](LineSetup& rig) { rig.exchange.CmdInstrumentTriggered("WAIT", 5); });
     EXPECT_EQ(times, (Times{0, 300, 0, 0, 0}));
 }
 
 TEST(Delays, Set_OnlyTwoModemsNeedThem) {
-    const Times times = timesByKind([](LineRig& rig) { rig.exchangeOf("set", "RBW,1", "0\r"); },
-                                    [](LineRig& rig) { rig.exchange.SetInstrument("RBW,1"); });
+    const Times times = timesByKind([](LineSetup& rig) { rig.exchangeOf("set", "RBW,1", "0\r"); },
+                                    [](LineSetup& rig) { rig.exchange.SetInstrument("RBW,1"); });
     EXPECT_EQ(times, (Times{0, 300, 0, 0, 0}));
 }
 
 TEST(Delays, Get_OnlyTwoModemsNeedThem) {
     std::string value;
     const Times times =
-        timesByKind([](LineRig& rig) { rig.exchangeOf("GET", "RBW", "0\r1\r"); },
-                    [&](LineRig& rig) { rig.exchange.GetInstrument("RBW", value); });
+        timesByKind([](LineSetup& rig) { rig.exchangeOf("GET", "RBW", "0\r1\r"); },
+                    [&](LineSetup& rig) { rig.exchange.GetInstrument("RBW", value); });
     EXPECT_EQ(times, (Times{0, 500, 0, 0, 0}));
 }
 
@@ -82,19 +82,19 @@ TEST_F(ModemDelays, Get_300BehindTheKeywordAnd100AheadOfTheValue) {
 }
 
 TEST(Delays, Tcp_HasNone) {
-    LineRig rig;
+    LineSetup rig;
     rig.overTcp();
     rig.socket.expect("set\r").answer("0\r");
     rig.socket.expect("RBW,1\r").answer("0\r");
     EXPECT_EQ(rig.time([&] { rig.exchange.SetInstrument("RBW,1"); }), 0);
 }
 
-void scriptTrace(LineRig& rig) {
+void scriptTrace(LineSetup& rig) {
     rig.port.expect("GET\r").answer("0\r");
     rig.port.expect("TRACEBIN\r").answer("0\r" + levelBlock(1));
 }
 
-void scriptComplexTrace(LineRig& rig) {
+void scriptComplexTrace(LineSetup& rig) {
     rig.port.expect("GET\r").answer("0\r");
     rig.port.expect("CTRACEBIN\r").answer("0\r" + levelBlock(1) + levelBlock(2));
 }
@@ -102,7 +102,7 @@ void scriptComplexTrace(LineRig& rig) {
 TEST(Delays, Trace_ByKind) {
     RawTrace trace;
     const Times times =
-        timesByKind(scriptTrace, [&](LineRig& rig) { rig.binary.GetTraceBinary(trace, false); });
+        timesByKind(scriptTrace, [&](LineSetup& rig) { rig.binary.GetTraceBinary(trace, false); });
     EXPECT_EQ(times, (Times{0, 200, 500, 0, 500}));
 }
 
@@ -116,8 +116,8 @@ TEST_F(ModemDelays, Trace_100BehindGetAnd100BehindTheKeyword) {
 
 TEST(Delays, ComplexTrace_ByKind) {
     std::vector<double> values;
-    const Times times =
-        timesByKind(scriptComplexTrace, [&](LineRig& rig) { rig.binary.GetCTraceBinary(values); });
+    const Times times = timesByKind(scriptComplexTrace,
+                                    [&](LineSetup& rig) { rig.binary.GetCTraceBinary(values); });
     EXPECT_EQ(times, (Times{0, 400, 0, 0, 0}));
 }
 
@@ -131,7 +131,7 @@ TEST_F(ModemDelays, ComplexTrace_200BehindGetAnd200BehindTheKeyword) {
 
 /// Moments of the re-requests of a complex trace on a line that fell silent.
 Times reRequests(std::int16_t kind) {
-    LineRig rig;
+    LineSetup rig;
     rig.panel.ConnectionState = kind;
     rig.state.ComplexTraceActive = true;
     rig.events.schedule(30'000, [&] { rig.port.close(); });

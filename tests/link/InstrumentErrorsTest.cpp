@@ -2,7 +2,7 @@
 
 #include "link/CommandExchange.h"
 #include "link/InstrumentErrors.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 
 namespace zel {
 namespace {
@@ -15,7 +15,7 @@ struct InstrumentErrors : ::testing::Test {
     Texts report(int status) {
         boxes.clear();
         ReportInstrumentError(state, boxes, status, "FREQ,1");
-        return told(boxes);
+        return shownBoxes(boxes);
     }
     static Texts box(const std::string& text) { return {"information | ZEL3 Error | " + text}; }
 };

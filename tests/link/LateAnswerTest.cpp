@@ -86,7 +86,7 @@ TEST_F(Line, AfterATimeOut_OneExchangeLooksForTheLateAnswerAndNoOther) {
 
 TEST_F(Line, PauseInsideTheStatusOfATransfer_ShiftsNoSample) {
     for (const int ms : {100, 5500, 9000}) {
-        LineRig rig;
+        LineSetup rig;
         std::string block;
         for (int i = 0; i < 301; ++i) block += std::string(1, static_cast<char>(i)) + "abc";
         rig.port.expect("GET\r").answer("0\r");

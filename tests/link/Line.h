@@ -15,7 +15,7 @@
 #include "link/ByteLink.h"
 #include "link/CommandExchange.h"
 #include "platform/virtual/VirtualPlatform.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 
 namespace zel {
 
@@ -51,8 +51,8 @@ struct StampedDebug : DebugChannel {
 };
 
 /// A direct serial link in session, at its beginning.
-struct LineRig {
-    LineRig() {
+struct LineSetup {
+    LineSetup() {
         SerialSetup setup;
         setup.CommPort = "COM1";
         port.open(setup);
@@ -101,7 +101,7 @@ struct LineRig {
         return now() - start;
     }
     std::string status() const { return panel.DebugTextBox.Text.get(); }
-    Texts shown() const { return told(boxes); }
+    Texts shown() const { return shownBoxes(boxes); }
     void expectPlayed() const {
         EXPECT_EQ(platform.port.failure(), "");
         EXPECT_EQ(platform.port.leftOver(), "");
@@ -115,7 +115,7 @@ struct LineRig {
     }
 };
 
-struct Line : LineRig, ::testing::Test {};
+struct Line : LineSetup, ::testing::Test {};
 
 /// The kinds of connection over the serial port.
 inline constexpr std::int16_t kSerialKinds[] = {ControllerForm::DIRECTCON, ControllerForm::MODEMCON,

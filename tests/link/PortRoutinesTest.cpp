@@ -3,7 +3,7 @@
 #include "link/RS232Ops.h"
 #include "link/TCPIPOps.h"
 #include "platform/virtual/VirtualPlatform.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 
 namespace zel {
 namespace {
@@ -54,14 +54,14 @@ TEST_F(PortRoutines, OpenComPort_BaudTextWithoutNumber_IsFalse) {
 TEST_F(PortRoutines, OpenComPortNumber_OpenPort_IsToldAndLeftAlone) {
     ops.OpenComPortNumber(port, "COM3", 19200);
     EXPECT_FALSE(ops.OpenComPortNumber(port, "COM4", 19200));
-    EXPECT_EQ(told(platform.boxes), Texts{"critical | ZELRemote | Port already opened!"});
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{"critical | ZELRemote | Port already opened!"});
     EXPECT_EQ(port.openings().size(), 1U);
     EXPECT_TRUE(port.isOpen());
 }
 
 TEST_F(PortRoutines, ReadComPortEvent_ClosedPort_IsTold) {
     EXPECT_EQ(readEvent(2), "");
-    EXPECT_EQ(told(platform.boxes), Texts{"critical | ZELRemote | Not Connected To Port!"});
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{"critical | ZELRemote | Not Connected To Port!"});
 }
 
 TEST_F(PortRoutines, ReadComPortEvent_DataReceived_WaitsForTheBurst) {

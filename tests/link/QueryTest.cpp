@@ -95,7 +95,7 @@ TEST_F(Query, LineThatCameInLate_IsNotTakenForTheAnswer) {
 
 TEST_F(Query, SilenceOnAnyLine_IsOneBoxAndFalse) {
     for (int answered = 0; answered < 3; ++answered) {
-        LineRig rig;
+        LineSetup rig;
         Dialogue& first = rig.port.expect("GET\r");
         if (answered > 0) {
             first.answer("0\r");
@@ -170,7 +170,7 @@ TEST_F(TcpQuery, EmptyValue_IsASuccess) {
 TEST_F(TcpQuery, SplitPacket_EverySplitPoint_GivesTheValue) {
     const std::string packet = "0\r1500000000\r";
     for (std::size_t at = 1; at < packet.size(); ++at) {
-        LineRig rig;
+        LineSetup rig;
         rig.overTcp();
         rig.socket.expect("GET\r").answer("0\r");
         rig.socket.expect("FREQ\r").answer(packet).chunks({at}, 200);

@@ -78,7 +78,7 @@ class FailingPort : public SerialPort {
     bool dead_ = false;
 };
 
-struct DeadLineRig {
+struct DeadLineSetup {
     VirtualPlatform platform;
     zelsim::InProcessPort instrument{platform.clock, platform.events};
     FailingPort line{instrument};
@@ -86,7 +86,7 @@ struct DeadLineRig {
     ControllerForm& panel = program.forms().controller;
     RecordedBoxes& boxes = platform.boxes;
 
-    DeadLineRig() {
+    DeadLineSetup() {
         program.start();
         connect();
     }

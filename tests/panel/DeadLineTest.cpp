@@ -204,7 +204,7 @@ class DeadLine : public ::testing::TestWithParam<Handler> {
               &CF::ResetButton, &CF::MarkPkButton, &CF::MarkToRefButton, &CF::SendButton})
             EXPECT_TRUE((panel.*key).Enabled);
     }
-    static void expectTold(const DeadLineRig& rig, int line, End end) {
+    static void expectTold(const DeadLineSetup& rig, int line, End end) {
         const Texts texts = rig.boxes.texts();
         // A transfer that comes short is drawn as far as it came.
         const bool quiet = end == End::Silent && rig.line.lastLine() == "TRACEBIN\r";
@@ -218,7 +218,7 @@ class DeadLine : public ::testing::TestWithParam<Handler> {
         EXPECT_NE(std::find(texts.begin(), texts.end(), GetParam().failure), texts.end());
     }
     /// The key of the frequency menu asks, and is answered.
-    static void expectWorksAgain(DeadLineRig& rig) {
+    static void expectWorksAgain(DeadLineSetup& rig) {
         std::string measurement;
         EXPECT_TRUE(rig.answers(measurement));
         const int mode = static_cast<int>(rig.instrument.device().settings().measurement());
@@ -232,7 +232,7 @@ class DeadLine : public ::testing::TestWithParam<Handler> {
 TEST_P(DeadLine, Handler_TellsItAndLeavesThePanelUsable) {
     int lines = 0;
     {
-        DeadLineRig good;
+        DeadLineSetup good;
         GetParam().ready(good.panel);
         good.line.failAt(0, End::Silent);
         GetParam().work(good.panel);
@@ -243,7 +243,7 @@ TEST_P(DeadLine, Handler_TellsItAndLeavesThePanelUsable) {
         for (int line = 1; line <= lines; ++line) {
             SCOPED_TRACE((end == End::Silent ? "silent at line " : "dead at line ") +
                          std::to_string(line));
-            DeadLineRig rig;
+            DeadLineSetup rig;
             GetParam().ready(rig.panel);
             rig.boxes.clear();
             rig.line.failAt(line, end);
@@ -275,7 +275,7 @@ TEST_P(DeadLineInTheView, Stop_IsTheWayBack) {
     constexpr int kLinesOfThreePasses = 26;
     for (int line = 1; line <= kLinesOfThreePasses; ++line) {
         SCOPED_TRACE("line " + std::to_string(line));
-        DeadLineRig rig;
+        DeadLineSetup rig;
         rig.boxes.clear();
         rig.line.failAt(line, GetParam());
         rig.panel.PlayContinuousButton.Click();  // comes back by itself

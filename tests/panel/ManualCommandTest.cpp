@@ -5,7 +5,7 @@
 
 #include "panel/ManualCommand.h"
 #include "platform/KeyInput.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 #include "tests/panel/Panel.h"
 
 namespace zel {
@@ -81,7 +81,7 @@ TEST_F(ManualCommandTest, CharacterThatTheInstrumentDoesNotKnow_IsRefused) {
     send("NAME,5 \u03A9");
     EXPECT_EQ(port.written(), "");
     EXPECT_EQ(
-        told(platform.boxes),
+        shownBoxes(platform.boxes),
         Texts{"plain | ZELRemote | The instrument has no character for \"\u03A9\".\r\nNothing "
               "was sent."});
     EXPECT_EQ(panel.MousePointer.get(), 0);

@@ -22,7 +22,7 @@ TEST(EntryColours, Entry_PaintsItsOwnKeyRedAndNoOther) {
         {kSweep, 0, "50m"}, {kSweep, 4, "1m"},  {kOccBW, 2, "2M"}, {kDtf, 1, "20"},
     };
     for (const Painted& row : rows) {
-        DeadLineRig rig;
+        DeadLineSetup rig;
         (rig.panel.*row.menu.key).Click();
         for (Button& key : rig.panel.SoftKey) key.BackColor = kGreen;
         rig.panel.SoftBoxFirstKey = 2;

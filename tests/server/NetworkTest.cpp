@@ -3,35 +3,35 @@
 #include <algorithm>
 #include <cmath>
 
-#include "tests/server/NetworkRig.h"
+#include "tests/server/NetworkSetup.h"
 
 namespace zel {
 namespace {
 
 constexpr NetFault kFaults[] = {NetFault::Reset, NetFault::HalfOpen, NetFault::Split};
-constexpr int kWays[] = {NetworkRig::kToServer, NetworkRig::kToClient};
+constexpr int kWays[] = {NetworkSetup::kToServer, NetworkSetup::kToClient};
 constexpr std::size_t kSamples = 301;
 constexpr std::size_t kMostForLine = 64 * 1024 + 4096;
 
 std::string placeOf(NetFault fault, int way, long byte) {
     constexpr const char* kNames[] = {"none", "reset", "half-open", "split"};
     return std::string(kNames[static_cast<int>(fault)]) + " at byte " + std::to_string(byte) +
-           (way == NetworkRig::kToServer ? " to the server" : " to the client");
+           (way == NetworkSetup::kToServer ? " to the server" : " to the client");
 }
 
 /// The server is at work, its line is free, and a client that comes now is served.
-void expectNextClientWorks(NetworkRig& rig) {
+void expectNextClientWorks(NetworkSetup& rig) {
     EXPECT_TRUE(rig.server.server().bridging());
     EXPECT_EQ(rig.waiting(), 0U);
     rig.client.disconnect();
     rig.desk.boxes.clear();
     ASSERT_TRUE(rig.connect());
-    EXPECT_EQ(told(rig.desk.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(rig.desk.boxes), Texts{});
     EXPECT_TRUE(rig.asksRightCentre());
-    EXPECT_EQ(told(rig.far.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(rig.far.boxes), Texts{});
 }
 
-void expectWholeTrace(const NetworkRig& rig) {
+void expectWholeTrace(const NetworkSetup& rig) {
     ASSERT_EQ(rig.panel.RawTraceData.size(), kSamples);
     const auto [least, most] =
         std::minmax_element(rig.panel.RawTraceData.begin(), rig.panel.RawTraceData.end());
@@ -40,9 +40,9 @@ void expectWholeTrace(const NetworkRig& rig) {
 }
 
 TEST(Network, Session_OverTheServer_IsAsOnTheDesk) {
-    NetworkRig rig;
+    NetworkSetup rig;
     ASSERT_TRUE(rig.connect());
-    EXPECT_EQ(told(rig.desk.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(rig.desk.boxes), Texts{});
     EXPECT_TRUE(rig.asksRightCentre());
     EXPECT_TRUE(rig.client.exchange().SetInstrument("TRACEDET,3"));
     rig.client.variables().TraceDetector = 3;
@@ -55,19 +55,19 @@ TEST(Network, Session_OverTheServer_IsAsOnTheDesk) {
 }
 
 TEST(Network, Query_FaultAtEachByte_NeverShowsAWrongValue) {
-    NetworkRig good;
+    NetworkSetup good;
     ASSERT_TRUE(good.connect());
     std::string value;
     long counts[2];
     for (const int way : kWays) good.arm(way, NetFault::None, 0);
     ASSERT_TRUE(good.get("FREQ", value));
     for (const int way : kWays) counts[way] = good.passed(way);
-    ASSERT_EQ(counts[NetworkRig::kToServer], 9);
+    ASSERT_EQ(counts[NetworkSetup::kToServer], 9);
     for (const int way : kWays)
         for (const NetFault fault : kFaults)
             for (long byte = 0; byte < counts[way]; ++byte) {
                 SCOPED_TRACE(placeOf(fault, way, byte));
-                NetworkRig rig;
+                NetworkSetup rig;
                 ASSERT_TRUE(rig.connect());
                 rig.arm(way, fault, byte);
                 std::string got = "old";
@@ -76,37 +76,37 @@ TEST(Network, Query_FaultAtEachByte_NeverShowsAWrongValue) {
                 EXPECT_EQ(got, done ? value : "old");
                 // The end of a connection is reported at the next exchange at the latest.
                 rig.client.disconnect();
-                EXPECT_EQ(told(rig.desk.boxes).empty(), done);
+                EXPECT_EQ(shownBoxes(rig.desk.boxes).empty(), done);
                 expectNextClientWorks(rig);
                 if (::testing::Test::HasFailure()) return;
             }
 }
 
 TEST(Network, Trace_SplitAtEachByte_IsWhole) {
-    NetworkRig rig;
+    NetworkSetup rig;
     ASSERT_TRUE(rig.connect());
     ASSERT_TRUE(rig.client.exchange().SetInstrument("TRACEDET,3"));
     rig.client.variables().TraceDetector = 3;
-    rig.arm(NetworkRig::kToClient, NetFault::None, 0);
+    rig.arm(NetworkSetup::kToClient, NetFault::None, 0);
     ASSERT_TRUE(rig.readTrace());
-    const long count = rig.passed(NetworkRig::kToClient);
+    const long count = rig.passed(NetworkSetup::kToClient);
     ASSERT_GT(count, 1205);
     for (long byte = 0; byte < count; ++byte) {
         SCOPED_TRACE(byte);
-        rig.arm(NetworkRig::kToClient, NetFault::Split, byte);
+        rig.arm(NetworkSetup::kToClient, NetFault::Split, byte);
         ASSERT_TRUE(rig.readTrace());
         expectWholeTrace(rig);
         if (::testing::Test::HasFailure()) return;
     }
-    EXPECT_EQ(told(rig.desk.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(rig.desk.boxes), Texts{});
 }
 
 TEST(Network, Trace_ConnectionThatFails_IsNeverShownAsWhole) {
     constexpr long kStep = 61;
     for (const NetFault fault : {NetFault::Reset, NetFault::HalfOpen})
         for (long byte = 0; byte < 1200; byte += kStep) {
-            SCOPED_TRACE(placeOf(fault, NetworkRig::kToClient, byte));
-            NetworkRig rig;
+            SCOPED_TRACE(placeOf(fault, NetworkSetup::kToClient, byte));
+            NetworkSetup rig;
             ASSERT_TRUE(rig.connect());
             ASSERT_TRUE(rig.client.exchange().SetInstrument("TRACEDET,3"));
             rig.client.variables().TraceDetector = 3;
@@ -115,7 +115,7 @@ TEST(Network, Trace_ConnectionThatFails_IsNeverShownAsWhole) {
                 ++cut;
                 EXPECT_LT(sweep.came, sweep.wanted);
             });
-            rig.arm(NetworkRig::kToClient, fault, byte);
+            rig.arm(NetworkSetup::kToClient, fault, byte);
             const bool whole = rig.readTrace() && cut == 0;
             EXPECT_FALSE(whole);
             expectNextClientWorks(rig);
@@ -126,7 +126,7 @@ TEST(Network, Trace_ConnectionThatFails_IsNeverShownAsWhole) {
 TEST(Network, LineOfTheServerThatFails_IsReportedOnBothSides) {
     for (long byte = 0; byte < 4; ++byte) {
         SCOPED_TRACE(byte);
-        NetworkRig rig;
+        NetworkSetup rig;
         ASSERT_TRUE(rig.connect());
         LineFaults faults;
         faults.dropAt = byte;
@@ -134,7 +134,7 @@ TEST(Network, LineOfTheServerThatFails_IsReportedOnBothSides) {
         std::string got = "old";
         EXPECT_FALSE(rig.get("FREQ", got));
         EXPECT_EQ(got, "old");
-        EXPECT_FALSE(told(rig.desk.boxes).empty());
+        EXPECT_FALSE(shownBoxes(rig.desk.boxes).empty());
         rig.run(2000);
         EXPECT_FALSE(rig.server.server().bridging());
         EXPECT_NE(rig.server.server().problem().find("The port has gone."), std::string::npos);
@@ -152,7 +152,7 @@ TEST(Network, FirstBytesOfOtherPrograms_HoldUpNobody) {
         std::string(5000, '\0'), std::string("\xFF\xFD\x18\xFF\xFD\x20\r\n+++ATH0\r", 17)};
     for (const std::string& scan : scans) {
         SCOPED_TRACE(scan.substr(0, 8));
-        NetworkRig rig;
+        NetworkSetup rig;
         PipeSocket scanner(rig.desk.events);
         scanner.knocks = [&](PipeSocket& who) { rig.listener.knock(who); };
         scanner.connectTo("127.0.0.1", 2277);
@@ -168,7 +168,7 @@ TEST(Network, FirstBytesOfOtherPrograms_HoldUpNobody) {
 }
 
 TEST(Network, Flood_IsTakenAtThePaceOfTheLine) {
-    NetworkRig rig;
+    NetworkSetup rig;
     PipeSocket flooder(rig.desk.events);
     flooder.knocks = [&](PipeSocket& who) { rig.listener.knock(who); };
     flooder.connectTo("127.0.0.1", 2277);
@@ -186,7 +186,7 @@ TEST(Network, Flood_IsTakenAtThePaceOfTheLine) {
 }
 
 TEST(Network, ClientThatTakesNothing_IsClosedAndTheNextOneWorks) {
-    NetworkRig rig;
+    NetworkSetup rig;
     PipeSocket greedy(rig.desk.events);
     greedy.knocks = [&](PipeSocket& who) { rig.listener.knock(who); };
     greedy.connectTo("127.0.0.1", 2277);
@@ -194,7 +194,7 @@ TEST(Network, ClientThatTakesNothing_IsClosedAndTheNextOneWorks) {
     greedy.sendData("\r");
     rig.run(1000);
     // From here on nothing passes to the client: it stays in the server's queue.
-    greedy.pipe()->ways[NetworkRig::kToClient].scheduled = true;
+    greedy.pipe()->ways[NetworkSetup::kToClient].scheduled = true;
     std::size_t most = 0;
     for (int i = 0; i < 2000 && rig.form.ClientState == 7; ++i) {
         greedy.sendData("GET\r");

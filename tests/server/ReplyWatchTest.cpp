@@ -1,4 +1,4 @@
-// What the client asked tells when the reply is whole; what is unclear waits for a quiet line.
+// When the reply to the last line of the client is whole; what is unclear waits for a quiet line.
 
 #include "server/ReplyWatch.h"
 #include "tests/server/ServerBench.h"

@@ -6,7 +6,7 @@
 #include "server/ServerBridge.h"
 #include "server/ServerDialog.h"
 #include "tests/Session.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 
 namespace zel {
 
@@ -26,7 +26,7 @@ struct ServerBench : TestSession {
     ScriptedSocket& client = platform.serverSocket.far();
     Texts happened;
 
-    Texts shown() const { return told(platform.boxes); }
+    Texts shown() const { return shownBoxes(platform.boxes); }
     void later(int ms, std::function<void()> act) { platform.events.schedule(ms, std::move(act)); }
     void run(double ms) { platform.events.runFor(ms); }
     /// An instrument that answers at this speed.

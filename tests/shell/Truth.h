@@ -13,7 +13,7 @@
 #include "link/CommandExchange.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
-#include "tests/server/NetworkRig.h"
+#include "tests/server/NetworkSetup.h"
 #include "trace/TraceReader.h"
 
 namespace zel {

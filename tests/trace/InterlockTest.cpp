@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "link/CommandExchange.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 #include "tests/trace/ReadCycle.h"
 #include "trace/Interlock.h"
 
@@ -17,7 +17,7 @@ using Turn = Interlock::Turn;
 
 struct InterlockTest : ReadCycle {
     Interlock& interlock = program.interlock();
-    Texts shown() const { return told(boxes); }
+    Texts shown() const { return shownBoxes(boxes); }
     /// A user's click, as a front passes it on.
     template <class T>
     bool click(T& control) {

@@ -14,7 +14,7 @@
 #include <csignal>
 
 #include "desktop/graph/GraphImage.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 #include "tests/desktop/graph/MetafilePlayer.h"
 
 namespace zel {
@@ -270,7 +270,7 @@ TEST_F(GraphImage, Success_ReplacesTheOlderFile) {
     EXPECT_EQ(playMetafile(contents(path)).faults, std::vector<std::string>());
 }
 
-class PanelImage : public Desk {};
+class PanelImage : public WindowTest {};
 
 TEST_F(PanelImage, DrawImage_WritesTheWindowsGraph) {
     connect();

@@ -6,12 +6,12 @@
 #include <QXmlStreamReader>
 
 #include "desktop/graph/GraphImage.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
-class GraphDesk : public Desk {
+class GraphWidgetTest : public WindowTest {
   protected:
     void SetUp() override {
         connect();
@@ -29,7 +29,7 @@ class GraphDesk : public Desk {
     }
 };
 
-TEST_F(GraphDesk, ZoomRectangle_SetsBothAxesAndEndsTheMode) {
+TEST_F(GraphWidgetTest, ZoomRectangle_SetsBothAxesAndEndsTheMode) {
     panel().cmdZoom.Click();
     window->showNow();
     drag(at(1e9, -40), at(2e9, -90));
@@ -42,7 +42,7 @@ TEST_F(GraphDesk, ZoomRectangle_SetsBothAxesAndEndsTheMode) {
     EXPECT_TRUE(panel().GraphZoomed);
 }
 
-TEST_F(GraphDesk, ZoomRectangle_OfAFewPixels_ChangesNothing) {
+TEST_F(GraphWidgetTest, ZoomRectangle_OfAFewPixels_ChangesNothing) {
     panel().cmdZoom.Click();
     window->showNow();
     const QPoint start = at(1e9, -40);
@@ -50,13 +50,13 @@ TEST_F(GraphDesk, ZoomRectangle_OfAFewPixels_ChangesNothing) {
     EXPECT_EQ(panel().CWGraph1.xAxis().Maximum, 3e9);
 }
 
-TEST_F(GraphDesk, PointerOverThePlot_ShowsItsPlace) {
+TEST_F(GraphWidgetTest, PointerOverThePlot_ShowsItsPlace) {
     QTest::mouseMove(&window->graph(), at(1.5e9, -70));
     EXPECT_EQ(panel().DeltaLabel.Caption.get().rfind("Cursor:1.", 0), 0U)
         << panel().DeltaLabel.Caption.get();
 }
 
-TEST_F(GraphDesk, ShownCursor_IsDraggedAndSnapsToTheTrace) {
+TEST_F(GraphWidgetTest, ShownCursor_IsDraggedAndSnapsToTheTrace) {
     panel().MarkerCheckBox.Click();
     window->showNow();
     const GraphCursor before = panel().CWGraph1.cursor(1);
@@ -72,7 +72,7 @@ TEST_F(GraphDesk, ShownCursor_IsDraggedAndSnapsToTheTrace) {
     EXPECT_EQ(panel().MarkerLabel.Caption.get().rfind("Marker:", 0), 0U);
 }
 
-TEST_F(GraphDesk, LabelsOfADraggedMarker_FollowBeforeItIsLetGo) {
+TEST_F(GraphWidgetTest, LabelsOfADraggedMarker_FollowBeforeItIsLetGo) {
     panel().MarkerCheckBox.Click();
     window->showNow();
     GraphWidget& graph = window->graph();
@@ -91,7 +91,7 @@ TEST_F(GraphDesk, LabelsOfADraggedMarker_FollowBeforeItIsLetGo) {
     EXPECT_EQ(panel().MarkerLabel.Caption.get(), texts[2]);
 }
 
-TEST_F(GraphDesk, DeltaMarker_IsDraggedByItself) {
+TEST_F(GraphWidgetTest, DeltaMarker_IsDraggedByItself) {
     panel().MarkerCheckBox.Click();
     panel().DeltaCheckBox.Click();
     window->showNow();
@@ -106,7 +106,7 @@ TEST_F(GraphDesk, DeltaMarker_IsDraggedByItself) {
         << panel().DeltaLabel.Caption.get();
 }
 
-TEST_F(GraphDesk, PointerOverAMarker_ShowsThatItCanBeDragged) {
+TEST_F(GraphWidgetTest, PointerOverAMarker_ShowsThatItCanBeDragged) {
     panel().MarkerCheckBox.Click();
     window->showNow();
     GraphWidget& graph = window->graph();
@@ -117,7 +117,7 @@ TEST_F(GraphDesk, PointerOverAMarker_ShowsThatItCanBeDragged) {
     EXPECT_NE(graph.cursor().shape(), Qt::SplitHCursor);
 }
 
-TEST_F(GraphDesk, ArrowKey_MovesTheCursorByOnePoint) {
+TEST_F(GraphWidgetTest, ArrowKey_MovesTheCursorByOnePoint) {
     panel().MarkerCheckBox.Click();
     window->showNow();
     const Graph& graph = panel().CWGraph1;
@@ -129,7 +129,7 @@ TEST_F(GraphDesk, ArrowKey_MovesTheCursorByOnePoint) {
     EXPECT_NEAR(graph.cursor(1).X, before, 1);
 }
 
-TEST_F(GraphDesk, F1_IsToldToTheGraph) {
+TEST_F(GraphWidgetTest, F1_IsToldToTheGraph) {
     std::vector<int> codes;
     panel().CWGraph1.KeyDown.connect([&codes](int code, int) { codes.push_back(code); });
     QTest::keyClick(&window->graph(), Qt::Key_F1);
@@ -142,7 +142,7 @@ void collectTexts(QCPLayout& layout, QList<QCPTextElement*>& texts) {
         if (auto* text = qobject_cast<QCPTextElement*>(element)) texts << text;
 }
 
-TEST_F(GraphDesk, LongTextsAroundTheGraph_AreNotCutInTheSmallestWindow) {
+TEST_F(GraphWidgetTest, LongTextsAroundTheGraph_AreNotCutInTheSmallestWindow) {
     ZEL3Variables& mirror = program->variables();
     mirror.ReferenceUnit = 3;
     mirror.ReferenceLevel = -123.45;
@@ -161,7 +161,7 @@ TEST_F(GraphDesk, LongTextsAroundTheGraph_AreNotCutInTheSmallestWindow) {
     }
 }
 
-TEST_F(GraphDesk, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
+TEST_F(GraphWidgetTest, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
     ZEL3Variables& mirror = program->variables();
     mirror.ReferenceLevel = -20;
     window->binder().flush();
@@ -192,13 +192,13 @@ TEST_F(GraphDesk, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
     EXPECT_EQ(widgetOf<QLabel>(panel().SpanLabel)->styleSheet(), "");
 }
 
-TEST_F(GraphDesk, HiddenCursor_IsNotDragged) {
+TEST_F(GraphWidgetTest, HiddenCursor_IsNotDragged) {
     const double before = panel().CWGraph1.cursor(1).X;
     drag(at(before, -60), at(6e8, -60));
     EXPECT_EQ(panel().CWGraph1.cursor(1).X, before);
 }
 
-TEST_F(GraphDesk, Png_IsWrittenWithThePlot) {
+TEST_F(GraphWidgetTest, Png_IsWrittenWithThePlot) {
     const QTemporaryDir folder;
     const QString file = folder.filePath("graph.png");
     QString error;
@@ -217,7 +217,7 @@ TEST_F(GraphDesk, Png_IsWrittenWithThePlot) {
     EXPECT_GT(tracePixels, 1000);
 }
 
-TEST_F(GraphDesk, Svg_IsWellFormedAndKeepsTheZoomedTraceInside) {
+TEST_F(GraphWidgetTest, Svg_IsWellFormedAndKeepsTheZoomedTraceInside) {
     panel().CWGraph1.setXRange(1e9, 1.1e9);
     const QTemporaryDir folder;
     const QString file = folder.filePath("graph.svg");
@@ -234,13 +234,13 @@ TEST_F(GraphDesk, Svg_IsWellFormedAndKeepsTheZoomedTraceInside) {
     EXPECT_GT(lines, 0);
 }
 
-TEST_F(GraphDesk, PictureOfAnUnknownKind_IsRefusedInWords) {
+TEST_F(GraphWidgetTest, PictureOfAnUnknownKind_IsRefusedInWords) {
     QString error;
     EXPECT_FALSE(saveGraphImage(panel().CWGraph1, {}, "graph.xyz", &error));
     EXPECT_EQ(error, "Unknown kind of picture: .xyz (wmf, svg, png or pdf)");
 }
 
-TEST_F(GraphDesk, PictureThatCannotBeWritten_SaysWhichAndWhy) {
+TEST_F(GraphWidgetTest, PictureThatCannotBeWritten_SaysWhichAndWhy) {
     QString error;
     EXPECT_FALSE(saveGraphImage(panel().CWGraph1, {}, "/no/such/folder/graph.png", &error));
     EXPECT_TRUE(error.startsWith("Cannot write /no/such/folder/graph.png: "))

@@ -8,7 +8,7 @@
 
 #include "desktop/graph/MetafileEngine.h"
 #include "desktop/graph/PolylineClip.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 #include "tests/desktop/graph/MetafilePlayer.h"
 
 namespace zel {

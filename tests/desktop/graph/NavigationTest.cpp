@@ -4,12 +4,12 @@
 #include <QWheelEvent>
 
 #include "desktop/graph/AxisText.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
-class NavigationDesk : public Desk {
+class NavigationTest : public WindowTest {
   protected:
     void SetUp() override {
         connect();
@@ -29,7 +29,7 @@ class NavigationDesk : public Desk {
     const Graph& graph() { return panel().CWGraph1; }
 };
 
-TEST_F(NavigationDesk, Wheel_LooksCloserAboutThePointer) {
+TEST_F(NavigationTest, Wheel_LooksCloserAboutThePointer) {
     const QPointF place = at(1e9, -60);
     wheel(place, 2);
     EXPECT_NEAR(graph().xAxis().Maximum - graph().xAxis().Minimum, 3e9 / 1.25 / 1.25, 1e3);
@@ -39,14 +39,14 @@ TEST_F(NavigationDesk, Wheel_LooksCloserAboutThePointer) {
     EXPECT_EQ(graph().yAxis().Maximum, -20);
 }
 
-TEST_F(NavigationDesk, ShiftAndWheel_ChangeTheLevelAxisAndItsWrittenScale) {
+TEST_F(NavigationTest, ShiftAndWheel_ChangeTheLevelAxisAndItsWrittenScale) {
     wheel(at(1e9, -60), 8, Qt::ShiftModifier);
     EXPECT_EQ(graph().xAxis().Maximum, 3e9);
     EXPECT_NEAR(graph().yAxis().Maximum - graph().yAxis().Minimum, 100 / std::pow(1.25, 8), 1e-6);
     EXPECT_FALSE(panel().GraphZoomed);
 }
 
-TEST_F(NavigationDesk, History_GoesBackAndForth) {
+TEST_F(NavigationTest, History_GoesBackAndForth) {
     wheel(at(1e9, -60), 2);
     const double closer = graph().xAxis().Maximum;
     QTest::keyClick(&window->graph(), Qt::Key_Left, Qt::AltModifier);
@@ -55,7 +55,7 @@ TEST_F(NavigationDesk, History_GoesBackAndForth) {
     EXPECT_EQ(graph().xAxis().Maximum, closer);
 }
 
-TEST_F(NavigationDesk, Home_ShowsTheWholeView) {
+TEST_F(NavigationTest, Home_ShowsTheWholeView) {
     wheel(at(1e9, -60), 3);
     wheel(at(1e9, -60), 3, Qt::ShiftModifier);
     QTest::keyClick(&window->graph(), Qt::Key_Home);
@@ -67,7 +67,7 @@ TEST_F(NavigationDesk, Home_ShowsTheWholeView) {
     EXPECT_EQ(panel().cmdZoom.Caption.get(), "Zoom");
 }
 
-TEST_F(NavigationDesk, MiddleButton_PansBothAxes) {
+TEST_F(NavigationTest, MiddleButton_PansBothAxes) {
     GraphWidget& widget = window->graph();
     const QPoint start = at(1e9, -60).toPoint();
     QTest::mousePress(&widget, Qt::MiddleButton, {}, start);
@@ -78,14 +78,14 @@ TEST_F(NavigationDesk, MiddleButton_PansBothAxes) {
     EXPECT_NEAR(graph().xAxis().Maximum - graph().xAxis().Minimum, 3e9, 1);
 }
 
-TEST_F(NavigationDesk, WheelWithoutATrace_ChangesNothing) {
+TEST_F(NavigationTest, WheelWithoutATrace_ChangesNothing) {
     panel().CWGraph1.clearPlot();
     window->showNow();
     wheel(at(1e9, -60), 3);
     EXPECT_EQ(graph().xAxis().Maximum, 3e9);
 }
 
-TEST_F(NavigationDesk, PointerThatLeaves_GivesTheDeltaItsTextBack) {
+TEST_F(NavigationTest, PointerThatLeaves_GivesTheDeltaItsTextBack) {
     panel().DeltaLabel.Caption = "Delta: 1 MHz; -3 dBm";
     panel().DeltaLabel.ForeColor = 65280;
     QTest::mouseMove(&window->graph(), at(1.5e9, -70).toPoint());
@@ -97,7 +97,7 @@ TEST_F(NavigationDesk, PointerThatLeaves_GivesTheDeltaItsTextBack) {
     EXPECT_EQ(panel().DeltaLabel.ForeColor.get(), 65280U);
 }
 
-TEST_F(NavigationDesk, ReadingThatComesUnderThePointer_IsWhatComesBack) {
+TEST_F(NavigationTest, ReadingThatComesUnderThePointer_IsWhatComesBack) {
     panel().DeltaLabel.Caption = "Delta: 1 MHz; -3 dBm";
     QTest::mouseMove(&window->graph(), at(1.5e9, -70).toPoint());
     panel().DeltaLabel.Caption = "Delta: 2 MHz; -4 dBm";
@@ -107,7 +107,7 @@ TEST_F(NavigationDesk, ReadingThatComesUnderThePointer_IsWhatComesBack) {
     EXPECT_EQ(panel().DeltaLabel.Caption.get(), "Delta: 2 MHz; -4 dBm");
 }
 
-TEST_F(NavigationDesk, PairsOfTheAutoPeakDetector_AreABand) {
+TEST_F(NavigationTest, PairsOfTheAutoPeakDetector_AreABand) {
     ASSERT_EQ(graph().values().size(), 602U);
     window->showNow();
     const std::size_t pair = 150;
@@ -119,7 +119,7 @@ TEST_F(NavigationDesk, PairsOfTheAutoPeakDetector_AreABand) {
     EXPECT_LT(low, high);
 }
 
-TEST_F(NavigationDesk, PeakOfTheBand_StandsWhereTheInstrumentHasIt) {
+TEST_F(NavigationTest, PeakOfTheBand_StandsWhereTheInstrumentHasIt) {
     panel().MarkerCheckBox.Click();
     panel().MarkPkButton.Click();
     window->showNow();
@@ -136,7 +136,7 @@ TEST(AxisText, Digits_TellNeighboursApart) {
     EXPECT_EQ(levelText(std::nan(""), "dBm"), "");
 }
 
-TEST_F(NavigationDesk, EntryThatCannotBeRead_IsMarkedAndNotSent) {
+TEST_F(NavigationTest, EntryThatCannotBeRead_IsMarkedAndNotSent) {
     auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
     QTest::keyClicks(box, "5 dBm");
     QTest::keyClick(box, Qt::Key_Return);
@@ -148,7 +148,7 @@ TEST_F(NavigationDesk, EntryThatCannotBeRead_IsMarkedAndNotSent) {
     EXPECT_FALSE(box->property("refused").toBool());
 }
 
-TEST_F(NavigationDesk, EntryWithACommaAndASmallPrefix_IsSentAsItIsMeant) {
+TEST_F(NavigationTest, EntryWithACommaAndASmallPrefix_IsSentAsItIsMeant) {
     auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
     QTest::keyClicks(box, "2,4g");
     QTest::keyClick(box, Qt::Key_Return);
@@ -157,7 +157,7 @@ TEST_F(NavigationDesk, EntryWithACommaAndASmallPrefix_IsSentAsItIsMeant) {
     EXPECT_EQ(box->text(), "2.4 GHz");
 }
 
-TEST_F(NavigationDesk, LetterInTheManualScale_KeepsItFromBeingTaken) {
+TEST_F(NavigationTest, LetterInTheManualScale_KeepsItFromBeingTaken) {
     panel().UtilityGraphSettings.Click();
     window->binder().flush();
     ManualScaleForm& form = program->forms().manualScale;

@@ -12,7 +12,7 @@
 
 #include "desktop/platform/DeviceName.h"
 #include "desktop/platform/QtPlatform.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {

@@ -15,7 +15,7 @@
 #include <csignal>
 
 #include "desktop/platform/QtPlatform.h"
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {

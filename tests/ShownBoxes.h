@@ -29,14 +29,14 @@ inline std::string iconName(BoxIcon icon) {
 }
 
 /// "critical | ZELRemote | Port not open!"
-inline std::string toldLine(const Box& box) {
+inline std::string boxLine(const Box& box) {
     return iconName(box.icon) + " | " + box.title + " | " + box.text;
 }
 
 /// All boxes so far, in order.
-inline Texts told(const RecordedBoxes& boxes) {
+inline Texts shownBoxes(const RecordedBoxes& boxes) {
     Texts lines;
-    for (const Box& box : boxes.boxes()) lines.push_back(toldLine(box));
+    for (const Box& box : boxes.boxes()) lines.push_back(boxLine(box));
     return lines;
 }
 

@@ -1,4 +1,4 @@
-#include "tests/desktop/Desk.h"
+#include "tests/desktop/WindowTest.h"
 
 #include <QDir>
 
@@ -25,7 +25,7 @@ bool savePicture(QWidget& widget, const QString& name) {
     return QDir().mkpath(folder) && widget.grab().save(folder + "/" + name + ".png");
 }
 
-Desk::Desk() {
+WindowTest::WindowTest() {
     applyTheme(testApplication(), ThemeChoice::Dark);
     program = std::make_unique<Program>(platform.bundle(port), "");
     program->start();
@@ -33,13 +33,13 @@ Desk::Desk() {
     window->buildAll();
 }
 
-Desk::~Desk() { window.reset(); }
+WindowTest::~WindowTest() { window.reset(); }
 
-void Desk::connect() {
+void WindowTest::connect() {
     ASSERT_TRUE(program->connect({LinkAddress::Kind::Serial, "/dev/zel3", 57600}, true));
 }
 
-void Desk::show() {
+void WindowTest::show() {
     window->show();
     window->showNow();
     QApplication::processEvents();

@@ -20,10 +20,10 @@ QApplication& testApplication();
 /// A picture beside the test's program, to be looked at.
 bool savePicture(QWidget& widget, const QString& name);
 
-class Desk : public testing::Test {
+class WindowTest : public testing::Test {
   protected:
-    Desk();
-    ~Desk() override;
+    WindowTest();
+    ~WindowTest() override;
 
     void connect();
     ControllerForm& panel() { return program->forms().controller; }

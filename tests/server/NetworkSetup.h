@@ -16,7 +16,7 @@
 #include "server/ServerDialog.h"
 #include "shell/Program.h"
 #include "support/NumberText.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 #include "trace/TraceReader.h"
 
 namespace zel {
@@ -196,7 +196,7 @@ class PipeServer : public ServerSocket {
     int request_ = 0;
 };
 
-struct NetworkRig {
+struct NetworkSetup {
     static constexpr int kToServer = 0;
     static constexpr int kToClient = 1;
 
@@ -211,7 +211,7 @@ struct NetworkRig {
     ServerForm& form = server.forms().server;
     ControllerForm& panel = client.forms().controller;
 
-    NetworkRig() {
+    NetworkSetup() {
         socket.knocks = [this](PipeSocket& who) { listener.knock(who); };
         server.start();
         client.start();

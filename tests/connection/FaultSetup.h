@@ -17,7 +17,7 @@
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
 #include "support/NumberText.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 #include "trace/TraceReader.h"
 
 namespace zel {
@@ -65,7 +65,7 @@ inline constexpr Fault kFaults[] = {Fault::Dies, Fault::Splits, Fault::Stalls, F
 inline constexpr int kStallMs = 3000;
 inline constexpr const char* kFaultNames[] = {"dies", "splits", "stalls", "garbles", "loses"};
 
-struct FaultRig {
+struct FaultSetup {
     VirtualPlatform platform;
     zelsim::InProcessPort instrument{platform.clock, platform.events};
     FaultyPort faulty{instrument, platform.events};
@@ -73,7 +73,7 @@ struct FaultRig {
     Program program{platform.bundle(line), ""};
     ControllerForm& panel = program.forms().controller;
 
-    FaultRig() { program.start(); }
+    FaultSetup() { program.start(); }
 
     void arm(Fault fault, long byte) {
         LineFaults faults;
