@@ -111,6 +111,12 @@ void GraphSide::showChannel() {
 }
 
 void GraphSide::showPower() {
+    // The edges of the channel belong to the mode, whether the trace changes with it or not.
+    if (shownMode_ != panel_.InstrumentMode) {
+        shownMode_ = panel_.InstrumentMode;
+        showChannel();
+        graph_->refresh();
+    }
     const bool power = panel_.isConnected && panel_.InstrumentMode == ControllerForm::POWERSENSOR;
     if (power == power_->isVisibleTo(graph_)) return;
     power_->setVisible(power);

@@ -2,6 +2,7 @@
 // The graph with all that stands on it and under it.
 
 #include <QWidget>
+#include <cstdint>
 #include <functional>
 #include <memory>
 
@@ -48,6 +49,7 @@ class GraphSide : public QWidget {
     PowerDisplay* power_;
     Readouts* readouts_;
     GraphNavigator navigator_;
+    std::int16_t shownMode_ = 0;
     std::unique_ptr<PointerText> pointer_;
 };
 
