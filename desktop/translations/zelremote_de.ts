@@ -877,5 +877,121 @@ oder eine Aufzeichnung laden</translation>
         <source>simulated instrument</source>
         <translation>simuliertes Gerät</translation>
     </message>
+    <message>
+        <source>Another one</source>
+        <translation>Ein anderes</translation>
+    </message>
+    <message>
+        <source>The instrument counts with the velocity factor</source>
+        <translation>Das Gerät rechnet mit dem Verkürzungsfaktor</translation>
+    </message>
+    <message>
+        <source>The cable is of</source>
+        <translation>Das Kabel ist aus</translation>
+    </message>
+    <message>
+        <source>with the velocity factor</source>
+        <translation>mit dem Verkürzungsfaktor</translation>
+    </message>
+    <message>
+        <source>Faults</source>
+        <translation>Fehler</translation>
+    </message>
+    <message>
+        <source>Peak</source>
+        <translation>Spitze</translation>
+    </message>
+    <message>
+        <source>Shown</source>
+        <translation>Angezeigt</translation>
+    </message>
+    <message>
+        <source>In this cable</source>
+        <translation>In diesem Kabel</translation>
+    </message>
+    <message>
+        <source>Level</source>
+        <translation>Pegel</translation>
+    </message>
+    <message>
+        <source>A velocity factor is above 0 and 1 at most.</source>
+        <translation>Ein Verkürzungsfaktor ist größer als 0 und höchstens 1.</translation>
+    </message>
+    <message>
+        <source>There are distances when the instrument measures Distance to Fault.</source>
+        <translation>Entfernungen gibt es, wenn das Gerät den Fehlerort misst (Distance to Fault).</translation>
+    </message>
+    <message>
+        <source>Watch</source>
+        <translation>Überwachen</translation>
+    </message>
+    <message>
+        <source>Fault</source>
+        <translation>Fehlerort</translation>
+    </message>
+    <message>
+        <source>When a sweep fails the mask of the page Limits:</source>
+        <translation>Wenn ein Sweep die Maske der Seite Grenzen verletzt:</translation>
+    </message>
+    <message>
+        <source>Save it to</source>
+        <translation>Speichern in</translation>
+    </message>
+    <message>
+        <source>File of the failing sweeps</source>
+        <translation>Datei der verletzenden Sweeps</translation>
+    </message>
+    <message>
+        <source>Sweeps are added to the end of the file: a recording</source>
+        <translation>Die Sweeps werden an die Datei angehängt: eine Aufzeichnung</translation>
+    </message>
+    <message>
+        <source>Choose...</source>
+        <translation>Auswählen...</translation>
+    </message>
+    <message>
+        <source> sweeps after it</source>
+        <translation> Sweeps danach</translation>
+    </message>
+    <message>
+        <source>and record</source>
+        <translation>und aufzeichnen</translation>
+    </message>
+    <message>
+        <source>Run</source>
+        <translation>Starten</translation>
+    </message>
+    <message>
+        <source>program and arguments</source>
+        <translation>Programm und Argumente</translation>
+    </message>
+    <message>
+        <source>{x}, {margin}, {time} and {file} are filled in. No shell reads the line; &quot;...&quot; keeps words together. One command runs at a time.</source>
+        <translation>{x}, {margin}, {time} und {file} werden eingesetzt. Keine Shell liest die Zeile; &quot;...&quot; hält Wörter zusammen. Es läuft immer nur ein Befehl.</translation>
+    </message>
+    <message>
+        <source>Views (*.csv);;All Files (*)</source>
+        <translation>Ansichten (*.csv);;Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <source>Give the file to which failing sweeps go.</source>
+        <translation>Bitte die Datei für die verletzenden Sweeps angeben.</translation>
+    </message>
+    <message>
+        <source>The command has a quote without an end.</source>
+        <translation>Im Befehl fehlt ein schließendes Anführungszeichen.</translation>
+    </message>
+    <message>
+        <source>Give the command to run.</source>
+        <translation>Bitte den Befehl angeben.</translation>
+    </message>
+    <message>
+        <source>Watching</source>
+        <translation>Überwacht</translation>
+    </message>
+    <message>
+        <source>There is no mask yet: page Limits</source>
+        <translation>Noch keine Maske: Seite Grenzen</translation>
+    </message>
 </context>
 </TS>

@@ -82,6 +82,7 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     pointer->addWidget(pointer_, 0, 0);
     pointer->addWidget(pointerLevel_, 1, 0);
     showPointer({}, {});
+    showTrace({}, {});
     QGridLayout* pace = card(*row, 0);
     QLabel* line = small();
     line->setMinimumWidth(kPaceWidth);
@@ -100,10 +101,13 @@ void Readouts::showPointer(const QString& position, const QString& level) {
 
 void Readouts::showTrace(const QString& atMarker, const QString& atDelta) {
     const bool room = width() >= kRoomForTrace;
-    atMarker_->setText(atMarker.isEmpty() || !room ? QString()
-                                                   : QObject::tr("trace %1").arg(atMarker));
-    atDelta_->setText(atDelta.isEmpty() || !room ? QString()
-                                                 : QObject::tr("trace %1").arg(atDelta));
+    const auto show = [room](QLabel* label, const QString& text) {
+        label->setText(text.isEmpty() ? text : QObject::tr("trace %1").arg(text));
+        // A hidden one leaves its gap to the marker's text.
+        label->setVisible(room && !text.isEmpty());
+    };
+    show(atMarker_, atMarker);
+    show(atDelta_, atDelta);
 }
 
 void Readouts::showFile(bool fromFile) {
