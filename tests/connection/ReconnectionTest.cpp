@@ -7,7 +7,7 @@
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
 #include "support/Text.h"
-#include "tests/Told.h"
+#include "tests/ShownBoxes.h"
 
 namespace zel {
 namespace {
@@ -78,7 +78,7 @@ TEST_F(ReconnectionTest, PortThatGoes_IsSaidAndThatItIsBack_IsOffered) {
     EXPECT_TRUE(panel.ReconnectButton.Visible);
     pass(20'000);
     EXPECT_FALSE(port.isOpen()) << "only a click connects";
-    EXPECT_EQ(told(platform.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
 }
 
 TEST_F(ReconnectionTest, Click_ConnectsWithTheSameProfile) {
@@ -98,7 +98,7 @@ TEST_F(ReconnectionTest, Click_ConnectsWithTheSameProfile) {
     EXPECT_EQ(bar(), "");
     pass(3000);
     EXPECT_EQ(bar(), "");
-    EXPECT_EQ(told(platform.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
 }
 
 TEST_F(ReconnectionTest, SettingsThatDiffer_AreNamed) {
@@ -128,7 +128,7 @@ TEST_F(ReconnectionTest, WithTheOption_ConnectsByItselfAndAsksNoBoxes) {
     EXPECT_TRUE(panel.isConnected);
     EXPECT_TRUE(port.isOpen());
     EXPECT_EQ(bar(), "Connected to /dev/ttyUSB0 again. All settings are as before.");
-    EXPECT_EQ(told(platform.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
 }
 
 TEST_F(ReconnectionTest, WithTheOption_TheViewGoesOn) {
@@ -145,7 +145,7 @@ TEST_F(ReconnectionTest, WithTheOption_TheViewGoesOn) {
     EXPECT_TRUE(panel.LinkLost);
     pass(40'000);
     EXPECT_TRUE(again);
-    EXPECT_EQ(told(platform.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
 }
 
 TEST_F(ReconnectionTest, WithoutAnInstrument_TheOptionAsksAgainQuietly) {
@@ -157,7 +157,7 @@ TEST_F(ReconnectionTest, WithoutAnInstrument_TheOptionAsksAgainQuietly) {
     plug();
     pass(6000);
     EXPECT_TRUE(contains(bar(), "is back, but no instrument answers at 57600 baud yet.")) << bar();
-    EXPECT_EQ(told(platform.boxes), Texts{});
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
     port.on = true;
     pass(10'000);
     EXPECT_TRUE(panel.isConnected);

@@ -114,7 +114,7 @@ TEST_P(Contrast, TextsAndTraceOfTheGraph_AreReadable) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Themes, Contrast, testing::Bool(),
-                         [](const auto& info) { return info.param ? "Dark" : "Light"; });
+                         [](const auto& theme) { return theme.param ? "Dark" : "Light"; });
 
 }  // namespace
 }  // namespace zel

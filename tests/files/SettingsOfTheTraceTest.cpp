@@ -42,8 +42,8 @@ struct SettingsOfTheTrace : DeadLineSetup, ::testing::Test {
         platform.fileDialogs.answer(folder.file(name));
         panel.SaveCurrentView.Click();
         Texts lines = linesOf(folder.read(name));
-        std::erase_if(lines, [](const std::string& line) {
-            return line.starts_with("Date;") || line.starts_with("Time;");
+        std::erase_if(lines, [](const std::string& text) {
+            return text.starts_with("Date;") || text.starts_with("Time;");
         });
         return lines;
     }
