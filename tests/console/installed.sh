@@ -28,9 +28,11 @@ done
 companion=$(find "$scratch/moved/" -path '*/zelremote/ZELSim/ZELSim')
 [ -n "$companion" ] && [ -x "$companion" ] || fail "the panel finds no simulator"
 run_simulator "$companion" "$scratch/port"
-"$bin/zelctl" --connect "serial:$scratch/port@57600" --home "$scratch/home" info | grep -q '^Model: '
+"$bin/zelctl" --connect "serial:$scratch/port@57600" --home "$scratch/home" info \
+    > "$scratch/info"
+grep -q '^Model: ' "$scratch/info" || fail "no instrument was found"
 
 for document in README.md CHANGELOG.md LICENSE docs/file-formats.md; do
-    find "$scratch/moved/share/doc" -path "*/$document" | grep -q . ||
+    [ -n "$(find "$scratch/moved/share/doc" -path "*/$document")" ] ||
         fail "$document is not installed"
 done

@@ -34,7 +34,8 @@ grep -q '^Depends:.*zelremote-cli' "$scratch/zelremote-server.control" || fail "
 
 root=$scratch/root/usr
 for tool in zelremote zelctl zeldraw ZELSim; do
-    "$root/bin/$tool" --version | grep -q "^$tool [0-9]" || fail "$tool names no version"
+    "$root/bin/$tool" --version > "$scratch/version"
+    grep -q "^$tool [0-9]" "$scratch/version" || fail "$tool names no version"
     "$root/bin/$tool" --help > "$scratch/help"
     zcat "$root/share/man/man1/$tool.1.gz" | sed 's/\\-/-/g' > "$scratch/page"
     while read -r option; do
