@@ -20,6 +20,32 @@
 namespace zel {
 namespace {
 
+/// The words of the program among the arguments of a window: those of the option, and what stands
+/// alone and is no file.
+std::string windowWords(const std::vector<std::string>& given) {
+    constexpr std::string_view kWords = "--words";
+    std::vector<std::string> words;
+    for (std::size_t i = 1; i < given.size(); ++i) {
+        const std::string& argument = given[i];
+        if (!startsWith(argument, "--")) {
+            if (argument.find_first_of("./") == std::string::npos) words.push_back(argument);
+        } else if (const auto sign = argument.find('='); sign != std::string::npos) {
+            if (argument.substr(0, sign) == kWords) words.push_back(argument.substr(sign + 1));
+        } else if (++i < given.size() && argument == kWords) {
+            words.push_back(given[i]);  // every option of a window has a value
+        }
+    }
+    std::string text;
+    for (const std::string& word : words) text += (text.empty() ? "" : " ") + word;
+    return text;
+}
+
+/// A record that a user began while connected: the state of the panel is not in it.
+bool beganConnected(const SessionRecord& record, Verb verb) {
+    return verb == Verb::Panel && record.events.size() > 1 &&
+           record.events[1].kind == SessionEvent::Kind::Open;
+}
+
 /// The options of the recorded run; those of a window become a panel session.
 Options recordedOptions(const SessionRecord& record) {
     Options recorded;
@@ -35,7 +61,7 @@ Options recordedOptions(const SessionRecord& record) {
         recorded = {};
         recorded.verb = Verb::Panel;
     }
-    if (window && given.size() > 1) recorded.words = given[1];
+    if (window) recorded.words = windowWords(given);
     recorded.log.clear();
     recorded.image.clear();
     recorded.waterfall.clear();
@@ -89,6 +115,10 @@ int runReplay(const Options& options, const Streams& streams) {
 
     const QTemporaryDir own;
     Options recorded = recordedOptions(record);
+    if (beganConnected(record, recorded.verb))
+        return fail(options.argument +
+                    ": the record began while the connection was open, so it cannot run again; "
+                    "record from before the connection on");
     recorded.home = options.home.empty() ? own.path().toStdString() : options.home;
     recorded.verbose = options.verbose;
     recorded.address = options.address ? options.address : recorded.address;

@@ -3,6 +3,15 @@
 #include "support/Text.h"
 
 namespace zel {
+namespace {
+
+/// As the arguments of a program that was started with these words.
+std::string startLine(const std::string& words) {
+    if (words.empty()) return "zelremote";
+    return joinArguments({"zelremote", "--words", words});
+}
+
+}  // namespace
 
 SessionKeys::SessionKeys(ControllerForm& panel, SessionLog& log, FileDialogs& dialogs,
                          MessageBoxes& boxes)
@@ -33,7 +42,10 @@ void SessionKeys::UtilityRecord_Click() {
                                      .folder = {},
                                      .fileName = "session.log",
                                      .promptOverwrite = true});
-    if (path) begin(*path, panel_.CommandLine.empty() ? "zelremote" : panel_.CommandLine);
+    if (!path || !begin(*path, startLine(panel_.CommandLine)) || !panel_.isConnected) return;
+    boxes_.show({BoxIcon::Information,
+                 "The record begins while ZELRemote is connected. It can be read, but not run "
+                 "again: for that, record from before the connection on."});
 }
 
 }  // namespace zel

@@ -187,13 +187,11 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
             if (!defers || !defers(control)) return false;
             act(control, std::move(enter));
             return true;
-        });
+        },
+        [this, &control](const char* act, const std::string& what) { note(control, act, what); });
     connect(widget, &QLineEdit::textEdited, this, [this, &control, widget](const QString& typed) {
         if (refused(control)) return markDirty(&control);
-        note(control, "set", typed.toStdString());
-        control.Text = typed.toStdString();
-        // A paste does not come by the keys; it edits the text, which then is to stay.
-        if (!widget->typing()) control.KeyDown(kKeyRight, 0);
+        widget->takeOver(typed.toStdString());
     });
     follow(control, widget, [this, &control, widget] {
         const QString shown = text(control.Text);

@@ -16,6 +16,8 @@
 #include <QSlider>
 #include <QTimer>
 #include <functional>
+#include <optional>
+#include <string>
 #include <unordered_map>
 #include <unordered_set>
 #include <vector>
@@ -68,8 +70,8 @@ class Binder : public QObject {
     std::function<std::string(const Control&)> reasonAgainst;
     /// Runs what a user does to a control, now or in its turn; at once where it is empty.
     std::function<void(const Control&, std::function<void()>)> perform;
-    /// Hears what the user does: "click NAME", "choose NAME INDEX", "set NAME TEXT", "key NAME
-    /// enter", in two parts.
+    /// Hears what the user does: "click NAME", "choose NAME INDEX", "type NAME TEXT", "set NAME
+    /// TEXT", "key NAME KEY", in two parts.
     std::function<void(const std::string& act, const std::string& what)> tell;
     /// Whether the control was bound, for the tests.
     QObject* widgetOf(const Control& control) const;
@@ -101,9 +103,12 @@ class Binder : public QObject {
 class PanelLineEdit : public QLineEdit {
   public:
     explicit PanelLineEdit(QWidget* parent = nullptr);
+    /// What a user does to the text: "type" with a character, "key" with the name of a key, "set"
+    /// with the whole text.
+    using Tell = std::function<void(const char* act, const std::string& what)>;
     /// `enter` may take an Enter over that has to wait for its turn.
     void setControl(TextBox* control, std::function<bool()> refused,
-                    std::function<bool(std::function<void()>)> enter);
+                    std::function<bool(std::function<void()>)> enter, Tell tell);
     /// Looks at an entry before Enter sends it: changes the text into what the panel reads, or
     /// says false with the problem, and nothing is sent.
     void setReader(std::function<bool(QString& text, QString& problem)> reader) {
@@ -113,16 +118,22 @@ class PanelLineEdit : public QLineEdit {
     void showProblem(const QString& problem);
     /// A key is on its way into the text, and its control knows of it.
     bool typing() const { return typing_; }
+    /// Puts the edited text into the control. The keys that were told do not say what becomes of
+    /// a text of which a part was selected; then the text is told as well.
+    void takeOver(const std::string& edited);
 
   protected:
     void keyPressEvent(QKeyEvent* event) override;
 
   private:
     void insertKey(QKeyEvent* event);
+    void tellKey(int code, int character);
     bool readable();
 
     TextBox* control_ = nullptr;
     bool typing_ = false;
+    std::optional<std::string> typed_;  ///< the text that the keys alone would give
+    Tell tell_;
     std::function<bool()> refused_;
     std::function<bool(std::function<void()>)> enter_;
     std::function<bool(QString& text, QString& problem)> reader_;

@@ -15,6 +15,28 @@ int characterOf(const QKeyEvent& event, int code) {
                                                                      : 0;
 }
 
+struct KeyName {
+    int code;
+    const char* name;
+};
+/// Keys without a character of the text that handlers know.
+constexpr KeyName kTold[] = {
+    {kKeyBackspace, "backspace"}, {kKeyClear, "clear"}, {kKeyLeft, "left"}, {kKeyRight, "right"}};
+
+std::string utf8Of(int character) {
+    const auto point = static_cast<char32_t>(character);
+    return QString::fromUcs4(&point, 1).toStdString();
+}
+
+/// The text after a key at its end.
+std::string after(const std::string& text, int character) {
+    if (character != kKeyBackspace) return text + utf8Of(character);
+    QList<uint> points = QString::fromStdString(text).toUcs4();
+    if (!points.isEmpty()) points.removeLast();
+    return QString::fromUcs4(reinterpret_cast<const char32_t*>(points.data()), points.size())
+        .toStdString();
+}
+
 }  // namespace
 
 PanelLineEdit::PanelLineEdit(QWidget* parent) : QLineEdit(parent) {
@@ -24,8 +46,9 @@ PanelLineEdit::PanelLineEdit(QWidget* parent) : QLineEdit(parent) {
 }
 
 void PanelLineEdit::setControl(TextBox* control, std::function<bool()> refused,
-                               std::function<bool(std::function<void()>)> enter) {
+                               std::function<bool(std::function<void()>)> enter, Tell tell) {
     control_ = control;
+    tell_ = std::move(tell);
     refused_ = std::move(refused);
     enter_ = std::move(enter);
 }
@@ -75,10 +98,28 @@ void PanelLineEdit::showProblem(const QString& problem) {
     if (marked && hasFocus()) QToolTip::showText(mapToGlobal(QPoint(0, height())), problem, this);
 }
 
+void PanelLineEdit::takeOver(const std::string& edited) {
+    // A paste does not come by the keys; it edits the text, which then is to stay.
+    if (!typing_) {
+        tell_("key", "right");
+        control_->KeyDown(kKeyRight, 0);
+    }
+    if (!typing_ || typed_ != edited) tell_("set", edited);
+    control_->Text = edited;
+}
+
+void PanelLineEdit::tellKey(int code, int character) {
+    for (const KeyName& key : kTold)
+        if (key.code == code) return tell_("key", key.name);
+    if (character != 0 && code != kKeyEnter) tell_("type", utf8Of(character));
+}
+
 void PanelLineEdit::insertKey(QKeyEvent* event) {
     const int code = keyCodeOf(*event);
-    control_->KeyDown(code, event->modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);
     int character = characterOf(*event, code);
+    tellKey(code, character);
+    typed_.reset();
+    control_->KeyDown(code, event->modifiers().testFlag(Qt::ShiftModifier) ? 1 : 0);
     if (character != 0) {
         control_->KeyPress(character);
         // A handler may have emptied the box, or set a whole new text after an Enter.
@@ -91,6 +132,7 @@ void PanelLineEdit::insertKey(QKeyEvent* event) {
             if (!control_->KeyPress.connected()) event->ignore();
             return;
         }
+        typed_ = after(control_->Text, character);
     }
     QLineEdit::keyPressEvent(event);
 }

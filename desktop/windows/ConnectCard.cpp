@@ -139,6 +139,7 @@ void ConnectCard::cancel() {
 }
 
 void ConnectCard::click(Button& button) {
+    if (binder_.tell) binder_.tell("click", button.form().name() + "." + button.name());
     const auto act = [&button] { button.Click(); };
     binder_.perform ? binder_.perform(button, act) : act();
 }

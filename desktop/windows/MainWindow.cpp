@@ -78,13 +78,17 @@ MainWindow::~MainWindow() {
 }
 
 void MainWindow::buildCentre() {
+    const auto clickWritten = [this](MenuItem& item) {
+        program_.sessionLog().clicked(item.name());
+        item.Click();
+    };
     auto* centre = new QWidget;
     auto* layout = new QHBoxLayout(centre);
     layout->setSpacing(kSpacing);
     layout->setContentsMargins(kSpacing, kSpacing, kSpacing, kSpacing);
     graphSide_ =
         new GraphSide(program_, binder_,
-                      {[this] { panel_.Direct.Click(); },
+                      {[this, clickWritten] { clickWritten(panel_.Direct); },
                        [this](int place) {
                            if (!recent_) return;
                            connectTo(recent_->addresses().at(static_cast<std::size_t>(place)));
@@ -93,7 +97,7 @@ void MainWindow::buildCentre() {
                            connectToSimulator_ = true;
                            panel_.UtilityTrouble.Click();
                        },
-                       [this] { panel_.LoadData.Click(); },
+                       [this, clickWritten] { clickWritten(panel_.LoadData); },
                        [this] {
                            if (LinkAddress last; addressOf(program_.forms(), last)) connectTo(last);
                        }});

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "console/Fronts.h"
+#include "console/ReplayVerb.h"
 #include "console/Tool.h"
 #include "tests/files/DiskFolder.h"
 #include "tests/files/FileSession.h"
@@ -27,6 +28,7 @@ struct ToolRun : ::testing::Test {
         if (const auto status =
                 parseOptions(static_cast<int>(list.size()), list.data(), options, out, errors))
             return *status;
+        if (options.verb == Verb::Replay) return runReplay(options, {out, errors});
         const bool simulated = options.address && options.address->simulated;
         const auto front =
             simulated ? makeSimulatorFront(options.home) : makePortFront(options.home);

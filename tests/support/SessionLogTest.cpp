@@ -1,5 +1,9 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <fstream>
+#include <iterator>
+
 #include "platform/virtual/ScriptedPort.h"
 #include "platform/virtual/ScriptedSocket.h"
 #include "platform/virtual/VirtualFiles.h"
@@ -41,6 +45,28 @@ TEST(SessionText, LogCutAnywhere_IsSaidToBe) {
     EXPECT_EQ(parseSession(whole.substr(0, whole.size() - 1)).problem, "") << "only the line end";
     for (std::size_t length = 0; length + 1 < whole.size(); ++length)
         EXPECT_NE(parseSession(whole.substr(0, length)).problem, "") << length;
+}
+
+TEST(SessionText, RecordedLogCutAtAnyLength_IsSaidToBeAndKeepsWhatWasWhole) {
+    std::ifstream file(ZEL_SOURCE_DIR "/tests/replays/late_in_handshake.log", std::ios::binary);
+    const std::string whole((std::istreambuf_iterator<char>(file)), {});
+    ASSERT_GT(whole.size(), 2000U);
+    const SessionRecord all = parseSession(whole);
+    ASSERT_EQ(all.problem, "");
+    for (std::size_t length = 2; length + 1 < whole.size(); ++length) {
+        const std::string_view cut(whole.data(), length);
+        const SessionRecord record = parseSession(cut);
+        // The port was closed there: up to that place it is a whole session.
+        const auto last = cut.substr(std::min(cut.rfind('\n', length - 2) + 1, length));
+        if (!contains(last, " closed")) {
+            ASSERT_NE(record.problem, "") << length;
+        }
+        // A line that was cut is damaged, or a shorter one that nobody can know to be cut.
+        const auto lines = static_cast<std::size_t>(std::count(cut.begin(), cut.end(), '\n'));
+        ASSERT_GE(record.events.size() + 1, lines) << length;
+        for (std::size_t i = 0; i + 1 < record.events.size(); ++i)
+            ASSERT_EQ(record.events[i].text, all.events[i].text) << length;
+    }
 }
 
 TEST(SessionText, DamagedLines_AreNamed) {

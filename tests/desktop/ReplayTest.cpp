@@ -1,0 +1,132 @@
+// A session at the window, written down, runs again in the console and sends the same bytes.
+
+#include <QClipboard>
+#include <QFile>
+#include <QLineEdit>
+#include <QProcess>
+#include <QPushButton>
+#include <QTemporaryDir>
+#include <QTest>
+
+#include "support/LoggedDialogs.h"
+#include "support/SessionLog.h"
+#include "tests/desktop/WindowTest.h"
+
+namespace zel {
+namespace {
+
+/// The same bundle with boxes and file dialogs whose answers are written down.
+Platform withDialogs(const Platform& p, MessageBoxes& boxes, FileDialogs& dialogs) {
+    return {p.clock,     p.events,     boxes,          p.serialPort, p.serialPorts,
+            p.tcpSocket, p.serverPort, p.serverSocket, p.settings,   p.debug,
+            p.clipboard, p.launcher,   p.startup,      p.folder,     dialogs,
+            p.files,     p.endSignals, p.machine,      p.portProbe};
+}
+
+struct RecordedDesk : WindowTest {
+    RecordedDesk() {
+        window.reset();
+        program = std::make_unique<Program>(withDialogs(platform.bundle(port), boxes, dialogs), "");
+        boxes.log = dialogs.log = &program->sessionLog();
+        program->start();
+        window = std::make_unique<MainWindow>(*program);
+        show();
+    }
+    ~RecordedDesk() override {
+        window.reset();
+        program.reset();
+    }
+    void connectWritten() {
+        program->sessionLog().input("connect");
+        connect();
+    }
+    void press(const Control& control) {
+        QTest::mouseClick(widgetOf<QPushButton>(control), Qt::LeftButton);
+        window->showNow();
+    }
+    void trigger(const Control& control) {
+        qobject_cast<QAction*>(window->binder().widgetOf(control))->trigger();
+        window->showNow();
+    }
+    /// What zelctl replay says about the record; its status before the text.
+    std::string replayed() {
+        EXPECT_EQ(parseSession(platform.files.bytes("/session.log")).problem, "");
+        QTemporaryDir folder;
+        QFile file(folder.filePath("session.log"));
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(QByteArray::fromStdString(platform.files.bytes("/session.log")));
+        file.close();
+        QProcess zelctl;
+        zelctl.setProcessChannelMode(QProcess::MergedChannels);
+        zelctl.setWorkingDirectory(folder.path());
+        zelctl.start(ZEL_PROGRAMS "/zelctl", {"replay", file.fileName()});
+        zelctl.waitForFinished();
+        return std::to_string(zelctl.exitCode()) + "\n" + zelctl.readAll().toStdString();
+    }
+    LoggedBoxes boxes{platform.boxes};
+    LoggedFileDialogs dialogs{platform.fileDialogs};
+};
+
+TEST_F(RecordedDesk, ClicksAnswersAndDrags_SendTheSameBytesAgain) {
+    ASSERT_TRUE(program->recordSession("/session.log", "zelremote"));
+    connectWritten();
+    window->showNow();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    QTest::keyClicks(box, "900M");
+    QTest::keyClick(box, Qt::Key_Return);
+    QTest::mouseClick(widgetOf<QWidget>(panel().MarkerCheckBox), Qt::LeftButton, {}, {8, 8});
+    window->showNow();
+    GraphWidget& graph = window->graph();
+    const int from = qRound(graph.xAxis->coordToPixel(panel().CWGraph1.cursor(1).X));
+    QTest::mousePress(&graph, Qt::LeftButton, {}, {from, graph.height() / 2});
+    QTest::mouseMove(&graph, {from - 90, graph.height() / 2});
+    QTest::mouseRelease(&graph, Qt::LeftButton, {}, {from - 90, graph.height() / 2});
+    platform.fileDialogs.answer("view.csv");
+    trigger(panel().SaveCurrentView);
+    trigger(panel().SaveCurrentView);  // cancelled
+    platform.boxes.answer(BoxAnswer::Ok);
+    trigger(panel().Disconnect);
+    program->sessionLog().end();
+    const std::string log = platform.files.bytes("/session.log");
+    for (const char* line :
+         {"input connect", "input answer view.csv", "input answer cancel", "input move2d 1 "})
+        EXPECT_NE(log.find(line), std::string::npos) << line;
+    const std::string result = replayed();
+    EXPECT_EQ(result.substr(0, 2), "0\n") << result << log;
+}
+
+TEST_F(RecordedDesk, KeysInABox_LeaveTheSameTextAgain) {
+    ASSERT_TRUE(program->recordSession("/session.log", "zelremote"));
+    connectWritten();
+    window->showNow();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    QTest::keyClicks(box, "95");
+    QTest::keyClick(box, Qt::Key_Backspace);
+    QTest::keyClicks(box, "00M");
+    QTest::keyClick(box, Qt::Key_Return);
+    // The cursor first, so that the text stays; then within it.
+    QTest::keyClick(box, Qt::Key_Home);
+    QTest::keyClick(box, Qt::Key_Right);
+    QTest::keyClick(box, Qt::Key_Left);
+    QTest::keyClick(box, Qt::Key_Delete);
+    QTest::keyClicks(box, "8");
+    QTest::keyClick(box, Qt::Key_Return);
+    QApplication::clipboard()->setText("700M");
+    box->selectAll();
+    box->paste();
+    QTest::keyClick(box, Qt::Key_Return);
+    // Nothing was typed since: this Enter sends nothing.
+    QTest::keyClick(box, Qt::Key_Return);
+    program->disconnect();
+    program->sessionLog().end();
+    const std::string log = platform.files.bytes("/session.log");
+    for (const char* sent : {"|FREQ,900000000.|", "|FREQ,800000000.|", "|FREQ,700000000.|"}) {
+        EXPECT_NE(log.find(sent), std::string::npos) << sent;
+        EXPECT_EQ(log.find(sent), log.rfind(sent)) << sent;
+    }
+    const std::string result = replayed();
+    EXPECT_EQ(result.substr(0, 2), "0\n") << result << log;
+}
+
+}  // namespace
+}  // namespace zel
