@@ -38,15 +38,15 @@ Event<int, int>* keysOf(Control& control) {
 
 }  // namespace
 
-int helpTopicOf(const Form& form) {
+int helpTopicOf(std::string_view form) {
     for (const Topic& row : kTopics)
-        if (row.form == form.name()) return row.context;
+        if (row.form == form) return row.context;
     return kContentsTopic;
 }
 
 HelpKeys::HelpKeys(Forms& forms) : panel_(forms.controller) {
     for (Form* form : forms.all()) {
-        const int topic = helpTopicOf(*form);
+        const int topic = helpTopicOf(form->name());
         const auto help = [this, topic](int key, int) { keyDown(key, topic); };
         handlers_.on(form->KeyDown, help);
         for (Control* control : form->controls())

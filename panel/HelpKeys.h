@@ -1,14 +1,16 @@
 #pragma once
 // F1 on a control of any form opens the help at the form's topic.
 
+#include <string_view>
+
 #include "forms/Forms.h"
 
 namespace zel {
 
-/// Help topics by the window that asks for them; the contents for a form without one.
+/// Help topics by the name of the form that asks for them; the contents for a form without one.
 inline constexpr int kPanelTopic = 2111;
 inline constexpr int kContentsTopic = 1110;
-int helpTopicOf(const Form& form);
+int helpTopicOf(std::string_view form);
 
 class HelpKeys {
   public:

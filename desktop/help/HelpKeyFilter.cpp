@@ -4,29 +4,9 @@
 #include <QMainWindow>
 #include <QWidget>
 
+#include "panel/HelpKeys.h"
+
 namespace zel {
-namespace {
-
-struct Topic {
-    const char* form;
-    int context;
-};
-constexpr int kContents = 1110;
-constexpr int kPanel = 2111;
-constexpr Topic kTopics[] = {
-    {"ControllerForm", kPanel},  {"MainForm", 1113}, {"TCPConnectionForm", 1113},
-    {"DevicesChoiceForm", 1112}, {"TimeForm", 1114}, {"ServerForm", 3113},
-    {"SpecialMeasForm", 4111},   {"STDForm", 4111},  {"ScriptEditor", 4111},
-    {"WaterfallForm", 5111},
-};
-
-}  // namespace
-
-int helpContextOf(const QString& form) {
-    for (const Topic& topic : kTopics)
-        if (form == QLatin1String(topic.form)) return topic.context;
-    return kContents;
-}
 
 bool HelpKeyFilter::eventFilter(QObject* watched, QEvent* event) {
     if (event->type() != QEvent::KeyPress) return false;
@@ -46,7 +26,7 @@ bool HelpKeyFilter::eventFilter(QObject* watched, QEvent* event) {
         return true;
     }
     if (!form.isValid() && !panel) return false;
-    open_(panel ? kPanel : helpContextOf(form.toString()));
+    open_(panel ? kPanelTopic : helpTopicOf(form.toString().toStdString()));
     return true;
 }
 

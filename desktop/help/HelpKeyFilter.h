@@ -6,10 +6,6 @@
 
 namespace zel {
 
-/// The context number of a form's topic, by the form's name; that of the contents for a form
-/// without a topic of its own.
-int helpContextOf(const QString& form);
-
 /// An event filter of the application. A window names its form in the property "form"; a window
 /// without one is the panel's. Boxes of the system keep the key.
 class HelpKeyFilter : public QObject {

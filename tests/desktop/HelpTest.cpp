@@ -199,8 +199,8 @@ TEST(HelpKey, F1_OpensTheTopicOfTheWindowsForm) {
                                        {"TimeForm", 1114},
                                        {"ServerForm", 3113},
                                        {"SpecialMeasForm", 4111},
-                                       {"STDForm", 4111},
-                                       {"ScriptEditor", 4111},
+                                       {"STDForm", 1110},
+                                       {"ScriptEditor", 1110},
                                        {"AboutForm", 1110}}) {
         window.setProperty("form", form);
         EXPECT_TRUE(filter.eventFilter(&field, &key));
