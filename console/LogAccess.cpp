@@ -71,6 +71,11 @@ const std::vector<Routine>& routines() {
              logs.rootDebug.Activate();
              return done();
          }},
+        {"RootDebug.MarkReady", 0,  // the same by its other name
+         [done](Logs& logs, const Arguments&) {
+             logs.rootDebug.Activate();
+             return done();
+         }},
         {"RootDebug.LogMessage", 3,
          [done](Logs& logs, const Arguments& a) -> std::optional<std::string> {
              const std::optional<int> level = wholeNumber(a[0]);

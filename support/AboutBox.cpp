@@ -41,11 +41,8 @@ AboutBox::AboutBox(AboutForm& form, const Services& services, const std::string&
     for (const Part& part : kParts) {
         (form_.*part.text).Locked = true;
         setShown(form_, part, false);
-        handlers_.on((form_.*part.key).Clicked, [this, &part] {
-            // One part at a time, so that it has the room.
-            const bool shown = (form_.*part.text).Visible;
-            for (const Part& other : kParts) setShown(form_, other, &other == &part && !shown);
-        });
+        handlers_.on((form_.*part.key).Clicked,
+                     [this, &part] { setShown(form_, part, !(form_.*part.text).Visible); });
     }
     handlers_.on(form_.Load, [this] { load(); });
     handlers_.on(form_.CreateSupportString.Clicked, [this] { CreateSupportString_Click(); });

@@ -1,6 +1,7 @@
 #include "support/RootDebug.h"
 
 #include <algorithm>
+#include <cmath>
 #include <utility>
 
 #include "support/MTStandard.h"
@@ -65,7 +66,10 @@ RootDebug::RootDebug(const Clock& clock, FileService& files, DebugChannel& debug
       files_(files),
       debugger_(debugger),
       folder_(std::move(folder)) {
-    const double now = clock_.date();
+    constexpr double kSecondsADay = 86400;
+    constexpr double kRounding = 1e-3;  // of a date, in seconds
+    // The second that has begun: a file is never of a time to come.
+    const double now = std::floor(clock_.date() * kSecondsADay + kRounding) / kSecondsADay;
     const std::string stamp = clock_.Clock::dateText(now) + "_" + clock_.Clock::timeText(now);
     FileName =
         folder_ + "/" + kFileHead + replaceAll(replaceAll(stamp, "-", "_"), ":", "_") + kFileTail;
@@ -207,7 +211,9 @@ void RootDebug::writeLine(const std::string& text) {
 void RootDebug::flush() {
     if (!pending_.empty()) {
         const std::string lines = std::exchange(pending_, "");
-        if (!files_.append(FileName, lines).empty()) tellFileError();
+        const bool written = files_.append(FileName, lines).empty();
+        if (!written) FileOpen = false;  // the next entry opens it again
+        if (!written) tellFileError();
     }
     if (FileSafeLogMode && FileLogEnabled) FileOpen = false;
 }

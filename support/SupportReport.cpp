@@ -15,6 +15,7 @@ namespace {
 
 constexpr std::size_t kColumn = 20;  // where the values begin
 constexpr std::size_t kMostListed = 100;
+constexpr std::size_t kMostLooked = 1000;  // of a folder; a slow disk must not hold the window
 constexpr const char* kNotInstalled = "not installed";
 constexpr const char* kUnknown = "unknown";
 constexpr const char* kNone = "none";
@@ -46,24 +47,26 @@ std::string installedText(const Clock& clock, double date) {
     return parts[2] + "." + parts[1] + "." + parts[0] + " " + clock.Clock::timeText(date);
 }
 
-std::string listOf(const std::string& name, FileService& files, const std::string& folder,
-                   const std::string& ending) {
+/// The files of a folder, which may be empty for none.
+std::string listOf(const std::string& name, FileService& files, const std::string& folder) {
     std::vector<std::string> found;
-    if (!folder.empty())
-        for (const std::string& file : files.list(folder)) {
-            const std::string lower = lowerCase(file);
-            if (lower.size() > ending.size() &&
-                lower.substr(lower.size() - ending.size()) == ending)
-                found.push_back(file);
-        }
-    std::sort(found.begin(), found.end());
-    std::string text = title(name);
-    if (found.empty()) return text + kNone + kCrLf;
-    const std::size_t shown = std::min(found.size(), kMostListed);
-    for (std::size_t i = 0; i < shown; ++i) text += found[i] + kCrLf;
-    if (shown < found.size())
-        text += "and " + std::to_string(found.size() - shown) + " more" + kCrLf;
-    return text;
+    if (!folder.empty()) found = files.list(folder);
+    const auto most = std::min(found.size(), kMostLooked);
+    std::partial_sort(found.begin(), found.begin() + static_cast<std::ptrdiff_t>(most),
+                      found.end());
+    std::string text;
+    std::size_t shown = 0;
+    std::size_t looked = 0;
+    for (const std::string& file : found) {
+        if (shown == kMostListed || looked == most) break;
+        ++looked;
+        if (file.front() == '.' || !files.stat(folder + "/" + file).isRegular()) continue;
+        text += file + kCrLf;
+        ++shown;
+    }
+    if (looked < found.size())
+        text += "and " + std::to_string(found.size() - looked) + " more" + kCrLf;
+    return title(name) + (text.empty() ? kNone + std::string(kCrLf) : text);
 }
 
 std::string systemPart(const ReportSources& s, const MachineFacts& facts) {
@@ -107,10 +110,9 @@ std::string driverPart(const ReportSources& s, const MachineFacts& facts) {
                          "SOFTWARE\\Microsoft\\Windows\\CurrentVersion", "ProgramFilesDir", "");
     if (ivi.empty()) ivi = s.machine.environment("ProgramFilesDir");
     if (!ivi.empty()) ivi += "/IVI/Bin";
-    text += kCrLf + listOf("VXI plug and play drivers", s.files, framework, ".dll");
-    text += kCrLf + listOf("IVI drivers", s.files, ivi, ".dll");
-    text +=
-        kCrLf + listOf("USB drivers", s.files, s.machine.environment("USB_DRIVER_PATH"), ".inf");
+    text += kCrLf + listOf("VXI plug and play drivers", s.files, framework);
+    text += kCrLf + listOf("IVI drivers", s.files, ivi);
+    text += kCrLf + listOf("USB drivers", s.files, s.machine.environment("USB_DRIVER_PATH"));
     return text + kCrLf;
 }
 

@@ -5,6 +5,7 @@
 #include <unistd.h>
 
 #include <QByteArray>
+#include <QCoreApplication>
 #include <QFileInfo>
 #include <QSysInfo>
 #include <clocale>
@@ -54,6 +55,25 @@ void splitLocale(const std::string& name, MachineFacts& facts) {
     if (parts.size() > 1) facts.codeset = parts[1];
 }
 
+/// The toolkit of the windows; a program without windows runs on the library of its language.
+void nameRuntime(MachineFacts& facts) {
+    const QCoreApplication* application = QCoreApplication::instance();
+    if (application != nullptr && application->inherits("QGuiApplication")) {
+        facts.runtimeName = "Qt";
+        facts.runtimeVersion = qVersion();
+        return;
+    }
+    facts.runtimeName = "C++ library";
+#if defined(_GLIBCXX_RELEASE)
+    facts.runtimeVersion =
+        "libstdc++ " + std::to_string(_GLIBCXX_RELEASE) + " (" + std::to_string(__GLIBCXX__) + ")";
+#elif defined(_LIBCPP_VERSION)
+    facts.runtimeVersion = "libc++ " + std::to_string(_LIBCPP_VERSION);
+#else
+    facts.runtimeVersion = "unknown";
+#endif
+}
+
 }  // namespace
 
 std::string SystemMachine::environment(const std::string& name) {
@@ -71,8 +91,7 @@ MachineFacts SystemMachine::facts() {
     for (const char* name : {"LC_ALL", "LC_MESSAGES", "LANG"})
         if (locale.empty()) locale = environment(name);
     splitLocale(locale, facts);
-    facts.runtimeName = "Qt";
-    facts.runtimeVersion = qVersion();
+    nameRuntime(facts);
     facts.ieeeDriver = firstThere({"/dev/gpib0", "/dev/gpib1"});
     facts.visa =
         firstThere({"/usr/lib/x86_64-linux-gnu/libvisa.so", "/usr/lib/libvisa.so",

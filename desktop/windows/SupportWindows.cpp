@@ -100,7 +100,7 @@ AboutWindow::AboutWindow(AboutForm& form, Binder& binder, QWidget* parent)
     for (Button* control : {&form.ShowSystemInfo, &form.ShowDriverInfo, &form.ShowLegalNotes})
         parts->addWidget(key(binder, *control));
     layout->addLayout(parts);
-    constexpr int kLines = 16;
+    constexpr int kLines = 4;  // at least; all three parts may be shown
     for (TextBox* control : {&form.SystemInfo, &form.DriverInfo, &form.LegalNotes}) {
         QPlainTextEdit* view = reading(binder, *control, kLines);
         // The window has the same size whatever it shows.

@@ -78,6 +78,13 @@ TEST_F(PanelSessionTest, Logs_WrongNamesAndValues_AreTold) {
               "zelctl: line 7: there is no routine \"Fly\" of these arguments\n");
 }
 
+TEST_F(PanelSessionTest, StructuredLog_IsMadeReadyByEitherName) {
+    for (const char* name : {"Activate", "MarkReady"})
+        EXPECT_EQ(play("set RootDebug.Initialized false\ncall RootDebug." + std::string(name) +
+                       "\nshow RootDebug.Initialized\n"),
+                  "true\n");
+}
+
 TEST_F(PanelSessionTest, Logs_LinesForTheDebugger_GoToTheErrors) {
     EXPECT_EQ(play("set RootDebug.DebuggerLogEnabled true\n"
                    "call RootDebug.LogMessage 3 \"Listen\" \"say \"\"hello\"\"\"\n"),

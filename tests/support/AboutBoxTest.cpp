@@ -76,10 +76,19 @@ TEST_F(AboutBoxTest, Drivers_AreListedFromTheFoldersThatTheEnvironmentNames) {
     platform.machine.variables["FRAMEWORK_PATH"] = "/vxipnp";
     platform.files.put("/vxipnp/b.DLL", "");
     platform.files.put("/vxipnp/a.dll", "");
-    platform.files.put("/vxipnp/readme.txt", "");
+    platform.files.put("/vxipnp/lib/c.dll", "");
+    platform.files.put("/vxipnp/.hidden", "");
+    platform.files.put("/programs/IVI/Bin/driver.so", "");
+    platform.files.put("/usb/analyser.rules", "");
+    platform.machine.variables["ProgramFilesDir"] = "/programs";
+    platform.machine.variables["USB_DRIVER_PATH"] = "/usb";
     platform.machine.known.ieeeDriver = "/dev/gpib0";
     show();
-    EXPECT_TRUE(contains(form.DriverInfo.Text.get(), "drivers ***\r\na.dll\r\nb.DLL\r\n\r\n"));
+    EXPECT_TRUE(contains(form.DriverInfo.Text.get(),
+                         "*** VXI plug and play drivers ***\r\na.dll\r\nb.DLL\r\n\r\n"
+                         "*** IVI drivers ***\r\ndriver.so\r\n\r\n"
+                         "*** USB drivers ***\r\nanalyser.rules\r\n\r\n"))
+        << form.DriverInfo.Text.get();
     EXPECT_TRUE(contains(form.DriverInfo.Text.get(), "IEEE driver         /dev/gpib0\r\n"));
 }
 
@@ -92,8 +101,10 @@ TEST_F(AboutBoxTest, Parts_AreShownAndHiddenByTheirKeys) {
         EXPECT_EQ(form.ShowSystemInfo.Caption.get(), "hide system information");
         form.ShowLegalNotes.Click();
         EXPECT_TRUE(form.LegalNotes.Visible);
-        EXPECT_FALSE(form.SystemInfo.Visible);
+        EXPECT_TRUE(form.SystemInfo.Visible) << "each part for itself";
+        EXPECT_FALSE(form.DriverInfo.Visible);
         form.ShowLegalNotes.Click();
+        EXPECT_TRUE(form.SystemInfo.Visible);
         EXPECT_FALSE(form.LegalNotes.Visible);
         EXPECT_EQ(form.ShowLegalNotes.Caption.get(), "show legal notes");
     });

@@ -34,6 +34,9 @@ TEST_F(RootDebugTest, Members_StartAsTheyShould) {
     EXPECT_EQ(fresh.CallStackTop, -1);
     EXPECT_FALSE(fresh.FileLogEnabled);
     EXPECT_EQ(fresh.FileName, kFile);
+    clock.setDate(46000.5 + 0.9 / 86400);
+    EXPECT_EQ(RootDebug(clock, files, debugger, "/home").FileName, kFile)
+        << "the second that has begun";
     EXPECT_EQ(fresh.FileLogLevel, 7);
     EXPECT_FALSE(fresh.FileTimeStamping);
     EXPECT_TRUE(fresh.FileSafeLogMode);
@@ -192,6 +195,11 @@ TEST_F(RootDebugTest, FileThatCannotBeWritten_IsToldAndNothingElse) {
     files.refuse("/home", "Permission denied");
     log.LogMessage(1, "Listen", "listening");
     EXPECT_EQ(errors, Lines{std::string("Could not access debugger file ") + kFile});
+    log.FileSafeLogMode = false;
+    log.LogMessage(1, "Listen", "listening");
+    EXPECT_FALSE(log.FileOpen) << "what could not be opened is not open";
+    EXPECT_EQ(errors.size(), 2U);
+    log.FileSafeLogMode = true;
     files.refuse("/home", "");
     log.LogMessage(1, "Listen", "again");
     EXPECT_EQ(lines().size(), 3U);
