@@ -118,8 +118,8 @@ class PanelLineEdit : public QLineEdit {
     void showProblem(const QString& problem);
     /// A key is on its way into the text, and its control knows of it.
     bool typing() const { return typing_; }
-    /// Puts the edited text into the control. The keys that were told do not say what becomes of
-    /// a text of which a part was selected; then the text is told as well.
+    /// Puts the edited text into the control. The keys alone do not say what becomes of a text of
+    /// which a part was selected; then the text is reported as well.
     void takeOver(const std::string& edited);
 
   protected:
