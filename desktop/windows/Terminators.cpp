@@ -9,6 +9,7 @@
 #include "desktop/binders/ShortcutTable.h"
 #include "panel/EntryText.h"
 #include "panel/SoftPositions.h"
+#include "support/AtEnd.h"
 
 namespace zel {
 namespace {
@@ -157,6 +158,7 @@ void TerminatorRow::press(std::size_t index) {
     const std::vector<Terminator>& terminators = terminatorsOf(panel_, mirror_, at);
     if (index >= terminators.size()) return;
     PanelLineEdit* box = boxOf(at);
+    if (!box->isEnabled()) return;
     box->setFocus(Qt::OtherFocusReason);
     // A value that was only read is not sent again, and a unit alone is no value.
     const bool typed = panel_.SoftBoxFirstKey != 1 && !box->text().isEmpty();
@@ -202,7 +204,11 @@ bool TerminatorRow::typeAhead(const QKeyEvent& event) {
     const int at = position();
     if (at < 0 || (binder_.refuses && binder_.refuses(panel_.SoftTextBox(at)))) return false;
     PanelLineEdit* box = boxOf(at);
-    if (box == nullptr || !box->isVisible()) return false;
+    // A grey box hands the key up to the window, which would send it here again.
+    static bool sending = false;
+    if (sending || box == nullptr || !box->isVisible() || !box->isEnabled()) return false;
+    sending = true;
+    const AtEnd sent([] { sending = false; });
     box->setFocus(Qt::OtherFocusReason);
     QKeyEvent key(QEvent::KeyPress, event.key(), event.modifiers(), event.text());
     QApplication::sendEvent(box, &key);

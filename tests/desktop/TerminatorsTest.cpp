@@ -152,6 +152,23 @@ TEST_F(EntryTest, DigitWithoutAnyBox_IsDropped) {
     EXPECT_EQ(window->focusWidget(), &window->graph());
 }
 
+TEST_F(EntryTest, DigitInAContinuousView_IsDroppedByTheGreyBox) {
+    const QString shown = box(0)->text();
+    bool typed = false;
+    platform.events.schedule(300, [&] {
+        window->showNow();
+        EXPECT_FALSE(box(0)->isEnabled());
+        QTest::keyClicks(&window->graph(), "9");
+        press("Alt+M");
+        EXPECT_EQ(box(0)->text(), shown);
+        typed = true;
+        panel().StopButton.Click();
+    });
+    panel().PlayContinuousButton.Click();
+    EXPECT_TRUE(typed);
+    EXPECT_EQ(program->variables().CenterFrequency, 1.5e9);
+}
+
 TEST_F(EntryTest, PastedValue_StaysForItsEnter) {
     box(0)->setFocus();
     box(0)->selectAll();
