@@ -68,6 +68,7 @@ void Handshake::connect() {
     if (!wakeInstrument()) return noInstrument(reader_.absenceTold());
     acceptRemote();
     if (!identify()) return;
+    mirror_.Unsure.clear();
     if (!readDetector()) return;
     readMode();
     if (!instrumentAnswers()) return;
@@ -77,7 +78,6 @@ void Handshake::connect() {
     if (panel_.InstrumentMode != CF::POWERSENSOR && !readState()) return;
     dialog_.IsConnecting = false;
     panel_.isConnected = true;
-    mirror_.Unsure.clear();
     connectedLook();
     fill_.FillTextFields("FREQ");
     showPointer(dialog_, session_.events, kArrow);
@@ -143,6 +143,7 @@ bool Handshake::readDetector() {
         if (!exchange_.SetInstrument("MEAS,1")) return false;
         if (!exchange_.GetInstrument("TRACEDET", answer)) return false;
     }
+    if (!mirror_.Unsure.answered("TRACEDET", answer)) return true;
     const auto number = static_cast<int>(std::clamp(leadingNumber(answer), -255.0, 255.0));
     mirror_.TraceDetector = static_cast<std::uint8_t>(number);
     return true;
@@ -162,7 +163,9 @@ void Handshake::readMode() {
 bool Handshake::query(const char* word, double& field) {
     std::string answer;
     if (!exchange_.GetInstrument(word, answer)) return false;
-    field = leadingNumber(answer);
+    // No number: it was spoiled on its way.
+    if (!startsWithNumber(answer) && !exchange_.GetInstrument(word, answer)) return false;
+    if (mirror_.Unsure.answered(word, answer)) field = leadingNumber(answer);
     return true;
 }
 

@@ -93,7 +93,7 @@ void ViewWriter::bandwidth(const char* word) {
                                                       : onGraph_.settings.VideoBandwidth;
     if (panel_.isConnected) {
         std::string answer;
-        if (!exchange_.GetInstrument(word, answer)) return;
+        if (!exchange_.GetInstrument(word, answer) || !startsWithNumber(answer)) return;
         value = leadingNumber(answer);
         // After a setting it may be another than that of the trace.
         if (!onGraph_.settingsKept) ofSweep = value;

@@ -50,6 +50,15 @@ std::string AnswerReader::ReadAnswer() {
     return read(static_cast<std::int64_t>(timeout * 1000), "No response received!", true);
 }
 
+std::string AnswerReader::ReadModeStatus() {
+    std::string answer = ReadAnswer();
+    const std::string text = trimmed(answer);
+    const bool isStatus = text.size() == 1 && isDigit(text.front());
+    if (text.empty() || isStatus || !panel_.isConnected) return answer;
+    state_.RestFound = true;
+    return lastOfAll(answer);
+}
+
 std::string AnswerReader::ReadAnswerTriggered(std::int32_t timeoutSeconds) {
     return read(std::int64_t{timeoutSeconds} * 1000, "External trigger timed out!", false);
 }

@@ -23,7 +23,12 @@ class AnswerReader {
     /// One line without its CR, or the empty text. A silence in session sets `ExchangeFailed`
     /// and reports "No response received!" once; while connecting it takes the connection down.
     std::string ReadAnswer();
-    /// The same with the caller's time-out in seconds, for an exchange that a trigger ends.
+    /// The status of a mode word. In session a line that is no status is left over from something
+    /// before it, such as the rest of a transfer that was longer than asked for: the last status
+    /// that comes before a silence counts. Where none comes the line stands as it is.
+    std::string ReadModeStatus();
+    /// The same as `ReadAnswer` with the caller's time-out in seconds, for an exchange that a
+    /// trigger ends.
     std::string ReadAnswerTriggered(std::int32_t timeoutSeconds);
     /// Takes a line that the instrument owes, or waits that long; nothing is reported.
     void awaitQuietly(int timeoutMs);

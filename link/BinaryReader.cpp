@@ -83,6 +83,11 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         state_.TCPDataArrived = false;
         return result;
     }
+    bool more = false;
+    const auto cut = [&] {
+        more = more || result.size() > wanted;
+        if (more) result.resize(wanted);
+    };
     std::string chunk = ReadBinaryChunk(kChunkSeconds);
     if (chunk.size() == 1) {
         const char status = chunk.front();
@@ -108,7 +113,7 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
             chunk.erase(0, passed);
             ofStatus -= passed;
             result += chunk;
-            if (result.size() > wanted) result.resize(wanted);
+            cut();
             chunk = link_.takeBytes();
             if (chunk.empty() && result.size() + 3 < wanted) chunk = ReadBinaryChunk(kChunkSeconds);
             session_.events.pump();
@@ -123,11 +128,13 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         result += chunk;
         if (result.size() + 2 >= wanted && result.size() < wanted)
             result += takeTail(wanted - result.size());
-        if (result.size() > wanted) result.resize(wanted);
+        cut();
     }
     state_.TCPDataArrived = false;
     link_.noteBlock(result.size());
-    if (result.size() < wanted) state_.AnswerOverdue = true;
+    // The rest of a transfer comes into the next exchange, as a late one does.
+    if (more) state_.RestFound = true;
+    if (more || result.size() < wanted) state_.AnswerOverdue = true;
     if (link_.isTcp() && result.size() < wanted && !link_.usable()) link_.tellLoss();
     return result;
 }

@@ -76,7 +76,7 @@ BinaryTrace::Outcome BinaryTrace::readOnce(RawTrace& trace, bool doubleBlock, bo
     state_.InputBuffer.clear();
     link_.WriteToLink("GET\r");
     delay(DelayPlace::AfterTraceGet);
-    int status = statusNumber(reader_.ReadAnswer());
+    int status = statusNumber(reader_.ReadModeStatus());
     if (state_.ExchangeFailed || !reader_.answered()) return Outcome::Failed;
     if (status != 0) {
         startingError(status, "TRACEBIN");
@@ -152,7 +152,7 @@ BinaryTrace::Outcome BinaryTrace::readComplexOnce(std::vector<double>& values, b
     state_.InputBuffer.clear();
     link_.WriteToLink("GET\r");
     delay(DelayPlace::AfterComplexGet);
-    int status = statusNumber(reader_.ReadAnswer());
+    int status = statusNumber(reader_.ReadModeStatus());
     if (state_.ExchangeFailed || !reader_.answered()) return Outcome::Failed;
     if (status != 0) {
         startingError(status, "CTRACEBIN");

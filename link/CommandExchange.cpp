@@ -127,13 +127,13 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
     delay(DelayPlace::AfterModeWord);
     state_.InputBuffer.clear();
     const Stopwatch firstAnswer(session_.clock);
-    std::string answer = reader_.ReadAnswer();
+    std::string answer = reader_.ReadModeStatus();
     const auto over = [this] {
         return (link_.isTcp() && !link_.usable()) || state_.mustLeave(session_.clock.micros());
     };
     while (answer.empty() && firstAnswer.Elapsed() <= kFirstAnswerMs && !over()) {
         session_.events.wait(kRetryPauseMs);
-        answer = reader_.ReadAnswer();
+        answer = reader_.ReadModeStatus();
     }
     if (state_.ExchangeFailed || !reader_.answered()) return false;
     const int status = statusNumber(answer);
@@ -178,7 +178,7 @@ bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
     link_.drain(kDrainReads);
     link_.WriteToLink("set\r");
     delay(DelayPlace::AfterModeWord);
-    int status = statusNumber(reader_.ReadAnswer());
+    int status = statusNumber(reader_.ReadModeStatus());
     if (state_.ExchangeFailed || !reader_.answered()) return false;
     if (status != 0) {
         report(status, keywordAndValue);
@@ -205,7 +205,7 @@ bool CommandExchange::GetInstrument(const std::string& keyword, std::string& val
     link_.drain(kDrainReads);
     link_.WriteToLink("GET\r");
     delay(DelayPlace::AfterModeWord);
-    int status = statusNumber(reader_.ReadAnswer());
+    int status = statusNumber(reader_.ReadModeStatus());
     if (state_.ExchangeFailed || !reader_.answered()) return false;
     if (status != 0) {
         session_.boxes.show(

@@ -24,6 +24,8 @@ struct ZELBas {
     bool AnswerOverdue = false;  ///< an exchange ended in a time-out: its answer may still come
     /// The line that was just sent follows such an exchange: what comes first may be its answer.
     bool LateAnswerFirst = false;
+    /// The line brought more than was asked for, as when the detector is another than is known.
+    bool RestFound = false;
     bool LossTold = false;     ///< the end of this connection was reported to the user
     double SweepTimeTold = 0;  ///< s, SWPTIME as the instrument last answered or accepted it
     /// Exchanges, transfers and whole cycles of them that have begun and not ended. What would

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "support/NumberText.h"
+
 namespace zel {
 namespace {
 
@@ -21,6 +23,12 @@ void UnsureSettings::set(std::string_view word, bool unsure) {
     if (mark == unsure) return;
     mark = unsure;
     Changed();
+}
+
+bool UnsureSettings::answered(std::string_view word, std::string_view answer) {
+    const bool isNumber = startsWithNumber(answer);
+    set(word, !isNumber);
+    return isNumber;
 }
 
 void UnsureSettings::clear() {

@@ -20,6 +20,9 @@ class UnsureSettings {
     bool any() const;
     /// A value of this word was sent and the mirror took it.
     void sent(std::string_view word, bool accepted) { set(word, !accepted); }
+    /// The instrument answered a query of this word. False for an answer that is no number: the
+    /// mirror keeps what it has, and the setting is unsure.
+    bool answered(std::string_view word, std::string_view answer);
     /// The mirror holds what the instrument answered.
     void known(std::string_view word) { set(word, false); }
     /// The mirror holds the instrument's settings: a new session, a preset.

@@ -63,7 +63,7 @@ bool HardKeys::readMarkers() {
 bool HardKeys::readSweepTime() {
     std::string answer;
     if (!exchange_.GetInstrument("SWPTIME", answer)) return false;
-    mirror_.SweepTime = leadingNumber(answer);
+    if (startsWithNumber(answer)) mirror_.SweepTime = leadingNumber(answer);
     return true;
 }
 

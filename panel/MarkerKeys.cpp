@@ -89,12 +89,12 @@ void MarkerKeys::MarkToCentButton_Click() {
     if (interlock_.refuses(panel_.MarkToCentButton)) return;
     const Hourglass busy(panel_, events_);
     if (!command("MARKTOCENT")) return;
+    mirror_.Unsure.sent("FREQ", false);  // until the new one is known
     events_.sleep(kMoveMs);
     std::string answer;
-    if (exchange_.GetInstrument("MARK1", answer)) {
+    if (exchange_.GetInstrument("MARK1", answer) && mirror_.Unsure.answered("FREQ", answer)) {
         panel_.CFLabel.Caption = centerLabelText(split(answer, ',').front());
         mirror_.CenterFrequency = leadingNumber(answer);
-        mirror_.Unsure.known("FREQ");
     }
     readout_.MakeMarkerReadout();
     bool success = false;
@@ -105,6 +105,7 @@ void MarkerKeys::MarkToRefButton_Click() {
     if (interlock_.refuses(panel_.MarkToRefButton)) return;
     const Hourglass busy(panel_, events_);
     if (!command("MARKTOLVL")) return;
+    mirror_.Unsure.sent("REFLVL", false);
     events_.sleep(kMoveMs);
     std::string answer;
     if (exchange_.GetInstrument("MARK1", answer)) {
@@ -112,7 +113,7 @@ void MarkerKeys::MarkToRefButton_Click() {
         const std::vector<std::string> pieces = split(answer, ',');
         // The centre did not move: the label takes the marker's x all the same.
         panel_.CFLabel.Caption = centerLabelText(pieces.front());
-        if (pieces.size() > 1)
+        if (pieces.size() > 1 && mirror_.Unsure.answered("REFLVL", pieces[1]))
             mirror_.ReferenceLevel =
                 leadingNumber(replaceAll(formatPattern(leadingNumber(pieces[1]), "00,0"), ",", ""));
     }

@@ -1,6 +1,7 @@
 #include "panel/MenuFill.h"
 
 #include <algorithm>
+#include <variant>
 #include <vector>
 
 #include "model/Numeric.h"
@@ -39,7 +40,13 @@ void MenuFill::ask(const SoftPosition& position) {
     if (position.fillAsks != nullptr && !position.fillAsks(panel_, mirror_)) return;
     std::string answer;
     if (!answered(position.word, answer)) return;
-    storeField(mirror_, position.fieldToFill(), leadingNumber(answer), answer);
+    const MirrorField field = position.fieldToFill();
+    const bool isText = std::holds_alternative<std::string ZEL3Variables::*>(field);
+    if (isText || startsWithNumber(answer)) {
+        storeField(mirror_, field, leadingNumber(answer), answer);
+    } else if (field.index() != 0) {
+        mirror_.Unsure.answered(position.word, answer);
+    }
     if (position.state == CF::OCCBW && position.key == 0)
         mirror_.OccBWValueCopy = mirror_.OccBWValue;
 }

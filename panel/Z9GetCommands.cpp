@@ -110,7 +110,8 @@ void Z9GetCommands::runQuery(const SoftPosition& query) {
         const double taken = whole ? answer : ParseValue(box.Text, prefix);
         storeField(mirror_, query.field, taken, LastQueryAnswer);
         // A number with a unit and no prefix reads as 0: the mirror is not the instrument's.
-        if (query.field.index() != 0 && taken == answer) mirror_.Unsure.known(query.word);
+        if (query.field.index() != 0 && (taken == answer || !startsWithNumber(LastQueryAnswer)))
+            mirror_.Unsure.answered(query.word, LastQueryAnswer);
         if (query.codes) decode(*query.codes, answer, query.key);
     } else if (query.codes) {
         // A caption reads as 0, so that the box shows the caption of code 0.
@@ -203,7 +204,8 @@ void Z9GetCommands::autoSweepTime(int index) {
     routines_.softPanel.SetButtonColor(1, "green");
     exchange_.SetInstrument("SWPTIME,0");
     std::string answer;
-    if (exchange_.GetInstrument("SWPTIME", answer)) mirror_.SweepTime = leadingNumber(answer);
+    if (exchange_.GetInstrument("SWPTIME", answer) && startsWithNumber(answer))
+        mirror_.SweepTime = leadingNumber(answer);
     const CodeRow* code = findCode(T::AutoSweepTime, mirror_.SweepTime);
     if (code != nullptr) {
         panel_.SoftTextBox(index).Text = std::string(code->choice);

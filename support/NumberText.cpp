@@ -17,6 +17,12 @@ constexpr int kMostRounding = 15;  // finer steps than a double has
 constexpr int kMostPatternDecimals = 20;
 
 /// Length of the number at the head of a text that begins with sign, digit or point; 0 for none.
+std::string_view withoutBlanks(std::string_view text) {
+    while (!text.empty() && (text.front() == ' ' || text.front() == '\t' || text.front() == '\n'))
+        text.remove_prefix(1);
+    return text;
+}
+
 std::size_t numberLength(std::string_view text) {
     std::size_t i = 0;
     if (i < text.size() && (text[i] == '+' || text[i] == '-')) ++i;
@@ -60,9 +66,10 @@ void groupThousands(std::string& digits) {
 
 }  // namespace
 
+bool startsWithNumber(std::string_view text) { return numberLength(withoutBlanks(text)) > 0; }
+
 double leadingNumber(std::string_view text) {
-    while (!text.empty() && (text.front() == ' ' || text.front() == '\t' || text.front() == '\n'))
-        text.remove_prefix(1);
+    text = withoutBlanks(text);
     std::size_t length = numberLength(text);
     if (length == 0) return 0;
     if (text.front() == '+') {

@@ -11,6 +11,8 @@ namespace zel {
 /// The number that a text starts with: blanks are skipped, then sign, digits, point, exponent.
 /// Junk gives 0, and so does a number past the range of a double.
 double leadingNumber(std::string_view text);
+/// The text starts with such a number.
+bool startsWithNumber(std::string_view text);
 /// The number that the whole text is, blanks around it allowed; nothing for any other text, for one
 /// with a comma, and past the range of a double.
 std::optional<double> parseNumber(std::string_view text);

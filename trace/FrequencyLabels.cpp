@@ -29,10 +29,9 @@ void FrequencyLabels::query(const char* word, double& field, Label& label,
     const Hourglass busy(dialog_, events_);
     std::string answer;
     ok = exchange_.GetInstrument(word, answer);
-    if (ok) {
+    if (ok && mirror_.Unsure.answered(word, answer)) {
         label.Caption = text(answer);
         field = leadingNumber(answer);
-        mirror_.Unsure.known(word);
     }
 }
 

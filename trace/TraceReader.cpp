@@ -16,6 +16,7 @@ namespace {
 constexpr std::size_t kBlock = 301;
 constexpr std::size_t kSecondBlock = 300;  // the pair of point i is (sample i, sample i - 1)
 constexpr double kIntervals = 300;
+constexpr int kRounds = 2;  // of a query whose answer is no number
 constexpr double kNone = std::numeric_limits<double>::quiet_NaN();
 
 std::uint8_t byteOf(double number) {
@@ -39,18 +40,28 @@ TraceReader::TraceReader(Forms& forms, ZEL3Variables& mirror, const InstrumentLi
       session_(session) {}
 
 TraceReader::Step TraceReader::query(const char* word, double& field) {
-    if (!exchange_.GetInstrument(word, panel_.InstrumentAnswer))
-        return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Refused;
-    field = leadingNumber(panel_.InstrumentAnswer);
-    if (exchange_.ExchangeFailed()) return Step::LinkFailed;
-    mirror_.Unsure.known(word);
-    return Step::Ok;
+    for (int round = 0; round < kRounds; ++round) {
+        if (!exchange_.GetInstrument(word, panel_.InstrumentAnswer))
+            return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Refused;
+        if (exchange_.ExchangeFailed()) return Step::LinkFailed;
+        // An answer that is no number was spoiled on its way.
+        if (!mirror_.Unsure.answered(word, panel_.InstrumentAnswer)) continue;
+        field = leadingNumber(panel_.InstrumentAnswer);
+        return Step::Ok;
+    }
+    return Step::NoNumber;
 }
 
 TraceReader::Step TraceReader::queryCode(const char* word, std::uint8_t& field) {
     double number = 0;
     const Step step = query(word, number);
     if (step == Step::Ok) field = byteOf(number);
+    return step;
+}
+
+TraceReader::Step TraceReader::queryDetector() {
+    const Step step = queryCode("TRACEDET", mirror_.TraceDetector);
+    if (step != Step::LinkFailed) state_.RestFound = false;
     return step;
 }
 
@@ -77,7 +88,7 @@ TraceReader::Step TraceReader::askSettings() {
     if (step == Step::Ok) step = query("UNIT", mirror_.ReferenceUnit);
     if (step == Step::Ok) step = query("RANGE", mirror_.ReferenceRange);
     if (step == Step::Ok) step = queryCode("DYNRANGE", mirror_.DynamicRangeMode);
-    if (step == Step::Ok) step = queryCode("TRACEDET", mirror_.TraceDetector);
+    if (step == Step::Ok) step = queryDetector();
     if (step == Step::Ok) step = query("SWPTIME", mirror_.SweepTime);
     return step;
 }
@@ -94,8 +105,7 @@ TraceReader::Step TraceReader::askAgain(const ReadAgain& again) {
         step = query("REFLVL", mirror_.ReferenceLevel);
     if (step == Step::Ok && wanted(again.range, AxisSetting::Range))
         step = query("RANGE", mirror_.ReferenceRange);
-    if (step == Step::Ok && wanted(again.detector, AxisSetting::Detector))
-        step = queryCode("TRACEDET", mirror_.TraceDetector);
+    if (step == Step::Ok && wanted(again.detector, AxisSetting::Detector)) step = queryDetector();
     return step;
 }
 
@@ -109,7 +119,9 @@ TraceReader::Step TraceReader::wait() {
     exchange_.CmdInstrument("WAIT");
     pace_.sweepWaitEnds();
     panel_.TraceIntervals = kIntervals;
-    return exchange_.ExchangeFailed() ? Step::LinkFailed : Step::Ok;
+    if (exchange_.ExchangeFailed()) return Step::LinkFailed;
+    // A transfer that was longer than asked for shows that the detector is another one.
+    return state_.RestFound ? queryDetector() : Step::Ok;
 }
 
 void TraceReader::begin() {
@@ -241,7 +253,7 @@ void TraceReader::ReadSingleTrace(bool& success) {
     if (panel_.SingleSweepModeActive && !exchange_.CmdInstrument("INIT")) return;
     Step step = askSettings();
     if (step == Step::Ok) step = wait();
-    if (step == Step::LinkFailed) return abortView(success);
+    if (step == Step::LinkFailed || step == Step::NoNumber) return abortView(success);
     // The x values for the waterfall are those of the trace before.
     if (step == Step::Refused || !ReadTraceData(panel_.ViewStart, panel_.ViewStop)) {
         panel_.MousePointer = kArrow;
@@ -285,7 +297,7 @@ void TraceReader::ReadSingleTrace2(const ReadAgain& again, bool& success) {
     // A loaded file has set fields of the mirror: they are the instrument's again after this.
     Step step = panel_.Shown.fromFile ? askSettings() : askAgain(again);
     if (step == Step::Ok) step = wait();
-    if (step == Step::LinkFailed) return abortView(success);
+    if (step == Step::LinkFailed || step == Step::NoNumber) return abortView(success);
     if (step == Step::Refused) return close();
     const SweepAxis axis = viewRange();
     if (!ReadTraceData(axis.start, axis.stop)) return close();

@@ -40,10 +40,11 @@ class TraceReader {
     Event<const Sweep&> CutShort;
 
   private:
-    enum class Step { Ok, Refused, LinkFailed };
+    enum class Step { Ok, Refused, LinkFailed, NoNumber };
 
     Step query(const char* word, double& field);
     Step queryCode(const char* word, std::uint8_t& field);
+    Step queryDetector();
     Step queryFrequency();
     Step querySpan();
     Step askSettings();

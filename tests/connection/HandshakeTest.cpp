@@ -266,6 +266,28 @@ TEST_F(Connection, Handshake_Done_LeavesNoSettingUnsure) {
     EXPECT_FALSE(panel.SpanLabel.Struck);
 }
 
+TEST_F(Connection, Handshake_LevelThatIsNoNumber_IsAskedForOnceMore) {
+    page().wake().cmd("REMOTE").identity().detectorModeAndFrequency();
+    page().get("SPAN", "1000000").get("UNIT", "0").get("REFLVL", "").get("REFLVL", "-20");
+    page().get("RANGE", "1").get("DYNRANGE", "1").get("SWPTIME", "0.02").get("SWPCONT", "1");
+    page().cmd("INIT").get("RBW", "4").get("VBW", "5").get("FREQOFFS", "0");
+    EXPECT_TRUE(connect());
+    expectPlayed();
+    EXPECT_EQ(mirror.ReferenceLevel, -20);
+    EXPECT_FALSE(mirror.Unsure.any());
+}
+
+// What the handshake did not learn the first cycle asks for.
+TEST_F(Connection, Handshake_FrequencyThatIsNoNumber_IsUnsure) {
+    page().wake().cmd("REMOTE").identity();
+    page().get("TRACEDET", "").get("MEAS", "1").get("FREQ", "").state().get("FREQOFFS", "0");
+    EXPECT_TRUE(connect());
+    expectPlayed();
+    EXPECT_TRUE(mirror.Unsure.has(AxisSetting::Frequency));
+    EXPECT_TRUE(mirror.Unsure.has(AxisSetting::Detector));
+    EXPECT_TRUE(panel.CFLabel.Struck);
+}
+
 TEST_F(Connection, Handshake_SecondOfTheProcess_AsksNoFrequencyOffset) {
     page().whole().cmd("LOCAL");
     page().wake().cmd("REMOTE").identity().detectorModeAndFrequency().state();

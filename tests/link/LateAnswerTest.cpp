@@ -28,6 +28,52 @@ TEST_F(Line, LateAnswer_InsideTheNextSetting_DoesNotAcceptIt) {
     expectPlayed();
 }
 
+// The separator of a block is a CR for an instrument, and its samples may hold one.
+template <class Far>
+void expectRestPassedOver(Line& line, Far& far) {
+    far.expect("GET\r").answer("...samples\r").answer("more\r0\r").after(100);
+    far.expect("FREQ\r").answer("0\r1500000000\r");
+    far.expect("set\r").answer("samples\r").answer("0\r").after(100);
+    far.expect("SPAN,1\r").answer("5\r");
+    std::string value;
+    EXPECT_TRUE(line.exchange.GetInstrument("FREQ", value));
+    EXPECT_EQ(value, "1500000000");
+    EXPECT_FALSE(line.exchange.SetInstrument("SPAN,1"));
+    line.expectPlayed();
+}
+
+TEST_F(Line, RestOfALongerTransfer_IsNoStatus) { expectRestPassedOver(*this, port); }
+
+TEST_F(Line, RestOfALongerTransfer_OverTcp_IsNoStatus) {
+    overTcp();
+    expectRestPassedOver(*this, socket);
+}
+
+TEST_F(Line, TransferThatWasLongerThanAskedFor_IsPassedOverBeforeTheNextQuery) {
+    const std::string block(1205, 'x');
+    port.expect("GET\r").answer("0\r");
+    port.expect("TRACEBIN\r").answer("0\r" + block + block.substr(0, 1200)).answer("5\r").after(30);
+    port.expect("GET\r").answer("0\r").after(40);
+    port.expect("FREQ\r").answer("0\r1500000000\r");
+    RawTrace trace;
+    EXPECT_TRUE(binary.GetTraceBinary(trace, false));
+    EXPECT_EQ(trace.came, 301U);
+    EXPECT_TRUE(state.RestFound);
+    std::string value;
+    EXPECT_TRUE(exchange.GetInstrument("FREQ", value));
+    EXPECT_EQ(value, "1500000000");
+    expectPlayed();
+}
+
+TEST_F(Line, LineThatIsNoStatus_WithNothingAfterIt_CountsAsAccepted) {
+    port.expect("GET\r").answer("junk\r");
+    port.expect("FREQ\r").answer("0\r1500000000\r");
+    std::string value;
+    EXPECT_TRUE(exchange.GetInstrument("FREQ", value));
+    EXPECT_EQ(value, "1500000000");
+    expectPlayed();
+}
+
 TEST_F(Line, LateAnswer_OverTcp_IsNotTakenForTheNext) {
     overTcp();
     socket.expect("cmd\r").answer("0\r");

@@ -196,6 +196,18 @@ TEST_F(MarkerTest, ToCentre_TakesTheMarkerForTheCentre) {
     EXPECT_GE(ms, 700);
 }
 
+TEST_F(MarkerTest, ToCentre_WithoutTheMarkersAnswer_AsksForTheCentreBeforeTheSweep) {
+    cmd("MARKTOCENT");
+    getRefused("MARK1", "4");
+    getRefused("MARK1", "4");
+    get("FREQ", "900000000");
+    sweep();
+    panel.MarkToCentButton.Click();
+    expectPlayed();
+    EXPECT_EQ(mirror.CenterFrequency, 9e8);
+    EXPECT_FALSE(mirror.Unsure.any());
+}
+
 TEST_F(MarkerTest, ToReference_TakesTheWholeLevelAndRewritesTheCentreLabel) {
     mirror.CenterFrequency = 1e9;
     cmd("MARKTOLVL");

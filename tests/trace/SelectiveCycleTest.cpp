@@ -26,6 +26,10 @@ struct SelectiveCycleTest : ReadCycle {
         cmd("WAIT");
         trace(levelBlock(-35250));
     }
+    void sweepOfPairs() {
+        cmd("WAIT");
+        trace(levelBlock(-35250) + levelBlock(-40000));
+    }
     void expectReady() {
         EXPECT_EQ(panel.MousePointer.get(), 0);
         EXPECT_TRUE(panel.PlaySingleButton.Enabled);
@@ -93,6 +97,36 @@ TEST_P(OneFlag, Refusal_EndsTheCycleAndFreesThePanel) {
     expectReady();
 }
 
+// An empty line, or a text, is no value of a setting.
+TEST_P(OneFlag, AnswerThatIsNoNumber_IsAskedForOnceMore) {
+    get(GetParam().word, "");
+    get(GetParam().word, "3");
+    sweep();
+    EXPECT_TRUE(readAgain(GetParam().again));
+    expectPlayed();
+    EXPECT_FALSE(mirror.Unsure.any());
+}
+
+TEST_P(OneFlag, NoNumberTwice_ShowsNoTraceOverIt) {
+    const ZEL3Variables before = mirror;
+    get(GetParam().word, "");
+    get(GetParam().word, "p5");
+    EXPECT_FALSE(readAgain(GetParam().again));
+    expectPlayed();
+    EXPECT_EQ(boxes.texts(), Texts{"Unsuccessful View"});
+    EXPECT_TRUE(mirror.Unsure.any());
+    EXPECT_EQ(mirror.CenterFrequency, before.CenterFrequency);
+    EXPECT_EQ(mirror.Span, before.Span);
+    EXPECT_EQ(mirror.ReferenceLevel, before.ReferenceLevel);
+    EXPECT_EQ(mirror.TraceDetector, before.TraceDetector);
+    // The next cycle asks again, whatever its flags.
+    get(GetParam().word, "3");
+    sweep();
+    EXPECT_TRUE(readAgain(kNothing));
+    expectPlayed();
+    EXPECT_FALSE(mirror.Unsure.any());
+}
+
 INSTANTIATE_TEST_SUITE_P(Flags, OneFlag,
                          ::testing::Values(FlagRow{{true, false, false, false, false}, "FREQ"},
                                            FlagRow{{false, true, false, false, false}, "SPAN"},
@@ -100,6 +134,20 @@ INSTANTIATE_TEST_SUITE_P(Flags, OneFlag,
                                            FlagRow{{false, false, false, true, false}, "RANGE"},
                                            FlagRow{{false, false, false, false, true},
                                                    "TRACEDET"}));
+
+// The instrument has the detector of pairs, and the mirror does not.
+TEST_F(SelectiveCycleTest, LongerTransfer_AsksForTheDetectorInTheNextCycle) {
+    sweepOfPairs();
+    EXPECT_TRUE(readAgain(kNothing));
+    cmd("WAIT");
+    get("TRACEDET", "0");
+    trace(levelBlock(-35250) + levelBlock(-40000));
+    EXPECT_TRUE(readAgain(kNothing));
+    EXPECT_EQ(mirror.TraceDetector, DETAUTOPEAK);
+    sweepOfPairs();
+    EXPECT_TRUE(readAgain(kNothing));
+    expectPlayed();
+}
 
 TEST_F(SelectiveCycleTest, FailedLink_AbortsAheadOfEverything) {
     program.link().ExchangeFailed = true;
