@@ -31,10 +31,10 @@ TEST_F(Line, LateAnswer_InsideTheNextSetting_DoesNotAcceptIt) {
 // The separator of a block is a CR for an instrument, and its samples may hold one.
 template <class Far>
 void expectRestPassedOver(Line& line, Far& far) {
-    far.expect("GET\r").answer("...samples\r").answer("more\r0\r").after(100);
-    far.expect("FREQ\r").answer("0\r1500000000\r");
-    far.expect("set\r").answer("samples\r").answer("0\r").after(100);
-    far.expect("SPAN,1\r").answer("5\r");
+    far.expect("GET\r").answer("...samples\r").answer("0\r").after(5);
+    far.expect("FREQ\r").answer("0\r1500000000\r").after(20);
+    far.expect("set\r").answer("samples\r").answer("0\r").after(5);
+    far.expect("SPAN,1\r").answer("5\r").after(20);
     std::string value;
     EXPECT_TRUE(line.exchange.GetInstrument("FREQ", value));
     EXPECT_EQ(value, "1500000000");
