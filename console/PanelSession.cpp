@@ -70,7 +70,15 @@ PanelSession::PanelSession(Program& program, const Services& means,
     program_.help().WinHelpA = shown;
 }
 
+void PanelSession::serveInPumps() {
+    m_.events.whilePumping = [this] {
+        if (!interlock_.userWorks() || depth_ >= kDeepest || ended_ || program_.ended()) return;
+        if (microsLeft() <= 0 && interlock_.waiting() == 0) readAndExecute();
+    };
+}
+
 PanelSession::~PanelSession() {
+    m_.events.whilePumping = nullptr;
     m_.events.whileWaiting = nullptr;
     program_.help().HtmlHelpA = nullptr;
     program_.help().WinHelpA = nullptr;

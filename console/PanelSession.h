@@ -41,6 +41,9 @@ class PanelSession {
     /// Starts the program and serves lines to the end. An unknown word or name is reported on the
     /// errors and makes the status 2; a connection that did not come about makes it 1.
     int run();
+    /// Serves lines also where the program only lets pending events run, as a window takes clicks:
+    /// a recorded session needs each line in its place.
+    void serveInPumps();
     /// Reports wrong use; the session goes on.
     void complain(const std::string& what);
 

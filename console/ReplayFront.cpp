@@ -10,9 +10,10 @@ namespace {
 class ReplayFront : public VirtualFront {
   public:
     ReplayFront(const SessionRecord& record, const std::string& home)
-        : VirtualFront(home), source_(record, clock_, events_, [this](std::int64_t micros) {
-              clock_.advanceMicros(micros - clock_.micros());
-          }) {}
+        : VirtualFront(home),
+          source_(record, clock_, events_, [this](std::int64_t micros) { passTo(micros); }) {}
+
+    void passTo(std::int64_t micros) { clock_.advanceMicros(micros - clock_.micros()); }
 
   private:
     Lines lines() override { return {port_, tcpSocket_, serverPort_, portProbe_}; }
@@ -26,8 +27,10 @@ class ReplayFront : public VirtualFront {
 
 }  // namespace
 
-std::unique_ptr<Front> makeReplayFront(const SessionRecord& record, const std::string& home) {
-    return std::make_unique<ReplayFront>(record, home);
+ReplayStage makeReplayFront(const SessionRecord& record, const std::string& home) {
+    auto front = std::make_unique<ReplayFront>(record, home);
+    const auto passTo = [&own = *front](std::int64_t micros) { own.passTo(micros); };
+    return {std::move(front), passTo};
 }
 
 }  // namespace zel

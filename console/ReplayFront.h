@@ -1,6 +1,8 @@
 #pragma once
 // A platform on which a recorded session stands for the instrument, in virtual time.
 
+#include <cstdint>
+#include <functional>
 #include <memory>
 #include <string>
 
@@ -9,7 +11,13 @@
 
 namespace zel {
 
+struct ReplayStage {
+    std::unique_ptr<Front> front;
+    /// Brings the front's clock to that many microseconds.
+    std::function<void(std::int64_t)> passTo;
+};
+
 /// The record must outlive the front.
-std::unique_ptr<Front> makeReplayFront(const SessionRecord& record, const std::string& home);
+ReplayStage makeReplayFront(const SessionRecord& record, const std::string& home);
 
 }  // namespace zel

@@ -1,6 +1,7 @@
 #include "console/ReplayInput.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "support/Text.h"
 
@@ -10,25 +11,34 @@ namespace {
 using Kind = SessionEvent::Kind;
 
 constexpr std::int64_t kPatience = 60'000'000;  // microseconds that a line waits for bytes
+constexpr std::int64_t kDrawing = 250'000;      // that a window may have drawn before a line
 
 }  // namespace
 
-ReplayInput::ReplayInput(const SessionRecord& record, const SessionCompare& compare,
-                         const Clock& clock, Events& events)
-    : compare_(compare), clock_(clock), events_(events), origin_(clock.micros()) {
+ReplayInput::ReplayInput(const SessionRecord& record, const ReplayProgress& progress,
+                         const Clock& clock, Events& events,
+                         std::function<void(std::int64_t)> passTo)
+    : progress_(progress),
+      clock_(clock),
+      events_(events),
+      passTo_(std::move(passTo)),
+      origin_(clock.micros()) {
     // A window writes an answer down when it is given, after the question; here it has to wait.
     const bool window = !record.events.empty() && startsWith(record.events[0].text, "zelremote");
     std::size_t answers = 0;
+    std::size_t came = 0;
     for (std::size_t i = 0; i < record.events.size(); ++i) {
         const SessionEvent& event = record.events[i];
         end_ = std::max(end_, event.micros);
-        if (event.kind == Kind::Click) items_.push_back({i, event.micros, "click " + event.text});
+        if (event.kind == Kind::Came) came += event.text.size();
+        if (event.kind == Kind::Click)
+            items_.push_back({i, event.micros, came, "click " + event.text});
         if (event.kind != Kind::Input) continue;
         if (window && startsWith(event.text, "answer ")) {
             items_.insert(items_.begin() + static_cast<std::ptrdiff_t>(answers++),
-                          {0, 0, event.text});
+                          {0, 0, 0, event.text});
         } else {
-            items_.push_back({i, event.micros, event.text});
+            items_.push_back({i, event.micros, came, event.text});
         }
     }
 }
@@ -38,7 +48,13 @@ ReplayInput::~ReplayInput() {
 }
 
 bool ReplayInput::due(const Item& item) {
-    const std::int64_t now = clock_.micros() - origin_;
+    const SessionCompare& compare = progress_.compare;
+    std::int64_t now = clock_.micros() - origin_;
+    const bool next = compare.place() > item.event && progress_.came >= item.came;
+    if (next && now < item.micros && item.micros <= now + kDrawing && passTo_) {
+        passTo_(origin_ + item.micros);
+        now = item.micros;
+    }
     if (now < item.micros) {
         // The loop looks again at that very moment.
         if (task_ != 0) events_.cancel(task_);
@@ -46,12 +62,13 @@ bool ReplayInput::due(const Item& item) {
             events_.schedule(static_cast<double>(item.micros - now) / 1000, [this] { task_ = 0; });
         return false;
     }
-    return compare_.place() > item.event || compare_.difference() || now > item.micros + kPatience;
+    return compare.place() > item.event || compare.difference() || now > item.micros + kPatience;
 }
 
 LineInput::Got ReplayInput::next(std::string& line, bool /*block*/) {
     if (at_ == items_.size()) {
-        const bool over = compare_.complete() || compare_.difference() ||
+        const SessionCompare& compare = progress_.compare;
+        const bool over = compare.complete() || compare.difference() ||
                           clock_.micros() - origin_ > end_ + kPatience;
         return over ? Got::End : Got::Nothing;
     }

@@ -2,6 +2,7 @@
 // The lines and clicks of a recorded session, each in its turn.
 
 #include <cstdint>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -12,12 +13,22 @@
 
 namespace zel {
 
-/// A line comes at its time of the record, after all that the program sent before it. A program
-/// that differs does not keep it back for ever.
+/// How far a program has come in a record.
+struct ReplayProgress {
+    explicit ReplayProgress(const SessionRecord& record) : compare(record) {}
+    SessionCompare compare;
+    std::size_t came = 0;  ///< bytes from the instrument
+};
+
+/// A line comes at its time of the record, after all that the program sent and got before it; or
+/// up to a quarter of a second earlier, when it is what happened next: drawing takes no time here,
+/// and the program would be beyond the line when its time has come. A program that differs does
+/// not keep it back for ever.
 class ReplayInput : public LineInput {
   public:
-    ReplayInput(const SessionRecord& record, const SessionCompare& compare, const Clock& clock,
-                Events& events);
+    /// `passTo` brings a clock that can be moved to that many microseconds; it may be empty.
+    ReplayInput(const SessionRecord& record, const ReplayProgress& progress, const Clock& clock,
+                Events& events, std::function<void(std::int64_t)> passTo);
     ~ReplayInput() override;
 
     Got next(std::string& line, bool block) override;
@@ -26,13 +37,15 @@ class ReplayInput : public LineInput {
     struct Item {
         std::size_t event;
         std::int64_t micros;
+        std::size_t came;  // bytes from the instrument before it
         std::string line;
     };
     bool due(const Item& item);
 
-    const SessionCompare& compare_;
+    const ReplayProgress& progress_;
     const Clock& clock_;
     Events& events_;
+    std::function<void(std::int64_t)> passTo_;
     std::vector<Item> items_;
     std::size_t at_ = 0;
     std::int64_t origin_;

@@ -1,6 +1,7 @@
 #include "console/ReplayVerb.h"
 
 #include <QTemporaryDir>
+#include <functional>
 #include <locale>
 #include <memory>
 #include <sstream>
@@ -124,26 +125,31 @@ int runReplay(const Options& options, const Streams& streams) {
     recorded.address = options.address ? options.address : recorded.address;
     if (!recorded.address) recorded.address = recordedAddress(record);
     std::unique_ptr<Front> front;
+    std::function<void(std::int64_t)> passTo;
     if (!options.address) {
-        front = makeReplayFront(record, recorded.home);
+        ReplayStage stage = makeReplayFront(record, recorded.home);
+        front = std::move(stage.front);
+        passTo = std::move(stage.passTo);
         // The answers come from the record, whatever the address says.
         if (recorded.address) recorded.address->simulated = false;
     } else {
         front = options.address->simulated ? makeSimulatorFront(recorded.home)
                                            : makePortFront(recorded.home);
     }
-    SessionCompare compare(record);
+    ReplayProgress progress(record);
     Rerun rerun;
-    rerun.begun = [&compare](Program& program) {
-        program.sessionLog().Noted.connect([&compare](const SessionEvent& event) {
-            if (event.kind == SessionEvent::Kind::Sent) compare.sent(event.text);
+    rerun.begun = [&progress](Program& program) {
+        program.sessionLog().Noted.connect([&progress](const SessionEvent& event) {
+            if (event.kind == SessionEvent::Kind::Sent) progress.compare.sent(event.text);
+            if (event.kind == SessionEvent::Kind::Came) progress.came += event.text.size();
         });
     };
     rerun.files = [](FileService& disk) { return std::make_unique<OverlayFiles>(disk); };
     rerun.input = [&](const Clock& clock, Events& events) {
-        return std::make_unique<ReplayInput>(record, compare, clock, events);
+        return std::make_unique<ReplayInput>(record, progress, clock, events, passTo);
     };
     const int status = runTool(recorded, *front, streams, &rerun);
+    const SessionCompare& compare = progress.compare;
     // Of a log that was cut nobody knows how it went on.
     const bool beyond =
         damaged && (!compare.difference() || compare.difference()->event >= record.events.size());

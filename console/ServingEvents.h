@@ -15,6 +15,9 @@ class ServingEvents : public Events {
     /// Gets the milliseconds of each wait; true when it has done the waiting.
     std::function<bool(int)> whileWaiting;
 
+    /// Runs before each pump, where somebody else may act there as well.
+    std::function<void()> whilePumping;
+
     /// Runs before each wait and pump: what must be served also where time is virtual.
     std::function<void()> always;
 
@@ -22,6 +25,7 @@ class ServingEvents : public Events {
 
     void pump() override {
         if (always) always();
+        if (whilePumping) whilePumping();
         inner_.pump();
     }
     void wait(int ms) override {

@@ -128,5 +128,29 @@ TEST_F(RecordedDesk, KeysInABox_LeaveTheSameTextAgain) {
     EXPECT_EQ(result.substr(0, 2), "0\n") << result << log;
 }
 
+TEST_F(RecordedDesk, StopWhileASweepIsDrawn_EndsTheViewAtTheSamePass) {
+    ASSERT_TRUE(program->recordSession("/session.log", "zelremote"));
+    connectWritten();
+    window->showNow();
+    // On a desk drawing takes its time, in the console it takes none.
+    constexpr double kDrawing = 17;  // ms
+    std::size_t drawn = 0;
+    const auto sweeps = panel().CWGraph1.Changed.connect([&] {
+        if (panel().ContinuosLoopActive && ++drawn % 4 == 0) platform.clock.advance(kDrawing);
+    });
+    platform.events.schedule(300, [&] { press(panel().StopButton); });
+    press(panel().PlayContinuousButton);
+    EXPECT_FALSE(panel().ContinuosLoopActive);
+    platform.events.runFor(1700);
+    press(panel().FrequencyButton);
+    QTest::keyClicks(widgetOf<QLineEdit>(panel().SoftTextBox(0)), "900M");
+    QTest::keyClick(widgetOf<QLineEdit>(panel().SoftTextBox(0)), Qt::Key_Return);
+    platform.events.runFor(200);
+    program->disconnect();
+    program->sessionLog().end();
+    const std::string result = replayed();
+    EXPECT_EQ(result.substr(0, 2), "0\n") << result;
+}
+
 }  // namespace
 }  // namespace zel
