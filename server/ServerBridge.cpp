@@ -240,7 +240,8 @@ void ServerBridge::showState() {
         state = "Looking for the instrument";
     }
     form_.lblState.Caption = state;
-    const std::string sweeps = std::to_string(relay_.sweeps()) + " sweeps";
+    const std::string sweeps =
+        std::to_string(relay_.sweeps()) + (relay_.sweeps() == 1 ? " sweep" : " sweeps");
     form_.lblToInstrument.Caption = std::to_string(relay_.bytesToInstrument()) + " bytes";
     form_.lblToClient.Caption = std::to_string(relay_.bytesToClient()) + " bytes, " + sweeps;
 }

@@ -24,6 +24,20 @@ std::string settingsKey(const std::string& section, const std::string& key) {
     return section + "\\" + key;
 }
 
+/// The program with the window, which is beside the console's.
+QString windowProgram() {
+    const QFileInfo beside(QCoreApplication::applicationDirPath() + "/zelremote");
+    return beside.isExecutable() ? beside.filePath() : QCoreApplication::applicationFilePath();
+}
+
+/// In the quotes of a command line of a desktop entry, whose own rules come after those of its
+/// texts: a backslash is written four times.
+QString entryText(QString text) {
+    text.replace("\\", R"(\\\\)").replace("%", "%%");
+    for (const char* mark : {"\"", "`", "$"}) text.replace(mark, QString(R"(\\)") + mark);
+    return text;
+}
+
 QString autostartEntry(const std::string& linkName) {
     const QString name = QFileInfo(QString::fromStdString(linkName)).completeBaseName();
     const QString folder =
@@ -112,7 +126,7 @@ bool QtStartupFolder::createLink(const std::string& linkName, const std::string&
     if (!file.open(QIODevice::WriteOnly)) return false;
     const QString text =
         QString("[Desktop Entry]\nType=Application\nName=ZELRemote\nExec=\"%1\" %2\n")
-            .arg(QCoreApplication::applicationFilePath(), QString::fromStdString(argument));
+            .arg(entryText(windowProgram()), QString::fromStdString(argument));
     file.write(text.toUtf8());
     return file.commit();
 }
