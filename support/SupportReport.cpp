@@ -21,13 +21,15 @@ constexpr const char* kUnknown = "unknown";
 constexpr const char* kNone = "none";
 
 constexpr const char* kLegalNotes[] = {
-    "ZELRemote is free software: you can redistribute it and/or modify it under the terms",
-    "of the GNU General Public License as published by the Free Software Foundation, either",
-    "version 3 of the License, or (at your option) any later version.",
+    "ZELRemote is free software: you can redistribute it and/or modify",
+    "it under the terms of the GNU General Public License as published",
+    "by the Free Software Foundation, either version 3 of the License,",
+    "or (at your option) any later version.",
     "",
-    "This program is distributed in the hope that it will be useful, but without any",
-    "warranty; without even the implied warranty of merchantability or fitness for a",
-    "particular purpose. See the GNU General Public License for more details.",
+    "This program is distributed in the hope that it will be useful,",
+    "but without any warranty; without even the implied warranty of",
+    "merchantability or fitness for a particular purpose. See the GNU",
+    "General Public License for more details.",
 };
 
 std::string title(const std::string& name) { return "*** " + name + " ***" + kCrLf; }
