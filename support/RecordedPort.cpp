@@ -41,20 +41,24 @@ RecordedSocket::RecordedSocket(Socket& socket, SessionLog& log) : socket_(socket
     handlers_.on(socket_.PeerClosed, [this] { PeerClosed(); });
 }
 
-void RecordedSocket::opened(const std::string& scheme, const std::string& host, int port) {
-    if (recorded_) log_.closed();
-    recorded_ = true;
+void RecordedSocket::reachFor(const std::string& scheme, const std::string& host, int port) {
+    if (std::exchange(recorded_, false)) log_.closed();
     const std::string name = contains(host, ":") ? "[" + host + "]" : host;
-    log_.opened(scheme + ":" + name + ":" + std::to_string(port));
+    address_ = scheme + ":" + name + ":" + std::to_string(port);
+}
+
+/// A server that refuses was never open: the first byte shows that the socket is.
+void RecordedSocket::noteOpen() {
+    if (!std::exchange(recorded_, true)) log_.opened(address_);
 }
 
 void RecordedSocket::connectTo(const std::string& host, int port) {
-    opened("tcp", host, port);
+    reachFor("tcp", host, port);
     socket_.connectTo(host, port);
 }
 
 void RecordedSocket::connectTls(const std::string& host, int port, const std::string& pinned) {
-    opened("tls", host, port);
+    reachFor("tls", host, port);
     socket_.connectTls(host, port, pinned);
 }
 
@@ -65,12 +69,16 @@ void RecordedSocket::close() {
 
 bool RecordedSocket::sendData(std::string_view bytes) {
     const bool taken = socket_.sendData(bytes);
-    if (taken) log_.sent(bytes);
+    if (taken) {
+        noteOpen();
+        log_.sent(bytes);
+    }
     return taken;
 }
 
 std::string RecordedSocket::getData() {
     std::string bytes = socket_.getData();
+    if (!bytes.empty()) noteOpen();
     log_.came(bytes);
     return bytes;
 }

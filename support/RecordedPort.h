@@ -43,11 +43,13 @@ class RecordedSocket : public Socket {
     std::string problem() const override { return socket_.problem(); }
 
   private:
-    void opened(const std::string& scheme, const std::string& host, int port);
+    void reachFor(const std::string& scheme, const std::string& host, int port);
+    void noteOpen();
 
     Socket& socket_;
     SessionLog& log_;
-    bool recorded_ = false;
+    std::string address_;    ///< that the socket reaches for
+    bool recorded_ = false;  ///< its opening is in the log
     Handlers handlers_;
 };
 

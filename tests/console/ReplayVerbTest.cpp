@@ -49,6 +49,13 @@ TEST_F(ReplayVerbTest, ChangedByte_IsNamedWithItsLine) {
     EXPECT_NE(out.str().find("> 47 52 45 51 0D |FREQ.|"), std::string::npos) << out.str();
 }
 
+TEST_F(ReplayVerbTest, ConnectionThatWasRefused_IsRefusedAgain) {
+    folder.write("refused.log", "0.000000 start --connect tcp:127.0.0.1:1 info\n0.100000 closed\n");
+    EXPECT_EQ(run({"replay", folder.file("refused.log")}), kDone) << errors.str();
+    EXPECT_EQ(out.str(), "");
+    EXPECT_NE(errors.str().find("no instrument was connected"), std::string::npos) << errors.str();
+}
+
 TEST_F(ReplayVerbTest, WordsOfAWindow_HoldAgain) {
     folder.write("window.log",
                  "0.000000 start zelremote --home /h --words \"NOHEADER x\" --log a.log button\n"

@@ -151,6 +151,18 @@ TEST_F(SessionLogTest, Socket_LeavesItsBytesAndEventsInTheLog) {
     EXPECT_TRUE(contains(text(), "< 42 |B|\n"));
 }
 
+TEST_F(SessionLogTest, SocketThatIsRefused_WasNeverOpen) {
+    ScriptedSocket inner(events);
+    RecordedSocket socket(inner, log);
+    ASSERT_EQ(log.begin("/logs/a.log", "panel"), "");
+    inner.connectsTo(SocketState::Error);
+    socket.connectTo("127.0.0.1", 2277);
+    events.runFor(10);
+    socket.close();
+    log.end();
+    EXPECT_EQ(text(), "0.000000 start panel\n0.010000 closed\n");
+}
+
 TEST_F(SessionLogTest, FileThatCannotBeMade_IsSaidAndNothingIsWritten) {
     EXPECT_EQ(log.begin("/none/a.log", "x"),
               "The file /none/a.log cannot be written: No such file or directory");
