@@ -49,6 +49,8 @@ ServerDialog::ServerDialog(Forms& forms, ServerBridge& bridge, const ServerSocke
     bridge_.showState();
     handlers_.on(form_.Load, [this] { Form_Load(); });
     handlers_.on(form_.QueryUnload, [this](int& cancel) { Form_QueryUnload(cancel); });
+    // The only field that can be changed while a client is at work: it counts at once.
+    handlers_.on(form_.chkKeep.Clicked, [this] { saveKeep(); });
     handlers_.on(form_.cmdConnect.Clicked, [this] { cmdConnect_Click(); });
     handlers_.on(form_.cmdCancel.Clicked, [this] { cmdCancel_Click(); });
     handlers_.on(form_.cmdDisconnectClient.Clicked, [this] { bridge_.disconnectClient(); });
@@ -115,6 +117,11 @@ void ServerDialog::loadSettings() {
     form_.chkKeep.setValue(get("KeepClient", "0") == "1");
 }
 
+void ServerDialog::saveKeep() {
+    const CallScope call(log_, kComponent, kClass, "saveKeep");
+    means_.settings.set(kProgramTitle, kSection, "KeepClient", form_.chkKeep.Value() ? "1" : "0");
+}
+
 void ServerDialog::saveSettings() {
     const CallScope call(log_, kComponent, kClass, "saveSettings");
     const auto set = [&](const char* key, const std::string& value) {
@@ -127,7 +134,7 @@ void ServerDialog::saveSettings() {
     set("BaudRateTyped", typedText(form_.BaudList));
     set("AutoBaud", form_.chkBaudRate.Value() ? "1" : "0");
     set("AllowedNetworks", form_.txtAllowed.Text);
-    set("KeepClient", form_.chkKeep.Value() ? "1" : "0");
+    saveKeep();
 }
 
 void ServerDialog::bridgingLook(bool bridging) {
@@ -193,10 +200,15 @@ void ServerDialog::lost() {
     bridgingLook(false);
     if (panel_.UtilityStartup.Checked) {
         retry_ = services_.events.schedule(kRetryMs, [this] { tryAgain(); });
-        form_.txtDebug.Text = bridge_.problem();
+        showRetry();
         return;
     }
     services_.boxes.show({BoxIcon::Warning, bridge_.problem()});
+}
+
+void ServerDialog::showRetry() {
+    const CallScope call(log_, kComponent, kClass, "showRetry");
+    form_.txtDebug.Text = "Tried again every 10 s. " + replaceAll(bridge_.problem(), kCrLf, " ");
 }
 
 // Nobody may be there to close a box, so that a failed try is only written down.
@@ -206,8 +218,12 @@ void ServerDialog::tryAgain() {
     if (bridge_.bridging() || bridge_.connecting()) return;
     const bool ok = bridge_.connect(true);
     bridgingLook(ok);
-    form_.txtDebug.Text = ok ? std::string() : bridge_.problem();
-    if (!ok) retry_ = services_.events.schedule(kRetryMs, [this] { tryAgain(); });
+    if (ok) {
+        form_.txtDebug.Text = "";
+        return;
+    }
+    retry_ = services_.events.schedule(kRetryMs, [this] { tryAgain(); });
+    showRetry();
 }
 
 }  // namespace zel

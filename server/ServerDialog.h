@@ -38,8 +38,10 @@ class ServerDialog {
     void Form_QueryUnload(int& cancel);
     void loadSettings();
     void saveSettings();
+    void saveKeep();
     void lost();
     void tryAgain();
+    void showRetry();
     void note(const std::string& text);
     void bridgingLook(bool bridging);
     bool serverWord() const;

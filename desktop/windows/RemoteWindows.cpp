@@ -285,13 +285,21 @@ QWidget* ServerWindow::happenings() {
     auto* events = new QListWidget;
     events->setFocusPolicy(Qt::ClickFocus);
     events->setSelectionMode(QAbstractItemView::NoSelection);
+    events->setWordWrap(true);
+    events->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     layout->addWidget(events, 1);
     binder_.bindShow(server_.lstEvents, events, [this, events] {
         events->clear();
         for (const std::string& text : server_.lstEvents.Items.get())
             events->addItem(QString::fromStdString(text));
     });
-    layout->addWidget(box(binder_, server_.txtDebug));
+    PanelLineEdit* debug = box(binder_, server_.txtDebug);
+    // A long text is read from its beginning, and whole in its tip.
+    connect(debug, &QLineEdit::textChanged, debug, [debug](const QString& text) {
+        debug->setCursorPosition(0);
+        debug->setToolTip(text.isEmpty() ? QObject::tr("State of the server") : text);
+    });
+    layout->addWidget(debug);
     return group;
 }
 

@@ -101,6 +101,15 @@ TEST_F(Server, Keep_RefusesNewcomers) {
     EXPECT_EQ(happened.back(), "refused 10.0.0.2");
 }
 
+TEST_F(Server, Keep_SetWhileAClientIsAtWork_IsStored) {
+    bridge();
+    enter("10.0.0.1");
+    form.chkKeep.Click();
+    EXPECT_EQ(platform.settings.get("ZELRemote", "ServerForm", "KeepClient", "absent"), "1");
+    form.chkKeep.Click();
+    EXPECT_EQ(platform.settings.get("ZELRemote", "ServerForm", "KeepClient", "absent"), "0");
+}
+
 TEST_F(Server, Stranger_IsRefusedAndTheClientStays) {
     bridge();
     enter("10.0.0.1");
@@ -215,8 +224,11 @@ TEST_F(Server, InstrumentThatGoes_WithStartup_IsTriedAgainEvery10Seconds) {
     run(25'000);
     EXPECT_FALSE(program.server().bridging());
     EXPECT_EQ(shown(), Texts{});
+    EXPECT_EQ(form.txtDebug.Text.get(),
+              "Tried again every 10 s. Could not connect to the specified COM port! away");
     run(10'000);
     EXPECT_TRUE(program.server().bridging());
+    EXPECT_EQ(form.txtDebug.Text.get(), "");
 }
 
 TEST_F(Server, SocketInError_ListensAgainWithinASecond) {
