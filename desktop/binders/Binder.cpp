@@ -198,6 +198,8 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
         if (widget->text() != shown) {
             const QSignalBlocker quiet(widget);
             widget->setText(shown);
+            // What is only read is read from its beginning.
+            if (control.Locked) widget->setCursorPosition(0);
         }
         widget->setReadOnly(control.Locked);
         widget->setEnabled(control.Enabled && usable(control));

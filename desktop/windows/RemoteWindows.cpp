@@ -293,13 +293,7 @@ QWidget* ServerWindow::happenings() {
         for (const std::string& text : server_.lstEvents.Items.get())
             events->addItem(QString::fromStdString(text));
     });
-    PanelLineEdit* debug = box(binder_, server_.txtDebug);
-    // A long text is read from its beginning, and whole in its tip.
-    connect(debug, &QLineEdit::textChanged, debug, [debug](const QString& text) {
-        debug->setCursorPosition(0);
-        debug->setToolTip(text.isEmpty() ? QObject::tr("State of the server") : text);
-    });
-    layout->addWidget(debug);
+    layout->addWidget(box(binder_, server_.txtDebug));
     return group;
 }
 
