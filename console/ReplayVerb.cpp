@@ -47,13 +47,18 @@ bool beganConnected(const SessionRecord& record, Verb verb) {
            record.events[1].kind == SessionEvent::Kind::Open;
 }
 
+bool isOfWindow(const SessionRecord& record) {
+    const std::vector<std::string> given = splitArgumentLine(record.events.front().text);
+    return given.empty() || given.front() == "zelremote";
+}
+
 /// The options of the recorded run; those of a window become a panel session.
 Options recordedOptions(const SessionRecord& record) {
     Options recorded;
     const std::vector<std::string> given = splitArgumentLine(record.events.front().text);
     std::vector<const char*> arguments = {"zelctl"};
     for (const std::string& argument : given) arguments.push_back(argument.c_str());
-    const bool window = given.empty() || given.front() == "zelremote";
+    const bool window = isOfWindow(record);
     std::ostringstream silent;
     silent.imbue(std::locale::classic());
     const bool parsed = !window && !parseOptions(static_cast<int>(arguments.size()),
@@ -129,7 +134,7 @@ int runReplay(const Options& options, const Streams& streams) {
     if (!options.address) {
         ReplayStage stage = makeReplayFront(record, recorded.home);
         front = std::move(stage.front);
-        passTo = std::move(stage.passTo);
+        if (isOfWindow(record)) passTo = std::move(stage.passTo);
         // The answers come from the record, whatever the address says.
         if (recorded.address) recorded.address->simulated = false;
     } else {
@@ -138,6 +143,7 @@ int runReplay(const Options& options, const Streams& streams) {
     }
     ReplayProgress progress(record);
     Rerun rerun;
+    rerun.ofWindow = isOfWindow(record);
     rerun.begun = [&progress](Program& program) {
         program.sessionLog().Noted.connect([&progress](const SessionEvent& event) {
             if (event.kind == SessionEvent::Kind::Sent) progress.compare.sent(event.text);

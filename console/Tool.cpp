@@ -164,7 +164,7 @@ int runPanel(const Options& options, Front& front, LineOutput& output, LineOutpu
     stage.boxes.misfit = [&session](const std::string& answer) {
         session.complain("\"" + answer + "\" answers no question: yes, no, ok or cancel does");
     };
-    if (rerun != nullptr) session.serveInPumps();
+    if (rerun != nullptr && rerun->ofWindow) session.serveInPumps();
     return session.run();
 }
 

@@ -24,6 +24,7 @@ struct Rerun {
     std::function<void(Program&)> begun;  ///< before the program starts
     std::function<std::unique_ptr<FileService>(FileService& disk)> files;
     std::function<std::unique_ptr<LineInput>(const Clock&, Events&)> input;
+    bool ofWindow = false;  ///< where pending events run, its clicks came as well
 };
 
 /// The exit status. Results that cannot be written end the run with 1. Lines of a panel session

@@ -31,10 +31,9 @@ std::string utf8Of(int character) {
 /// The text after a key at its end.
 std::string after(const std::string& text, int character) {
     if (character != kKeyBackspace) return text + utf8Of(character);
-    QList<uint> points = QString::fromStdString(text).toUcs4();
-    if (!points.isEmpty()) points.removeLast();
-    return QString::fromUcs4(reinterpret_cast<const char32_t*>(points.data()), points.size())
-        .toStdString();
+    QString shown = QString::fromStdString(text);
+    if (!shown.isEmpty()) shown.chop(shown.back().isLowSurrogate() ? 2 : 1);
+    return shown.toStdString();
 }
 
 }  // namespace
