@@ -3,9 +3,9 @@
 #include "connection/Profiles.h"
 #include "link/ByteLink.h"
 #include "link/WaitNotice.h"
-#include "platform/LinkAddress.h"
 #include "support/AtEnd.h"
 #include "support/NumberText.h"
+#include "support/Text.h"
 
 namespace zel {
 namespace {
@@ -15,17 +15,18 @@ using CF = ControllerForm;
 constexpr const char* kSection = "Properties";
 constexpr const char* kKey = "ReconnectByItself";
 constexpr std::int64_t kAskAgainMicros = 5'000'000;
+constexpr int kHighestPort = 65535;
 
 }  // namespace
 
 Reconnection::Reconnection(Forms& forms, ZEL3Variables& mirror, const Services& services,
-                           ConnectionDialog& dialog, Disconnection& disconnection,
+                           const Dialogs& dialogs, Disconnection& disconnection,
                            const Interlock& interlock)
     : forms_(forms),
       panel_(forms.controller),
       mirror_(mirror),
       s_(services),
-      dialog_(dialog),
+      dialogs_(dialogs),
       disconnection_(disconnection),
       interlock_(interlock) {
     putAway();
@@ -70,25 +71,88 @@ void Reconnection::offer(const std::string& text, bool button) {
     panel_.ReconnectFrame.Visible = true;
 }
 
+bool Reconnection::overTcp() const { return panel_.ConnectionState == CF::TCPCON; }
+
+bool Reconnection::lineIsThere() const {
+    if (overTcp()) {
+        const SocketState state = s_.socket.state();
+        return state == SocketState::Connected || state == SocketState::Connecting;
+    }
+    return panel_.ConnectionState != CF::DIRECTCON || s_.port.isOpen();
+}
+
 void Reconnection::look() {
     if (busy_) return;
-    const bool open = panel_.ConnectionState != CF::DIRECTCON || s_.port.isOpen();
-    if (panel_.isConnected && !open && state_ == State::Quiet) lost();
+    if (panel_.isConnected && !lineIsThere() && state_ == State::Quiet) lost();
+    if (tcp_ && (state_ == State::Back || state_ == State::Closed)) return tryServerAgain();
     if (state_ == State::Gone || state_ == State::Back) lookForPort();
 }
 
 void Reconnection::lost() {
-    const auto baud = wholeNumber(forms_.main.BaudList.Text(), 1, kFastestBaud);
-    port_ = forms_.main.COMList.Text();
-    if (!baud || port_.empty()) return;
-    baud_ = *baud;
+    tcp_ = overTcp();
+    if (tcp_) {
+        if (!keepServer()) return;
+    } else {
+        const auto baud = wholeNumber(forms_.main.BaudList.Text(), 1, kFastestBaud);
+        port_ = forms_.main.COMList.Text();
+        if (!baud || port_.empty()) return;
+        baud_ = *baud;
+    }
     before_ = keepSettingsOf(panel_, mirror_);
     viewRan_ = panel_.STOPFlag && panel_.StopButton.Visible && !panel_.RecordDataFlag;
     recorded_ = panel_.RecordDataFlag || forms_.time.ContinuousRecording;
-    state_ = State::Gone;
+    state_ = tcp_ ? State::Back : State::Gone;
     askAt_ = 0;
+    paused_ = false;
     showLinkLost(panel_, true);
-    offer(port_ + " has gone. Plug it in again; what is shown stays until then.", false);
+    if (tcp_) {
+        offer("The connection to " + port_ + " was lost. What is shown stays until it is back.",
+              true);
+    } else {
+        offer(port_ + " has gone. Plug it in again; what is shown stays until then.", false);
+    }
+}
+
+/// The fields of the dialog may hold another address by the time of the next attempt.
+bool Reconnection::keepServer() {
+    const TCPConnectionForm& form = forms_.tcpConnection;
+    const auto number = wholeNumber(trimmed(form.RemotePortTextBox.Text.get()), 1, kHighestPort);
+    server_.port = trimmed(form.IPAdressTextBox.Text.get());
+    if (!number || server_.port.empty()) return false;
+    server_.number = *number;
+    server_.kind = form.chkTls.Value() ? LinkAddress::Kind::Tls : LinkAddress::Kind::Tcp;
+    server_.pinned = form.FingerprintTextBox.Text;
+    port_ = server_.port + ":" + std::to_string(server_.number);
+    return true;
+}
+
+void Reconnection::tryServerAgain() {
+    if (!panel_.ReconnectAlways.Checked || paused_ || forms_.specialMeas.RunsActive > 0 ||
+        forms_.tcpConnection.Visible || forms_.main.Visible ||
+        interlock_.turnOf(panel_.ReconnectButton) != Interlock::Turn::Now ||
+        interlock_.session().clock.micros() < askAt_)
+        return;
+    reconnect();
+    paused_ = !panel_.isConnected && dialogs_.tcp.wasLeft();
+    if (panel_.isConnected || paused_ || state_ == State::Quiet) return;
+    askAt_ = interlock_.session().clock.micros() + kAskAgainMicros;
+    offer("No connection to " + port_ + " yet: " + dialogs_.tcp.failure() +
+              " It is tried again each 5 s.",
+          true);
+}
+
+/// The dead socket takes no farewell, and that it is dead was reported.
+void Reconnection::connectServer() {
+    s_.line.LossTold = true;
+    if (panel_.isConnected) disconnection_.endSession();
+    panel_.ReconnectLabel.Caption = "Connecting to " + port_ + " again";
+    panel_.ConnectionState = CF::TCPCON;
+    TCPConnectionForm& form = forms_.tcpConnection;
+    form.IPAdressTextBox.Text = server_.port;
+    form.RemotePortTextBox.Text = std::to_string(server_.number);
+    form.chkTls.setValue(server_.kind == LinkAddress::Kind::Tls);
+    form.FingerprintTextBox.Text = server_.pinned;
+    dialogs_.tcp.connectQuietly(panel_.InstrumentMode != CF::POWERSENSOR);
 }
 
 void Reconnection::lookForPort() {
@@ -132,12 +196,21 @@ void Reconnection::reconnect() {
         busy_ = true;
         const AtEnd over([this] { busy_ = false; });
         panel_.ReconnectButton.Visible = false;
-        if (panel_.isConnected) disconnection_.endSession();
-        panel_.ReconnectLabel.Caption = "Connecting to " + port_ + " again";
-        dialog_.connectTo(port_, baud_, panel_.InstrumentMode != CF::POWERSENSOR);
+        if (tcp_) {
+            connectServer();
+        } else {
+            if (panel_.isConnected) disconnection_.endSession();
+            panel_.ReconnectLabel.Caption = "Connecting to " + port_ + " again";
+            dialogs_.serial.connectTo(port_, baud_, panel_.InstrumentMode != CF::POWERSENSOR);
+        }
     }
     if (panel_.isConnected) return report();
     state_ = State::Closed;
+    if (tcp_) {
+        const std::string why =
+            dialogs_.tcp.wasLeft() ? "The attempt was left." : dialogs_.tcp.failure();
+        return offer("No connection to " + port_ + ". " + why, true);
+    }
     offer("No instrument answers on " + port_ + " at " + std::to_string(baud_) +
               " baud. Check that it is on, then try again.",
           true);

@@ -1,6 +1,7 @@
 #pragma once
-// A serial port that disappears in a session and returns: offers to connect again with the same
-// port and rate, or does it by itself, and says which settings are other than before.
+// A line that is lost in a session, a serial port that disappears and returns or a TCP connection
+// that ends: offers to connect again with the same profile, or does it by itself, and says which
+// settings are other than before.
 
 #include <cstdint>
 #include <string>
@@ -9,11 +10,15 @@
 #include "connection/Disconnection.h"
 #include "connection/Doctor.h"
 #include "connection/KeptSettings.h"
+#include "connection/TcpDialog.h"
 #include "forms/Forms.h"
+#include "link/ZELBas.h"
 #include "model/ZEL3Variables.h"
+#include "platform/LinkAddress.h"
 #include "platform/PortProbe.h"
 #include "platform/SerialPort.h"
 #include "platform/Services.h"
+#include "platform/Socket.h"
 #include "trace/Interlock.h"
 
 namespace zel {
@@ -25,12 +30,17 @@ class Reconnection {
         PortProbe& probe;
         SettingsStore& settings;
         Doctor& doctor;
+        const Socket& socket;
+        ZELBas& line;
+    };
+    struct Dialogs {
+        ConnectionDialog& serial;
+        TcpDialog& tcp;
     };
     /// Looks at the port once a second; connects the bar's keys and the menu entry, whose tick is
     /// kept between runs.
     Reconnection(Forms& forms, ZEL3Variables& mirror, const Services& services,
-                 ConnectionDialog& dialog, Disconnection& disconnection,
-                 const Interlock& interlock);
+                 const Dialogs& dialogs, Disconnection& disconnection, const Interlock& interlock);
     ~Reconnection();
     Reconnection(const Reconnection&) = delete;
     Reconnection& operator=(const Reconnection&) = delete;
@@ -39,11 +49,16 @@ class Reconnection {
     enum class State : std::uint8_t {
         Quiet,
         Gone,    ///< the port is not there
-        Back,    ///< it is there again
+        Back,    ///< it is there again, or a server can be asked
         Closed,  ///< the session was given up, and the attempt after it failed
     };
     void look();
+    bool overTcp() const;
+    bool lineIsThere() const;
     void lost();
+    bool keepServer();
+    void tryServerAgain();
+    void connectServer();
     void lookForPort();
     void offer(const std::string& text, bool button);
     void reconnect();
@@ -55,12 +70,15 @@ class Reconnection {
     ControllerForm& panel_;
     ZEL3Variables& mirror_;
     Services s_;
-    ConnectionDialog& dialog_;
+    Dialogs dialogs_;
     Disconnection& disconnection_;
     const Interlock& interlock_;
     State state_ = State::Quiet;
-    std::string port_;
+    std::string port_;  ///< its name, or "HOST:PORT"
     int baud_ = 0;
+    LinkAddress server_;  ///< of a session over TCP
+    bool tcp_ = false;
+    bool paused_ = false;  ///< the user has left an attempt that the option made
     KeptSettings before_;
     bool viewRan_ = false;
     bool recorded_ = false;

@@ -8,6 +8,7 @@
 #include "link/WaitNotice.h"
 #include "platform/ModalForm.h"
 #include "platform/Pointer.h"
+#include "support/AtEnd.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
@@ -120,8 +121,15 @@ void TcpDialog::TCPConnection_Click() {
 
 void TcpDialog::ConnectTCPButton_Click() { connect(true); }
 
+void TcpDialog::connectQuietly(bool readTrace) {
+    quiet_ = true;
+    const AtEnd over([this] { quiet_ = false; });
+    connect(readTrace);
+}
+
 void TcpDialog::connect(bool readTrace) {
     if (dialog_.Connecting) return;
+    failure_.clear();
     const std::string portText = trimmed(dialog_.RemotePortTextBox.Text.get());
     const double port = leadingNumber(portText);
     if (!IsNumericText(portText) || port < 1 || port > kHighestPort) {
@@ -169,10 +177,12 @@ bool TcpDialog::open(const std::string& host, const std::string& portText) {
         giveUp();
         return false;
     }
-    dialog_.AdviceLabel.Caption =
-        socket_.state() == SocketState::Connected ? connectionAdvice(forms_) : endOfServer();
-    session_.boxes.show(
-        {BoxIcon::Information, "No M&T ZEL3 found at the specified adress!", "No ZEL3 found"});
+    const bool lives = socket_.state() == SocketState::Connected;
+    dialog_.AdviceLabel.Caption = lives ? connectionAdvice(forms_) : endOfServer();
+    failure_ = lives ? "The server is there, but no instrument answers." : endOfServer();
+    if (!quiet_)
+        session_.boxes.show(
+            {BoxIcon::Information, "No M&T ZEL3 found at the specified adress!", "No ZEL3 found"});
     start_.setClock("stop");
     return false;
 }
@@ -180,7 +190,8 @@ bool TcpDialog::open(const std::string& host, const std::string& portText) {
 /// The reason stands in the dialog; where that is not on show a box says it.
 void TcpDialog::failed(const std::string& where, const std::string& reason) {
     dialog_.lblReason.Caption = reason;
-    if (dialog_.Visible || reason.empty()) return;
+    failure_ = reason;
+    if (dialog_.Visible || reason.empty() || quiet_) return;
     session_.boxes.show({BoxIcon::Critical, "The connection to " + where + " failed: " + reason});
 }
 

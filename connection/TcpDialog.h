@@ -24,6 +24,12 @@ class TcpDialog {
     void QuitTCPButton_Click();
     /// Connects the socket and does the handshake; one sweep after it with `readTrace`.
     void connect(bool readTrace);
+    /// The same without a box when it fails; `failure` says why then.
+    void connectQuietly(bool readTrace);
+    /// Why the last attempt failed, for a user; empty where the words are in the advice.
+    const std::string& failure() const { return failure_; }
+    /// Whether the user has left the last attempt.
+    bool wasLeft() const { return quit_; }
 
   private:
     bool awaitConnection(const std::string& where);
@@ -48,7 +54,9 @@ class TcpDialog {
     SettingsStore& settings_;
     Session session_;
     Stopwatch StopwatchA_;
-    bool quit_ = false;  ///< the user has given up
+    bool quit_ = false;   ///< the user has given up
+    bool quiet_ = false;  ///< no boxes
+    std::string failure_;
     Handlers handlers_;
 };
 

@@ -90,6 +90,8 @@ void ByteLink::tellLoss() {
     showLinkLost(panel_, true);
     if (state_.LossTold) return;
     state_.LossTold = true;
+    // Who lets the program connect again by itself is not asked: the bar says what happens.
+    if (panel_.ReconnectAlways.Checked) return;
     const SocketState state = socket_.state();
     const char* reason = state == SocketState::PeerClosing ? "The other end closed the connection."
                          : state == SocketState::Error     ? "The connection broke."

@@ -176,8 +176,9 @@ struct Program::Rooms {
           doctor({p.portProbe, p.serialPort, p.tcpSocket, p.clock, p.events}),
           doctorKeys(forms, doctor, p.clipboard, p.events),
           rateSearch(forms, line, doctor, dialog, session),
-          reconnection(forms, mirror, {p.serialPort, p.portProbe, p.settings, doctor}, dialog,
-                       disconnection, interlock),
+          reconnection(forms, mirror,
+                       {p.serialPort, p.portProbe, p.settings, doctor, p.tcpSocket, line},
+                       {dialog, tcpDialog}, disconnection, interlock),
           sessionKeys(panel, record, p.fileDialogs, boxes),
           failures(logs, report, [this] { endAfterFailure(); }) {
         panel.CommandLine = std::move(commandLine);
