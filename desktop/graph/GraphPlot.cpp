@@ -15,6 +15,8 @@ namespace {
 
 /// Half of the last label of the x axis stands in it: one that does not fit is not drawn at all.
 constexpr int kRightMargin = 42;
+constexpr int kLeftMargin = 10;
+constexpr double kNoStretch = 0.001;
 constexpr std::size_t kPairedValues = 602;
 constexpr double kBandShare = 0.35;  // of the line's ink in the band's
 
@@ -41,18 +43,18 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     layout->insertRow(0);
     auto* top = new QCPLayoutGrid;
     layout->addElement(0, 0, top);
-    top->setMargins(QMargins(10, 8, kRightMargin, 0));
+    top->setMargins(QMargins(kLeftMargin, 8, kRightMargin, 0));
     top->setRowSpacing(1);
     top_ = {addText(*top, 0, 0, Qt::AlignLeft), addText(*top, 0, 1, Qt::AlignRight),
             addText(*top, 1, 0, Qt::AlignLeft), addText(*top, 1, 1, Qt::AlignRight)};
     auto* bottom = new QCPLayoutGrid;
     layout->addElement(2, 0, bottom);
-    bottom->setMargins(QMargins(10, 0, kRightMargin, 6));
+    bottom->setMargins(QMargins(kLeftMargin, 0, kRightMargin, 6));
     bottom_ = {addText(*bottom, 0, 0, Qt::AlignLeft), addText(*bottom, 0, 1, Qt::AlignHCenter),
                addText(*bottom, 0, 2, Qt::AlignRight)};
     layout->setRowSpacing(2);
-    layout->setRowStretchFactor(0, 0.001);
-    layout->setRowStretchFactor(2, 0.001);
+    layout->setRowStretchFactor(0, kNoStretch);
+    layout->setRowStretchFactor(2, kNoStretch);
 
     styleAxes();
     channel_ = new QCPItemRect(&plot_);
@@ -81,8 +83,11 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     old_ = addNote(0.04);
     old_->setText("OLD TRACE");
     incomplete_ = addNote(0.10);
-    source_ = addNote(0.16);
-    source_->setColor(colors_.file);
+    source_ = new AnnotationText(&plot_, plotFont());
+    source_->setTextColor(colors_.file);
+    source_->setTextFlags(static_cast<int>((Qt::AlignLeft | Qt::AlignVCenter).toInt()));
+    source_->setMargins(QMargins(kLeftMargin, 1, kRightMargin, 1));
+    source_->setVisible(false);
 }
 
 QCPItemText* GraphPlot::addNote(double height) {
@@ -188,8 +193,27 @@ QColor GraphPlot::bandInk(const QColor& line) const {
 }
 
 void GraphPlot::setSource(const QString& name) {
-    source_->setText(name);
-    source_->setVisible(!name.isEmpty());
+    sourceName_ = name;
+    const bool shown = !name.isEmpty();
+    if (shown == source_->visible()) return fitSource();
+    source_->setVisible(shown);
+    QCPLayoutGrid* layout = plot_.plotLayout();
+    if (shown) {
+        layout->insertRow(1);
+        layout->addElement(1, 0, source_);
+        layout->setRowStretchFactor(1, kNoStretch);
+    } else {
+        layout->take(source_);
+        layout->simplify();
+    }
+    fitSource();
+}
+
+/// A long name keeps its beginning and its date.
+void GraphPlot::fitSource() {
+    if (!source_->visible()) return;
+    const int room = plot_.width() - kLeftMargin - kRightMargin;
+    source_->setText(QFontMetrics(source_->font()).elidedText(sourceName_, Qt::ElideMiddle, room));
 }
 
 void GraphPlot::setChannel(double left, double right) {
@@ -232,6 +256,7 @@ void GraphPlot::update(const Graph& graph, const ViewAnnotations& view) {
         drawn_ = true;
     }
     view_ = view;
+    fitSource();
     cursors_->place(graph, {markerTexts_, resolution_, view.xUnit, view.unit,
                             [this](double x) { return levelsAt(x).second; }});
     const std::string& note = graph.Note;

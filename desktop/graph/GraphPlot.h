@@ -25,7 +25,8 @@ class GraphPlot {
     void update(const Graph& graph, const ViewAnnotations& view);
     /// In pixels of the plot. One pixel of the device is what Qt draws fast.
     void setTraceWidth(double width) { width_ = width; }
-    /// What the trace was loaded from; empty for a sweep of the instrument.
+    /// What the trace was loaded from, for a line of its own over the graticule; empty for a sweep
+    /// of the instrument.
     void setSource(const QString& name);
     /// Shades a stretch of the x axis; nothing where both ends are the same.
     void setChannel(double left, double right);
@@ -55,6 +56,7 @@ class GraphPlot {
     void strike(const ViewAnnotations& view);
     void fillWithin(const QRectF& view);
     QColor bandInk(const QColor& line) const;
+    void fitSource();
 
     QCustomPlot& plot_;
     GraphColors colors_;
@@ -68,7 +70,8 @@ class GraphPlot {
     QCPItemText* old_ = nullptr;
     QCPItemText* incomplete_ = nullptr;
     QCPGraph* low_ = nullptr;  ///< the lower edge of the band
-    QCPItemText* source_ = nullptr;
+    AnnotationText* source_ = nullptr;
+    QString sourceName_;
     QCPItemRect* channel_ = nullptr;
     QList<QPointF> points_;  ///< of the trace, each value for itself
     ViewAnnotations view_;
