@@ -190,7 +190,10 @@ bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
     status = statusNumber(reader_.ReadAnswer());
     if (!reader_.answered()) return false;
     session_.DebugLine("<" + keywordAndValue + "> response: " + numberText(status));
-    if (status != 0) report(status, keywordAndValue);
+    if (status != 0) {
+        SettingRefused(status);
+        report(status, keywordAndValue);
+    }
     if (status == 0 && startsWith(keywordAndValue, kSweepTimeSetting))
         state_.SweepTimeTold = leadingNumber(keywordAndValue.substr(kSweepTimeSetting.size()));
     finishLine("SET", keywordAndValue, t0);

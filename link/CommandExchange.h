@@ -33,6 +33,8 @@ class CommandExchange {
     bool GetInstrument(const std::string& keyword, std::string& value);
     /// A setting or a command that may change one goes out next: not WAIT, INIT, REMOTE, LOCAL.
     Event<> SettingBegins;
+    /// The instrument did not take a setting: the digit of its answer. Before the box that says so.
+    Event<int> SettingRefused;
     /// A dialogue is under way further up the stack, and only lets events run: the line is taken.
     bool busy() const { return state_.DialoguesUnderWay > 0; }
     /// The user does not wait any longer for what is under way; an answer that comes within

@@ -140,8 +140,10 @@ void Z9SetCommands::readTrace() {
 
 void Z9SetCommands::afterCentre(int /*index*/) {
     std::string answer;
-    if (exchange_.GetInstrument("SPAN", answer) && mirror_.Unsure.answered("SPAN", answer))
+    if (exchange_.GetInstrument("SPAN", answer) && mirror_.Unsure.answered("SPAN", answer)) {
         mirror_.Span = leadingNumber(answer);
+        showSpan();
+    }
     panel_.SoftTextBox(1).Text = FormatValue(mirror_.Span, "Hz");
     panel_.CFLabel.Caption = centerLabelText(mirror_.CenterFrequency);
     showEdges();

@@ -327,6 +327,7 @@ Program::Program(const Platform& platform, std::string commandLine)
       rooms_(std::make_unique<Rooms>(guards_->platform, guards_->log, std::move(commandLine))) {
     guards_->boxes.quiet = [this] { return rooms_->recording.inTimedTick(); };
     rooms_->end.Ended.connect([this] { Ended(); });
+    rooms_->exchange.SettingRefused.connect([this](int status) { SettingRefused(status); });
 }
 
 Program::~Program() { guards_->boxes.quiet = nullptr; }

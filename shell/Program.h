@@ -83,6 +83,8 @@ class Program {
     /// The signal that ended it ("SIGTERM"); empty when none did.
     const std::string& endedBy() const;
     Event<> Ended;
+    /// The instrument did not take a setting: the digit of its answer.
+    Event<int> SettingRefused;
 
     /// Reports the exception that is being handled and ends the program; call it inside a catch
     /// alone. A front catches what a handler, a timer or the line throws.

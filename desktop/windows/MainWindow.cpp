@@ -10,6 +10,7 @@
 #include "desktop/graph/GraphImage.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/SimulatorChild.h"
+#include "desktop/windows/EntryMarks.h"
 #include "desktop/windows/FileDrop.h"
 #include "desktop/windows/MainMenus.h"
 #include "desktop/windows/RemoteWindows.h"
@@ -105,6 +106,7 @@ void MainWindow::buildCentre() {
     layout->addWidget(graphSide_, 1);
     side_ = new PanelSide(panel_, program_.variables(), binder_);
     terminators_ = &side_->terminators();
+    new EntryMarks(program_, binder_, side_->refusals(), this);
     layout->addWidget(side_);
     setCentralWidget(centre);
 }

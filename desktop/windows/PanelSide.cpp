@@ -163,7 +163,14 @@ QWidget* PanelSide::softPosition(int index) {
     beside->setSpacing(1);
     QLabel* caption = smallCaption();
     beside->addStretch(1);
-    beside->addWidget(caption);
+    auto* head = new QHBoxLayout;
+    head->addWidget(caption, 1);
+    QLabel* refusal = smallCaption();
+    refusal->setProperty("problem", true);
+    refusal->setAccessibleName(QObject::tr("Refusal"));
+    refusals_.at(static_cast<std::size_t>(index)) = refusal;
+    head->addWidget(refusal);
+    beside->addLayout(head);
     auto* fields = new QWidget;
     auto* places = layoutOf<QHBoxLayout>(fields);
     auto* box = new PanelLineEdit;

@@ -2,6 +2,7 @@
 // The keys at the right of the graph, as on the instrument's front: one column of fixed width.
 
 #include <QScrollArea>
+#include <array>
 #include <vector>
 
 #include "desktop/binders/Binder.h"
@@ -30,6 +31,8 @@ class PanelSide : public QScrollArea {
     /// A line says why keys are grey while the continuous view runs, else that the boxes show the
     /// instrument while the graph shows a file.
     void showState(bool viewRuns, bool fileShown);
+    /// Beside the five boxes: why the instrument did not take an entry.
+    const std::array<QLabel*, 5>& refusals() const { return refusals_; }
 
   signals:
     /// The user has folded or opened a group.
@@ -57,6 +60,7 @@ class PanelSide : public QScrollArea {
     Binder& binder_;
     TerminatorRow* terminators_;
     QLabel* reason_ = nullptr;
+    std::array<QLabel*, 5> refusals_{};
     QWidget* column_;
     QVBoxLayout* layout_;
     std::vector<FoldGroup*> groups_;  ///< the first one folds last

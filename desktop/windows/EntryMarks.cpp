@@ -1,0 +1,156 @@
+#include "desktop/windows/EntryMarks.h"
+
+#include <QPointer>
+
+#include "model/CodeTables.h"
+#include "model/Numeric.h"
+#include "platform/Controls.h"
+
+namespace zel {
+namespace {
+
+using CF = ControllerForm;
+
+/// By the digit of the answer.
+constexpr const char* kRefusals[] = {
+    QT_TRANSLATE_NOOP("QObject", "refused"),
+    QT_TRANSLATE_NOOP("QObject", "refused: not understood"),
+    QT_TRANSLATE_NOOP("QObject", "refused: not in this mode"),
+    QT_TRANSLATE_NOOP("QObject", "refused: storage full"),
+    QT_TRANSLATE_NOOP("QObject", "refused: not allowed"),
+    QT_TRANSLATE_NOOP("QObject", "refused: out of range"),
+};
+constexpr int kKnownRefusals = static_cast<int>(std::size(kRefusals));
+
+struct Rest {
+    std::int16_t state;
+    int box;
+    bool onCentre;
+    bool onSpan;
+    bool onLevel;
+};
+/// What the boxes of the menus rest on.
+constexpr Rest kRests[] = {
+    {CF::Freq, 0, true, false, false}, {CF::Freq, 1, false, true, false},
+    {CF::Freq, 2, true, true, false},  {CF::Freq, 3, true, true, false},
+    {CF::SPAN, 0, false, true, false}, {CF::AMPT, 0, false, false, true},
+};
+
+const Rest* restOf(std::int16_t state, int box) {
+    for (const Rest& row : kRests)
+        if (row.state == state && row.box == box) return &row;
+    return nullptr;
+}
+
+}  // namespace
+
+EntryMarks::EntryMarks(Program& program, Binder& binder,
+                       const std::array<QLabel*, kBoxes>& refusals, QObject* parent)
+    : QObject(parent),
+      panel_(program.forms().controller),
+      mirror_(program.variables()),
+      binder_(binder),
+      refusals_(refusals) {
+    const QPointer<EntryMarks> self(this);
+    for (int box = 0; box < kBoxes; ++box) follow(box);
+    program.SettingRefused.connect([self](int status) {
+        if (self) self->refused(status);
+    });
+    program.variables().Unsure.Changed.connect([self] {
+        if (self) self->takeUnsure();
+    });
+}
+
+void EntryMarks::follow(int box) {
+    const QPointer<EntryMarks> self(this);
+    TextBox& text = panel_.SoftTextBox(box);
+    // The panel's own handlers send the value at KeyPress; that of this class runs after them.
+    text.KeyDown.connect([self, box](int key, int) {
+        if (self && key == kKeyEnter) self->entering_ = box;
+    });
+    text.KeyPress.connect([self](int& key) {
+        if (self && key == kKeyEnter) self->entering_ = -1;
+    });
+    text.Changed.connect([self, box] {
+        if (!self) return;
+        if (self->panel_.State != self->state_) return self->takeMenu();
+        const Mark& mark = self->marks_.at(static_cast<std::size_t>(box));
+        const bool other = self->panel_.SoftTextBox(box).Text.get() != mark.text;
+        if (!mark.reason.isEmpty() && other && !mark.onAxis) self->clear(box);
+    });
+}
+
+/// The boxes are those of another menu.
+void EntryMarks::takeMenu() {
+    state_ = panel_.State;
+    for (int box = 0; box < kBoxes; ++box) clear(box);
+    takeUnsure();
+}
+
+void EntryMarks::refused(int status) {
+    if (entering_ < 0) return;
+    if (panel_.State != state_) takeMenu();
+    const int row = status > 0 && status < kKnownRefusals ? status : 0;
+    const Rest* rest = restOf(panel_.State, entering_);
+    mark(entering_, QObject::tr(kRefusals[row]), rest != nullptr);
+}
+
+bool EntryMarks::restsOnUnsure(int box) const {
+    const Rest* rest = restOf(panel_.State, box);
+    const UnsureSettings& unsure = mirror_.Unsure;
+    return rest != nullptr && ((rest->onCentre && unsure.has(AxisSetting::Frequency)) ||
+                               (rest->onSpan && unsure.has(AxisSetting::Span)) ||
+                               (rest->onLevel && unsure.has(AxisSetting::ReferenceLevel)));
+}
+
+void EntryMarks::takeUnsure() {
+    const UnsureSettings& unsure = mirror_.Unsure;
+    const bool now = unsure.has(AxisSetting::Frequency) || unsure.has(AxisSetting::Span) ||
+                     unsure.has(AxisSetting::ReferenceLevel);
+    for (int box = 0; box < kBoxes; ++box) {
+        const Mark& old = marks_.at(static_cast<std::size_t>(box));
+        if (restsOnUnsure(box) && old.reason.isEmpty()) mark(box, QObject::tr("unsure"), true);
+        if (!restsOnUnsure(box) && !old.reason.isEmpty() && old.onAxis) clear(box);
+    }
+    if (unsure_ && !now) showInstrument();
+    unsure_ = now;
+}
+
+/// The mirror holds what the instrument answered: so do the boxes.
+void EntryMarks::showInstrument() {
+    const auto put = [this](int box, const std::string& text) {
+        if (panel_.SoftTextBox(box).Visible) panel_.SoftTextBox(box).Text = text;
+    };
+    const auto hertz = [](double value) { return FormatValue(value, "Hz"); };
+    const double half = mirror_.Span / 2;
+    if (panel_.State == CF::Freq) {
+        put(0, hertz(mirror_.CenterFrequency));
+        put(1, hertz(mirror_.Span));
+        put(2, hertz(mirror_.CenterFrequency - half));
+        put(3, hertz(mirror_.CenterFrequency + half));
+    } else if (panel_.State == CF::SPAN) {
+        put(0, hertz(mirror_.Span));
+    } else if (panel_.State == CF::AMPT) {
+        put(0, FormatValue(mirror_.ReferenceLevel, levelUnitText(mirror_.ReferenceUnit), "",
+                           mirror_.ReferenceUnit > UNITDB));
+    }
+}
+
+void EntryMarks::mark(int box, const QString& reason, bool onAxis) {
+    marks_.at(static_cast<std::size_t>(box)) = {reason, panel_.SoftTextBox(box).Text.get(), onAxis};
+    show(box);
+}
+
+void EntryMarks::clear(int box) {
+    marks_.at(static_cast<std::size_t>(box)) = {};
+    show(box);
+}
+
+void EntryMarks::show(int box) {
+    const QString& reason = marks_.at(static_cast<std::size_t>(box)).reason;
+    refusals_.at(static_cast<std::size_t>(box))->setText(reason);
+    if (auto* line = qobject_cast<QWidget*>(binder_.widgetOf(panel_.SoftTextBox(box))))
+        setMark(line, "struck", !reason.isEmpty());
+}
+
+}  // namespace zel
