@@ -1,5 +1,7 @@
 #include "trace/ViewAnnotations.h"
 
+#include <cmath>
+
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
 #include "trace/GraphScaling.h"
@@ -36,6 +38,15 @@ void annotateFile(const ShownView& shown, ViewAnnotations& view) {
     view.sweepTime = fileText("SWT ", shown.sweepTime, "s");
     view.detector = shown.detector.empty() ? "" : "Det " + shown.detector;
     view.mode = shown.mode;
+}
+
+/// A thousandth of a width, as a power of ten; 0 where it has none.
+double digitStep(double width) {
+    return width > 0 && std::isfinite(width) ? std::pow(10, std::floor(std::log10(width)) - 3) : 0;
+}
+
+double roundedTo(double value, double step) {
+    return step > 0 ? std::round(value / step) * step : value;
 }
 
 void markUnsure(const UnsureSettings& unsure, ViewAnnotations& view) {
@@ -84,8 +95,15 @@ ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& m
     } else {
         markUnsure(mirror.Unsure, view);
     }
-    const double left = graph.xAxis().Minimum;
-    const double right = graph.xAxis().Maximum;
+    double left = graph.xAxis().Minimum;
+    double right = graph.xAxis().Maximum;
+    if (panel.GraphZoomed) {
+        // The ends of a view that a wheel or a hand chose are no settings: four digits of its
+        // width say where it is.
+        const double step = digitStep(right - left);
+        left = roundedTo(left, step);
+        right = roundedTo(right, step);
+    }
     view.left = "Start " + FormatValue(left, view.xUnit);
     view.center = "Center " + FormatValue((left + right) / 2, view.xUnit);
     view.right = "Stop " + FormatValue(right, view.xUnit);

@@ -3,6 +3,7 @@
 #include <QDateTime>
 #include <QEvent>
 #include <QFileInfo>
+#include <QShortcut>
 #include <QVBoxLayout>
 
 #include "desktop/graph/SpectrogramWidget.h"
@@ -47,6 +48,11 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
         if (self && self->power_->isVisibleTo(self->graph_)) self->power_->take();
     });
     graph_->installEventFilter(this);
+    // The wheel looks closer whatever has the focus; so does the way back.
+    connect(new QShortcut(QKeySequence("Alt+Left"), this), &QShortcut::activated, this,
+            [this] { navigator_.back(); });
+    connect(new QShortcut(QKeySequence("Alt+Right"), this), &QShortcut::activated, this,
+            [this] { navigator_.forward(); });
     layout->addWidget(new ReconnectBar(panel_, binder_));
     layout->addWidget(graph_, 2);
     layout->addWidget(spectrogram(), 1);

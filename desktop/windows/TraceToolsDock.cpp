@@ -31,10 +31,18 @@ TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow
       panel_(program.forms().controller),
       graph_(graph),
       watch_(program.files(), command_, program.clock()),
-      overlay_(graph),
-      pages_(new QTabWidget) {
+      overlay_(graph) {
     setObjectName("TraceTools");
     setProperty("topic", kTopic);
+    follow();
+    letMarkersMove();
+}
+
+TraceToolsDock::~TraceToolsDock() = default;
+
+void TraceToolsDock::build() {
+    if (pages_ != nullptr) return;
+    pages_ = new QTabWidget;
     markers_ = new MarkersPage(tools_);
     traces_ = new TracesPage(tools_, [this] { scaleLevelAxis(); });
     limits_ = new LimitsPage(tools_);
@@ -51,12 +59,20 @@ TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow
     for (const auto& [name, page] : pages) pages_->addTab(page, QObject::tr(name));
     connect(pages_, &QTabWidget::currentChanged, this, [this] { showLater(); });
     setWidget(pages_);
-    resize(kUsualSize);
-    follow();
-    letMarkersMove();
 }
 
-TraceToolsDock::~TraceToolsDock() = default;
+void TraceToolsDock::setVisible(bool visible) {
+    if (visible && !placed_) {
+        placed_ = true;
+        build();
+        setFloating(true);
+        resize(kUsualSize);
+        // Beside the middle of the window that it belongs to, as a dialog.
+        if (parentWidget() != nullptr)
+            move(parentWidget()->frameGeometry().center() - rect().center());
+    }
+    QDockWidget::setVisible(visible);
+}
 
 void TraceToolsDock::follow() {
     const QPointer<TraceToolsDock> self(this);
@@ -100,7 +116,7 @@ void TraceToolsDock::showNow() {
     waits_ = false;
     overlay_.show(picture());
     graph_.replot(QCustomPlot::rpQueuedReplot);
-    if (isVisible())
+    if (isVisible() && pages_ != nullptr)
         if (auto* page = dynamic_cast<TracePage*>(pages_->currentWidget())) page->showState();
 }
 
@@ -179,7 +195,8 @@ void TraceToolsDock::addCurve(OverlayPicture& picture, const SpectrumTrace& trac
 
 OverlayPicture TraceToolsDock::picture() const {
     OverlayPicture picture;
-    TraceTools& tools = const_cast<TraceToolsDock*>(this)->tools_;
+    auto* self = const_cast<TraceToolsDock*>(this);
+    TraceTools& tools = self->tools_;
     const std::optional<SpectrumTrace>& now = tools.trace();
     QStringList foot;
     if (!tools.problem().empty() && (tools.request.mask || !tools.corrections().empty()))
@@ -187,24 +204,25 @@ OverlayPicture TraceToolsDock::picture() const {
     if (now) {
         for (std::size_t i = 0; i < kHolds; ++i)
             if (tools.traces().isOn(static_cast<HoldKind>(i)))
-                addCurve(picture, tools.traces().held(static_cast<HoldKind>(i)), traces_->color(i));
+                addCurve(picture, tools.traces().held(static_cast<HoldKind>(i)),
+                         self->traces().color(i));
         for (std::size_t i = 0; i < kMemories; ++i) {
             const auto& memory = tools.traces().memory(i);
-            if (!memory || !traces_->memoryShown(i)) continue;
+            if (!memory || !self->traces().memoryShown(i)) continue;
             if (closeAxes(*memory, *now)) {
-                addCurve(picture, *memory, traces_->color(kHolds + i));
+                addCurve(picture, *memory, self->traces().color(kHolds + i));
             } else {
                 foot << "Reference " + QString::number(i + 1) + " has another span or unit";
             }
         }
-        if (const auto less = traces_->normalisedBy()) {
+        if (const auto less = self->traces_ == nullptr ? std::nullopt : traces_->normalisedBy()) {
             if (const auto trace = tools.traces().normalised(*now, *less)) {
-                addCurve(picture, *trace, traces_->color(kHolds + kMemories));
+                addCurve(picture, *trace, self->traces().color(kHolds + kMemories));
                 foot << "Sweep less reference " + QString::number(*less + 1) + ", dB";
             }
         }
         if (!tools.corrections().empty())
-            addCurve(picture, *now, traces_->color(kHolds + kMemories));
+            addCurve(picture, *now, self->traces().color(kHolds + kMemories));
         for (std::size_t i = 0; i < kHostMarkers; ++i) {
             const MarkerReading& reading = tools.readings().at(i);
             if (!reading.x || !reading.level) continue;
@@ -268,7 +286,7 @@ void TraceToolsDock::fill(QMenu& menu) {
     menu.addSeparator();
     for (std::size_t i = 0; i < kHolds; ++i) {
         const auto kind = static_cast<HoldKind>(i);
-        QAction* action = menu.addAction(TracesPage::kNames.at(i));
+        QAction* action = menu.addAction(QObject::tr(TracesPage::kNames.at(i)));
         action->setCheckable(true);
         connect(action, &QAction::triggered, this, [this, kind](bool on) {
             tools_.traces().switchOn(kind, on);
@@ -290,7 +308,6 @@ TraceToolsDock* addTraceTools(QMainWindow& window, Program& program, GraphWidget
                               QMenu& before) {
     auto* dock = new TraceToolsDock(program, graph, window);
     window.addDockWidget(Qt::BottomDockWidgetArea, dock);
-    dock->setFloating(true);
     dock->hide();
     auto* menu = new QMenu(QObject::tr("&Trace"), &window);
     window.menuBar()->insertMenu(before.menuAction(), menu);

@@ -20,27 +20,40 @@ class QMainWindow;
 
 namespace zel {
 
+/// The pages are built when the dock is shown or used for the first time: most sessions begin
+/// without it, and the window is to be there at once.
 class TraceToolsDock : public QDockWidget {
   public:
     TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow& window);
     ~TraceToolsDock() override;
 
     TraceTools& tools() { return tools_; }
-    LimitsPage& limits() { return *limits_; }
-    TracesPage& traces() { return *traces_; }
+    LimitsPage& limits() {
+        build();
+        return *limits_;
+    }
+    TracesPage& traces() {
+        build();
+        return *traces_;
+    }
     MaskWatch& watch() { return watch_; }
     /// What is drawn over the graph now.
     OverlayPicture picture() const;
-    QTabWidget& pages() { return *pages_; }
+    QTabWidget& pages() {
+        build();
+        return *pages_;
+    }
     /// The entries of the menu "Trace".
     void fill(QMenu& menu);
     /// Shows everything at once, without waiting for the next turn.
     void showNow();
+    void setVisible(bool visible) override;
 
   protected:
     void showEvent(QShowEvent* event) override;
 
   private:
+    void build();
     void follow();
     void takeSweep(bool loaded);
     void showLater();
@@ -58,13 +71,14 @@ class TraceToolsDock : public QDockWidget {
     SystemCommand command_;
     MaskWatch watch_;
     TraceOverlay overlay_;
-    QTabWidget* pages_;
-    TracesPage* traces_;
-    LimitsPage* limits_;
-    MarkersPage* markers_;
+    QTabWidget* pages_ = nullptr;
+    TracesPage* traces_ = nullptr;
+    LimitsPage* limits_ = nullptr;
+    MarkersPage* markers_ = nullptr;
     unsigned long plotSerial_ = 0;
     double lastTime_ = 0;
     bool waits_ = false;
+    bool placed_ = false;  ///< it was shown once
 };
 
 /// Adds the dock, hidden, and the menu "Trace", which stands before another menu, to the window.
