@@ -16,7 +16,7 @@ struct Tip {
 const Tip kTips[] = {
     {"PlaySingleButton", QT_TRANSLATE_NOOP("QObject", "Read one sweep")},
     {"PlayContinuousButton", QT_TRANSLATE_NOOP("QObject", "Read sweep after sweep")},
-    {"ReconnectButton", QT_TRANSLATE_NOOP("QObject", "Connect with the same port and baud rate")},
+    {"ReconnectButton", QT_TRANSLATE_NOOP("QObject", "Connect to the same place again")},
     {"ReconnectCloseButton", QT_TRANSLATE_NOOP("QObject", "Put this line away")},
     {"StopButton", QT_TRANSLATE_NOOP("QObject", "Stop the continuous view or the recording")},
     {"cmdZoom", QT_TRANSLATE_NOOP(
@@ -132,7 +132,7 @@ const Tip kNames[] = {
     {"PlaybackPosition", QT_TRANSLATE_NOOP("QObject", "Position in the recording")},
     {"sldSpeed", QT_TRANSLATE_NOOP("QObject", "Speed")},
     {"WaitLabel", QT_TRANSLATE_NOOP("QObject", "Wait")},
-    {"ReconnectLabel", QT_TRANSLATE_NOOP("QObject", "State of the lost port")},
+    {"ReconnectLabel", QT_TRANSLATE_NOOP("QObject", "State of the lost connection")},
 };
 
 /// Captions of controls that the window has beside those of the instrument's panel.

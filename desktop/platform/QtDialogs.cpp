@@ -68,6 +68,8 @@ QStringList filtersOf(const std::string& filter) {
         QString name = pieces[i];
         const auto bracket = name.lastIndexOf('(');
         if (bracket >= 0) name.truncate(bracket);
+        // The request calls a metafile a text.
+        if (pieces[i + 1] == "*.wmf") name = "WMF Files";
         const QString pattern = pieces[i + 1] == "*.*" ? QString("*") : pieces[i + 1];
         result << name.trimmed() + " (" + pattern + ")";
     }

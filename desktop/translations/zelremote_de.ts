@@ -802,16 +802,8 @@ oder eine Aufzeichnung laden</translation>
         <translation>Farbe nach Pegel</translation>
     </message>
     <message>
-        <source>Connect with the same port and baud rate</source>
-        <translation>Mit demselben Anschluss und derselben Baudrate verbinden</translation>
-    </message>
-    <message>
         <source>Put this line away</source>
         <translation>Diese Zeile schließen</translation>
-    </message>
-    <message>
-        <source>State of the lost port</source>
-        <translation>Zustand des verlorenen Anschlusses</translation>
     </message>
     <message>
         <source>Cancel</source>
@@ -864,10 +856,6 @@ oder eine Aufzeichnung laden</translation>
     <message>
         <source>Lost connection</source>
         <translation>Verlorene Verbindung</translation>
-    </message>
-    <message>
-        <source>Connects again as soon as the port is back and the instrument answers</source>
-        <translation>Verbindet wieder, sobald der Anschluss zurück ist und das Gerät antwortet</translation>
     </message>
     <message>
         <source>The port is a whole number from 1 to 65535</source>
@@ -992,6 +980,474 @@ oder eine Aufzeichnung laden</translation>
     <message>
         <source>There is no mask yet: page Limits</source>
         <translation>Noch keine Maske: Seite Grenzen</translation>
+    </message>
+    <message>
+        <source>refused</source>
+        <translation>abgelehnt</translation>
+    </message>
+    <message>
+        <source>refused: not understood</source>
+        <translation>abgelehnt: nicht verstanden</translation>
+    </message>
+    <message>
+        <source>refused: not in this mode</source>
+        <translation>abgelehnt: nicht in dieser Betriebsart</translation>
+    </message>
+    <message>
+        <source>refused: storage full</source>
+        <translation>abgelehnt: Speicher voll</translation>
+    </message>
+    <message>
+        <source>refused: not allowed</source>
+        <translation>abgelehnt: nicht erlaubt</translation>
+    </message>
+    <message>
+        <source>refused: out of range</source>
+        <translation>abgelehnt: außerhalb</translation>
+    </message>
+    <message>
+        <source>unsure</source>
+        <translation>unsicher</translation>
+    </message>
+    <message>
+        <source>Serial port</source>
+        <translation>Serielle Schnittstelle</translation>
+    </message>
+    <message>
+        <source>The port is open</source>
+        <translation>Die Schnittstelle ist offen</translation>
+    </message>
+    <message>
+        <source>Dial</source>
+        <translation>Wählen</translation>
+    </message>
+    <message>
+        <source>Mask: a row a point, x in Hz; a level may be empty</source>
+        <translation>Maske: eine Zeile je Punkt, x in Hz; ein Pegel darf fehlen</translation>
+    </message>
+    <message>
+        <source>Mask</source>
+        <translation>Maske</translation>
+    </message>
+    <message>
+        <source>Apply</source>
+        <translation>Anwenden</translation>
+    </message>
+    <message>
+        <source>Load...</source>
+        <translation>Laden...</translation>
+    </message>
+    <message>
+        <source>Load Mask</source>
+        <translation>Maske laden</translation>
+    </message>
+    <message>
+        <source>Save...</source>
+        <translation>Speichern...</translation>
+    </message>
+    <message>
+        <source>Save Mask</source>
+        <translation>Maske speichern</translation>
+    </message>
+    <message>
+        <source>Remove</source>
+        <translation>Entfernen</translation>
+    </message>
+    <message>
+        <source>Antenna...</source>
+        <translation>Antenne...</translation>
+    </message>
+    <message>
+        <source>Cable...</source>
+        <translation>Kabel...</translation>
+    </message>
+    <message>
+        <source>Amplifier...</source>
+        <translation>Verstärker...</translation>
+    </message>
+    <message>
+        <source>Load Correction</source>
+        <translation>Korrektur laden</translation>
+    </message>
+    <message>
+        <source>No sweep was held against the mask yet</source>
+        <translation>Noch kein Sweep wurde mit der Maske verglichen</translation>
+    </message>
+    <message>
+        <source>No mask</source>
+        <translation>Keine Maske</translation>
+    </message>
+    <message>
+        <source>No correction: tables x;db over frequency</source>
+        <translation>Keine Korrektur: Tabellen x;db über der Frequenz</translation>
+    </message>
+    <message>
+        <source>Corrected: %1</source>
+        <translation>Korrigiert: %1</translation>
+    </message>
+    <message>
+        <source>Refusal</source>
+        <translation>Ablehnung</translation>
+    </message>
+    <message>
+        <source>Threshold</source>
+        <translation>Schwelle</translation>
+    </message>
+    <message>
+        <source>none</source>
+        <translation>keine</translation>
+    </message>
+    <message>
+        <source>Excursion</source>
+        <translation>Abfall</translation>
+    </message>
+    <message>
+        <source>Over</source>
+        <translation>Über</translation>
+    </message>
+    <message>
+        <source>Fall, dB</source>
+        <translation>Abfall, dB</translation>
+    </message>
+    <message>
+        <source>Order</source>
+        <translation>Reihenfolge</translation>
+    </message>
+    <message>
+        <source>By level</source>
+        <translation>Nach Pegel</translation>
+    </message>
+    <message>
+        <source>By x</source>
+        <translation>Nach x</translation>
+    </message>
+    <message>
+        <source>A click puts a marker on the peak</source>
+        <translation>Ein Klick setzt einen Marker auf die Spitze</translation>
+    </message>
+    <message>
+        <source>Copy Table</source>
+        <translation>Tabelle kopieren</translation>
+    </message>
+    <message>
+        <source>Save Table...</source>
+        <translation>Tabelle speichern...</translation>
+    </message>
+    <message>
+        <source>Save Peaks</source>
+        <translation>Spitzen speichern</translation>
+    </message>
+    <message>
+        <source>At</source>
+        <translation>Bei</translation>
+    </message>
+    <message>
+        <source>Delta to</source>
+        <translation>Delta zu</translation>
+    </message>
+    <message>
+        <source>Noise</source>
+        <translation>Rauschen</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Aus</translation>
+    </message>
+    <message>
+        <source>Peak %1</source>
+        <translation>Spitze %1</translation>
+    </message>
+    <message>
+        <source>Here</source>
+        <translation>Hier</translation>
+    </message>
+    <message>
+        <source>Place of %1</source>
+        <translation>Ort von %1</translation>
+    </message>
+    <message>
+        <source>Here: stays where it is, while the sweeps go on</source>
+        <translation>Hier: bleibt an seinem Ort, während die Sweeps weitergehen</translation>
+    </message>
+    <message>
+        <source>Reference of %1</source>
+        <translation>Bezug von %1</translation>
+    </message>
+    <message>
+        <source>A place can be typed into the column x; the mouse drags a marker</source>
+        <translation>In die Spalte x lässt sich ein Ort eintippen; die Maus zieht einen Marker</translation>
+    </message>
+    <message>
+        <source>This is no place: %1; 935.2M is one</source>
+        <translation>Das ist kein Ort: %1; 935.2M ist einer</translation>
+    </message>
+    <message>
+        <source>The sweep does not reach %1</source>
+        <translation>Der Sweep reicht nicht bis %1</translation>
+    </message>
+    <message>
+        <source>Bandwidth</source>
+        <translation>Bandbreite</translation>
+    </message>
+    <message>
+        <source>dB down, as 3</source>
+        <translation>dB darunter, etwa 3</translation>
+    </message>
+    <message>
+        <source>Channel</source>
+        <translation>Kanal</translation>
+    </message>
+    <message>
+        <source>start, as 935M</source>
+        <translation>Anfang, etwa 935M</translation>
+    </message>
+    <message>
+        <source>Channel stop</source>
+        <translation>Ende des Kanals</translation>
+    </message>
+    <message>
+        <source>stop, as 960M</source>
+        <translation>Ende, etwa 960M</translation>
+    </message>
+    <message>
+        <source>Occupied</source>
+        <translation>Belegt</translation>
+    </message>
+    <message>
+        <source>percent, as 99</source>
+        <translation>Prozent, etwa 99</translation>
+    </message>
+    <message>
+        <source>Adjacent</source>
+        <translation>Nachbarn</translation>
+    </message>
+    <message>
+        <source>width, as 5M</source>
+        <translation>Breite, etwa 5M</translation>
+    </message>
+    <message>
+        <source>Channel spacing</source>
+        <translation>Kanalabstand</translation>
+    </message>
+    <message>
+        <source>spacing, as 5M</source>
+        <translation>Abstand, etwa 5M</translation>
+    </message>
+    <message>
+        <source>The bandwidth stands about the strongest peak, the adjacent channels about its frequency.</source>
+        <translation>Die Bandbreite liegt um die stärkste Spitze, die Nachbarkanäle um deren Frequenz.</translation>
+    </message>
+    <message>
+        <source>Recent servers</source>
+        <translation>Letzte Server</translation>
+    </message>
+    <message>
+        <source>Address</source>
+        <translation>Adresse</translation>
+    </message>
+    <message>
+        <source>of the server&apos;s certificate; empty: by its authority</source>
+        <translation>des Zertifikats des Servers; leer: nach dessen Aussteller</translation>
+    </message>
+    <message>
+        <source>Fingerprint</source>
+        <translation>Fingerabdruck</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>Zustand</translation>
+    </message>
+    <message>
+        <source>Device</source>
+        <translation>Gerät</translation>
+    </message>
+    <message>
+        <source>Hide in the tray</source>
+        <translation>Im Infobereich ablegen</translation>
+    </message>
+    <message>
+        <source>Network</source>
+        <translation>Netzwerk</translation>
+    </message>
+    <message>
+        <source>This machine</source>
+        <translation>Dieser Rechner</translation>
+    </message>
+    <message>
+        <source>TCP port</source>
+        <translation>TCP-Port</translation>
+    </message>
+    <message>
+        <source>private networks</source>
+        <translation>private Netze</translation>
+    </message>
+    <message>
+        <source>Allowed networks</source>
+        <translation>Erlaubte Netze</translation>
+    </message>
+    <message>
+        <source>Connection</source>
+        <translation>Verbindung</translation>
+    </message>
+    <message>
+        <source>To the instrument</source>
+        <translation>Zum Messgerät</translation>
+    </message>
+    <message>
+        <source>To the client</source>
+        <translation>Zum Client</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>Suchen</translation>
+    </message>
+    <message>
+        <source>Replace with</source>
+        <translation>Ersetzen durch</translation>
+    </message>
+    <message>
+        <source>Find Next</source>
+        <translation>Weitersuchen</translation>
+    </message>
+    <message>
+        <source>Replace</source>
+        <translation>Ersetzen</translation>
+    </message>
+    <message>
+        <source>Replace All</source>
+        <translation>Alle ersetzen</translation>
+    </message>
+    <message>
+        <source>Script Editor</source>
+        <translation>Skripteditor</translation>
+    </message>
+    <message>
+        <source>Close without saving the changes?</source>
+        <translation>Schließen, ohne die Änderungen zu speichern?</translation>
+    </message>
+    <message>
+        <source>Count</source>
+        <translation>Zählen</translation>
+    </message>
+    <message>
+        <source>Occupancy over</source>
+        <translation>Belegung über</translation>
+    </message>
+    <message>
+        <source>Occupied at or over</source>
+        <translation>Belegt ab</translation>
+    </message>
+    <message>
+        <source>occupied, %</source>
+        <translation>belegt, %</translation>
+    </message>
+    <message>
+        <source>serial:DEVICE@BAUD or tcp:HOST:PORT; empty: all ports</source>
+        <translation>serial:GERÄT@BAUD oder tcp:HOST:PORT; leer: alle Schnittstellen</translation>
+    </message>
+    <message>
+        <source>Clear</source>
+        <translation>Löschen</translation>
+    </message>
+    <message>
+        <source>Fits the level axis to what is on the graph, until the next setting</source>
+        <translation>Passt die Pegelachse an das Diagramm an, bis zur nächsten Einstellung</translation>
+    </message>
+    <message>
+        <source>Corrected sweep</source>
+        <translation>Korrigierter Sweep</translation>
+    </message>
+    <message>
+        <source>Reference %1</source>
+        <translation>Referenz %1</translation>
+    </message>
+    <message>
+        <source>Store</source>
+        <translation>Merken</translation>
+    </message>
+    <message>
+        <source>Subtract</source>
+        <translation>Abziehen</translation>
+    </message>
+    <message>
+        <source>Shows the sweep less this reference, in dB</source>
+        <translation>Zeigt den Sweep abzüglich dieser Referenz, in dB</translation>
+    </message>
+    <message>
+        <source>Takes the first trace of a saved view or a recording</source>
+        <translation>Nimmt die erste Kurve einer gespeicherten Ansicht oder Aufzeichnung</translation>
+    </message>
+    <message>
+        <source>Load Reference</source>
+        <translation>Referenz laden</translation>
+    </message>
+    <message>
+        <source>Colour of %1</source>
+        <translation>Farbe von %1</translation>
+    </message>
+    <message>
+        <source>Chooses the colour</source>
+        <translation>Wählt die Farbe</translation>
+    </message>
+    <message>
+        <source>The reference was not taken: %1</source>
+        <translation>Die Referenz wurde nicht übernommen: %1</translation>
+    </message>
+    <message>
+        <source>the file is too long</source>
+        <translation>die Datei ist zu lang</translation>
+    </message>
+    <message>
+        <source>1 sweep</source>
+        <translation>1 Sweep</translation>
+    </message>
+    <message>
+        <source>%1 sweeps</source>
+        <translation>%1 Sweeps</translation>
+    </message>
+    <message>
+        <source>Max hold</source>
+        <translation>Max. halten</translation>
+    </message>
+    <message>
+        <source>Min hold</source>
+        <translation>Min. halten</translation>
+    </message>
+    <message>
+        <source>Average, level</source>
+        <translation>Mittel, Pegel</translation>
+    </message>
+    <message>
+        <source>Average, power</source>
+        <translation>Mittel, Leistung</translation>
+    </message>
+    <message>
+        <source>Colours</source>
+        <translation>Farben</translation>
+    </message>
+    <message>
+        <source>Depth</source>
+        <translation>Tiefe</translation>
+    </message>
+    <message>
+        <source>Levels</source>
+        <translation>Pegel</translation>
+    </message>
+    <message>
+        <source>to</source>
+        <translation>bis</translation>
+    </message>
+    <message>
+        <source>Connect to the same place again</source>
+        <translation>Wieder mit demselben Ziel verbinden</translation>
+    </message>
+    <message>
+        <source>State of the lost connection</source>
+        <translation>Zustand der verlorenen Verbindung</translation>
+    </message>
+    <message>
+        <source>Connects again as soon as the port or the server is back and the instrument answers</source>
+        <translation>Verbindet wieder, sobald Anschluss oder Server zurück ist und das Gerät antwortet</translation>
     </message>
 </context>
 </TS>

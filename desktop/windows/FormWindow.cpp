@@ -254,9 +254,9 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
         return key;
     };
 
-    auto* serial = new QGroupBox("Serial port");
+    auto* serial = new QGroupBox(QObject::tr("Serial port"));
     auto* serialFields = new QFormLayout(serial);
-    serialFields->addRow("Port", list(form.COMList));
+    serialFields->addRow(QObject::tr("Port"), list(form.COMList));
     QComboBox* baud = list(form.BaudList);
     setAccept(form.ZELButton);
     checkField(*baud, [](const QString& text) {
@@ -265,19 +265,19 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
                    ? QString()
                    : QObject::tr("The baud rate is a whole number");
     });
-    serialFields->addRow("Baud rate", baud);
-    auto* portState = new QLabel("The port is open");
+    serialFields->addRow(QObject::tr("Baud rate"), baud);
+    auto* portState = new QLabel(QObject::tr("The port is open"));
     serialFields->addRow("", portState);
-    serialFields->addRow("Instrument", box(form.IDText));
+    serialFields->addRow(QObject::tr("Instrument"), box(form.IDText));
     binder.bind(form.DirectConnectionFrame, serial, nullptr);
     binder.bindShow(form.OnPic, portState,
                     [&form, portState] { portState->setVisible(form.OnPic.Visible); });
     layout->addWidget(serial);
 
-    auto* dial = new QGroupBox("Dial");
+    auto* dial = new QGroupBox(QObject::tr("Dial"));
     auto* dialFields = new QFormLayout(dial);
-    dialFields->addRow("Number", box(form.TelNumberBox));
-    dialFields->addRow("Modem", box(form.AirBaudRateText));
+    dialFields->addRow(QObject::tr("Number"), box(form.TelNumberBox));
+    dialFields->addRow(QObject::tr("Modem"), box(form.AirBaudRateText));
     auto* dialKeys = new QHBoxLayout;
     dialKeys->addWidget(button(form.DialButton));
     dialKeys->addWidget(button(form.CancelButton));

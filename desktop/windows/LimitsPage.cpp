@@ -18,27 +18,27 @@ QPushButton* key(QHBoxLayout& row, const QString& text) {
 
 LimitsPage::LimitsPage(TraceTools& tools) : TracePage(tools) {
     auto* layout = new QVBoxLayout(this);
-    auto* caption = new QLabel("Mask: a row a point, x in Hz; a level may be empty");
+    auto* caption = new QLabel(QObject::tr("Mask: a row a point, x in Hz; a level may be empty"));
     layout->addWidget(caption);
     table_ = new QPlainTextEdit;
     table_->setObjectName("MaskTable");
-    table_->setAccessibleName("Mask");
+    table_->setAccessibleName(QObject::tr("Mask"));
     table_->setTabChangesFocus(true);
     table_->setPlainText("x;upper;lower\n");
     caption->setBuddy(table_);
     layout->addWidget(table_, 1);
     auto* masks = new QHBoxLayout;
-    connect(key(*masks, "Apply"), &QPushButton::clicked, this,
+    connect(key(*masks, QObject::tr("Apply")), &QPushButton::clicked, this,
             [this] { applyMask(table_->toPlainText()); });
-    connect(key(*masks, "Load..."), &QPushButton::clicked, this, [this] {
-        const auto text = readTable(*this, "Load Mask", nullptr);
+    connect(key(*masks, QObject::tr("Load...")), &QPushButton::clicked, this, [this] {
+        const auto text = readTable(*this, QObject::tr("Load Mask"), nullptr);
         if (!text) return;
         table_->setPlainText(*text);
         applyMask(*text);
     });
-    connect(key(*masks, "Save..."), &QPushButton::clicked, this,
-            [this] { saveTable(*this, "Save Mask", table_->toPlainText()); });
-    connect(key(*masks, "Remove"), &QPushButton::clicked, this, [this] {
+    connect(key(*masks, QObject::tr("Save...")), &QPushButton::clicked, this,
+            [this] { saveTable(*this, QObject::tr("Save Mask"), table_->toPlainText()); });
+    connect(key(*masks, QObject::tr("Remove")), &QPushButton::clicked, this, [this] {
         word_->clear();
         tools_.setMask(std::nullopt);
     });
@@ -52,16 +52,16 @@ LimitsPage::LimitsPage(TraceTools& tools) : TracePage(tools) {
     layout->addWidget(corrections_);
     auto* tables = new QHBoxLayout;
     constexpr std::pair<CorrectionKind, const char*> kKinds[] = {
-        {CorrectionKind::Antenna, "Antenna..."},
-        {CorrectionKind::Cable, "Cable..."},
-        {CorrectionKind::Amplifier, "Amplifier..."}};
+        {CorrectionKind::Antenna, QT_TRANSLATE_NOOP("QObject", "Antenna...")},
+        {CorrectionKind::Cable, QT_TRANSLATE_NOOP("QObject", "Cable...")},
+        {CorrectionKind::Amplifier, QT_TRANSLATE_NOOP("QObject", "Amplifier...")}};
     for (const auto& [kind, text] : kKinds)
-        connect(key(*tables, text), &QPushButton::clicked, this, [this, which = kind] {
+        connect(key(*tables, QObject::tr(text)), &QPushButton::clicked, this, [this, which = kind] {
             QString name;
-            if (const auto table = readTable(*this, "Load Correction", &name))
+            if (const auto table = readTable(*this, QObject::tr("Load Correction"), &name))
                 addCorrection(which, name, *table);
         });
-    connect(key(*tables, "Remove"), &QPushButton::clicked, this, [this] {
+    connect(key(*tables, QObject::tr("Remove")), &QPushButton::clicked, this, [this] {
         word_->clear();
         tools_.setCorrections({});
     });
@@ -97,7 +97,8 @@ void LimitsPage::addCorrection(CorrectionKind kind, const QString& name, const Q
 
 void LimitsPage::showState() {
     const AnalysisResult& result = tools_.result();
-    QString verdict = tools_.request.mask ? "No sweep was held against the mask yet" : "No mask";
+    QString verdict = tools_.request.mask ? QObject::tr("No sweep was held against the mask yet")
+                                          : QObject::tr("No mask");
     if (result.mask) {
         verdict = result.mask->pass ? "Pass" : "FAIL";
         verdict += result.mask->margin ? ", margin " + levelText(result.mask->margin, "dB") +
@@ -108,8 +109,9 @@ void LimitsPage::showState() {
         verdict += "; " + QString::fromStdString(tools_.maskCount().text());
     verdict_->setText(verdict);
     const std::string names = correctionNames(tools_.corrections());
-    corrections_->setText(names.empty() ? "No correction: tables x;db over frequency"
-                                        : "Corrected: " + QString::fromStdString(names));
+    corrections_->setText(names.empty()
+                              ? QObject::tr("No correction: tables x;db over frequency")
+                              : QObject::tr("Corrected: %1").arg(QString::fromStdString(names)));
 }
 
 }  // namespace zel

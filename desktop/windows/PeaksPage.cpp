@@ -24,7 +24,6 @@ constexpr double kMostDecibels = 1000;
 QTableWidget* makeTable(const QStringList& names, const QString& name) {
     auto* table = new QTableWidget(0, static_cast<int>(names.size()));
     table->setObjectName(name);
-    table->setAccessibleName(name);
     table->setHorizontalHeaderLabels(names);
     table->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
     table->verticalHeader()->setVisible(false);
@@ -43,10 +42,10 @@ void put(QTableWidget& table, int row, int column, const QString& text) {
     if (item->text() != text) item->setText(text);
 }
 
-QLineEdit* field(const QString& name, const QString& hint, const QString& text) {
+QLineEdit* field(const char* name, const QString& hint, const QString& text) {
     auto* box = new QLineEdit(text);
     box->setObjectName(name);
-    box->setAccessibleName(name);
+    box->setAccessibleName(QObject::tr(name));
     box->setPlaceholderText(hint);
     box->setMaximumWidth(64);
     return box;
@@ -57,11 +56,12 @@ QLineEdit* field(const QString& name, const QString& hint, const QString& text) 
 PeaksPage::PeaksPage(TraceTools& tools, std::function<void(std::size_t)> goTo) : TracePage(tools) {
     auto* layout = new QVBoxLayout(this);
     auto* settings = new QHBoxLayout;
-    count_ = field("Peaks", "", "10");
-    threshold_ = field("Threshold", "none", "");
-    excursion_ = field("Excursion", "6", "6");
-    for (const auto& [text, box] : {std::pair("Peaks", count_), std::pair("Over", threshold_),
-                                    std::pair("Fall, dB", excursion_)}) {
+    count_ = field(QT_TRANSLATE_NOOP("QObject", "Peaks"), "", "10");
+    threshold_ = field(QT_TRANSLATE_NOOP("QObject", "Threshold"), QObject::tr("none"), "");
+    excursion_ = field(QT_TRANSLATE_NOOP("QObject", "Excursion"), "6", "6");
+    for (const auto& [text, box] :
+         {std::pair(QObject::tr("Peaks"), count_), std::pair(QObject::tr("Over"), threshold_),
+          std::pair(QObject::tr("Fall, dB"), excursion_)}) {
         auto* label = new QLabel(text);
         label->setBuddy(box);
         settings->addWidget(label);
@@ -69,22 +69,23 @@ PeaksPage::PeaksPage(TraceTools& tools, std::function<void(std::size_t)> goTo) :
         connect(box, &QLineEdit::editingFinished, this, [this] { takeSettings(); });
     }
     order_ = new QComboBox;
-    order_->setAccessibleName("Order");
-    order_->addItems({"By level", "By x"});
+    order_->setAccessibleName(QObject::tr("Order"));
+    order_->addItems({QObject::tr("By level"), QObject::tr("By x")});
     connect(order_, &QComboBox::currentIndexChanged, this, [this] { showState(); });
     settings->addWidget(order_);
     layout->addLayout(settings);
-    table_ = makeTable({"Peak", "x", "Level"}, "PeaksTable");
+    table_ = makeTable({QObject::tr("Peak"), "x", QObject::tr("Level")}, "PeaksTable");
+    table_->setAccessibleName(QObject::tr("Peaks"));
     connect(table_, &QTableWidget::cellClicked, this, [this, goTo = std::move(goTo)](int row) {
         goTo(static_cast<std::size_t>(table_->item(row, 0)->text().toInt()));
     });
-    table_->setToolTip("A click puts a marker on the peak");
+    table_->setToolTip(QObject::tr("A click puts a marker on the peak"));
     layout->addWidget(table_, 1);
     auto* keys = new QHBoxLayout;
-    auto* copy = new QPushButton("Copy Table");
+    auto* copy = new QPushButton(QObject::tr("Copy Table"));
     connect(copy, &QPushButton::clicked, this,
             [this] { QApplication::clipboard()->setText(asText()); });
-    auto* save = new QPushButton("Save Table...");
+    auto* save = new QPushButton(QObject::tr("Save Table..."));
     connect(save, &QPushButton::clicked, this, [this] {
         QString text = "peak;x;level\r\n";
         int number = 0;
@@ -93,7 +94,7 @@ PeaksPage::PeaksPage(TraceTools& tools, std::function<void(std::size_t)> goTo) :
                 QString::number(++number) + ";" +
                 QString::fromStdString(shortestNumber(peak.x) + ";" + shortestNumber(peak.level)) +
                 "\r\n";
-        saveTable(*this, "Save Peaks", text);
+        saveTable(*this, QObject::tr("Save Peaks"), text);
     });
     keys->addWidget(copy);
     keys->addWidget(save);
@@ -145,13 +146,16 @@ QString PeaksPage::asText() const {
 
 MarkersPage::MarkersPage(TraceTools& tools) : TracePage(tools) {
     auto* layout = new QVBoxLayout(this);
-    table_ = makeTable({"", "At", "Delta to", "x", "Level", "Noise"}, "MarkersTable");
+    table_ = makeTable({"", QObject::tr("At"), QObject::tr("Delta to"), "x", QObject::tr("Level"),
+                        QObject::tr("Noise")},
+                       "MarkersTable");
+    table_->setAccessibleName(QObject::tr("Markers"));
     table_->setRowCount(static_cast<int>(kHostMarkers));
     for (const int narrow : {0, 1, 2, 4, 5})  // the place has the most digits
         table_->horizontalHeader()->setSectionResizeMode(narrow, QHeaderView::ResizeToContents);
-    QStringList places = {"Off"};
-    for (int i = 1; i <= kFollowed; ++i) places << "Peak " + QString::number(i);
-    places << "Here";
+    QStringList places = {QObject::tr("Off")};
+    for (int i = 1; i <= kFollowed; ++i) places << QObject::tr("Peak %1").arg(i);
+    places << QObject::tr("Here");
     QStringList markers = {QString::fromUtf8("–")};
     for (std::size_t i = 1; i <= kHostMarkers; ++i) markers << "M" + QString::number(i);
     for (std::size_t i = 0; i < kHostMarkers; ++i) {
@@ -160,11 +164,11 @@ MarkersPage::MarkersPage(TraceTools& tools) : TracePage(tools) {
         put(*table_, row, 0, name);
         follows_.at(i) = new QComboBox;
         follows_.at(i)->addItems(places);
-        follows_.at(i)->setAccessibleName("Place of " + name);
-        follows_.at(i)->setToolTip("Here: stays where it is, while the sweeps go on");
+        follows_.at(i)->setAccessibleName(QObject::tr("Place of %1").arg(name));
+        follows_.at(i)->setToolTip(QObject::tr("Here: stays where it is, while the sweeps go on"));
         delta_.at(i) = new QComboBox;
         delta_.at(i)->addItems(markers);
-        delta_.at(i)->setAccessibleName("Reference of " + name);
+        delta_.at(i)->setAccessibleName(QObject::tr("Reference of %1").arg(name));
         table_->setCellWidget(row, 1, follows_.at(i));
         table_->setCellWidget(row, 2, delta_.at(i));
         for (QComboBox* box : {follows_.at(i), delta_.at(i)})
@@ -172,7 +176,8 @@ MarkersPage::MarkersPage(TraceTools& tools) : TracePage(tools) {
     }
     table_->setEditTriggers(QAbstractItemView::DoubleClicked | QAbstractItemView::EditKeyPressed |
                             QAbstractItemView::AnyKeyPressed);
-    table_->setToolTip("A place can be typed into the column x; the mouse drags a marker");
+    table_->setToolTip(
+        QObject::tr("A place can be typed into the column x; the mouse drags a marker"));
     connect(table_, &QTableWidget::itemChanged, this, [this](QTableWidgetItem* item) {
         if (item->column() == kPlaceColumn) takePlace(item->row(), item->text());
     });
@@ -189,9 +194,9 @@ void MarkersPage::takePlace(int row, const QString& text) {
     const auto x = quantityOf(text);
     word_->clear();
     if (!x) {
-        word_->setText("This is no place: " + text + "; 935.2M is one");
+        word_->setText(QObject::tr("This is no place: %1; 935.2M is one").arg(text));
     } else if (trace && !trace->x.empty() && (*x < trace->x.front() || *x > trace->x.back())) {
-        word_->setText("The sweep does not reach " + placeText(x, trace->xUnit));
+        word_->setText(QObject::tr("The sweep does not reach %1").arg(placeText(x, trace->xUnit)));
     } else {
         HostMarker& marker = tools_.markers.at(static_cast<std::size_t>(row));
         marker.on = true;

@@ -8,11 +8,11 @@ namespace {
 constexpr double kMostDecibels = 1000;
 constexpr double kWhole = 100;
 
-QLineEdit* field(const QString& name, const QString& hint) {
+QLineEdit* field(const char* name, const char* hint) {
     auto* box = new QLineEdit;
     box->setObjectName(name);
-    box->setAccessibleName(name);
-    box->setPlaceholderText(hint);
+    box->setAccessibleName(QObject::tr(name));
+    box->setPlaceholderText(QObject::tr(hint));
     return box;
 }
 
@@ -34,12 +34,12 @@ PowerPage::PowerPage(TraceTools& tools) : TracePage(tools) {
     auto* grid = new QGridLayout(this);
     grid->setColumnStretch(1, 1);
     grid->setColumnStretch(2, 1);
-    const auto row = [this, grid](const QString& name, QLineEdit*& one, const char* hint,
-                                  QLineEdit** two, const QString& twoName, const char* twoHint,
+    const auto row = [this, grid](const char* name, QLineEdit*& one, const char* hint,
+                                  QLineEdit** two, const char* twoName, const char* twoHint,
                                   QLabel*& found) {
         const int at = grid->rowCount();
         one = field(name, hint);
-        auto* caption = new QLabel(name);
+        auto* caption = new QLabel(QObject::tr(name));
         caption->setBuddy(one);
         grid->addWidget(caption, at, 0);
         grid->addWidget(one, at, 1);
@@ -52,14 +52,21 @@ PowerPage::PowerPage(TraceTools& tools) : TracePage(tools) {
         found = finding(name);
         grid->addWidget(found, at + 1, 1, 1, 2);
     };
-    row("Bandwidth", down_, "dB down, as 3", nullptr, "", "", bandwidth_);
-    row("Channel", start_, "start, as 935M", &stop_, "Channel stop", "stop, as 960M", channel_);
-    row("Occupied", percent_, "percent, as 99", nullptr, "", "", occupied_);
-    row("Adjacent", width_, "width, as 5M", &spacing_, "Channel spacing", "spacing, as 5M",
-        adjacent_);
+    row(QT_TRANSLATE_NOOP("QObject", "Bandwidth"), down_,
+        QT_TRANSLATE_NOOP("QObject", "dB down, as 3"), nullptr, "", "", bandwidth_);
+    row(QT_TRANSLATE_NOOP("QObject", "Channel"), start_,
+        QT_TRANSLATE_NOOP("QObject", "start, as 935M"), &stop_,
+        QT_TRANSLATE_NOOP("QObject", "Channel stop"), QT_TRANSLATE_NOOP("QObject", "stop, as 960M"),
+        channel_);
+    row(QT_TRANSLATE_NOOP("QObject", "Occupied"), percent_,
+        QT_TRANSLATE_NOOP("QObject", "percent, as 99"), nullptr, "", "", occupied_);
+    row(QT_TRANSLATE_NOOP("QObject", "Adjacent"), width_,
+        QT_TRANSLATE_NOOP("QObject", "width, as 5M"), &spacing_,
+        QT_TRANSLATE_NOOP("QObject", "Channel spacing"),
+        QT_TRANSLATE_NOOP("QObject", "spacing, as 5M"), adjacent_);
     auto* note = new QLabel(
-        "The bandwidth stands about the strongest peak, the adjacent channels "
-        "about its frequency.");
+        QObject::tr("The bandwidth stands about the strongest peak, the adjacent channels about "
+                    "its frequency."));
     note->setWordWrap(true);
     grid->addWidget(note, grid->rowCount(), 0, 1, 3);
     word_ = new QLabel;

@@ -21,8 +21,8 @@ ReconnectBar::ReconnectBar(ControllerForm& panel, Binder& binder, QWidget* paren
     binder.bind(panel.ReconnectLabel, text);
     layout->addWidget(text, 1);
     auto* always = new QCheckBox(QString::fromStdString(panel.ReconnectAlways.Caption));
-    always->setToolTip(
-        QObject::tr("Connects again as soon as the port is back and the instrument answers"));
+    always->setToolTip(QObject::tr(
+        "Connects again as soon as the port or the server is back and the instrument answers"));
     always->setChecked(panel.ReconnectAlways.Checked);
     connect(always, &QCheckBox::clicked, this, [&panel] { panel.ReconnectAlways.Click(); });
     panel.ReconnectAlways.Changed.connect([tick = QPointer<QCheckBox>(always), &panel] {

@@ -110,17 +110,17 @@ TcpWindow::TcpWindow(TCPConnectionForm& form, Binder& binder, QWidget* parent)
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(12, 12, 12, 12);
     auto* fields = new QFormLayout;
-    fields->addRow("Recent servers", list(binder, form.RecentServersList));
-    fields->addRow("Address", box(binder, form.IPAdressTextBox));
+    fields->addRow(QObject::tr("Recent servers"), list(binder, form.RecentServersList));
+    fields->addRow(QObject::tr("Address"), box(binder, form.IPAdressTextBox));
     PanelLineEdit* port = box(binder, form.RemotePortTextBox);
     setAccept(form.ConnectTCPButton);
     checkField(*port, portProblem);
-    fields->addRow("Port", port);
+    fields->addRow(QObject::tr("Port"), port);
     fields->addRow("", check(binder, form.chkTls));
     PanelLineEdit* pinned = box(binder, form.FingerprintTextBox);
-    pinned->setPlaceholderText("of the server's certificate; empty: by its authority");
-    fields->addRow("Fingerprint", pinned);
-    fields->addRow("State", box(binder, form.IDTextBox));
+    pinned->setPlaceholderText(QObject::tr("of the server's certificate; empty: by its authority"));
+    fields->addRow(QObject::tr("Fingerprint"), pinned);
+    fields->addRow(QObject::tr("State"), box(binder, form.IDTextBox));
     QLabel* reason = label(binder, form.lblReason);
     QLabel* advice = label(binder, form.AdviceLabel);
     reason->setMinimumHeight(2 * reason->fontMetrics().height());
@@ -155,10 +155,10 @@ DevicesWindow::DevicesWindow(DevicesChoiceForm& form, Binder& binder, QWidget* p
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(12, 12, 12, 12);
     auto* fields = new QFormLayout;
-    fields->addRow("Device", list(binder, form.AvailableDevicesChoice));
-    fields->addRow("Port", list(binder, form.DevicesPortList));
-    fields->addRow("Baud rate", list(binder, form.DevicesBaudList));
-    fields->addRow("Command", label(binder, form.DeviceStatusLabel));
+    fields->addRow(QObject::tr("Device"), list(binder, form.AvailableDevicesChoice));
+    fields->addRow(QObject::tr("Port"), list(binder, form.DevicesPortList));
+    fields->addRow(QObject::tr("Baud rate"), list(binder, form.DevicesBaudList));
+    fields->addRow(QObject::tr("Command"), label(binder, form.DeviceStatusLabel));
     layout->addLayout(fields);
     layout->addStretch(1);
     busy_ = new QProgressBar;
@@ -200,7 +200,7 @@ ServerWindow::ServerWindow(ServerForm& form, Binder& binder, QWidget* parent)
     busy_->setSizePolicy(policy);
     layout->addWidget(busy_);
     auto* keys = new QHBoxLayout;
-    auto* hideKey = new QPushButton("Hide in the tray");
+    auto* hideKey = new QPushButton(QObject::tr("Hide in the tray"));
     hideKey->setAutoDefault(false);
     keys->addWidget(hideKey);
     keys->addStretch(1);
@@ -226,30 +226,30 @@ QWidget* ServerWindow::settings() {
     auto* column = new QWidget;
     auto* layout = new QVBoxLayout(column);
     layout->setContentsMargins(0, 0, 0, 0);
-    auto* instrument = new QGroupBox("Instrument");
+    auto* instrument = new QGroupBox(QObject::tr("Instrument"));
     auto* instrumentFields = new QFormLayout(instrument);
-    instrumentFields->addRow("Port", list(binder_, server_.COMList));
+    instrumentFields->addRow(QObject::tr("Port"), list(binder_, server_.COMList));
     instrumentFields->addRow("", check(binder_, server_.chkBaudRate));
-    instrumentFields->addRow("Baud rate", list(binder_, server_.BaudList));
+    instrumentFields->addRow(QObject::tr("Baud rate"), list(binder_, server_.BaudList));
     layout->addWidget(instrument);
-    auto* network = new QGroupBox("Network");
+    auto* network = new QGroupBox(QObject::tr("Network"));
     auto* networkFields = new QFormLayout(network);
     auto* address = new QHBoxLayout;
     PanelLineEdit* own = box(binder_, server_.localIPTextBox);
     own->setMinimumWidth(110);
     address->addWidget(own, 1);
     address->addWidget(button(binder_, server_.cmdCopyAddress));
-    networkFields->addRow("This machine", address);
+    networkFields->addRow(QObject::tr("This machine"), address);
     PanelLineEdit* port = box(binder_, server_.localPortTextBox);
     setAccept(server_.cmdConnect);
     checkField(*port, portProblem);
-    networkFields->addRow("TCP port", port);
+    networkFields->addRow(QObject::tr("TCP port"), port);
     PanelLineEdit* allowed = box(binder_, server_.txtAllowed);
-    allowed->setPlaceholderText("private networks");
+    allowed->setPlaceholderText(QObject::tr("private networks"));
     allowed->setToolTip(
         "Who may connect: addresses or networks such as 192.168.1.0/24, with "
         "blanks between them. Empty: this machine and the private networks.");
-    networkFields->addRow("Allowed networks", allowed);
+    networkFields->addRow(QObject::tr("Allowed networks"), allowed);
     QCheckBox* keep = check(binder_, server_.chkKeep);
     networkFields->addRow(keep);
     layout->addWidget(network);
@@ -258,7 +258,7 @@ QWidget* ServerWindow::settings() {
 }
 
 QWidget* ServerWindow::happenings() {
-    auto* group = new QGroupBox("Connection");
+    auto* group = new QGroupBox(QObject::tr("Connection"));
     auto* layout = new QVBoxLayout(group);
     auto* state = new QHBoxLayout;
     light_ = new QLabel;
@@ -279,8 +279,8 @@ QWidget* ServerWindow::happenings() {
     client->setContentsMargins(0, 0, 0, 0);
     row->setMinimumHeight(row->sizeHint().height());
     fields->addRow(label(binder_, server_.lblClient), row);
-    fields->addRow("To the instrument", label(binder_, server_.lblToInstrument));
-    fields->addRow("To the client", label(binder_, server_.lblToClient));
+    fields->addRow(QObject::tr("To the instrument"), label(binder_, server_.lblToInstrument));
+    fields->addRow(QObject::tr("To the client"), label(binder_, server_.lblToClient));
     layout->addLayout(fields);
     auto* events = new QListWidget;
     events->setFocusPolicy(Qt::ClickFocus);

@@ -144,22 +144,22 @@ QWidget* ScriptEditorWindow::findBar() {
     auto* layout = new QHBoxLayout(findBar_);
     layout->setContentsMargins(0, 0, 0, 0);
     findText_ = new QLineEdit;
-    findText_->setPlaceholderText("Find");
-    findText_->setAccessibleName("Find");
+    findText_->setPlaceholderText(QObject::tr("Find"));
+    findText_->setAccessibleName(QObject::tr("Find"));
     replaceText_ = new QLineEdit;
-    replaceText_->setPlaceholderText("Replace with");
-    replaceText_->setAccessibleName("Replace with");
-    const auto button = [&](const char* caption, auto work) {
+    replaceText_->setPlaceholderText(QObject::tr("Replace with"));
+    replaceText_->setAccessibleName(QObject::tr("Replace with"));
+    const auto button = [&](const QString& caption, auto work) {
         auto* key = new QPushButton(caption);
         key->setAutoDefault(false);
         connect(key, &QPushButton::clicked, this, work);
         return key;
     };
     layout->addWidget(findText_, 1);
-    layout->addWidget(button("Find Next", [this] { findNext(true); }));
+    layout->addWidget(button(QObject::tr("Find Next"), [this] { findNext(true); }));
     layout->addWidget(replaceText_, 1);
-    layout->addWidget(button("Replace", [this] { replaceOne(); }));
-    layout->addWidget(button("Replace All", [this] { replaceAllMatches(); }));
+    layout->addWidget(button(QObject::tr("Replace"), [this] { replaceOne(); }));
+    layout->addWidget(button(QObject::tr("Replace All"), [this] { replaceAllMatches(); }));
     return findBar_;
 }
 
@@ -266,8 +266,9 @@ void ScriptEditorWindow::keyPressEvent(QKeyEvent* event) {
 void ScriptEditorWindow::reject() {
     if (text_->isListActive()) return text_->cancelList();
     const bool lost =
-        changed_ && QMessageBox::question(this, "Script Editor",
-                                          "Close without saving the changes?") != QMessageBox::Yes;
+        changed_ &&
+        QMessageBox::question(this, QObject::tr("Script Editor"),
+                              QObject::tr("Close without saving the changes?")) != QMessageBox::Yes;
     if (!lost) script_.cmdCancel.Click();
 }
 

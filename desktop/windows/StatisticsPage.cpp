@@ -24,15 +24,15 @@ QVector<double> vectorOf(const std::vector<double>& values) {
 StatisticsPage::StatisticsPage(TraceTools& tools) : TracePage(tools) {
     auto* layout = new QVBoxLayout(this);
     auto* row = new QHBoxLayout;
-    on_ = new QCheckBox("Count");
+    on_ = new QCheckBox(QObject::tr("Count"));
     on_->setObjectName("CountStatistics");
     threshold_ = new QLineEdit(QString::fromStdString(generalNumber(kUsualThreshold)));
-    threshold_->setAccessibleName("Occupancy over");
+    threshold_->setAccessibleName(QObject::tr("Occupancy over"));
     threshold_->setMaximumWidth(64);
-    auto* caption = new QLabel("Occupied at or over");
+    auto* caption = new QLabel(QObject::tr("Occupied at or over"));
     caption->setBuddy(threshold_);
     count_ = new QLabel;
-    auto* save = new QPushButton("Save Table...");
+    auto* save = new QPushButton(QObject::tr("Save Table..."));
     row->addWidget(on_);
     row->addWidget(caption);
     row->addWidget(threshold_);
@@ -41,7 +41,7 @@ StatisticsPage::StatisticsPage(TraceTools& tools) : TracePage(tools) {
     layout->addLayout(row);
     plot_ = new QCustomPlot;
     plot_->setMinimumHeight(150);
-    plot_->setAccessibleName("Statistics");
+    plot_->setAccessibleName(QObject::tr("Statistics"));
     const GraphColors colors = darkGraph();
     plot_->setBackground(colors.background);
     plot_->axisRect()->setBackground(colors.plotArea);
@@ -56,7 +56,7 @@ StatisticsPage::StatisticsPage(TraceTools& tools) : TracePage(tools) {
     }
     plot_->xAxis->setTicker(QSharedPointer<DivisionTicker>(new DivisionTicker(2)));
     plot_->yAxis2->setVisible(true);
-    plot_->yAxis2->setLabel("occupied, %");
+    plot_->yAxis2->setLabel(QObject::tr("occupied, %"));
     plot_->yAxis2->setRange(0, 100);
     for (int i = 0; i < kCurves; ++i) {
         const bool share = i + 1 == kCurves;

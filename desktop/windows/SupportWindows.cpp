@@ -179,7 +179,8 @@ DoctorWindow::DoctorWindow(DoctorForm& form, Binder& binder, QWidget* parent)
     layout->setSpacing(8);
     auto* fields = new QFormLayout;
     auto* address = new PanelLineEdit;
-    address->setPlaceholderText("serial:DEVICE@BAUD or tcp:HOST:PORT; empty: all ports");
+    address->setPlaceholderText(
+        QObject::tr("serial:DEVICE@BAUD or tcp:HOST:PORT; empty: all ports"));
     binder.bind(form.AddressBox, address);
     QLabel* caption = words(binder, form.AddressCaption);
     caption->setWordWrap(false);

@@ -16,9 +16,10 @@ constexpr QSize kSwatch(20, 20);
 constexpr int kSwatchLine = 4;
 constexpr qint64 kLargestView = 100'000'000;
 
-QPushButton* button(const QString& text, const QString& name) {
+/// `about` is read with the text.
+QPushButton* button(const QString& text, const QString& name, const QString& about = {}) {
     auto* key = new QPushButton(text);
-    key->setAccessibleName(name);
+    key->setAccessibleName(about.isEmpty() ? text : text + ", " + about);
     key->setObjectName(name);
     return key;
 }
@@ -33,7 +34,8 @@ TracesPage::TracesPage(TraceTools& tools, std::function<void()> scale) : TracePa
         const QString name = kNames.at(i);
         const int row = static_cast<int>(i);
         HoldRow& line = holds_.at(i);
-        line = {new QCheckBox(name), new QLabel, button("Clear", "Clear " + name)};
+        line = {new QCheckBox(QObject::tr(kNames.at(i))), new QLabel,
+                button(QObject::tr("Clear"), "Clear " + name, QObject::tr(kNames.at(i)))};
         line.on->setObjectName(name);
         connect(line.on, &QCheckBox::toggled, this, [this, kind](bool on) {
             tools_.traces().switchOn(kind, on);
@@ -43,18 +45,20 @@ TracesPage::TracesPage(TraceTools& tools, std::function<void()> scale) : TracePa
             tools_.traces().clear(kind);
             tools_.refresh();
         });
-        grid->addWidget(swatch(i, name), row, 0);
+        grid->addWidget(swatch(i, name, QObject::tr(kNames.at(i))), row, 0);
         grid->addWidget(line.on, row, 1);
         grid->addWidget(line.count, row, 2, 1, 3);
         grid->addWidget(line.clear, row, 5);
     }
     for (std::size_t i = 0; i < kMemories; ++i) buildMemory(*grid, static_cast<int>(kHolds + i), i);
-    auto* fit = button("Scale Level Axis", "Scale Level Axis");
-    fit->setToolTip("Fits the level axis to what is on the graph, until the next setting");
+    auto* fit = button(QObject::tr("Scale Level Axis"), "Scale Level Axis");
+    fit->setToolTip(
+        QObject::tr("Fits the level axis to what is on the graph, until the next setting"));
     connect(fit, &QPushButton::clicked, this, std::move(scale));
     const int last = static_cast<int>(kHolds + kMemories);
-    grid->addWidget(swatch(kColors - 1, "Corrected sweep"), last, 0);
-    grid->addWidget(new QLabel("Corrected sweep"), last, 1);
+    grid->addWidget(swatch(kColors - 1, "Corrected sweep", QObject::tr("Corrected sweep")), last,
+                    0);
+    grid->addWidget(new QLabel(QObject::tr("Corrected sweep")), last, 1);
     grid->addWidget(fit, last, 2, 1, 4);
     word_ = new QLabel;
     word_->setWordWrap(true);
@@ -65,21 +69,24 @@ TracesPage::TracesPage(TraceTools& tools, std::function<void()> scale) : TracePa
 
 void TracesPage::buildMemory(QGridLayout& grid, int row, std::size_t place) {
     const QString name = "Reference " + QString::number(place + 1);
+    const QString shown = QObject::tr("Reference %1").arg(place + 1);
     MemoryRow& line = memories_.at(place);
-    line = {button("Store", "Store " + name), button("Load...", "Load " + name),
-            new QCheckBox(name), new QCheckBox("Subtract"), button("Clear", "Clear " + name)};
+    line = {button(QObject::tr("Store"), "Store " + name, shown),
+            button(QObject::tr("Load..."), "Load " + name, shown), new QCheckBox(shown),
+            new QCheckBox(QObject::tr("Subtract")),
+            button(QObject::tr("Clear"), "Clear " + name, shown)};
     line.show->setObjectName(name);
     line.less->setObjectName("Subtract " + name);
-    line.less->setToolTip("Shows the sweep less this reference, in dB");
-    line.load->setToolTip("Takes the first trace of a saved view or a recording");
-    grid.addWidget(swatch(kHolds + place, name), row, 0);
+    line.less->setToolTip(QObject::tr("Shows the sweep less this reference, in dB"));
+    line.load->setToolTip(QObject::tr("Takes the first trace of a saved view or a recording"));
+    grid.addWidget(swatch(kHolds + place, name, shown), row, 0);
     grid.addWidget(line.show, row, 1);
     grid.addWidget(line.store, row, 2);
     grid.addWidget(line.load, row, 3);
     grid.addWidget(line.less, row, 4);
     grid.addWidget(line.clear, row, 5);
     connect(line.load, &QPushButton::clicked, this, [this, place] {
-        const QString path = QFileDialog::getOpenFileName(this, "Load Reference", {},
+        const QString path = QFileDialog::getOpenFileName(this, QObject::tr("Load Reference"), {},
                                                           "Views (*.csv *.txt);;All Files (*)");
         if (!path.isEmpty()) loadMemory(place, path);
     });
@@ -110,17 +117,18 @@ void TracesPage::paint(std::size_t place, const QColor& color) {
     swatches_.at(place)->setIcon(picture);
 }
 
-QToolButton* TracesPage::swatch(std::size_t place, const QString& name) {
+QToolButton* TracesPage::swatch(std::size_t place, const QString& name, const QString& shown) {
     auto* key = new QToolButton;
     key->setAutoRaise(true);
     key->setIconSize(kSwatch);
     key->setObjectName("Colour of " + name);
-    key->setAccessibleName("Colour of " + name);
-    key->setToolTip("Chooses the colour");
+    key->setAccessibleName(QObject::tr("Colour of %1").arg(shown));
+    key->setToolTip(QObject::tr("Chooses the colour"));
     swatches_.at(place) = key;
     paint(place, hostTraceColor(place));
-    connect(key, &QToolButton::clicked, this, [this, place, name] {
-        const QColor color = QColorDialog::getColor(colors_.at(place), this, "Colour of " + name);
+    connect(key, &QToolButton::clicked, this, [this, place, shown] {
+        const QColor color =
+            QColorDialog::getColor(colors_.at(place), this, QObject::tr("Colour of %1").arg(shown));
         if (!color.isValid()) return;
         paint(place, color);
         tools_.refresh();
@@ -132,8 +140,9 @@ void TracesPage::loadMemory(std::size_t place, const QString& path) {
     fileWord_.clear();
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly) || file.size() > kLargestView) {
-        fileWord_ = "The reference was not taken: " +
-                    (file.isOpen() ? "the file is too long" : file.errorString());
+        fileWord_ =
+            QObject::tr("The reference was not taken: %1")
+                .arg(file.isOpen() ? QObject::tr("the file is too long") : file.errorString());
         return showState();
     }
     try {
@@ -146,7 +155,8 @@ void TracesPage::loadMemory(std::size_t place, const QString& path) {
         if (first) tools_.traces().remember(place, *first);
         memories_.at(place).show->setChecked(true);
     } catch (const std::runtime_error& wrong) {
-        fileWord_ = "The reference was not taken: " + QString::fromUtf8(wrong.what());
+        fileWord_ =
+            QObject::tr("The reference was not taken: %1").arg(QString::fromUtf8(wrong.what()));
     }
     tools_.refresh();
     showState();
@@ -164,8 +174,9 @@ void TracesPage::showState() {
         const auto count = static_cast<qulonglong>(tools_.traces().count(kind));
         const QSignalBlocker quiet(holds_.at(i).on);
         holds_.at(i).on->setChecked(tools_.traces().isOn(kind));
-        holds_.at(i).count->setText(
-            count == 0 ? QString() : QString::number(count) + (count == 1 ? " sweep" : " sweeps"));
+        holds_.at(i).count->setText(count == 0   ? QString()
+                                    : count == 1 ? QObject::tr("1 sweep")
+                                                 : QObject::tr("%1 sweeps").arg(count));
         holds_.at(i).clear->setEnabled(count > 0);
     }
     for (std::size_t i = 0; i < kMemories; ++i) {

@@ -19,8 +19,10 @@ class TracesPage : public TracePage {
     void showState() override;
 
     /// Names of the holds, in the order of `HoldKind`.
-    static constexpr std::array<const char*, kHolds> kNames = {"Max hold", "Min hold",
-                                                               "Average, level", "Average, power"};
+    static constexpr std::array<const char*, kHolds> kNames = {
+        QT_TRANSLATE_NOOP("QObject", "Max hold"), QT_TRANSLATE_NOOP("QObject", "Min hold"),
+        QT_TRANSLATE_NOOP("QObject", "Average, level"),
+        QT_TRANSLATE_NOOP("QObject", "Average, power")};
 
     bool memoryShown(std::size_t place) const { return memories_.at(place).show->isChecked(); }
     /// Of a hold, then of a reference, then (the last) of the corrected or normalised sweep.
@@ -43,7 +45,7 @@ class TracesPage : public TracePage {
         QCheckBox* less;
         QPushButton* clear;
     };
-    QToolButton* swatch(std::size_t place, const QString& name);
+    QToolButton* swatch(std::size_t place, const QString& name, const QString& shown);
     void paint(std::size_t place, const QColor& color);
     void buildMemory(QGridLayout& grid, int row, std::size_t place);
 

@@ -159,13 +159,13 @@ QWidget* WaterfallWindow::options() {
     auto* layout = new QHBoxLayout(row);
     layout->setContentsMargins(kSpacing, kSpacing / 2, kSpacing, kSpacing / 2);
     layout->setSpacing(kSpacing / 2);
-    const auto caption = [layout](const char* text) {
+    const auto caption = [layout](const QString& text) {
         auto* label = new QLabel(text);
         label->setObjectName("caption");
         layout->addWidget(label);
         return label;
     };
-    const auto list = [&](const char* text, DropDownList& control) {
+    const auto list = [&](const QString& text, DropDownList& control) {
         QLabel* label = caption(text);
         auto* combo = new QComboBox;
         combo->setSizeAdjustPolicy(QComboBox::AdjustToContents);
@@ -175,11 +175,11 @@ QWidget* WaterfallWindow::options() {
         binder_.bind(control, combo);
         combo->setAccessibleName(text);
     };
-    list("Colours", waterfall_.ColourMapList);
-    list("Depth", waterfall_.DepthList);
-    list("Levels", waterfall_.LevelsList);
+    list(QObject::tr("Colours"), waterfall_.ColourMapList);
+    list(QObject::tr("Depth"), waterfall_.DepthList);
+    list(QObject::tr("Levels"), waterfall_.LevelsList);
     for (TextBox* box : {&waterfall_.LevelMinBox, &waterfall_.LevelMaxBox}) {
-        if (box == &waterfall_.LevelMaxBox) caption("to");
+        if (box == &waterfall_.LevelMaxBox) caption(QObject::tr("to"));
         auto* line = new PanelLineEdit;
         line->setFixedWidth(kBoxWidth);
         layout->addWidget(line);
