@@ -51,7 +51,7 @@ int main(int argc, char** argv) {
     zel::QtPlatform platform(QString::fromStdString(options.home));
     const zel::ThemeChoice theme = options.theme.value_or(zel::themeFromText(
         QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Theme", ""))));
-    zel::applyTheme(application, theme);
+    const bool dark = zel::prepareTheme(application, theme);
     const QString language =
         options.language.empty()
             ? QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Language", ""))
@@ -77,6 +77,7 @@ int main(int argc, char** argv) {
         [&program](int context) { program.forms().controller.ShowHelp(context); });
     application.installEventFilter(&helpKey);
     zel::MainWindow window(program);
+    zel::dressTheme(application, dark);
     window.useSettings(platform.settings);
     platform.launcher.ready = [&] { window.simulatorReady(platform.launcher.link()); };
     platform.launcher.ended = [&](const QString& why) { window.simulatorEnded(why); };

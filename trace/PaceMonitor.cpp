@@ -12,6 +12,8 @@ constexpr std::size_t kTracesKept = 8;
 constexpr double kSecond = 1e6;             // microseconds
 constexpr std::int64_t kLongGap = 5000000;  // a pause is no pace
 constexpr std::int64_t kShortestCycle = 50000;
+constexpr int kQuick = 250;  // ms between two texts
+constexpr int kSecondMs = 1000;
 
 /// A view that runs shows tenths. A trace that only gets older is written as seldom as its age
 /// means something, since each writing costs an idle program time.
@@ -47,6 +49,7 @@ void PaceMonitor::drawn() {
     if (drawnAt_.size() > kTracesKept) drawnAt_.pop_front();
     cycleMicros_ = now - cycleStart_;
     sweepMicros_ = waited_;
+    panel_.PaceTimer.Interval = kQuick;
     panel_.PaceTimer.Enabled = true;
     if (panel_.CWGraph1.Old) show();
 }
@@ -69,6 +72,8 @@ void PaceMonitor::show() {
     panel_.CWGraph1.Old =
         panel_.LinkLost || (running && age > 2 * std::max(cycleMicros_, kShortestCycle));
     panel_.PaceLabel.Caption = text;
+    // At rest the text changes with whole seconds of the age.
+    if (!running) panel_.PaceTimer.Interval = kSecondMs - static_cast<int>(age / 1000 % kSecondMs);
 }
 
 }  // namespace zel

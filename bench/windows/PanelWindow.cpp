@@ -53,11 +53,12 @@ int idleShare(zel::Program& program, const std::string& device, int seconds) {
 
 int main(int argc, char** argv) {
     QApplication application(argc, argv);
-    zel::applyTheme(application, zel::ThemeChoice::System);
+    const bool dark = zel::prepareTheme(application, zel::ThemeChoice::System);
     const QTemporaryDir home;
     zel::QtPlatform platform(home.path());
     zel::Program program(platform.bundle(), "");
     zel::MainWindow window(program);
+    zel::dressTheme(application, dark);
     if (argc == 3) {
         program.start();
         window.show();

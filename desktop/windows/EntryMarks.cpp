@@ -112,7 +112,10 @@ void EntryMarks::takeUnsure() {
         if (restsOnUnsure(box) && old.reason.isEmpty()) mark(box, QObject::tr("unsure"), true);
         if (!restsOnUnsure(box) && !old.reason.isEmpty() && old.onAxis) clear(box);
     }
-    if (unsure_ && !now) showInstrument();
+    // The mirror takes the answer after this.
+    if (unsure_ && !now)
+        QMetaObject::invokeMethod(
+            this, [this] { showInstrument(); }, Qt::QueuedConnection);
     unsure_ = now;
 }
 

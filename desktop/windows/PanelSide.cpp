@@ -64,6 +64,16 @@ PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder&
     FoldGroup* command = addGroup("Command", QObject::tr("Command line"), commandLine());
     for (Button* control : {&panel_.ResetButton, &panel_.LocalButton, &panel_.OnOffButton})
         command->headingRow().addWidget(key(*control));
+    // They were made after the lines below them.
+    QWidget* before = &command->heading();
+    for (Control* control :
+         {static_cast<Control*>(&panel_.ResetButton), static_cast<Control*>(&panel_.LocalButton),
+          static_cast<Control*>(&panel_.OnOffButton),
+          static_cast<Control*>(&panel_.ManualCommandText)}) {
+        auto* next = qobject_cast<QWidget*>(binder_.widgetOf(*control));
+        setTabOrder(before, next);
+        before = next;
+    }
     groups_ = {markers, modes, command};
     layout_->addStretch(1);
     setWidget(column_);
@@ -261,15 +271,17 @@ QWidget* PanelSide::modeKeys() {
 QWidget* PanelSide::markerKeys() {
     auto* group = new QWidget;
     auto* layout = layoutOf<QGridLayout>(group);
-    int row = 0;
-    for (CheckBox* control : {&panel_.MarkerCheckBox, &panel_.DeltaCheckBox}) {
-        auto* check = new QCheckBox;
-        binder_.bind(*control, check);
-        layout->addWidget(check, row++, 0);
-    }
+    // In the order of reading, which Tab follows.
+    const auto check = [&](CheckBox& control, int row) {
+        auto* box = new QCheckBox;
+        binder_.bind(control, box);
+        layout->addWidget(box, row, 0);
+    };
+    check(panel_.MarkerCheckBox, 0);
     layout->addWidget(key(panel_.MarkPkButton), 0, 1, 1, 2);
     layout->addWidget(key(panel_.NextPeakButton), 0, 3, 1, 2);
     layout->addWidget(key(panel_.MinPeakButton), 0, 5, 1, 2);
+    check(panel_.DeltaCheckBox, 1);
     layout->addWidget(key(panel_.MarkToCentButton), 1, 1, 1, 3);
     layout->addWidget(key(panel_.MarkToRefButton), 1, 4, 1, 3);
     for (int i = 1; i <= 6; ++i) layout->setColumnStretch(i, 1);

@@ -4,6 +4,8 @@
 #include <QGridLayout>
 #include <QHBoxLayout>
 
+#include "desktop/windows/StillLabel.h"
+
 namespace zel {
 namespace {
 
@@ -84,10 +86,11 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     showPointer({}, {});
     showTrace({}, {});
     QGridLayout* pace = card(*row, 0);
-    QLabel* line = small();
-    line->setMinimumWidth(kPaceWidth);
+    auto* line = new StillLabel(kPaceWidth, 2);
+    line->setObjectName("caption");
+    line->setTextFormat(Qt::PlainText);
     binder.bindShow(panel.PaceLabel, line, [&panel, line] {
-        line->setText(inTwoLines(panel.PaceLabel.Caption));
+        line->showText(inTwoLines(panel.PaceLabel.Caption));
         line->setVisible(panel.PaceLabel.Visible);
     });
     pace->addWidget(line, 0, 0, 2, 1);

@@ -5,6 +5,7 @@
 #include <QStatusBar>
 
 #include "desktop/platform/SimulatorChild.h"
+#include "desktop/windows/StillLabel.h"
 #include "platform/Pointer.h"
 
 namespace zel {
@@ -63,10 +64,14 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     activity_->setAccessibleName(QObject::tr("Traffic on the link"));
     state_->setTextFormat(Qt::PlainText);
     state_->setAccessibleName(QObject::tr("State of the connection"));
-    auto* clock = new QLabel;
+    auto* clock = new StillLabel;
     clock->setObjectName("caption");
-    for (QLabel* label : {activity_, state_, clock}) bar->addPermanentWidget(label);
-    binder.bind(panel_.TimeLabel, clock);
+    for (QLabel* label : {activity_, state_, static_cast<QLabel*>(clock)})
+        bar->addPermanentWidget(label);
+    binder.bindShow(panel_.TimeLabel, clock, [this, clock] {
+        clock->showText(QString::fromStdString(panel_.TimeLabel.Caption));
+        clock->setVisible(panel_.TimeLabel.Visible);
+    });
     for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
         binder.bindShow(*picture, state_, [this] { showState(); });
     activityOff_.setSingleShot(true);

@@ -172,14 +172,22 @@ QString themeText(ThemeChoice choice) {
     return choice == ThemeChoice::Light ? "light" : choice == ThemeChoice::Dark ? "dark" : "system";
 }
 
-bool applyTheme(QApplication& application, ThemeChoice choice) {
+bool prepareTheme(QApplication& application, ThemeChoice choice) {
     const bool system = systemIsDark();
     const bool dark = choice == ThemeChoice::Dark || (choice == ThemeChoice::System && system);
-    const ThemeColors& colors = dark ? kDark : kLight;
     application.setStyle(QStyleFactory::create("Fusion"));
-    application.setPalette(paletteOf(colors));
-    application.setStyleSheet(styled(colors));
+    application.setPalette(paletteOf(dark ? kDark : kLight));
     useDarkInk(dark);
+    return dark;
+}
+
+void dressTheme(QApplication& application, bool dark) {
+    application.setStyleSheet(styled(dark ? kDark : kLight));
+}
+
+bool applyTheme(QApplication& application, ThemeChoice choice) {
+    const bool dark = prepareTheme(application, choice);
+    dressTheme(application, dark);
     return dark;
 }
 

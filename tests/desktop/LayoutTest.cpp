@@ -87,6 +87,27 @@ TEST_F(WindowTest, ShortcutOfAFoldedBox_OpensItsGroup) {
     EXPECT_EQ(window->focusWidget(), widgetOf<QWidget>(panel().ManualCommandText));
 }
 
+TEST_F(WindowTest, PlaceOfAFoldedKey_HasNothingToPress) {
+    connect();
+    window->resize(1280, 1000);
+    show();
+    panel().MarkerCheckBox.Click();
+    show();
+    int clicks = 0;
+    panel().MarkPkButton.Clicked.connect([&clicks] { ++clicks; });
+    auto* key = widgetOf<QWidget>(panel().MarkPkButton);
+    const QPoint place = key->mapTo(window.get(), key->rect().center());
+    FoldGroup* markers = window->side().groups()[0];
+    QTest::mouseClick(&markers->heading(), Qt::LeftButton);
+    QApplication::processEvents();
+    ASSERT_FALSE(markers->isOpen());
+    EXPECT_FALSE(key->isVisible());
+    QWidget* there = window->childAt(place);
+    EXPECT_NE(there, key);
+    if (there != nullptr) QTest::mouseClick(there, Qt::LeftButton);
+    EXPECT_EQ(clicks, 0);
+}
+
 TEST_F(WindowTest, F12_TakesThePanelAway) {
     show();
     EXPECT_TRUE(window->side().isVisible());

@@ -1,0 +1,43 @@
+#pragma once
+// A line whose text changes each second, in a place that does not.
+
+#include <QLabel>
+#include <algorithm>
+
+namespace zel {
+
+/// A label of its own size asks nobody for room: the window is laid out again only when a text
+/// needs more of it. A window at rest does hardly anything then.
+class StillLabel : public QLabel {
+  public:
+    /// `least` is the width in pixels that it has always.
+    explicit StillLabel(int least = 0, int lines = 1) : least_(least), lines_(lines) {}
+
+    void showText(const QString& text) {
+        if (text == this->text()) return;
+        fit(text);
+        setText(text);
+    }
+
+  private:
+    /// Steps of width keep it where it is while the digits change.
+    static constexpr int kStep = 24;
+
+    void fit(const QString& text) {
+        ensurePolished();
+        const QSize needed = fontMetrics().size(0, text);
+        const QMargins around = contentsMargins();
+        const int wide = needed.width() + around.left() + around.right() + kAround;
+        const int width = std::max(least_, (wide + kStep - 1) / kStep * kStep);
+        const int height = lines_ * fontMetrics().lineSpacing() + around.top() + around.bottom();
+        const QSize wanted(text.isEmpty() ? least_ : width, std::max(height, needed.height()));
+        if (wanted != minimumSize() || wanted != maximumSize()) setFixedSize(wanted);
+    }
+
+    static constexpr int kAround = 12;  // what the style sheet adds at most, both sides
+
+    int least_;
+    int lines_;
+};
+
+}  // namespace zel
