@@ -102,6 +102,23 @@ TEST_F(Help, EveryControlThatTheFormsRegister_IsDescribed) {
     EXPECT_GT(count, 200);
 }
 
+TEST_F(Help, EveryEntryOfTheMenus_IsDescribed) {
+    const QString text = pages()["menus.html"];
+    const ControllerForm panel;
+    int count = 0;
+    for (const Control* control : panel.controls()) {
+        if (control->kind() != ControlKind::MenuItem) continue;
+        const auto& item = static_cast<const MenuItem&>(*control);
+        QString caption = QString::fromStdString(item.Caption);
+        if (item.parent() == nullptr || caption.isEmpty() || caption == "-") continue;
+        ++count;
+        caption.remove("...");
+        const QString row = QString::fromStdString(item.parent()->Caption) + ", " + caption;
+        EXPECT_TRUE(text.contains("<td>" + row + "</td>")) << row.toStdString();
+    }
+    EXPECT_GT(count, 25);
+}
+
 TEST_F(Help, EveryStatementOfTheScriptLanguage_IsDescribed) {
     const QString text = pages()["scripts.html"];
     int count = 0;
