@@ -164,7 +164,8 @@ bool Handshake::query(const char* word, double& field) {
     std::string answer;
     if (!exchange_.GetInstrument(word, answer)) return false;
     // No number: it was spoiled on its way.
-    if (!startsWithNumber(answer) && !exchange_.GetInstrument(word, answer)) return false;
+    if (!mirror_.Unsure.answered(word, answer) && !exchange_.GetInstrument(word, answer))
+        return false;
     if (mirror_.Unsure.answered(word, answer)) field = leadingNumber(answer);
     return true;
 }

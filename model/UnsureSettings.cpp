@@ -9,6 +9,15 @@ namespace {
 
 // In the order of AxisSetting.
 constexpr std::array<std::string_view, 5> kWords = {"FREQ", "SPAN", "REFLVL", "RANGE", "TRACEDET"};
+constexpr std::string_view kDigits = "0123456789";
+
+/// A unit may follow the number, and no further digit: "15x0000000" was spoiled on its way.
+bool isOneNumber(std::string_view text) {
+    if (!startsWithNumber(text)) return false;
+    const auto end = text.find_first_not_of("+-.eE0123456789", text.find_first_not_of(" \t\n"));
+    return end == std::string_view::npos ||
+           text.find_first_of(kDigits, end) == std::string_view::npos;
+}
 
 }  // namespace
 
@@ -26,7 +35,7 @@ void UnsureSettings::set(std::string_view word, bool unsure) {
 }
 
 bool UnsureSettings::answered(std::string_view word, std::string_view answer) {
-    const bool isNumber = startsWithNumber(answer);
+    const bool isNumber = isOneNumber(answer);
     set(word, !isNumber);
     return isNumber;
 }

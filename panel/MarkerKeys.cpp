@@ -92,7 +92,8 @@ void MarkerKeys::MarkToCentButton_Click() {
     mirror_.Unsure.sent("FREQ", false);  // until the new one is known
     events_.sleep(kMoveMs);
     std::string answer;
-    if (exchange_.GetInstrument("MARK1", answer) && mirror_.Unsure.answered("FREQ", answer)) {
+    if (exchange_.GetInstrument("MARK1", answer) &&
+        mirror_.Unsure.answered("FREQ", split(answer, ',').front())) {
         panel_.CFLabel.Caption = centerLabelText(split(answer, ',').front());
         mirror_.CenterFrequency = leadingNumber(answer);
     }

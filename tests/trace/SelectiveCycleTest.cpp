@@ -99,12 +99,14 @@ TEST_P(OneFlag, Refusal_EndsTheCycleAndFreesThePanel) {
 
 // An empty line, or a text, is no value of a setting.
 TEST_P(OneFlag, AnswerThatIsNoNumber_IsAskedForOnceMore) {
-    get(GetParam().word, "");
-    get(GetParam().word, "3");
-    sweep();
-    EXPECT_TRUE(readAgain(GetParam().again));
-    expectPlayed();
-    EXPECT_FALSE(mirror.Unsure.any());
+    for (const char* spoiled : {"", "x", "1x5"}) {
+        get(GetParam().word, spoiled);
+        get(GetParam().word, "3");
+        sweep();
+        EXPECT_TRUE(readAgain(GetParam().again));
+        expectPlayed();
+        EXPECT_FALSE(mirror.Unsure.any());
+    }
 }
 
 TEST_P(OneFlag, NoNumberTwice_ShowsNoTraceOverIt) {
