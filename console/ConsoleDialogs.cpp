@@ -41,6 +41,7 @@ bool isCancel(const std::string& answer) { return lowerCase(trimmed(answer)) == 
 }  // namespace
 
 std::optional<std::string> AnswerQueue::next() {
+    if (answers_.empty() && await) await();
     if (answers_.empty()) return std::nullopt;
     std::string answer = std::move(answers_.front());
     answers_.pop_front();

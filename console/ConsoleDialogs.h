@@ -16,7 +16,10 @@ namespace zel {
 class AnswerQueue {
   public:
     void add(std::string text) { answers_.push_back(std::move(text)); }
+    bool empty() const { return answers_.empty(); }
     std::optional<std::string> next();
+    /// Waits for an answer while there is none; it may stay so.
+    std::function<void()> await;
 
   private:
     std::deque<std::string> answers_;

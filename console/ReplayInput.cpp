@@ -11,7 +11,9 @@ namespace {
 using Kind = SessionEvent::Kind;
 
 constexpr std::int64_t kPatience = 60'000'000;  // microseconds that a line waits for bytes
-constexpr std::int64_t kDrawing = 250'000;      // that a window may have drawn before a line
+constexpr std::string_view kAnswer = "answer ";
+constexpr int kLookMs = 5;
+constexpr std::int64_t kDrawing = 250'000;  // that a window may have drawn before a line
 
 }  // namespace
 
@@ -23,9 +25,6 @@ ReplayInput::ReplayInput(const SessionRecord& record, const ReplayProgress& prog
       events_(events),
       passTo_(std::move(passTo)),
       origin_(clock.micros()) {
-    // A window writes an answer down when it is given, after the question; here it has to wait.
-    const bool window = !record.events.empty() && startsWith(record.events[0].text, "zelremote");
-    std::size_t answers = 0;
     std::size_t came = 0;
     for (std::size_t i = 0; i < record.events.size(); ++i) {
         const SessionEvent& event = record.events[i];
@@ -34,12 +33,7 @@ ReplayInput::ReplayInput(const SessionRecord& record, const ReplayProgress& prog
         if (event.kind == Kind::Click)
             items_.push_back({i, event.micros, came, "click " + event.text});
         if (event.kind != Kind::Input) continue;
-        if (window && startsWith(event.text, "answer ")) {
-            items_.insert(items_.begin() + static_cast<std::ptrdiff_t>(answers++),
-                          {0, 0, 0, event.text});
-        } else {
-            items_.push_back({i, event.micros, came, event.text});
-        }
+        items_.push_back({i, event.micros, came, event.text});
     }
 }
 
@@ -75,6 +69,16 @@ LineInput::Got ReplayInput::next(std::string& line, bool /*block*/) {
     if (!due(items_[at_])) return Got::Nothing;
     line = items_[at_++].line;
     return Got::Line;
+}
+
+void ReplayInput::awaitAnswer(AnswerQueue& answers) {
+    while (answers.empty() && at_ < items_.size() && startsWith(items_[at_].line, kAnswer)) {
+        if (due(items_[at_])) {
+            answers.add(items_[at_++].line.substr(kAnswer.size()));
+        } else {
+            events_.wait(kLookMs);
+        }
+    }
 }
 
 }  // namespace zel

@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include "console/ConsoleDialogs.h"
 #include "console/LineInput.h"
 #include "platform/Clock.h"
 #include "platform/Events.h"
@@ -32,6 +33,9 @@ class ReplayInput : public LineInput {
     ~ReplayInput() override;
 
     Got next(std::string& line, bool block) override;
+    /// Waits for the answer to a question that stands open, until its turn has come; events run
+    /// meanwhile, as in a window. At once where the record goes on with another line.
+    void awaitAnswer(AnswerQueue& answers);
 
   private:
     struct Item {

@@ -151,9 +151,13 @@ int runReplay(const Options& options, const Streams& streams) {
         });
     };
     rerun.files = [](FileService& disk) { return std::make_unique<OverlayFiles>(disk); };
+    ReplayInput* input = nullptr;
     rerun.input = [&](const Clock& clock, Events& events) {
-        return std::make_unique<ReplayInput>(record, progress, clock, events, passTo);
+        auto made = std::make_unique<ReplayInput>(record, progress, clock, events, passTo);
+        input = made.get();
+        return made;
     };
+    rerun.awaitAnswer = [&input](AnswerQueue& answers) { input->awaitAnswer(answers); };
     const int status = runTool(recorded, *front, streams, &rerun);
     const SessionCompare& compare = progress.compare;
     // Of a log that was cut nobody knows how it went on.

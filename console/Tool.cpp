@@ -164,7 +164,10 @@ int runPanel(const Options& options, Front& front, LineOutput& output, LineOutpu
     stage.boxes.misfit = [&session](const std::string& answer) {
         session.complain("\"" + answer + "\" answers no question: yes, no, ok or cancel does");
     };
-    if (rerun != nullptr && rerun->ofWindow) session.serveInPumps();
+    if (rerun != nullptr && rerun->ofWindow) {
+        session.serveInPumps();
+        stage.answers.await = [&] { rerun->awaitAnswer(stage.answers); };
+    }
     return session.run();
 }
 

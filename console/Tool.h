@@ -19,11 +19,15 @@ struct Streams {
     bool errorsAreTerminal = false;
 };
 
+class AnswerQueue;
+
 /// What takes the place of the user and of the disk when a recorded session runs again.
 struct Rerun {
     std::function<void(Program&)> begun;  ///< before the program starts
     std::function<std::unique_ptr<FileService>(FileService& disk)> files;
     std::function<std::unique_ptr<LineInput>(const Clock&, Events&)> input;
+    /// A question waits for its answer of the record; empty where the answers come first.
+    std::function<void(AnswerQueue&)> awaitAnswer;
     bool ofWindow = false;  ///< where pending events run, its clicks came as well
 };
 

@@ -152,5 +152,31 @@ TEST_F(RecordedDesk, StopWhileASweepIsDrawn_EndsTheViewAtTheSamePass) {
     EXPECT_EQ(result.substr(0, 2), "0\n") << result;
 }
 
+TEST_F(RecordedDesk, QuestionThatStandsOpen_LetsARecordingGoOnAgain) {
+    ASSERT_TRUE(program->recordSession("/session.log", "zelremote"));
+    connectWritten();
+    window->showNow();
+    platform.fileDialogs.answer("rec.csv");
+    TimeForm& time = program->forms().time;
+    platform.events.schedule(50, [&] {
+        window->showNow();
+        QTest::keyClicks(widgetOf<QLineEdit>(time.TimeIntervalBox), "1");
+        press(time.SubmitTimeButton);
+    });
+    trigger(panel().RecordData);
+    platform.events.runFor(2500);
+    platform.boxes.whileShown = [&](const Box& box) {
+        if (box.buttons != BoxButtons::Ok) platform.events.runFor(2500);
+    };
+    platform.boxes.answer(BoxAnswer::Ok);
+    trigger(panel().Disconnect);
+    program->sessionLog().end();
+    const std::string log = platform.files.bytes("/session.log");
+    const auto asked = log.find("click Disconnect");
+    EXPECT_NE(log.find("|TRACEBIN.|", asked), std::string::npos) << "while the box stands open";
+    const std::string result = replayed();
+    EXPECT_EQ(result.substr(0, 2), "0\n") << result;
+}
+
 }  // namespace
 }  // namespace zel
