@@ -1,6 +1,7 @@
 #pragma once
 // A line whose text changes each second, in a place that does not.
 
+#include <QEvent>
 #include <QLabel>
 #include <algorithm>
 
@@ -11,7 +12,7 @@ namespace zel {
 class StillLabel : public QLabel {
   public:
     /// `least` is the width in pixels that it has always.
-    explicit StillLabel(int least = 0, int lines = 1) : least_(least), lines_(lines) {}
+    explicit StillLabel(int least = 0, int lines = 1) : least_(least), lines_(lines) { fit({}); }
 
     void showText(const QString& text) {
         if (text == this->text()) return;
@@ -19,12 +20,18 @@ class StillLabel : public QLabel {
         setText(text);
     }
 
+  protected:
+    void changeEvent(QEvent* event) override {
+        QLabel::changeEvent(event);
+        if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange)
+            fit(text());
+    }
+
   private:
     /// Steps of width keep it where it is while the digits change.
     static constexpr int kStep = 24;
 
     void fit(const QString& text) {
-        ensurePolished();
         const QSize needed = fontMetrics().size(0, text);
         const QMargins around = contentsMargins();
         const int wide = needed.width() + around.left() + around.right() + kAround;
