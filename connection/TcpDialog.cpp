@@ -183,7 +183,7 @@ bool TcpDialog::open(const std::string& host, const std::string& portText) {
     if (!quiet_)
         session_.boxes.show(
             {BoxIcon::Information, "No M&T ZEL3 found at the specified adress!", "No ZEL3 found"});
-    start_.setClock("stop");
+    stopClock();
     return false;
 }
 
@@ -208,7 +208,12 @@ bool TcpDialog::left() const { return link_.state.mustLeave(session_.clock.micro
 void TcpDialog::giveUp() {
     socket_.close();
     dialog_.IDTextBox.Text = "";
-    start_.setClock("stop");
+    stopClock();
+}
+
+/// The next attempt of its own is due when the clock says so.
+void TcpDialog::stopClock() {
+    if (!quiet_) start_.setClock("stop");
 }
 
 bool TcpDialog::awaitConnection(const std::string& where) {

@@ -37,6 +37,7 @@ class TcpDialog {
     std::string endOfServer() const;
     bool left() const;
     void giveUp();
+    void stopClock();
     bool open(const std::string& host, const std::string& portText);
     bool probe();
     void emptySocket();

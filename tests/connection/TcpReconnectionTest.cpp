@@ -23,6 +23,8 @@ class ServedInstrument : public Socket {
         if (state_ == SocketState::Connected) state_ = SocketState::PeerClosing;
     }
     void comeBack() { there_ = true; }
+    /// The server is there, and its instrument is switched off.
+    void switchInstrument(bool on) { answers_ = on; }
     int attempts() const { return attempts_; }
     const std::string& host() const { return host_; }
 
@@ -44,7 +46,7 @@ class ServedInstrument : public Socket {
     SocketState state() const override { return state_; }
     bool sendData(std::string_view bytes) override {
         if (state_ != SocketState::Connected) return false;
-        port_.output(bytes);
+        if (answers_) port_.output(bytes);
         return true;
     }
     std::string peekData() override {
@@ -62,6 +64,7 @@ class ServedInstrument : public Socket {
     zelsim::InProcessPort port_;
     SocketState state_ = SocketState::Closed;
     bool there_ = true;
+    bool answers_ = true;
     int attempts_ = 0;
     std::string waiting_;
     std::string host_;
@@ -154,6 +157,22 @@ TEST_F(TcpReconnectionTest, WithTheOption_TriesAgainUntilTheServerIsBack) {
     pass(7000);
     EXPECT_TRUE(panel.isConnected);
     EXPECT_EQ(bar(), "Connected to host:2277 again. All settings are as before.");
+    EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
+}
+
+TEST_F(TcpReconnectionTest, WithTheOption_ServerWithoutInstrument_IsTriedOn) {
+    ASSERT_TRUE(connect());
+    panel.ReconnectAlways.Click();
+    socket.goAway();
+    pass(1500);
+    socket.comeBack();
+    socket.switchInstrument(false);
+    pass(30'000);
+    EXPECT_FALSE(panel.isConnected);
+    EXPECT_GE(socket.attempts(), 3);
+    socket.switchInstrument(true);
+    pass(20'000);
+    EXPECT_TRUE(panel.isConnected);
     EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
 }
 
