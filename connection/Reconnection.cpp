@@ -206,6 +206,7 @@ void Reconnection::reconnect() {
     }
     if (panel_.isConnected) return report();
     state_ = State::Closed;
+    showLinkLost(panel_, true);  // what is shown is old still
     if (tcp_) {
         const std::string why =
             dialogs_.tcp.wasLeft() ? "The attempt was left." : dialogs_.tcp.failure();

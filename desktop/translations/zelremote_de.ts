@@ -1449,5 +1449,13 @@ oder eine Aufzeichnung laden</translation>
         <source>Connects again as soon as the port or the server is back and the instrument answers</source>
         <translation>Verbindet wieder, sobald Anschluss oder Server zurück ist und das Gerät antwortet</translation>
     </message>
+    <message>
+        <source>Reconnect</source>
+        <translation>Wieder verbinden</translation>
+    </message>
+    <message>
+        <source>Reconnect by Itself</source>
+        <translation>Von selbst wieder verbinden</translation>
+    </message>
 </context>
 </TS>

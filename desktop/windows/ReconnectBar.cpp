@@ -6,6 +6,8 @@
 #include <QPointer>
 #include <QPushButton>
 
+#include "desktop/binders/ToolTips.h"
+
 namespace zel {
 
 ReconnectBar::ReconnectBar(ControllerForm& panel, Binder& binder, QWidget* parent)
@@ -20,7 +22,7 @@ ReconnectBar::ReconnectBar(ControllerForm& panel, Binder& binder, QWidget* paren
     text->setTextFormat(Qt::PlainText);
     binder.bind(panel.ReconnectLabel, text);
     layout->addWidget(text, 1);
-    auto* always = new QCheckBox(QString::fromStdString(panel.ReconnectAlways.Caption));
+    auto* always = new QCheckBox(ownCaption(panel.ReconnectAlways, panel.ReconnectAlways.Caption));
     always->setToolTip(QObject::tr(
         "Connects again as soon as the port or the server is back and the instrument answers"));
     always->setChecked(panel.ReconnectAlways.Checked);

@@ -133,6 +133,8 @@ TEST_F(TcpReconnectionTest, ClickInVain_SaysWhyAndCanBeRepeated) {
     panel.ReconnectButton.Click();
     EXPECT_FALSE(panel.isConnected);
     EXPECT_EQ(bar(), "No connection to host:2277. Connection refused.");
+    pass(2000);
+    EXPECT_TRUE(panel.CWGraph1.Old);
     EXPECT_TRUE(panel.ReconnectButton.Visible);
     EXPECT_EQ(shownBoxes(platform.boxes), Texts{});
     socket.comeBack();
