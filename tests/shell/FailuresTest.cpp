@@ -116,5 +116,25 @@ TEST_F(FailuresTest, MenuEntry_RecordsTheSessionUntilItIsClickedAgain) {
     EXPECT_FALSE(panel.UtilityRecord.Checked);
 }
 
+TEST_F(FailuresTest, RecordBegunWhileConnected_IsSaidNotToRunAgain) {
+    startConnected();
+    platform.fileDialogs.answer("/home/a.log");
+    panel.UtilityRecord.Click();
+    EXPECT_TRUE(panel.UtilityRecord.Checked);
+    ASSERT_EQ(platform.boxes.texts().size(), 1U);
+    EXPECT_TRUE(
+        startsWith(platform.boxes.texts()[0], "The record begins while ZELRemote is connected."));
+}
+
+TEST_F(FailuresTest, RecordBegunByTheMenu_NamesTheWordsOfTheStart) {
+    Program other(platform.bundle(), "BUTTON x");
+    other.start();
+    platform.fileDialogs.answer("/home/b.log");
+    other.forms().controller.UtilityRecord.Click();
+    EXPECT_TRUE(startsWith(platform.files.bytes("/home/b.log"),
+                           "0.000000 start zelremote --words \"BUTTON x\"\n"))
+        << platform.files.bytes("/home/b.log");
+}
+
 }  // namespace
 }  // namespace zel
