@@ -74,7 +74,8 @@ struct Bench {
 
 double loadSeconds(Bench& bench, const std::string& path) {
     int shown = 0;
-    bench.panel.TraceLoaded.connect([&shown] { ++shown; });
+    zel::Handlers handlers;
+    handlers.on(bench.panel.TraceLoaded, [&shown] { ++shown; });
     const double seconds = timeOf([&] { bench.panel.OpenFile(path); });
     if (shown % kTraces != 0 || shown == 0)
         throw std::runtime_error("the recording was not loaded");
@@ -185,7 +186,8 @@ Figure seriesPlay() {
     QApplication::processEvents();
     zel::ControllerForm& panel = program.forms().controller;
     int shown = 0;
-    panel.TraceLoaded.connect([&] {
+    zel::Handlers handlers;
+    handlers.on(panel.TraceLoaded, [&] {
         ++shown;
         // To the pixels of the window, painting included.
         window.graph().drawNow();

@@ -61,7 +61,8 @@ Passes runView(OpenPanel& desk, int passes) {
     std::size_t after = 0;
     unsigned long serial = desk.panel.CWGraph1.plotSerial();
     bool counting = true;
-    desk.panel.CWGraph1.Changed.connect([&, &graph = desk.panel.CWGraph1] {
+    zel::Handlers handlers;
+    handlers.on(desk.panel.CWGraph1.Changed, [&, &graph = desk.panel.CWGraph1] {
         if (!counting || graph.plotSerial() == serial) return;
         serial = graph.plotSerial();
         ++plots;
