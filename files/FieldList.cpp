@@ -40,16 +40,17 @@ FieldList::FieldList(std::string_view text, const std::function<void(double)>& y
 
 std::string_view FieldList::at(int index) const {
     if (index < 0 || index > last()) return {};
-    std::size_t start = 0;
-    if (index_ >= 0 && index == index_ + 1) {
-        start = next(end_);
-    } else {
-        start = starts_[static_cast<std::size_t>(index / kStep)];
-        for (int i = index % kStep; i > 0; --i) start = next(endOf(start));
+    if (index != index_) {
+        if (index_ >= 0 && index == index_ + 1) {
+            start_ = next(end_);
+        } else {
+            start_ = starts_[static_cast<std::size_t>(index / kStep)];
+            for (int i = index % kStep; i > 0; --i) start_ = next(endOf(start_));
+        }
+        index_ = index;
+        end_ = endOf(start_);
     }
-    index_ = index;
-    end_ = endOf(start);
-    return text_.substr(start, end_ - start);
+    return text_.substr(start_, end_ - start_);
 }
 
 }  // namespace zel

@@ -19,8 +19,8 @@ class FieldList {
 
     int count() const { return count_; }
     int last() const { return count_ - 1; }
-    /// Empty beyond the last. Quick for the entry after the one before; else a few entries are
-    /// walked.
+    /// Empty beyond the last. Quick for the entry of the call before and the one after it; else a
+    /// few entries are walked.
     std::string_view at(int index) const;
     std::string_view operator[](int index) const { return at(index); }
 
@@ -33,6 +33,7 @@ class FieldList {
     std::vector<std::uint32_t> starts_;  ///< of every sixteenth entry
     // Where the last call found its entry.
     mutable int index_ = -1;
+    mutable std::size_t start_ = 0;
     mutable std::size_t end_ = 0;
 };
 
