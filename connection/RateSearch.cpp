@@ -63,7 +63,7 @@ void RateSearch::SearchRatesButton_Click() {
         form_.MousePointer = kHourglass;
         const AtEnd over([this] {
             form_.Searching = false;
-            form_.MousePointer = 0;
+            form_.MousePointer = kArrow;
             for (Button* close : {&form_.CancelConnButton, &form_.CancelConnButton1})
                 close->Caption = "Close";
         });

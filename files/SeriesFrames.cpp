@@ -9,8 +9,6 @@
 namespace zel {
 namespace {
 
-constexpr int kRowsAfterMark = 3;
-constexpr std::size_t kDayLength = 10;
 constexpr int kDay = 24 * 60 * 60;
 constexpr int kNoon = 12;
 constexpr int kMsPerSecond = 1000;

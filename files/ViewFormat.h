@@ -1,6 +1,7 @@
 #pragma once
 // The words of a saved view that the writer and the reader share.
 
+#include <cstddef>
 #include <string>
 
 namespace zel {
@@ -19,6 +20,11 @@ inline constexpr const char* kReferenceLevel = "Reference Level";
 inline constexpr const char* kTraceDetector = "Trace Detector";
 inline constexpr const char* kTraceWritePointer = "Trace Write Pointer";
 inline constexpr const char* kMeasuredValue = "Measured Value";
+
+/// Lines from the one with the trace's mark to its first value.
+inline constexpr int kRowsAfterMark = 3;
+/// Characters of a date at the head of a trace.
+inline constexpr std::size_t kDayLength = 10;
 
 /// With `toCode` dB a division becomes a range code: 10, 5, 2, 1 give 0 to 3, anything else
 /// stays. Without it a range code becomes dB a division, 10 for a code that is none of 0 to 3.

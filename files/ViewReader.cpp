@@ -22,9 +22,7 @@ using CF = ControllerForm;
 
 /// What one trace's header and 301 rows come to.
 constexpr int kLargestSingle = 970;
-constexpr int kRowsBehindMark = 3;
 constexpr int kMostRowsBack = 500;
-constexpr std::size_t kDayLength = 10;
 constexpr double kIntervals = 300;
 constexpr int kShownBytes = 4 * 1024 * 1024;
 constexpr int kFirstLogEntry = 3;
@@ -223,7 +221,7 @@ void ViewReader::takeView(const Text& text, const std::string& fileTime, std::in
         FieldList lines(*text, [this](double part) { progress("Loading", part); });
         Header header = readHeader(*text, lines, fileTime);
         const bool series = header.series = rowNumber == 0 && lines.last() > kLargestSingle;
-        int start = header.mark + kRowsBehindMark;
+        int start = header.mark + kRowsAfterMark;
         if (header.mark < 0) {
             // A table without a header begins with its first number.
             for (start = 0; start <= lines.last() && !looksLikeNumber(lines[start]);) ++start;
