@@ -5,8 +5,6 @@
 namespace zel {
 namespace {
 
-constexpr int kSlowestMs = 1000;
-constexpr int kMsPerStep = 100;
 constexpr int kSliceMs = 100;
 constexpr int kShortestRoundMs = 20;
 
@@ -104,11 +102,9 @@ void Playback::goTo(int index) {
 }
 
 bool Playback::stands(int ms) const {
-    const Slider& speed = forms_.specialMeas.sldSpeed;
     // The keys may change while a trace stands.
-    int whole = speed.Value == speed.Max ? 0 : kSlowestMs - kMsPerStep * speed.Value.get();
-    if (panel_.PlaybackRealTime.Value()) whole = frames_->gapAfter(position_);
-    return ms < whole;
+    return ms < (panel_.PlaybackRealTime.Value() ? frames_->gapAfter(position_)
+                                                 : forms_.specialMeas.seriesPauseMs());
 }
 
 int Playback::next() {

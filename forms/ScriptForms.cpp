@@ -1,5 +1,7 @@
 #include "forms/ScriptForms.h"
 
+#include <algorithm>
+
 namespace zel {
 
 SpecialMeasForm::SpecialMeasForm() : Form("SpecialMeasForm") {
@@ -28,6 +30,13 @@ SpecialMeasForm::SpecialMeasForm() : Form("SpecialMeasForm") {
     cmdNext.Visible = false;
     cmdStop.Visible = false;
     cmdStop.Enabled = false;
+}
+
+int SpecialMeasForm::seriesPauseMs() const {
+    constexpr int kSlowestMs = 1000;
+    constexpr int kMsPerStep = 100;
+    if (sldSpeed.Value == sldSpeed.Max) return 0;
+    return std::max(kSlowestMs - kMsPerStep * sldSpeed.Value.get(), 0);
 }
 
 STDForm::STDForm() : Form("STDForm") {

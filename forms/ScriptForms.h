@@ -46,6 +46,10 @@ class SpecialMeasForm : public Form {
     /// Ends a wait of the step mode, stopped or not.
     Event<> ReleaseWait;
 
+    /// How long a trace of a loaded series stands at the slider's pace, in milliseconds; 0 at the
+    /// slider's top.
+    int seriesPauseMs() const;
+
     Button cmdOpenCommandsFile{*this, "cmdOpenCommandsFile", "Open..."};
     Button cmdEdit{*this, "cmdEdit", "Edit..."};
     Button cmdNew{*this, "cmdNew", "New..."};

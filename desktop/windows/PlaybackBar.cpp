@@ -13,8 +13,7 @@ constexpr int kIconSize = 16;
 constexpr int kSpacing = 4;
 constexpr int kPageOfTraces = 10;
 constexpr int kSpeedWidth = 120;
-constexpr double kSlowestMs = 1000;
-constexpr int kMsPerStep = 100;
+constexpr double kMsPerSecond = 1000;
 
 QLabel* word(const QString& text) {
     auto* label = new QLabel(text);
@@ -40,7 +39,7 @@ QCheckBox* box(CheckBox& control, Binder& binder) {
 }  // namespace
 
 PlaybackBar::PlaybackBar(Forms& forms, Binder& binder, QWidget* parent)
-    : QWidget(parent), speed_(forms.specialMeas.sldSpeed), pace_(word({})) {
+    : QWidget(parent), script_(forms.specialMeas), pace_(word({})) {
     ControllerForm& panel = forms.controller;
     auto* rows = new QVBoxLayout(this);
     rows->setContentsMargins(0, 0, 0, 0);
@@ -81,7 +80,7 @@ PlaybackBar::PlaybackBar(Forms& forms, Binder& binder, QWidget* parent)
     second->addWidget(key(panel.PlaybackClose, "close", binder));
     rows->addLayout(second);
 
-    binder.bind(speed_, slider);
+    binder.bind(script_.sldSpeed, slider);
     binder.bind(panel.PlaybackFrame, this, nullptr);
     const QPointer<PlaybackBar> self(this);
     panel.PlaybackPlay.Changed.connect([play, self, &panel, shown = std::string()]() mutable {
@@ -89,7 +88,7 @@ PlaybackBar::PlaybackBar(Forms& forms, Binder& binder, QWidget* parent)
         shown = panel.PlaybackPlay.Caption;
         play->setIcon(themeIcon(panel.SeriesPlays ? "pause" : "play"));
     });
-    speed_.Changed.connect([self] {
+    script_.sldSpeed.Changed.connect([self] {
         if (self) self->showPace();
     });
     showPace();
@@ -97,10 +96,10 @@ PlaybackBar::PlaybackBar(Forms& forms, Binder& binder, QWidget* parent)
 }
 
 void PlaybackBar::showPace() {
-    const int ms = static_cast<int>(kSlowestMs) - kMsPerStep * speed_.Value;
-    const bool all = speed_.Value == speed_.Max || ms <= 0;
-    pace_->setText(all ? QObject::tr("all at once")
-                       : QObject::tr("%1 traces/s").arg(QString::number(kSlowestMs / ms, 'f', 1)));
+    const int ms = script_.seriesPauseMs();
+    pace_->setText(
+        ms == 0 ? QObject::tr("all at once")
+                : QObject::tr("%1 traces/s").arg(QString::number(kMsPerSecond / ms, 'f', 1)));
 }
 
 }  // namespace zel

@@ -16,7 +16,7 @@ class PlaybackBar : public QWidget {
   private:
     void showPace();
 
-    Slider& speed_;
+    SpecialMeasForm& script_;
     QLabel* pace_;
 };
 
