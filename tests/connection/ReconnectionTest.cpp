@@ -2,26 +2,17 @@
 
 #include <gtest/gtest.h>
 
-#include "ZELSim/InProcessPort.h"
 #include "link/CommandExchange.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
 #include "support/Text.h"
 #include "tests/ShownBoxes.h"
+#include "tests/connection/SwitchedPort.h"
 
 namespace zel {
 namespace {
 
 constexpr const char* kPath = "/dev/ttyUSB0";
-
-/// An instrument that can be switched off.
-struct SwitchedPort : zelsim::InProcessPort {
-    using InProcessPort::InProcessPort;
-    bool on = true;
-    void output(std::string_view bytes) override {
-        if (on) InProcessPort::output(bytes);
-    }
-};
 
 struct ReconnectionTest : ::testing::Test {
     ReconnectionTest() {

@@ -7,20 +7,13 @@
 
 #include "desktop/windows/ConnectCard.h"
 #include "desktop/windows/ReconnectBar.h"
+#include "tests/connection/SwitchedPort.h"
 #include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
 
 constexpr const char* kPath = "/dev/ttyUSB0";
-
-struct SwitchedPort : zelsim::InProcessPort {
-    using InProcessPort::InProcessPort;
-    bool on = true;
-    void output(std::string_view bytes) override {
-        if (on) InProcessPort::output(bytes);
-    }
-};
 
 /// The window over an instrument that can be switched off, at 38400 baud.
 struct Connecting : testing::Test {

@@ -5,16 +5,11 @@
 #include <QTest>
 #include <QWheelEvent>
 
+#include "tests/desktop/Looks.h"
 #include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
-
-struct Look {
-    const char* name;
-    ThemeChoice theme;
-    QSize size;
-};
 
 struct Scene {
     const char* name;
@@ -223,27 +218,9 @@ TEST_P(BareLooks, WindowWithoutAnInstrument_ShowsTheWaysToBegin) {
     EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-empty"));
 }
 
-const auto kNameOfLook = [](const auto& look) {
-    return QString(look.param.name).replace('-', '_').toStdString();
-};
+INSTANTIATE_TEST_SUITE_P(Sizes, BareLooks, kLooks, kNameOfLook);
 
-INSTANTIATE_TEST_SUITE_P(Sizes, BareLooks,
-                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
-                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
-                                         Look{"dark-1280x760", ThemeChoice::Dark, {1280, 760}},
-                                         Look{"light-1280x760", ThemeChoice::Light, {1280, 760}},
-                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
-                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
-                         kNameOfLook);
-
-INSTANTIATE_TEST_SUITE_P(Sizes, Looks,
-                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
-                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
-                                         Look{"dark-1280x760", ThemeChoice::Dark, {1280, 760}},
-                                         Look{"light-1280x760", ThemeChoice::Light, {1280, 760}},
-                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
-                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
-                         kNameOfLook);
+INSTANTIATE_TEST_SUITE_P(Sizes, Looks, kLooks, kNameOfLook);
 
 }  // namespace
 }  // namespace zel

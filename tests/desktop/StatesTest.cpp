@@ -3,16 +3,11 @@
 #include <QDialog>
 #include <QDockWidget>
 
+#include "tests/desktop/Looks.h"
 #include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
-
-struct Look {
-    const char* name;
-    ThemeChoice theme;
-    QSize size;
-};
 
 /// A recording of that many traces, a minute apart.
 std::string recordingOf(int count) {
@@ -132,16 +127,7 @@ TEST_P(LooksOfStates, Windows_ArePictures) {
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Sizes, LooksOfStates,
-                         testing::Values(Look{"dark-1024x600", ThemeChoice::Dark, {1024, 600}},
-                                         Look{"light-1024x600", ThemeChoice::Light, {1024, 600}},
-                                         Look{"dark-1280x760", ThemeChoice::Dark, {1280, 760}},
-                                         Look{"light-1280x760", ThemeChoice::Light, {1280, 760}},
-                                         Look{"dark-1920x1080", ThemeChoice::Dark, {1920, 1080}},
-                                         Look{"light-1920x1080", ThemeChoice::Light, {1920, 1080}}),
-                         [](const auto& look) {
-                             return QString(look.param.name).replace('-', '_').toStdString();
-                         });
+INSTANTIATE_TEST_SUITE_P(Sizes, LooksOfStates, kLooks, kNameOfLook);
 
 }  // namespace
 }  // namespace zel
