@@ -81,8 +81,8 @@ void MaskWatch::follow() {
     const std::optional<int> status = runner_.ended();
     if (!status) return;
     report(commandProblem_, *status == 0 ? std::string()
-                                         : "The command " + settings_.command.at(0) +
-                                               " ended with status " + std::to_string(*status));
+                                         : "The command " + running_ + " ended with status " +
+                                               std::to_string(*status));
 }
 
 void MaskWatch::save(const Sweep& sweep) {
@@ -105,6 +105,7 @@ void MaskWatch::run(const Sweep& sweep, const MaskVerdict& verdict) {
     const std::string problem = runner_.start(words);
     if (problem.empty()) {
         ++started_;
+        running_ = words.front();
     } else {
         report(commandProblem_, problem);
     }

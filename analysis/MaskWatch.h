@@ -68,6 +68,7 @@ class MaskWatch {
     CommandRunner& runner_;
     const Clock& clock_;
     WatchSettings settings_;
+    std::string running_;  ///< the program that was started last, also after other settings
     std::size_t due_ = 0;  ///< sweeps still to be saved after a failing one
     std::uint64_t saved_ = 0;
     std::uint64_t started_ = 0;

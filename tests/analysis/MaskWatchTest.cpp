@@ -104,6 +104,15 @@ TEST_F(Watching, SweepThatDidNotComeWhole_IsLeftOut) {
     EXPECT_EQ(watch.saved(), 1U);
 }
 
+TEST_F(Watching, CommandThatIsTakenAway_StillSaysHowItEnded) {
+    watch.set({"", 0, {"note"}});
+    fail();
+    watch.set({});
+    commands.end(3);
+    watch.follow();
+    EXPECT_EQ(watch.problem(), "The command note ended with status 3");
+}
+
 TEST_F(Watching, Command_GetsItsWordsFilledAndRunsAlone) {
     watch.set({"/failed.csv", 0, {"note", "at {x} by {margin}", "{time}", "{file}", "{y}"}});
     fail();
