@@ -13,8 +13,6 @@
 namespace zel {
 namespace {
 
-constexpr int kFrameMs = 16;
-
 struct Face {
     Color color;
     const char* name;
@@ -69,10 +67,16 @@ void Binder::act(const Control& control, std::function<void()> work) const {
     const auto checked = [&control, work = std::move(work)] {
         if (control.Visible && control.Enabled) work();
     };
-    if (perform) {
-        perform(control, checked);
-    } else if (!refused(control)) {
-        checked();
+    // The toolkit that called is not made for exceptions: what it holds would be lost.
+    try {
+        if (perform) {
+            perform(control, checked);
+        } else if (!refused(control)) {
+            checked();
+        }
+    } catch (...) {
+        if (!failed) throw;
+        failed();
     }
 }
 

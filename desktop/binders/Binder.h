@@ -27,6 +27,9 @@
 
 namespace zel {
 
+/// What changes is drawn once in this time, however often it changes.
+inline constexpr int kFrameMs = 16;
+
 class PanelLineEdit;
 
 class Binder : public QObject {
@@ -70,6 +73,8 @@ class Binder : public QObject {
     std::function<std::string(const Control&)> reasonAgainst;
     /// Runs what a user does to a control, now or in its turn; at once where it is empty.
     std::function<void(const Control&, std::function<void()>)> perform;
+    /// Reports the exception that is being handled; without it the exception goes on.
+    std::function<void()> failed;
     /// Hears what the user does: "click NAME", "choose NAME INDEX", "type NAME TEXT", "set NAME
     /// TEXT", "key NAME KEY", in two parts.
     std::function<void(const std::string& act, const std::string& what)> tell;

@@ -46,6 +46,7 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     binder_.defers = [&interlock](const Control& control) {
         return interlock.turnOf(control) == Interlock::Turn::Later;
     };
+    binder_.failed = [this] { program_.showFailure(); };
     binder_.perform = [&interlock](const Control& control, std::function<void()> act) {
         interlock.perform(control, std::move(act));
     };

@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <cmath>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/windows/FaultPage.h"
 #include "desktop/windows/PowerPage.h"
 #include "desktop/windows/StatisticsPage.h"
@@ -33,6 +34,8 @@ TraceToolsDock::TraceToolsDock(Program& program, GraphWidget& graph, QMainWindow
       watch_(program.files(), command_, program.clock()),
       overlay_(graph) {
     setObjectName("TraceTools");
+    turn_.setSingleShot(true);
+    connect(&turn_, &QTimer::timeout, this, [this] { showNow(); });
     setProperty("topic", kTopic);
     follow();
     letMarkersMove();
@@ -106,16 +109,18 @@ void TraceToolsDock::takeSweep(bool loaded) {
 }
 
 void TraceToolsDock::showLater() {
-    if (waits_) return;
-    waits_ = true;
-    QMetaObject::invokeMethod(
-        this, [this] { showNow(); }, Qt::QueuedConnection);
+    // With the window's own frame: quick sweeps are not drawn one by one.
+    if (!turn_.isActive()) turn_.start(kFrameMs);
 }
 
 void TraceToolsDock::showNow() {
-    waits_ = false;
-    overlay_.show(picture());
-    graph_.replot(QCustomPlot::rpQueuedReplot);
+    turn_.stop();
+    const OverlayPicture now = picture();
+    if (!now.empty() || drawn_) {
+        overlay_.show(now);
+        graph_.replot(QCustomPlot::rpQueuedReplot);
+    }
+    drawn_ = !now.empty();
     if (isVisible() && pages_ != nullptr)
         if (auto* page = dynamic_cast<TracePage*>(pages_->currentWidget())) page->showState();
 }

@@ -3,6 +3,7 @@
 
 #include <QDockWidget>
 #include <QTabWidget>
+#include <QTimer>
 #include <array>
 #include <memory>
 
@@ -77,8 +78,9 @@ class TraceToolsDock : public QDockWidget {
     MarkersPage* markers_ = nullptr;
     unsigned long plotSerial_ = 0;
     double lastTime_ = 0;
-    bool waits_ = false;
     bool placed_ = false;  ///< it was shown once
+    QTimer turn_;
+    bool drawn_ = false;  ///< something stands on the graph
 };
 
 /// Adds the dock, hidden, and the menu "Trace", which stands before another menu, to the window.
