@@ -5,6 +5,7 @@
 #include <limits>
 
 #include "desktop/graph/AxisText.h"
+#include "desktop/graph/BandGraph.h"
 #include "desktop/graph/DivisionTicker.h"
 #include "desktop/graph/PolylineClip.h"
 #include "support/NumberText.h"
@@ -68,9 +69,8 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     channel_->setVisible(false);
     low_ = plot_.addGraph();
     low_->setAdaptiveSampling(false);
-    trace_ = plot_.addGraph();
+    trace_ = new BandGraph(plot_.xAxis, plot_.yAxis);
     trace_->setPen(QPen(colors_.trace, 1));
-    trace_->setAdaptiveSampling(false);
     cursors_ = std::make_unique<CursorMarks>(plot_, colors_);  // over the trace
     trigger_ = new QCPItemStraightLine(&plot_);
     trigger_->setPen(QPen(colors_.trigger, 1, Qt::DashLine));
