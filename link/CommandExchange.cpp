@@ -235,6 +235,7 @@ bool CommandExchange::GetInstrument(const std::string& keyword, std::string& val
     if (keyword == "SWPTIME") state_.SweepTimeTold = leadingNumber(value);
     session_.DebugLine("<" + keyword + "> response: " + value);
     finishLine("GET", keyword, t0);
+    Answered(keyword, value);
     return true;
 }
 

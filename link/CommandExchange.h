@@ -35,6 +35,8 @@ class CommandExchange {
     Event<> SettingBegins;
     /// The instrument did not take a setting: the digit of its answer. Before the box that says so.
     Event<int> SettingRefused;
+    /// A query has succeeded: its keyword and its value, whoever asked.
+    Event<const std::string&, const std::string&> Answered;
     /// A dialogue is under way further up the stack, and only lets events run: the line is taken.
     bool busy() const { return state_.DialoguesUnderWay > 0; }
     /// The user does not wait any longer for what is under way; an answer that comes within

@@ -10,12 +10,14 @@
 #include "desktop/windows/GraphMenu.h"
 #include "desktop/windows/PlaybackBar.h"
 #include "desktop/windows/ReconnectBar.h"
+#include "link/CommandExchange.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {
 
 constexpr int kSpacing = 6;
+constexpr const char* kPowerReading = "PWR";
 
 }  // namespace
 
@@ -34,7 +36,7 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
         new ConnectCard(program.forms(), binder, {ways.again, [this] { showEmpty(); }}, graph_);
     empty_ = new EmptyScreen(std::move(ways), graph_);
     connecting_->raise();
-    power_ = new PowerDisplay(panel_, graph_);
+    power_ = new PowerDisplay(graph_);
     readouts_ = new Readouts(panel_, binder_);
     graph_->setNavigator(&navigator_);
     pointer_ = std::make_unique<PointerText>(*graph_, *readouts_, panel_);
@@ -44,9 +46,10 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
         });
     };
     binder_.bindShow(panel_.CWGraph1, graph_, [this] { refreshGraph(); });
-    panel_.SoftTextBox(0).Changed.connect([self = QPointer<GraphSide>(this)] {
-        if (self && self->power_->isVisibleTo(self->graph_)) self->power_->take();
-    });
+    readings_.on(program_.exchange().Answered,
+                 [this](const std::string& word, const std::string& value) {
+                     if (word == kPowerReading && showsPower()) power_->take(value);
+                 });
     graph_->installEventFilter(this);
     // The wheel looks closer whatever has the focus; so does the way back.
     connect(new QShortcut(QKeySequence("Alt+Left"), this), &QShortcut::activated, this,
@@ -116,6 +119,10 @@ void GraphSide::showChannel() {
     graph_->setChannel(mirror.CenterFrequency - half, mirror.CenterFrequency + half);
 }
 
+bool GraphSide::showsPower() const {
+    return panel_.isConnected && panel_.InstrumentMode == ControllerForm::POWERSENSOR;
+}
+
 void GraphSide::showPower() {
     // The edges of the channel belong to the mode, whether the trace changes with it or not.
     if (shownMode_ != panel_.InstrumentMode) {
@@ -123,10 +130,10 @@ void GraphSide::showPower() {
         showChannel();
         graph_->refresh();
     }
-    const bool power = panel_.isConnected && panel_.InstrumentMode == ControllerForm::POWERSENSOR;
+    const bool power = showsPower();
     if (power == power_->isVisibleTo(graph_)) return;
+    if (!power) power_->clear();
     power_->setVisible(power);
-    if (power) power_->take();
     place();
 }
 

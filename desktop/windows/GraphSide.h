@@ -39,6 +39,7 @@ class GraphSide : public QWidget {
     void refreshGraph();
     void showSource();
     void showChannel();
+    bool showsPower() const;
 
     Program& program_;
     ControllerForm& panel_;
@@ -51,6 +52,7 @@ class GraphSide : public QWidget {
     GraphNavigator navigator_;
     std::int16_t shownMode_ = 0;
     std::unique_ptr<PointerText> pointer_;
+    Handlers readings_;
 };
 
 }  // namespace zel

@@ -23,15 +23,21 @@ double shareOf(double level) {
 
 }  // namespace
 
-PowerDisplay::PowerDisplay(ControllerForm& panel, QWidget* parent)
-    : QWidget(parent), panel_(panel) {
+PowerDisplay::PowerDisplay(QWidget* parent) : QWidget(parent) {
     setAccessibleName(QObject::tr("Power"));
     hide();
 }
 
-void PowerDisplay::take() {
-    if (panel_.LastPowerText.empty()) return history_.clear();
-    history_.push_back(leadingNumber(panel_.LastPowerText));
+void PowerDisplay::clear() {
+    history_.clear();
+    setAccessibleDescription(QString());
+    update();
+}
+
+void PowerDisplay::take(const std::string& answer) {
+    const std::optional<double> level = parseNumber(answer);
+    if (!level) return;
+    history_.push_back(*level);
     if (history_.size() > kMostReadings) history_.pop_front();
     setAccessibleDescription(QString::fromStdString(levelText(history_.back(), "dBm")));
     update();

@@ -3,17 +3,20 @@
 
 #include <QWidget>
 #include <deque>
-
-#include "forms/ControllerForm.h"
+#include <string>
 
 namespace zel {
 
 class PowerDisplay : public QWidget {
   public:
-    PowerDisplay(ControllerForm& panel, QWidget* parent);
+    explicit PowerDisplay(QWidget* parent);
 
-    /// Takes a reading over when there is a new one.
-    void take();
+    /// A reading as the instrument has answered it, in dBm; what is no number counts as none.
+    void take(const std::string& answer);
+    /// The mode has ended: readings of another time are none of the next.
+    void clear();
+    /// dBm, the newest last; 300 at most.
+    const std::deque<double>& history() const { return history_; }
 
   protected:
     void paintEvent(QPaintEvent* event) override;
@@ -22,8 +25,7 @@ class PowerDisplay : public QWidget {
     void drawBar(QPainter& painter, const QRectF& place) const;
     void drawHistory(QPainter& painter, const QRectF& place) const;
 
-    ControllerForm& panel_;
-    std::deque<double> history_;  ///< dBm, the newest last
+    std::deque<double> history_;
 };
 
 }  // namespace zel
