@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdlib>
 
 namespace zel {
 namespace {
@@ -19,10 +20,7 @@ double between(double from, double to, double share) { return from + (to - from)
 
 }  // namespace
 
-BandGraph::BandGraph(QCPAxis* x, QCPAxis* y) : QCPGraph(x, y) {
-    setAdaptiveSampling(false);
-    setAntialiasedFill(false);  // its edges lie under the lines
-}
+BandGraph::BandGraph(QCPAxis* x, QCPAxis* y) : QCPGraph(x, y) { setAdaptiveSampling(false); }
 
 void BandGraph::drawFill(QCPPainter* painter, QVector<QPointF>* lines) const {
     const QCPGraph* lower = channelFillGraph();
@@ -32,40 +30,43 @@ void BandGraph::drawFill(QCPPainter* painter, QVector<QPointF>* lines) const {
     const QCPRange seen = keyAxis()->range();
     const auto first = data()->findBegin(seen.lower);
     const auto last = data()->findEnd(seen.upper);
-    const QRectF area = clipRect();
-    const double column = 1 / scale;
+    if (first == last) return;
+    // From here on in pixels of the device, so that each column is a rectangle of whole pixels.
+    const QRectF area(QRectF(clipRect()).topLeft() * scale, QRectF(clipRect()).size() * scale);
     const auto edgeAt = [&](QCPGraphDataContainer::const_iterator at) {
         const auto index = static_cast<int>(at - data()->constBegin());
         const auto pixel = [&](double level) {
-            return std::clamp(valueAxis()->coordToPixel(level), area.top(), area.bottom());
+            return std::clamp(valueAxis()->coordToPixel(level) * scale, area.top(), area.bottom());
         };
-        return Edge{keyAxis()->coordToPixel(at->key), pixel(at->value),
+        return Edge{keyAxis()->coordToPixel(at->key) * scale, pixel(at->value),
                     index < lower->dataCount() ? pixel(lower->dataMainValue(index)) : qQNaN()};
     };
-    QVector<QRectF> columns;
-    if (first == last) return;
+    QVector<QRect> columns;
+    columns.reserve(static_cast<qsizetype>(area.width()) + (last - first));
     Edge left = edgeAt(first);
     for (auto at = first + 1; at != last; ++at) {
         const Edge right = edgeAt(at);
         if (left.number() && right.number()) {
             const double width = right.x - left.x;
-            const double begin = std::max(left.x, area.left());
-            const double end = std::min(right.x, area.right() + column);
-            for (double x = std::floor(begin * scale) / scale; x < end; x += column) {
+            const int begin = qFloor(std::max(left.x, area.left()));
+            const int end = qCeil(std::min(right.x, area.right()));
+            for (int x = begin; x < end; ++x) {
                 const double share =
-                    width > 0 ? std::clamp((x + column / 2 - left.x) / width, 0.0, 1.0) : 0;
-                const double top = between(left.high, right.high, share);
-                const double bottom = between(left.low, right.low, share);
-                columns.push_back(
-                    QRectF(x, std::min(top, bottom), column, std::fabs(bottom - top)));
+                    width > 0 ? std::clamp((x + 0.5 - left.x) / width, 0.0, 1.0) : 0;
+                const int high = qRound(between(left.high, right.high, share));
+                const int low = qRound(between(left.low, right.low, share));
+                columns.push_back(QRect(x, std::min(high, low), 1, std::abs(low - high)));
             }
         }
         left = right;
     }
-    applyFillAntialiasingHint(painter);
+    painter->save();
+    painter->setAntialiasing(false);
+    painter->scale(1 / scale, 1 / scale);
     painter->setPen(Qt::NoPen);
     painter->setBrush(brush());
     painter->drawRects(columns);
+    painter->restore();
 }
 
 }  // namespace zel
