@@ -54,7 +54,7 @@ TEST_F(PowerDisplayTest, AnotherModeForgetsTheReadings) {
     read(3);
     ASSERT_GE(display->history().size(), 3U);
     panel().FrequencyButton.Click();
-    panel().InstrumentMode = ControllerForm::ANALYZERMODE;
+    panel().InstrumentMode = ControllerForm::ANALYZER;
     panel().CWGraph1.noteChange();
     show();
     EXPECT_TRUE(display->history().empty());
