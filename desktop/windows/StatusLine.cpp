@@ -66,6 +66,7 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     state_->setAccessibleName(QObject::tr("State of the connection"));
     auto* clock = new StillLabel;
     clock->setObjectName("caption");
+    clock->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
     for (QLabel* label : {activity_, state_, static_cast<QLabel*>(clock)})
         bar->addPermanentWidget(label);
     binder.bindShow(panel_.TimeLabel, clock, [this, clock] {
