@@ -103,6 +103,7 @@ QCheckBox::indicator { border-radius: 3px; }
 QRadioButton::indicator { border-radius: 7px; }
 QRadioButton::indicator:checked, QCheckBox::indicator:checked { background: @accent;
     border: 1px solid @text; }
+QCheckBox::indicator:checked { image: url(:/pictures/check.svg); }
 QRadioButton::indicator:disabled, QCheckBox::indicator:disabled { border-color: @border; }
 )";
 
