@@ -80,7 +80,9 @@ const WaterfallPicture& WaterfallCanvas::picture(double fontHeight) {
     style.dots = devicePixelRatioF();
     if (size() != pictureSize_) fine_ = false;
     style.oversampling = fine_ ? 2 : 1;
-    if (changed_ || style != pictureStyle_ || size() != pictureSize_) {
+    // A paint for another reason leaves new rows to the end of the rest.
+    const bool due = changed_ && !(waits_ && rest_.isActive());
+    if (due || style != pictureStyle_ || size() != pictureSize_) {
         picture_ = drawWaterfall(form_.Graph3D, style, width(), height(), fontHeight);
         pictureStyle_ = style;
         pictureSize_ = size();
@@ -96,8 +98,9 @@ void WaterfallCanvas::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.fillRect(rect(), colors_.background);
     painter.setFont(waterfallFont());
-    paintWaterfall(painter, rect(), picture(painter.fontMetrics().height()), colors_);
-    waits_ = false;
+    const WaterfallPicture& seen = picture(painter.fontMetrics().height());
+    paintWaterfall(painter, rect(), seen, colors_);
+    waits_ = waits_ && rest_.isActive() && changed_;
     if (form_.Graph3D.hasRows()) return;
     painter.setPen(colors_.text);
     painter.drawText(rect(), Qt::AlignCenter,

@@ -314,8 +314,7 @@ TEST_F(WaterfallWindowTest, NothingChanged_NothingIsComputed) {
     view.Longitude += 10;
     form().Graph3D.setView(view);
     flush();
-    canvas().grab();
-    EXPECT_EQ(canvas().drawings(), before + 1);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return canvas().drawings() == before + 1; }));
     waterfall().resize(waterfall().size() + QSize(40, 0));
     canvas().grab();
     EXPECT_EQ(canvas().drawings(), before + 2);
@@ -325,6 +324,22 @@ TEST_F(WaterfallWindowTest, NothingChanged_NothingIsComputed) {
     sweeps(3);
     QTest::qWait(120);
     EXPECT_EQ(canvas().drawings(), before + 2);
+}
+
+TEST_F(WaterfallWindowTest, PaintForAnotherReason_LeavesAChangeToTheEndOfTheRest) {
+    open(20);
+    form().Graph3D.noteChange();
+    flush();
+    canvas().repaint();
+    const int before = canvas().drawings();
+    // The rest after that picture has begun; sweeps and other paints come in it.
+    for (int i = 0; i < 5; ++i) {
+        form().Graph3D.noteChange();
+        flush();
+        canvas().repaint();
+    }
+    EXPECT_EQ(canvas().drawings(), before);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return canvas().drawings() == before + 1; }));
 }
 
 TEST_F(WaterfallWindowTest, PictureThatRests_IsDrawnOnceMoreAndFiner) {
