@@ -305,7 +305,7 @@ TEST_F(TraceToolsWindow, SavedPicture_HoldsTheTools) {
     EXPECT_TRUE(drawn.contains(hostTraceColor(0).name().toUtf8()));
     for (const char* name : {"tools.png", "tools.pdf", "tools.wmf"})
         EXPECT_GT(draw(name).size(), 1000);
-    for (const char* name : {"tools.png", "tools.svg"})
+    for (const char* name : {"tools.png", "tools.svg", "tools.pdf", "tools.wmf"})
         QFile::copy(folder.filePath(name),
                     QCoreApplication::applicationDirPath() + "/pictures/" + name);
 }
