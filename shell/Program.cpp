@@ -370,6 +370,9 @@ ServerBridge& Program::server() { return rooms_->bridge; }
 ServerDialog& Program::serverDialog() { return rooms_->serverDialog; }
 ZELBas& Program::link() { return rooms_->line; }
 CommandExchange& Program::exchange() { return rooms_->exchange; }
+Event<const std::string&, const std::string&>& Program::answers() {
+    return rooms_->exchange.Answered;
+}
 Sweep& Program::sweep() { return rooms_->onGraph; }
 TraceReader& Program::traces() { return rooms_->traces; }
 SweepHistory& Program::history() { return rooms_->history; }

@@ -42,6 +42,8 @@ class Program {
     ZEL3Variables& variables();
     ZELBas& link();
     CommandExchange& exchange();
+    /// Keyword and value of each query that the instrument has answered.
+    Event<const std::string&, const std::string&>& answers();
     TraceReader& traces();
     /// The sweeps of the last while.
     SweepHistory& history();

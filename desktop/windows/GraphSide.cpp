@@ -10,7 +10,6 @@
 #include "desktop/windows/GraphMenu.h"
 #include "desktop/windows/PlaybackBar.h"
 #include "desktop/windows/ReconnectBar.h"
-#include "link/CommandExchange.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {
@@ -46,10 +45,9 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
         });
     };
     binder_.bindShow(panel_.CWGraph1, graph_, [this] { refreshGraph(); });
-    readings_.on(program_.exchange().Answered,
-                 [this](const std::string& word, const std::string& value) {
-                     if (word == kPowerReading && showsPower()) power_->take(value);
-                 });
+    readings_.on(program_.answers(), [this](const std::string& word, const std::string& value) {
+        if (word == kPowerReading && showsPower()) power_->take(value);
+    });
     graph_->installEventFilter(this);
     // The wheel looks closer whatever has the focus; so does the way back.
     connect(new QShortcut(QKeySequence("Alt+Left"), this), &QShortcut::activated, this,
