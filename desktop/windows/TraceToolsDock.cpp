@@ -255,7 +255,9 @@ OverlayPicture TraceToolsDock::picture() const {
             verdict += result.mask->margin ? ", margin " + levelText(result.mask->margin, "dB") +
                                                  " at " + placeText(result.mask->x, result.xUnit)
                                            : QString(", no sample covered");
-            foot << verdict + "; " + QString::fromStdString(tools.maskCount().text());
+            if (tools.maskCount().sweeps > 0)
+                verdict += "; " + QString::fromStdString(tools.maskCount().text());
+            foot << verdict;
         }
     }
     if (const std::string names = correctionNames(tools.corrections()); !names.empty())

@@ -301,6 +301,7 @@ TEST_F(TraceToolsWindow, SavedPicture_HoldsTheTools) {
     const QByteArray drawn = draw("tools.svg");
     EXPECT_FALSE(plain.contains("Mask: "));
     EXPECT_TRUE(drawn.contains("Mask: pass"));
+    EXPECT_FALSE(drawn.contains("0/0"));  // no sweep has been counted yet
     EXPECT_TRUE(drawn.contains(">M1<"));
     EXPECT_TRUE(drawn.contains(hostTraceColor(0).name().toUtf8()));
     for (const char* name : {"tools.png", "tools.pdf", "tools.wmf"})
