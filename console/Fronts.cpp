@@ -1,6 +1,7 @@
 #include "console/Fronts.h"
 
 #include <QCoreApplication>
+#include <optional>
 
 #include "ZELSim/InProcessPort.h"
 #include "console/VirtualFront.h"
@@ -56,8 +57,15 @@ class PortFront : public Front {
 }  // namespace
 
 struct ToolkitSession::Application {
-    Application(int& argc, char** argv) : object(argc, argv) {}
-    QCoreApplication object;
+    /// The plain event loop wakes sooner than the one of windows, which nothing here needs.
+    Application(int& argc, char** argv) {
+        constexpr const char* kPlainLoop = "QT_NO_GLIB";
+        const bool chosen = qEnvironmentVariableIsSet(kPlainLoop);
+        if (!chosen) qputenv(kPlainLoop, "1");
+        object.emplace(argc, argv);
+        if (!chosen) qunsetenv(kPlainLoop);  // programs that are started have their own
+    }
+    std::optional<QCoreApplication> object;
 };
 
 ToolkitSession::ToolkitSession(int& argc, char** argv)
