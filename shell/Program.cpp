@@ -328,6 +328,8 @@ Program::Program(const Platform& platform, std::string commandLine)
     guards_->boxes.quiet = [this] { return rooms_->recording.inTimedTick(); };
     rooms_->end.Ended.connect([this] { Ended(); });
     rooms_->exchange.SettingRefused.connect([this](int status) { SettingRefused(status); });
+    rooms_->exchange.Answered.connect(
+        [this](const std::string& word, const std::string& value) { Answered(word, value); });
 }
 
 Program::~Program() { guards_->boxes.quiet = nullptr; }
@@ -370,9 +372,6 @@ ServerBridge& Program::server() { return rooms_->bridge; }
 ServerDialog& Program::serverDialog() { return rooms_->serverDialog; }
 ZELBas& Program::link() { return rooms_->line; }
 CommandExchange& Program::exchange() { return rooms_->exchange; }
-Event<const std::string&, const std::string&>& Program::answers() {
-    return rooms_->exchange.Answered;
-}
 Sweep& Program::sweep() { return rooms_->onGraph; }
 TraceReader& Program::traces() { return rooms_->traces; }
 SweepHistory& Program::history() { return rooms_->history; }

@@ -42,8 +42,6 @@ class Program {
     ZEL3Variables& variables();
     ZELBas& link();
     CommandExchange& exchange();
-    /// Keyword and value of each query that the instrument has answered.
-    Event<const std::string&, const std::string&>& answers();
     TraceReader& traces();
     /// The sweeps of the last while.
     SweepHistory& history();
@@ -87,6 +85,8 @@ class Program {
     Event<> Ended;
     /// The instrument did not take a setting: the digit of its answer.
     Event<int> SettingRefused;
+    /// The instrument has answered a query: its keyword and its value.
+    Event<const std::string&, const std::string&> Answered;
 
     /// Reports the exception that is being handled and ends the program; call it inside a catch
     /// alone. A front catches what a handler, a timer or the line throws.

@@ -45,7 +45,7 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
         });
     };
     binder_.bindShow(panel_.CWGraph1, graph_, [this] { refreshGraph(); });
-    readings_.on(program_.answers(), [this](const std::string& word, const std::string& value) {
+    readings_.on(program_.Answered, [this](const std::string& word, const std::string& value) {
         if (word == kPowerReading && showsPower()) power_->take(value);
     });
     graph_->installEventFilter(this);
