@@ -31,6 +31,14 @@ std::string oneLine(const std::string& text) {
     return replaceAll(replaceAll(text, "\r", " "), "\n", " ");
 }
 
+/// The first sentence of a reason without its point; what to do stands in the remedy.
+std::string reason(const std::string& text, const std::string& path) {
+    const std::size_t from = startsWith(text, path) ? path.size() : 0;  // a name may hold points
+    std::string first = text.substr(0, text.find(". ", from));
+    if (!first.empty() && first.back() == '.') first.pop_back();
+    return first;
+}
+
 std::string bytesText(const std::string& bytes) {
     if (bytes.empty()) return "nothing";
     std::string text;
@@ -184,6 +192,14 @@ bool Doctor::openPort(const std::string& path, int baud) {
     return true;
 }
 
+void Doctor::tellNotOpened(const std::string& path) {
+    const std::string why = reason(s_.port.problem(), path);
+    const bool held = why.empty() || contains(why, "held");
+    tell(Grade::Fault, "open", why.empty() ? path + " could not be opened" : why,
+         held ? "Close the program that uses the port, then run the doctor again."
+              : "Plug the adapter out and in, or choose another port or speed.");
+}
+
 Doctor::Line Doctor::portLine() {
     return {[this](const std::string& bytes) { s_.port.output(bytes); },
             [this] { return s_.port.input(); }};
@@ -234,10 +250,7 @@ void Doctor::search(const LinkAddress& address) {
         if (stopped_) return;
         const std::string baud = std::to_string(rate);
         if (!openPort(address.port, rate)) {
-            const std::string why = s_.port.problem();
-            return tell(Grade::Fault, "open",
-                        why.empty() ? address.port + " could not be opened" : why,
-                        "Close the program that uses the port, then run the doctor again.");
+            return tellNotOpened(address.port);
         }
         const Answer answer = ask(portLine());
         if (answer.echo)
@@ -282,9 +295,7 @@ std::optional<int> Doctor::findRate(const std::string& port, const std::vector<i
 
 void Doctor::askModem(const LinkAddress& address) {
     if (!openPort(address.port, address.number > 0 ? address.number : kUsualRate)) {
-        const std::string why = s_.port.problem();
-        return tell(Grade::Fault, "open", why.empty() ? address.port + " could not be opened" : why,
-                    "Close the program that uses the port, then run the doctor again.");
+        return tellNotOpened(address.port);
     }
     const Line line = portLine();
     line.send("AT\r");
@@ -295,11 +306,13 @@ void Doctor::askModem(const LinkAddress& address) {
 }
 
 void Doctor::examineServer(const LinkAddress& address) {
-    const std::string place = address.port + ":" + std::to_string(address.number);
+    const std::string host = contains(address.port, ":") ? "[" + address.port + "]" : address.port;
+    const std::string place = host + ":" + std::to_string(address.number);
     if (s_.socket.state() == SocketState::Connected)
         return tell(Grade::Ok, "reach", "a session is under way over TCP; it was left alone");
     s_.socket.close();
-    if (address.kind == LinkAddress::Kind::Tls) {
+    const bool tls = address.kind == LinkAddress::Kind::Tls;
+    if (tls) {
         s_.socket.connectTls(address.port, address.number, address.pinned);
     } else {
         s_.socket.connectTo(address.port, address.number);
@@ -309,10 +322,12 @@ void Doctor::examineServer(const LinkAddress& address) {
         s_.events.wait(kLookMs);
     if (stopped_) return s_.socket.close();
     if (s_.socket.state() != SocketState::Connected) {
-        const std::string why = s_.socket.problem();
+        std::string why = reason(s_.socket.problem(), {});
+        if (why.empty())
+            why = std::string(tls ? "no TLS handshake" : "no answer") + " within " +
+                  std::to_string(kReachMs / 1000) + " s";
         s_.socket.close();
-        return tell(Grade::Fault, "reach",
-                    place + " cannot be reached" + (why.empty() ? "" : ": " + why),
+        return tell(Grade::Fault, "reach", place + " cannot be reached: " + why,
                     "Check the address, the port and the firewall, and that the server runs.");
     }
     tell(Grade::Ok, "reach", place + " can be reached");

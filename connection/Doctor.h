@@ -75,6 +75,7 @@ class Doctor {
     void askModem(const LinkAddress& address);
     void examineServer(const LinkAddress& address);
     bool openPort(const std::string& path, int baud);
+    void tellNotOpened(const std::string& path);
     Line portLine();
     Answer ask(const Line& line);
     std::string collect(const Line& line, int ms, int ends);

@@ -65,6 +65,36 @@ bool isFarSide(const fs::path& process, const std::string& descriptor, unsigned 
 constexpr unsigned kFirstPtsMajor = 136;
 constexpr unsigned kLastPtsMajor = 143;
 constexpr unsigned kMinorsEach = 256;
+constexpr unsigned kTerminalMajor = 4;
+constexpr unsigned kConsoles = 64;  // the first minor numbers are those of the screen
+constexpr unsigned kMasterMajor = 5;
+
+/// A serial port, or a terminal that may stand for one; known without opening it.
+bool isPort(const struct stat& status) {
+    if (!S_ISCHR(status.st_mode)) return false;
+    const unsigned owner = major(status.st_rdev);
+    const unsigned number = minor(status.st_rdev);
+    if (owner == kMasterMajor || (owner == kTerminalMajor && number < kConsoles)) return false;
+    std::error_code problem;
+    const fs::path device = "/sys/dev/char/" + std::to_string(owner) + ":" + std::to_string(number);
+    const fs::path subsystem = fs::read_symlink(device / "subsystem", problem);
+    // A pseudo terminal is not in that list.
+    return problem || subsystem.filename() == "tty";
+}
+
+/// The terminal that a process is worked from, which every user may know. Field 7 of its status
+/// has the number's parts in the order of the kernel.
+bool isWorkedFrom(const fs::path& process, const struct stat& port) {
+    const std::string text = firstLine(process / "stat");
+    const auto name = text.rfind(')');  // the name before it may hold blanks
+    if (name == std::string::npos) return false;
+    const std::vector<std::string> fields = split(text.substr(name + 1), ' ');
+    constexpr std::size_t kTerminal = 5;
+    const unsigned low = minor(port.st_rdev) & 0xFFU;
+    const unsigned high = minor(port.st_rdev) & ~0xFFU;
+    const unsigned number = low | (major(port.st_rdev) << 8U) | (high << 12U);
+    return fields.size() > kTerminal && fields[kTerminal] == std::to_string(number);
+}
 
 enum class Holds { No, Yes, Unknown };
 
@@ -76,7 +106,10 @@ Holds holds(const fs::path& process, const struct stat& port) {
     bool open = false;
     bool farSide = false;
     fs::directory_iterator at(process / "fd", problem);
-    if (problem) return fs::exists(process / "fd") ? Holds::Unknown : Holds::No;
+    if (problem) {
+        if (isWorkedFrom(process, port)) return Holds::Yes;
+        return fs::exists(process / "fd") ? Holds::Unknown : Holds::No;
+    }
     for (const fs::directory_iterator end; !problem && at != end; at.increment(problem)) {
         struct stat status {};
         if (::stat(at->path().c_str(), &status) != 0 || !S_ISCHR(status.st_mode)) continue;
@@ -130,10 +163,10 @@ PortAccess SystemPortProbe::access(const std::string& path) {
     struct stat status {};
     if (::stat(path.c_str(), &status) != 0) return access;
     access.exists = true;
-    // 4 and 5 are consoles; what looks like a terminal is asked when it can be opened.
-    access.terminal = S_ISCHR(status.st_mode);
+    access.terminal = isPort(status);
     access.usable = ::access(path.c_str(), R_OK | W_OK) == 0;
-    if ((status.st_mode & (S_IRGRP | S_IWGRP)) == (S_IRGRP | S_IWGRP)) {
+    // Nobody is to join the group of the administrator.
+    if ((status.st_mode & (S_IRGRP | S_IWGRP)) == (S_IRGRP | S_IWGRP) && status.st_gid != 0) {
         const struct group* row = ::getgrgid(status.st_gid);
         access.group = row != nullptr ? row->gr_name : std::to_string(status.st_gid);
         access.member = inGroup(status.st_gid, false);
@@ -170,7 +203,8 @@ std::vector<std::string> SystemPortProbe::modemManagers() {
     for (const auto& [number, process] : processes()) {
         const std::string name = firstLine(process / "comm");
         for (const char* known : kModemManagers)
-            if (name == known) running.push_back(name);
+            if (name == known && std::find(running.begin(), running.end(), name) == running.end())
+                running.push_back(name);
     }
     return running;
 }

@@ -102,6 +102,18 @@ TEST_F(DoctorTest, HolderThatComesInBetween_IsNotDisturbed) {
     EXPECT_FALSE(platform.port.isOpen());
 }
 
+TEST_F(DoctorTest, PortThatDoesNotOpen_IsAFaultWithTheRemedyForIt) {
+    platform.port.failOpen("/dev/tty.x. y is held by another program. Close it there.");
+    const LinkAddress odd{LinkAddress::Kind::Serial, "/dev/tty.x. y", 57600};
+    platform.portProbe.rights[odd.port] = platform.portProbe.rights[kPath];
+    EXPECT_TRUE(contains(look(platform.port, odd),
+                         "fault open: /dev/tty.x. y is held by another program; Close the program "
+                         "that uses the port, then run the doctor again.\n"));
+    platform.port.failOpen("/dev/ttyUSB0: Input/output error");
+    EXPECT_TRUE(contains(look(), "fault open: /dev/ttyUSB0: Input/output error; Plug the "));
+    EXPECT_FALSE(wrote());
+}
+
 TEST_F(DoctorTest, OwnSession_IsLeftAlone) {
     SerialSetup setup;
     setup.CommPort = kPath;
@@ -185,15 +197,18 @@ TEST_F(DoctorTest, ServerThatAnswers_IsFound) {
 
 TEST_F(DoctorTest, ServerThatCannotBeReached_IsAFault) {
     platform.tcpSocket.connectsTo(SocketState::Error);
-    platform.tcpSocket.setProblem("Connection refused");
+    platform.tcpSocket.setProblem("Connection refused.");
     EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
                          "fault reach: host:2277 cannot be reached: Connection refused; Check"));
     platform.tcpSocket.setProblem("");
     platform.tcpSocket.connectsTo(SocketState::Connecting);
     const std::int64_t begun = platform.clock.micros();
     EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
-                         "fault reach: host:2277 cannot be reached;"));
-    EXPECT_LT(platform.clock.micros() - begun, 6'000'000);
+                         "fault reach: host:2277 cannot be reached: no answer within 5 s; Check"));
+    EXPECT_TRUE(
+        contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tls, "::1", 2277}),
+                 "fault reach: [::1]:2277 cannot be reached: no TLS handshake within 5 s; Check"));
+    EXPECT_LT(platform.clock.micros() - begun, 11'000'000);
     EXPECT_FALSE(well);
 }
 
