@@ -1,7 +1,10 @@
 #pragma once
 // What the machine says of itself: system, user, language, what is installed.
 
+#include <memory>
 #include <string>
+
+#include "platform/FolderFiles.h"
 
 namespace zel {
 
@@ -27,6 +30,8 @@ class Machine {
     virtual MachineFacts facts() = 0;
     /// A variable of the environment; empty where it is not set.
     virtual std::string environment(const std::string& name) = 0;
+    /// Begins to read a folder; comes back at once.
+    virtual std::unique_ptr<FolderReading> readFolder(const std::string& folder) = 0;
 };
 
 }  // namespace zel

@@ -12,6 +12,10 @@ constexpr const char* kSpy = "SOFTWARE\\National Instruments\\NI Spy";
 constexpr const char* kSpyOptions = "SOFTWARE\\National Instruments\\NI Spy\\Options";
 constexpr const char* kSpyProgram = "NISpy.exe";
 constexpr const char* kHistoryDepth = "1000";
+// A disk that is slow must not hold the window: what takes longer comes when it is there.
+constexpr int kLoadMs = 60;
+constexpr int kLookMs = 50;
+constexpr std::int64_t kCopyMicros = 3'000'000;
 
 struct Part {
     Button AboutForm::*key;
@@ -50,12 +54,36 @@ AboutBox::AboutBox(AboutForm& form, const Services& services, const std::string&
     handlers_.on(form_.ButtonOK.Clicked, [this] { form_.Hide(); });
 }
 
+AboutBox::~AboutBox() { stopWaiting(); }
+
 void AboutBox::show() {
-    if (!form_.Visible) showModalForm(form_, s_.events);
+    if (form_.Visible) return;
+    showModalForm(form_, s_.events);
+    stopWaiting();
+}
+
+void AboutBox::stopWaiting() {
+    if (task_ != 0) s_.events.cancel(task_);
+    task_ = 0;
 }
 
 void AboutBox::load() {
-    report_ = makeSupportReport({s_.machine, s_.files, s_.clock, registry_});
+    folders_.emplace(s_.machine, registry_);
+    const bool whole = folders_->read(kLoadMs);
+    fill();
+    if (!whole) awaitFolders();
+}
+
+void AboutBox::awaitFolders() {
+    stopWaiting();
+    task_ = s_.events.schedule(kLookMs, [this] {
+        task_ = 0;
+        folders_->read(0) ? fill() : awaitFolders();
+    });
+}
+
+void AboutBox::fill() {
+    report_ = makeSupportReport({s_.machine, s_.clock, *folders_});
     form_.TitleLabel.Caption = kProgramTitle;
     form_.VersionLabel.Caption = "Version " + versionText(kVersion);
     form_.LicenceLabel.Caption =
@@ -67,6 +95,16 @@ void AboutBox::load() {
 }
 
 void AboutBox::CreateSupportString_Click() {
+    // The text is to be whole; the window goes on meanwhile, and closing it ends the wait.
+    const bool shown = form_.Visible;
+    if (!folders_) load();
+    form_.CreateSupportString.Enabled = false;
+    const std::int64_t until = s_.clock.micros() + kCopyMicros;
+    while (form_.Visible == shown && !folders_->read(kLoadMs) && s_.clock.micros() < until)
+        s_.events.wait(kLookMs);
+    form_.CreateSupportString.Enabled = true;
+    if (form_.Visible != shown) return;
+    fill();
     s_.clipboard.setText(report_.whole());
     s_.boxes.show({BoxIcon::Information,
                    "Support information copied to clipboard." + std::string(kCrLf) +

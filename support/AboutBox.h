@@ -1,12 +1,14 @@
 #pragma once
 // The window about the program: its title and version, and the support report.
 
+#include <optional>
 #include <string>
 
 #include "forms/SupportForms.h"
 #include "platform/Events.h"
 #include "platform/MessageBox.h"
 #include "platform/Services.h"
+#include "support/DriverFolders.h"
 #include "support/SupportReport.h"
 #include "support/cRegistry.h"
 
@@ -28,11 +30,16 @@ class AboutBox {
     AboutBox(const AboutBox&) = delete;
     AboutBox& operator=(const AboutBox&) = delete;
 
+    ~AboutBox();
+
     /// Shows the window modally; comes back when it is closed.
     void show();
 
   private:
     void load();
+    void fill();
+    void awaitFolders();
+    void stopWaiting();
     void CreateSupportString_Click();
     void StartNISpy_Click();
     std::string spyText(const std::string& section, const std::string& name);
@@ -41,7 +48,9 @@ class AboutBox {
     AboutForm& form_;
     Services s_;
     cRegistry registry_;
+    std::optional<DriverFolders> folders_;  ///< of the report that is shown
     SupportReport report_;
+    TaskId task_ = 0;
     Handlers handlers_;
 };
 

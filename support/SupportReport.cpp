@@ -1,24 +1,19 @@
 #include "support/SupportReport.h"
 
-#include <algorithm>
 #include <vector>
 
 #include "platform/MessageBox.h"
-#include "support/RegAccess.h"
+#include "support/DriverFolders.h"
 #include "support/SupportAddress.h"
 #include "support/Text.h"
 #include "support/VersionInfo.h"
-#include "support/cRegistry.h"
 
 namespace zel {
 namespace {
 
 constexpr std::size_t kColumn = 20;  // where the values begin
-constexpr std::size_t kMostListed = 100;
-constexpr std::size_t kMostLooked = 1000;  // of a folder; a slow disk must not hold the window
 constexpr const char* kNotInstalled = "not installed";
 constexpr const char* kUnknown = "unknown";
-constexpr const char* kNone = "none";
 
 constexpr const char* kLegalNotes[] = {
     "ZELRemote is free software: you can redistribute it and/or modify",
@@ -47,28 +42,6 @@ std::string installedText(const Clock& clock, double date) {
     const std::vector<std::string> parts = split(clock.Clock::dateText(date), '-');
     if (parts.size() != 3) return kUnknown;
     return parts[2] + "." + parts[1] + "." + parts[0] + " " + clock.Clock::timeText(date);
-}
-
-/// The files of a folder, which may be empty for none.
-std::string listOf(const std::string& name, FileService& files, const std::string& folder) {
-    std::vector<std::string> found;
-    if (!folder.empty()) found = files.list(folder);
-    const auto most = std::min(found.size(), kMostLooked);
-    std::partial_sort(found.begin(), found.begin() + static_cast<std::ptrdiff_t>(most),
-                      found.end());
-    std::string text;
-    std::size_t shown = 0;
-    std::size_t looked = 0;
-    for (const std::string& file : found) {
-        if (shown == kMostListed || looked == most) break;
-        ++looked;
-        if (file.front() == '.' || !files.stat(folder + "/" + file).isRegular()) continue;
-        text += file + kCrLf;
-        ++shown;
-    }
-    if (looked < found.size())
-        text += "and " + std::to_string(found.size() - looked) + " more" + kCrLf;
-    return title(name) + (text.empty() ? kNone + std::string(kCrLf) : text);
 }
 
 std::string systemPart(const ReportSources& s, const MachineFacts& facts) {
@@ -103,19 +76,7 @@ std::string driverPart(const ReportSources& s, const MachineFacts& facts) {
         facts.visa.empty() ? std::string("VISA IS NOT INSTALLED") + kCrLf : row("VISA", facts.visa);
     text += row("Secondary VISA", kNotInstalled);
     text += row("Instrument drivers", kNotInstalled);
-    std::string framework =
-        readRegistryText(s.registry, HKEY_LOCAL_MACHINE,
-                         "SOFTWARE\\VXIPNP_Alliance\\VXIPNP\\CurrentVersion", "FrameworkPath", "");
-    if (framework.empty()) framework = s.machine.environment("FRAMEWORK_PATH");
-    std::string ivi =
-        readRegistryText(s.registry, HKEY_LOCAL_MACHINE,
-                         "SOFTWARE\\Microsoft\\Windows\\CurrentVersion", "ProgramFilesDir", "");
-    if (ivi.empty()) ivi = s.machine.environment("ProgramFilesDir");
-    if (!ivi.empty()) ivi += "/IVI/Bin";
-    text += kCrLf + listOf("VXI plug and play drivers", s.files, framework);
-    text += kCrLf + listOf("IVI drivers", s.files, ivi);
-    text += kCrLf + listOf("USB drivers", s.files, s.machine.environment("USB_DRIVER_PATH"));
-    return text + kCrLf;
+    return text + s.folders.text() + kCrLf;
 }
 
 std::string legalPart() {

@@ -4,12 +4,11 @@
 #include <string>
 
 #include "platform/Clock.h"
-#include "platform/Files.h"
 #include "platform/Machine.h"
 
 namespace zel {
 
-class cRegistry;
+class DriverFolders;
 
 /// The parts that the window shows and hides one by one. Lines end with CR LF; values begin in one
 /// column.
@@ -23,9 +22,8 @@ struct SupportReport {
 
 struct ReportSources {
     Machine& machine;
-    FileService& files;
     const Clock& clock;
-    cRegistry& registry;
+    DriverFolders& folders;
 };
 
 SupportReport makeSupportReport(const ReportSources& sources);

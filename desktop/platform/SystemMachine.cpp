@@ -11,6 +11,7 @@
 #include <clocale>
 #include <ctime>
 
+#include "desktop/platform/FolderThread.h"
 #include "support/Text.h"
 
 namespace zel {
@@ -78,6 +79,10 @@ void nameRuntime(MachineFacts& facts) {
 
 std::string SystemMachine::environment(const std::string& name) {
     return qgetenv(name.c_str()).toStdString();
+}
+
+std::unique_ptr<FolderReading> SystemMachine::readFolder(const std::string& folder) {
+    return readInThread(folder);
 }
 
 MachineFacts SystemMachine::facts() {

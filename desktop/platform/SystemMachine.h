@@ -9,6 +9,7 @@ class SystemMachine : public Machine {
   public:
     MachineFacts facts() override;
     std::string environment(const std::string& name) override;
+    std::unique_ptr<FolderReading> readFolder(const std::string& folder) override;
 };
 
 }  // namespace zel

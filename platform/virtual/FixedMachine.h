@@ -1,17 +1,23 @@
 #pragma once
 // A machine and serial ports of the tests' own making.
 
+#include <algorithm>
 #include <map>
+#include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "platform/Machine.h"
 #include "platform/PortProbe.h"
+#include "platform/virtual/VirtualTime.h"
 
 namespace zel {
 
 class FixedMachine : public Machine {
   public:
+    FixedMachine(FileService& files, VirtualClock& clock) : files_(files), clock_(clock) {}
+
     MachineFacts known = virtualSystem();
     std::map<std::string, std::string> variables;
     MachineFacts facts() override { return known; }
@@ -20,7 +26,29 @@ class FixedMachine : public Machine {
         return found == variables.end() ? std::string() : found->second;
     }
 
+    /// Milliseconds that a folder takes; those that have no entry take no time.
+    std::map<std::string, int> slow;
+    std::unique_ptr<FolderReading> readFolder(const std::string& folder) override {
+        return std::make_unique<Reading>(filesOf(files_, folder), clock_, slow[folder]);
+    }
+
   private:
+    class Reading : public FolderReading {
+      public:
+        Reading(FolderFiles found, VirtualClock& clock, int ms)
+            : found_(std::move(found)), clock_(clock), end_(clock.micros() + ms * 1000LL) {}
+        const FolderFiles* result(int ms) override {
+            const std::int64_t left = end_ - clock_.micros();
+            if (left > 0) clock_.advanceMicros(std::min<std::int64_t>(left, ms * 1000LL));
+            return clock_.micros() >= end_ ? &found_ : nullptr;
+        }
+
+      private:
+        FolderFiles found_;
+        VirtualClock& clock_;
+        std::int64_t end_;
+    };
+
     static MachineFacts virtualSystem() {
         MachineFacts facts;
         facts.operatingSystem = "Virtual System 1";
@@ -28,6 +56,9 @@ class FixedMachine : public Machine {
         facts.runtimeVersion = "1.0";
         return facts;
     }
+
+    FileService& files_;
+    VirtualClock& clock_;
 };
 
 class FixedProbe : public PortProbe {

@@ -31,7 +31,7 @@ struct VirtualPlatform {
     QueuedFileDialogs fileDialogs;
     VirtualFiles files{clock};
     Signals endSignals;
-    FixedMachine machine;
+    FixedMachine machine{files, clock};
     FixedProbe portProbe;
 
     /// The bundle with the scripted port.

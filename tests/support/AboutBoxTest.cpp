@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "platform/virtual/VirtualPlatform.h"
 #include "support/AboutBox.h"
 #include "support/Text.h"
@@ -117,6 +119,79 @@ TEST_F(AboutBoxTest, CopiedText_IsWholeWhateverIsShown) {
     EXPECT_EQ(platform.boxes.texts(),
               Texts{"Support information copied to clipboard.\r\nUse <CTRL-V> to paste the "
                     "information in your mail program or a text editor."});
+}
+
+constexpr const char* kLists =
+    "*** VXI plug and play drivers ***\r\n/slow is still being read\r\n\r\n"
+    "*** IVI drivers ***\r\nnone\r\n\r\n"
+    "*** USB drivers ***\r\na.rules\r\n\r\n";
+
+struct SlowFolderTest : AboutBoxTest {
+    SlowFolderTest() {
+        platform.machine.variables["FRAMEWORK_PATH"] = "/slow";
+        platform.machine.variables["USB_DRIVER_PATH"] = "/usb";
+        platform.files.put("/slow/b.dll", "");
+        platform.files.put("/usb/a.rules", "");
+        platform.machine.slow["/slow"] = 1500;
+    }
+};
+
+TEST_F(SlowFolderTest, Window_OpensAtOnceAndIsFilledLater) {
+    std::string first;
+    form.Changed.connect([&] {
+        if (first.empty() && form.Visible) first = form.DriverInfo.Text;
+    });
+    std::string later;
+    platform.events.schedule(2000, [&] {
+        later = form.DriverInfo.Text;
+        form.ButtonOK.Click();
+    });
+    std::int64_t longest = 0;
+    std::int64_t last = platform.clock.micros();
+    std::function<void()> beat = [&] {
+        longest = std::max(longest, platform.clock.micros() - last);
+        last = platform.clock.micros();
+        platform.events.schedule(1, beat);
+    };
+    beat();
+    about.show();
+    EXPECT_LT(longest, 100'000) << "the window was held";
+    EXPECT_TRUE(contains(first, kLists)) << first;
+    EXPECT_TRUE(contains(later, "drivers ***\r\nb.dll\r\n\r\n*** IVI")) << later;
+}
+
+TEST_F(SlowFolderTest, CopiedText_WaitsForTheFolder) {
+    show([this] { form.CreateSupportString.Click(); });
+    EXPECT_TRUE(contains(platform.clipboard.text(), "drivers ***\r\nb.dll\r\n\r\n*** IVI"));
+    EXPECT_EQ(platform.boxes.texts().size(), 1U);
+    EXPECT_TRUE(form.CreateSupportString.Enabled);
+}
+
+TEST_F(SlowFolderTest, FolderThatNeverComes_IsSaidToBeMissingInTheCopiedText) {
+    platform.machine.slow["/slow"] = 100'000'000;
+    show([this] { form.CreateSupportString.Click(); });
+    EXPECT_TRUE(contains(platform.clipboard.text(), kLists)) << platform.clipboard.text();
+    EXPECT_EQ(platform.boxes.texts().size(), 1U);
+    EXPECT_LT(platform.clock.micros(), 4'000'000);
+    EXPECT_EQ(platform.events.pending(), 0U) << "nobody looks at it any more";
+}
+
+TEST_F(SlowFolderTest, WindowThatIsClosed_CopiesNothing) {
+    platform.events.schedule(500, [this] { form.ButtonOK.Click(); });
+    platform.events.schedule(10, [this] { form.CreateSupportString.Click(); });
+    about.show();
+    EXPECT_EQ(platform.clipboard.text(), "");
+    EXPECT_TRUE(platform.boxes.texts().empty());
+    EXPECT_LT(platform.clock.micros(), 700'000);
+}
+
+TEST_F(AboutBoxTest, LongFolder_ListsItsFirstThousandFiles) {
+    platform.machine.variables["USB_DRIVER_PATH"] = "/usb";
+    for (int i = 0; i < 1010; ++i) platform.files.put("/usb/f" + std::to_string(10'000 + i), "");
+    show();
+    const std::string text = form.DriverInfo.Text;
+    EXPECT_TRUE(contains(text, "f10000\r\nf10001\r\n"));
+    EXPECT_TRUE(contains(text, "f10999\r\nand 10 more\r\n"));
 }
 
 TEST_F(AboutBoxTest, Spy_IsAskedForAndStartedWithItsOptions) {
