@@ -4,6 +4,8 @@ set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME zelremote)
 set(CPACK_PACKAGE_VENDOR "The ZELRemote developers")
 set(CPACK_PACKAGE_CONTACT "The ZELRemote developers <support@zelremote.example>")
+# Each package has a summary of its own.
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "")
 set(CPACK_PACKAGE_HOMEPAGE_URL "https://zelremote.example")
 set(CPACK_PACKAGING_INSTALL_PREFIX "/usr")
 set(CPACK_PACKAGE_DIRECTORY "${PROJECT_BINARY_DIR}/packages")
@@ -52,7 +54,8 @@ zel_package(server zelremote-server science "server for a ZEL3 spectrum analyser
 "A unit that serves the instrument at a serial port over TCP, as
 zelremote-server@ttyUSB0, and a udev rule that keeps modem managers off the
 port.")
-set(CPACK_DEBIAN_SERVER_PACKAGE_DEPENDS "zelremote-cli ${same}, udev")
+set(CPACK_DEBIAN_SERVER_PACKAGE_DEPENDS "zelremote-cli ${same}")
+set(CPACK_DEBIAN_SERVER_PACKAGE_RECOMMENDS udev)  # a container has the ports without it
 set(CPACK_DEBIAN_SERVER_PACKAGE_ARCHITECTURE all)
 set(CPACK_DEBIAN_SERVER_PACKAGE_SHLIBDEPS OFF)
 file(COPY_FILE "${PROJECT_SOURCE_DIR}/packaging/debian/udev.postinst"

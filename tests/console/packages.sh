@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# Packs the build into Debian packages, unpacks them into a fresh root and runs the programs from
-# there, with no display.
+# Packs the build into Debian packages, installs them into a fresh root, runs the programs from
+# there, with no display, and takes the packages away again.
 #
 #   packages.sh CPACK BUILD_FOLDER
 set -euo pipefail
@@ -17,11 +17,25 @@ for name in zelremote zelremote-cli zelremote-draw zelremote-server; do
     package=$(echo "$scratch/packages/${name}_"*.deb)
     [ -f "$package" ] || fail "there is no package $name"
     dpkg-deb -f "$package" Package Version Depends Description > "$scratch/$name.control"
-    mkdir -p "$scratch/$name"
-    dpkg -x "$package" "$scratch/$name"
-    dpkg -x "$package" "$scratch/root"
+done
+if [ "$(sed -n 's/^Description: //p' "$scratch/"*.control | sort -u | wc -l)" != 4 ]; then
+    fail "the packages have no summaries of their own"
+fi
+
+# The root knows the packages of this machine, so that each dependency has to be met.
+mkdir -p "$scratch/root/var/lib/dpkg/info" "$scratch/root/var/lib/dpkg/updates"
+cp /var/lib/dpkg/status "$scratch/root/var/lib/dpkg/status"
+in_root() {
+    dpkg --root="$scratch/root" --force-not-root --force-bad-path --force-script-chrootless \
+        --no-pager "$@" > "$scratch/dpkg" 2>&1 ||
+        { grep -v 'files list file' "$scratch/dpkg"; fail "dpkg $1"; }
+}
+in_root --install "$scratch/packages/"*.deb
+for name in zelremote zelremote-cli zelremote-draw zelremote-server; do
+    state=$(dpkg-query --admindir="$scratch/root/var/lib/dpkg" -W -f '${db:Status-Status}' "$name")
+    [ "$state" = installed ] || fail "$name is $state"
     for document in copyright changelog.gz; do
-        [ -s "$scratch/$name/usr/share/doc/$name/$document" ] || fail "$name has no $document"
+        [ -s "$scratch/root/usr/share/doc/$name/$document" ] || fail "$name has no $document"
     done
 done
 if grep -qiE 'widgets|gui|svg|qcustomplot|qscintilla' \
@@ -111,3 +125,7 @@ fi
 if command -v lintian > /dev/null; then
     lintian --fail-on error "$scratch/packages/"*.deb 2> /dev/null
 fi
+
+in_root --purge zelremote zelremote-server zelremote-draw zelremote-cli
+left=$(find "$scratch/root/" ! -type d ! -path '*/var/lib/dpkg/*')
+[ -z "$left" ] || fail "left after the removal: $left"
