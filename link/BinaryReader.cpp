@@ -126,8 +126,8 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         // last bytes still belong to the samples.
         chunk.erase(0, std::min(ofStatus, chunk.size()));
         result += chunk;
-        if (result.size() + 2 >= wanted && result.size() < wanted)
-            result += takeTail(wanted - result.size());
+        cut();
+        if (result.size() + 2 >= wanted) result += takeTail(wanted - result.size());
         cut();
     }
     state_.TCPDataArrived = false;

@@ -77,7 +77,7 @@ BinaryTrace::Outcome BinaryTrace::readOnce(RawTrace& trace, bool doubleBlock, bo
     link_.WriteToLink("GET\r");
     delay(DelayPlace::AfterTraceGet);
     int status = statusNumber(reader_.ReadModeStatus());
-    if (state_.ExchangeFailed || !reader_.answered()) return Outcome::Failed;
+    if (!reader_.answered()) return Outcome::Failed;
     if (status != 0) {
         startingError(status, "TRACEBIN");
         return Outcome::Done;
@@ -153,7 +153,7 @@ BinaryTrace::Outcome BinaryTrace::readComplexOnce(std::vector<double>& values, b
     link_.WriteToLink("GET\r");
     delay(DelayPlace::AfterComplexGet);
     int status = statusNumber(reader_.ReadModeStatus());
-    if (state_.ExchangeFailed || !reader_.answered()) return Outcome::Failed;
+    if (!reader_.answered()) return Outcome::Failed;
     if (status != 0) {
         startingError(status, "CTRACEBIN");
         return Outcome::Done;

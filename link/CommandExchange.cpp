@@ -135,7 +135,7 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
         session_.events.wait(kRetryPauseMs);
         answer = reader_.ReadModeStatus();
     }
-    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    if (!reader_.answered()) return false;
     const int status = statusNumber(answer);
     if (status != 0) return refuseCommand(keyword, status, t0);
     link_.WriteToLink(keyword + "\r");
@@ -159,14 +159,13 @@ bool CommandExchange::triggeredDialogue(const std::string& keyword, std::int32_t
     delay(DelayPlace::AfterModeWord);
     state_.InputBuffer.clear();
     const std::string answer = reader_.ReadAnswerTriggered(timeoutSeconds);
-    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    if (!reader_.answered()) return false;
     const int status = answer.empty() ? -1 : statusNumber(answer);
     if (status != 0) return refuseCommand(keyword, status, t0);
     link_.WriteToLink(keyword + "\r");
     delay(DelayPlace::AfterCmdKeyword);
     const int result = statusNumber(reader_.ReadAnswerTriggered(timeoutSeconds));
-    return reader_.answered() && finishCommand(keyword, answer, result, t0) &&
-           !state_.ExchangeFailed;
+    return reader_.answered() && finishCommand(keyword, answer, result, t0);
 }
 
 bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
@@ -179,7 +178,7 @@ bool CommandExchange::SetInstrument(const std::string& keywordAndValue) {
     link_.WriteToLink("set\r");
     delay(DelayPlace::AfterModeWord);
     int status = statusNumber(reader_.ReadModeStatus());
-    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    if (!reader_.answered()) return false;
     if (status != 0) {
         report(status, keywordAndValue);
         finishLine("SET", keywordAndValue, t0);
@@ -209,7 +208,7 @@ bool CommandExchange::GetInstrument(const std::string& keyword, std::string& val
     link_.WriteToLink("GET\r");
     delay(DelayPlace::AfterModeWord);
     int status = statusNumber(reader_.ReadModeStatus());
-    if (state_.ExchangeFailed || !reader_.answered()) return false;
+    if (!reader_.answered()) return false;
     if (status != 0) {
         session_.boxes.show(
             {BoxIcon::Information,

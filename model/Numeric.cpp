@@ -81,7 +81,7 @@ double lengthFactor(std::string_view text, std::string& unit) {
 double scaledNumber(const std::string& text, std::size_t stop, double factor) {
     // Without a prefix the whole text has to be a number.
     const std::string number = factor == 1 ? text : text.substr(0, stop);
-    double value = 0;
+    double value{};
     if (!IsNumericText(number) || !parsePlainNumber(number, value)) return 0;
     return value * factor;
 }
@@ -133,7 +133,7 @@ double ParseLength(const std::string& text, std::string& unit) {
     const std::size_t stop = materialEnd(plain);
     const double factor = lengthFactor(std::string_view(plain).substr(stop), unit);
     const std::string number = factor == 1 ? plain : plain.substr(0, stop);
-    double value = 0;
+    double value{};
     if (!IsNumericText(number)) return 0;
     if (!parsePlainNumber(number, value)) throw std::invalid_argument(plain);
     return value * factor;

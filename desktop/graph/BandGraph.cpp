@@ -22,15 +22,12 @@ double between(double from, double to, double share) { return from + (to - from)
 
 BandGraph::BandGraph(QCPAxis* x, QCPAxis* y) : QCPGraph(x, y) { setAdaptiveSampling(false); }
 
-void BandGraph::drawFill(QCPPainter* painter, QVector<QPointF>* lines) const {
+QVector<QRect> BandGraph::columns(double scale) const {
     const QCPGraph* lower = channelFillGraph();
-    const double scale = painter->deviceTransform().m11();
-    if (lower == nullptr || painter->modes().testFlag(QCPPainter::pmVectorized) || scale <= 0)
-        return QCPGraph::drawFill(painter, lines);
     const QCPRange seen = keyAxis()->range();
     const auto first = data()->findBegin(seen.lower);
     const auto last = data()->findEnd(seen.upper);
-    if (first == last) return;
+    if (first == last) return {};
     // From here on in pixels of the device, so that each column is a rectangle of whole pixels.
     const QRectF area(QRectF(clipRect()).topLeft() * scale, QRectF(clipRect()).size() * scale);
     const auto edgeAt = [&](QCPGraphDataContainer::const_iterator at) {
@@ -41,8 +38,8 @@ void BandGraph::drawFill(QCPPainter* painter, QVector<QPointF>* lines) const {
         return Edge{keyAxis()->coordToPixel(at->key) * scale, pixel(at->value),
                     index < lower->dataCount() ? pixel(lower->dataMainValue(index)) : qQNaN()};
     };
-    QVector<QRect> columns;
-    columns.reserve(static_cast<qsizetype>(area.width()) + (last - first));
+    QVector<QRect> all;
+    all.reserve(static_cast<qsizetype>(area.width()) + (last - first));
     Edge left = edgeAt(first);
     for (auto at = first + 1; at != last; ++at) {
         const Edge right = edgeAt(at);
@@ -55,17 +52,25 @@ void BandGraph::drawFill(QCPPainter* painter, QVector<QPointF>* lines) const {
                     width > 0 ? std::clamp((x + 0.5 - left.x) / width, 0.0, 1.0) : 0;
                 const int high = qRound(between(left.high, right.high, share));
                 const int low = qRound(between(left.low, right.low, share));
-                columns.push_back(QRect(x, std::min(high, low), 1, std::abs(low - high)));
+                all.push_back(QRect(x, std::min(high, low), 1, std::abs(low - high)));
             }
         }
         left = right;
     }
+    return all;
+}
+
+void BandGraph::drawFill(QCPPainter* painter, QVector<QPointF>* lines) const {
+    const double scale = painter->deviceTransform().m11();
+    if (channelFillGraph() == nullptr || painter->modes().testFlag(QCPPainter::pmVectorized) ||
+        scale <= 0)
+        return QCPGraph::drawFill(painter, lines);
     painter->save();
     painter->setAntialiasing(false);
     painter->scale(1 / scale, 1 / scale);
     painter->setPen(Qt::NoPen);
     painter->setBrush(brush());
-    painter->drawRects(columns);
+    painter->drawRects(columns(scale));
     painter->restore();
 }
 

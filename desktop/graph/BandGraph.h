@@ -11,6 +11,10 @@ class BandGraph : public QCPGraph {
   public:
     BandGraph(QCPAxis* x, QCPAxis* y);
 
+    /// The columns of the fill that are seen, in pixels of a device that has `scale` pixels a pixel
+    /// of the widget; none beside a point that did not come. Needs the channel fill graph.
+    QVector<QRect> columns(double scale) const;
+
   protected:
     void drawFill(QCPPainter* painter, QVector<QPointF>* lines) const override;
 };

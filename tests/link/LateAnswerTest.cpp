@@ -120,6 +120,21 @@ TEST_F(Line, RestOfATransfer_InsideTheNextQuery_IsNotTakenForIts) {
     expectPlayed();
 }
 
+TEST_F(Line, LateAnswer_BeforeTheNextOne_LeavesTheDigitOfTheLastLine) {
+    for (const char* late : {"0\r", "3\r7\r"}) {
+        state.AnswerOverdue = true;
+        port.expect("cmd\r").answer(late).answer("0\r4\r").after(100);
+        link.WriteToLink("cmd\r");
+        EXPECT_EQ(reader.ReadAnswer(), "4");
+        EXPECT_EQ(state.InputBuffer, "");
+    }
+    state.AnswerOverdue = true;
+    port.expect("cmd\r").answer("\r");  // an empty line has none
+    link.WriteToLink("cmd\r");
+    EXPECT_EQ(reader.ReadAnswer(), "");
+    expectPlayed();
+}
+
 TEST_F(Line, AfterATimeOut_OneExchangeLooksForTheLateAnswerAndNoOther) {
     port.expect("set\r").silence();
     exchangeOf("set", "RBW,1", "0\r");

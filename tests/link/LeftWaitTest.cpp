@@ -68,6 +68,9 @@ TEST_F(LeftWait, WhileConnecting_TheAttemptIsOverAndNothingIsTold) {
     reader.AttemptAbandoned.connect([&] { ++abandoned; });
     port.expect("\r").silence();
     link.WriteToLink("\r");
+    showConnectingStep(forms, "Port open");
+    std::string step;
+    events.schedule(2500, [&] { step = dialog.AdviceLabel.Caption; });
     leaveAfter(3000);
     const std::int64_t ms = time([&] {
         const DialogueScope scope(state);
@@ -75,6 +78,8 @@ TEST_F(LeftWait, WhileConnecting_TheAttemptIsOverAndNothingIsTold) {
     });
     EXPECT_LE(ms, 3050);
     EXPECT_EQ(abandoned, 1);
+    EXPECT_EQ(step, "Port open, 2 of 9 s");
+    EXPECT_EQ(dialog.AdviceLabel.Caption.get(), "Port open");
     EXPECT_EQ(shown(), Texts{});
 }
 

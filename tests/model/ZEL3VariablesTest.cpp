@@ -54,6 +54,7 @@ TEST(GetLazyQueryTest, LongSession_DoesNotWrapTheCounter) {
     ZEL3Variables mirror;
     mirror.GetLazyQuery("BW");
     for (int i = 0; i < 70000; ++i) ASSERT_TRUE(mirror.GetLazyQuery("BW")) << i;
+    EXPECT_EQ(mirror.MenuVisitCount.at(3), 2);
 }
 
 TEST(ChannelPowerUnitTextTest, Codes_GiveTheirUnits) {

@@ -3,6 +3,7 @@
 #include <limits>
 #include <vector>
 
+#include "desktop/graph/BandGraph.h"
 #include "desktop/graph/GraphColors.h"
 #include "tests/desktop/WindowTest.h"
 
@@ -26,6 +27,20 @@ struct BandGraphTest : WindowTest {
         graph.setYRange(-120, -20);
         graph.plotY(values, 0, kStop / (kValues - 1));
         show();  // with a trace the ways to begin go from the graph
+    }
+    /// The columns between two places of the axis.
+    QVector<QRect> columns(double from, double to) {
+        window->graph().drawNow();
+        const BandGraph* band = nullptr;
+        for (int i = 0; i < window->graph().graphCount() && band == nullptr; ++i)
+            band = dynamic_cast<const BandGraph*>(window->graph().graph(i));
+        if (band == nullptr) return {};
+        QVector<QRect> found = band->columns(1);
+        const QCPAxis& axis = *window->graph().xAxis;
+        found.removeIf([&](const QRect& column) {
+            return column.x() < axis.coordToPixel(from) || column.x() >= axis.coordToPixel(to);
+        });
+        return found;
     }
     bool filled(double x, double level) {
         window->graph().drawNow();
@@ -52,6 +67,10 @@ TEST_F(BandGraphTest, PointsThatDidNotCome_AreNotFilled) {
     EXPECT_FALSE(filled(1.452e9, -73));
     EXPECT_TRUE(filled(1.372e9, -73));
     EXPECT_TRUE(filled(1.532e9, -73));
+    // No number, no rectangle, wherever it would stand.
+    EXPECT_GT(columns(1.3e9, 1.38e9).size(), 10);
+    EXPECT_TRUE(columns(1.401e9, 1.499e9).isEmpty());
+    EXPECT_GT(columns(1.52e9, 1.6e9).size(), 10);
 }
 
 TEST_F(BandGraphTest, CloserView_IsFilledBetweenItsPointsToBothEdges) {

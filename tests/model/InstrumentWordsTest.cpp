@@ -54,6 +54,7 @@ TEST(InstrumentWords, Codes_AreNamedFromTheProgramsTables) {
     const auto rows = table();
     EXPECT_EQ(wordLine(*rows.at("TRACEDET")),
               "TRACEDET\tDetector\t\t0 Auto Peak, 1 Min Peak, 2 Max Peak, 3 Sample, 4 RMS");
+    EXPECT_EQ(wordValues(*rows.at("SWPCONT")), "0 Single, 1 Continuous");
     EXPECT_EQ(wordLine(*rows.at("SPAN")), "SPAN\tSpan; 0 for zero span\tHz\t0 to 3000000000");
 }
 
