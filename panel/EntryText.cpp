@@ -118,7 +118,6 @@ bool groupsThousands(std::string_view number) {
     for (std::size_t at = last; at < point; at = last) {
         last = std::min(number.find(',', at + 1), point);
         if (last - at != 4) return false;
-        if (last == point) break;
     }
     return number.find(',', point) == std::string_view::npos;
 }

@@ -42,11 +42,8 @@ void MenuFill::ask(const SoftPosition& position) {
     if (!answered(position.word, answer)) return;
     const MirrorField field = position.fieldToFill();
     const bool isText = std::holds_alternative<std::string ZEL3Variables::*>(field);
-    if (isText || startsWithNumber(answer)) {
+    if (isText || startsWithNumber(answer))
         storeField(mirror_, field, leadingNumber(answer), answer);
-    } else if (field.index() != 0) {
-        mirror_.Unsure.answered(position.word, answer);
-    }
     if (position.state == CF::OCCBW && position.key == 0)
         mirror_.OccBWValueCopy = mirror_.OccBWValue;
 }

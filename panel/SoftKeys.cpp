@@ -4,13 +4,9 @@
 
 namespace zel {
 
-SoftKeys::SoftKeys(ControllerForm& panel, SoftPanel& softPanel, Z9GetCommands& queries,
-                   Z9SetCommands& settings, const Interlock& interlock)
-    : panel_(panel),
-      softPanel_(softPanel),
-      queries_(queries),
-      settings_(settings),
-      interlock_(interlock) {
+SoftKeys::SoftKeys(ControllerForm& panel, Z9GetCommands& queries, Z9SetCommands& settings,
+                   const Interlock& interlock)
+    : panel_(panel), queries_(queries), settings_(settings), interlock_(interlock) {
     for (int i = 0; i < panel_.SoftKey.count(); ++i) {
         handlers_.on(panel_.SoftKey(i).Clicked, [this, i] { SoftKey_Click(i); });
         handlers_.on(panel_.SoftTextBox(i).KeyPress,
@@ -24,7 +20,6 @@ SoftKeys::SoftKeys(ControllerForm& panel, SoftPanel& softPanel, Z9GetCommands& q
 void SoftKeys::SoftKey_Click(int index) {
     if (interlock_.refuses(panel_.SoftKey(index))) return;
     const Hourglass busy(panel_, interlock_.session().events);
-    softPanel_.SetSoftButtonsColor(index);
     queries_.press(index);
 }
 

@@ -2,7 +2,6 @@
 // The five soft positions: keys, boxes and lists.
 
 #include "forms/ControllerForm.h"
-#include "panel/SoftPanel.h"
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
 #include "trace/Interlock.h"
@@ -12,8 +11,8 @@ namespace zel {
 class SoftKeys {
   public:
     /// Connects keys, boxes and lists.
-    SoftKeys(ControllerForm& panel, SoftPanel& softPanel, Z9GetCommands& queries,
-             Z9SetCommands& settings, const Interlock& interlock);
+    SoftKeys(ControllerForm& panel, Z9GetCommands& queries, Z9SetCommands& settings,
+             const Interlock& interlock);
 
     void SoftKey_Click(int index);
     /// Enter sets the value of the position; other characters go into the box.
@@ -25,7 +24,6 @@ class SoftKeys {
 
   private:
     ControllerForm& panel_;
-    SoftPanel& softPanel_;
     Z9GetCommands& queries_;
     Z9SetCommands& settings_;
     const Interlock& interlock_;

@@ -72,6 +72,7 @@ Z9GetCommands::Quirk Z9GetCommands::quirk(KeyQuirk which) {
 }
 
 void Z9GetCommands::press(int index) {
+    routines_.softPanel.SetSoftButtonsColor(index);
     for (const SoftPosition& position : softPositions()) {
         if (position.state != panel_.State || position.key != index) continue;
         if (const Quirk does = quirk(position.onKey)) {
@@ -137,8 +138,7 @@ void Z9GetCommands::edgeFrequency(int index, double direction) {
 void Z9GetCommands::startFrequency(int index) { edgeFrequency(index, -1); }
 void Z9GetCommands::stopFrequency(int index) { edgeFrequency(index, 1); }
 
-void Z9GetCommands::fullSpan(int index) {
-    routines_.softPanel.SetSoftButtonsColor(index);
+void Z9GetCommands::fullSpan(int /*index*/) {
     const bool accepted = exchange_.SetInstrument("SPAN," + WireNumber(kFullSpan));
     mirror_.CenterFrequency = kFullCentre;
     mirror_.Span = kFullSpan;
@@ -149,8 +149,7 @@ void Z9GetCommands::fullSpan(int index) {
     readTrace();
 }
 
-void Z9GetCommands::zeroSpan(int index) {
-    routines_.softPanel.SetSoftButtonsColor(index);
+void Z9GetCommands::zeroSpan(int /*index*/) {
     const bool accepted = exchange_.SetInstrument("SPAN,0");
     mirror_.Span = 0;
     mirror_.Unsure.sent("SPAN", accepted);
@@ -158,8 +157,7 @@ void Z9GetCommands::zeroSpan(int index) {
     readTrace();
 }
 
-void Z9GetCommands::lastSpan(int index) {
-    routines_.softPanel.SetSoftButtonsColor(index);
+void Z9GetCommands::lastSpan(int /*index*/) {
     const bool accepted = exchange_.SetInstrument("SPAN," + WireNumber(panel_.LastSpan));
     mirror_.Span = panel_.LastSpan;
     mirror_.Unsure.sent("SPAN", accepted);
@@ -177,7 +175,6 @@ void Z9GetCommands::referenceLevel(int index) {
 void Z9GetCommands::bandwidth(int index) {
     const SoftPosition& position = *row(index);
     if (getSelected()) return runQuery(position);
-    routines_.softPanel.SetSoftButtonsColor(index);
     if (index == 0) routines_.softPanel.SetButtonColor(3, "green");
     const BandwidthPrompt& prompt = index == 0 ? kResolutionPrompt : kVideoPrompt;
     const std::optional<std::string> reply = boxes_.prompt(prompt.text, "Enter Value", "");

@@ -144,7 +144,7 @@ struct Program::Rooms {
           queries(panel, mirror, exchange, keys, boxes),
           settings(panel, mirror, exchange, keys, queries, session),
           hardKeys(panel, mirror, exchange, MenuRoutines{softPanel, fill}, interlock),
-          softKeys(panel, softPanel, queries, settings, interlock),
+          softKeys(panel, queries, settings, interlock),
           modeKeys(forms, mirror, exchange, MenuRoutines{softPanel, fill}, scaling, interlock),
           markerKeys(panel, mirror, exchange, markerReadout, traces, interlock),
           manualCommand(panel, instrument, interlock),

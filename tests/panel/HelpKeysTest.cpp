@@ -1,5 +1,8 @@
 #include <gtest/gtest.h>
 
+#include <map>
+#include <string_view>
+
 #include "panel/HelpKeys.h"
 #include "platform/KeyInput.h"
 #include "tests/files/FileSession.h"
@@ -38,6 +41,23 @@ TEST_F(HelpKeysTest, F1_OnEveryKeyOfThePanel_OpensItsTopic) {
     pressKey(panel.SoftTextBox(3), kKeyF1);
     panel.CWGraph1.KeyDown(kKeyF1, 0);
     EXPECT_EQ(opened(), std::vector<std::string>(wanted + 2, "2111"));
+}
+
+TEST_F(HelpKeysTest, F1_InEachForm_OpensTheTopicOfTheForm) {
+    for (const auto& [form, topic] : std::map<std::string_view, int>{{"ControllerForm", 2111},
+                                                                     {"DevicesChoiceForm", 1112},
+                                                                     {"TCPConnectionForm", 1113},
+                                                                     {"MainForm", 1113},
+                                                                     {"TimeForm", 1114},
+                                                                     {"ServerForm", 3113},
+                                                                     {"SpecialMeasForm", 4111},
+                                                                     {"WaterfallForm", 5111},
+                                                                     {"no form", 1110}})
+        EXPECT_EQ(helpTopicOf(form), topic) << form;
+    pressKey(forms.tcpConnection.IPAdressTextBox, kKeyF1);
+    forms.main.ZELButton.KeyDown(kKeyF1, 0);
+    forms.waterfall.KeyDown(kKeyF1, 0);
+    EXPECT_EQ(opened(), (std::vector<std::string>{"1113", "1113", "5111"}));
 }
 
 TEST_F(HelpKeysTest, OtherKeys_OpenNothing) {

@@ -247,6 +247,7 @@ TEST_F(LayoutTest, SubMenuOfLimits_IsTypedAndHasItsKeys) {
     EXPECT_TRUE(panel.SoftTextBox(0).Visible && panel.SoftTextBox(1).Visible);
     EXPECT_FALSE(panel.ChoiceBox(0).Visible || panel.ChoiceBox(1).Visible);
     EXPECT_EQ(panel.ChoiceBox(2).items(), (Texts{"Unknown", "Failed", "Passed"}));
+    EXPECT_TRUE(panel.ChoiceBox(2).Locked);
     EXPECT_EQ(panel.ChoiceBox(2).Text(), "Passed");
     EXPECT_EQ(panel.SoftTextBox(2).Text.get(), "Passed (2)");
 }
