@@ -41,7 +41,6 @@ void Playback::open(std::shared_ptr<SeriesFrames> frames) {
 
 void Playback::close() {
     frames_.reset();
-    position_ = 0;
     showState();
 }
 
@@ -70,7 +69,7 @@ void Playback::showState() {
     const int count = frames_ ? frames_->count() : 1;
     panel_.PlaybackPosition.Min = 1;
     panel_.PlaybackPosition.Max = std::max(count, 1);
-    panel_.PlaybackPosition.Value = position_ + 1;
+    panel_.PlaybackPosition.Value = frames_ ? position_ + 1 : 1;
     panel_.PlaybackBack.Enabled = frames_ && position_ > 0;
     panel_.PlaybackForward.Enabled = frames_ && position_ + 1 < count;
     std::string text;

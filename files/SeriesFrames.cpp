@@ -1,6 +1,7 @@
 #include "files/SeriesFrames.h"
 
 #include <algorithm>
+#include <array>
 #include <charconv>
 
 #include "files/ViewFormat.h"
@@ -24,14 +25,14 @@ int occurrences(std::string_view text, std::string_view word) {
 }  // namespace
 
 int secondOfDay(std::string_view time) {
-    int parts[3] = {0, 0, 0};
+    std::array<int, 3> parts{};
     const char* at = time.data();
     const char* const end = at + time.size();
-    for (int i = 0; i < 3; ++i) {
+    for (std::size_t i = 0; i < parts.size(); ++i) {
         const auto [stop, problem] = std::from_chars(at, end, parts[i]);
         if (problem != std::errc() || parts[i] < 0 || parts[i] >= (i == 0 ? 24 : 60)) return -1;
         at = stop;
-        if (i == 2) break;
+        if (i + 1 == parts.size()) break;
         if (at == end || *at != ':') return -1;
         ++at;
     }

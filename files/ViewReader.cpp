@@ -24,7 +24,7 @@ using CF = ControllerForm;
 constexpr int kLargestSingle = 970;
 constexpr int kMostRowsBack = 500;
 constexpr double kIntervals = 300;
-constexpr int kShownBytes = 4 * 1024 * 1024;
+constexpr int kShownBytes = 4 << 20;
 constexpr int kFirstLogEntry = 3;
 
 constexpr const char* kFaultLocation = "Fault Location";
@@ -311,8 +311,8 @@ void ViewReader::jumpTo(int index) {
     header.series = true;
     if (!frames->reach(index)) return playback_.setPosition(playback_.position());
     if (!showUpTo(*frames, header, index)) {
-        frames->endAt(index);
-        return playback_.setPosition(std::min(playback_.position(), frames->count() - 1));
+        frames->endAt(index);  // the file ends there, after all that was shown
+        return playback_.setPosition(playback_.position());
     }
     panel_.TraceLoaded();
     playback_.setPosition(index);

@@ -169,7 +169,7 @@ bool Interlock::anyUnmet(const Control& control) const {
 }
 
 bool Interlock::talks(const Control& control) const {
-    if (silent_.count(&control) > 0) return false;
+    if (silent_.contains(&control)) return false;
     const Form& form = control.form();
     return &form == &panel_ || &form == &forms_.main || &form == &forms_.tcpConnection ||
            &form == &forms_.time || &form == &forms_.specialMeas || &form == &forms_.devicesChoice;
@@ -177,14 +177,14 @@ bool Interlock::talks(const Control& control) const {
 
 Interlock::Turn Interlock::turnOf(const Control& control) const {
     // What only looks at sweeps that have come disturbs nothing.
-    if (always_.count(&control) > 0 || &control.form() == &forms_.waterfall) return Turn::Now;
+    if (always_.contains(&control) || &control.form() == &forms_.waterfall) return Turn::Now;
     if (state_.Ending) return Turn::Never;
     // The loop that plays a recording has the line free and waits for these.
-    if (panel_.SeriesPlays && playback_.count(&control) > 0) return Turn::Now;
+    if (panel_.SeriesPlays && playback_.contains(&control)) return Turn::Now;
     if (anyUnmet(control)) return Turn::Now;  // it refuses by itself, in words
     if (std::find(running_.begin(), running_.end(), &control) != running_.end()) return Turn::Never;
     // While the view runs, a hard key lays out its menu and asks nothing.
-    if (panel_.ContinuosLoopActive && quietInView_.count(&control) > 0) return Turn::Now;
+    if (panel_.ContinuosLoopActive && quietInView_.contains(&control)) return Turn::Now;
     if (state_.DialoguesUnderWay > 0) return talks(control) ? Turn::Later : Turn::Now;
     if (panel_.ContinuosLoopActive) return Turn::Now;
     const bool busy = panel_.MousePointer == kHourglass || panel_.AcquisitionRunning ||
@@ -242,7 +242,7 @@ bool Interlock::userWorks() const {
     if (known_.empty()) return !states.empty();
     const States& before = known_.back();
     return std::any_of(states.begin(), states.end(),
-                       [&](const void* state) { return before.count(state) == 0; });
+                       [&](const void* state) { return !before.contains(state); });
 }
 
 void Interlock::endLiveStates() {

@@ -67,6 +67,25 @@ TEST_F(FailedTickTest, FailedTicks_ShowNoBox) {
     EXPECT_EQ(panel.MousePointer.get(), 0);
 }
 
+TEST_F(FailedTickTest, MissedTraces_AreCountedByWhatTheyLack) {
+    const auto progress = [this](std::size_t length) {
+        return panel.FileLabel.Caption.get().substr(0, length);
+    };
+    fullSweep();
+    platform.events.runFor(31000);
+    EXPECT_EQ(progress(22), "trace.csv: 1 trace, 7.");
+    cmd("INIT");
+    cmd("WAIT");
+    trace(levelBlock(-35000).substr(0, 400));
+    platform.events.runFor(30000);
+    EXPECT_EQ(progress(34), "trace.csv: 1 trace, 1 incomplete, ");
+    port.expect("cmd\r").silence();
+    platform.events.runFor(30000);
+    EXPECT_EQ(progress(44), "trace.csv: 1 trace, 1 incomplete, 1 failed, ");
+    EXPECT_EQ(traces(), 1U);
+    expectPlayed();
+}
+
 TEST_F(FailedTickTest, FileThatCannotBeWritten_IsShownThough) {
     platform.files.refuse(folder.file("trace.csv"), "Permission denied");
     fullSweep();

@@ -45,6 +45,7 @@ TEST_F(FileMenuTest, ImageDialog_OffersTheKindFirstAndCompletesTheName) {
     const FileDialogRequest& request = platform.fileDialogs.saves[0];
     EXPECT_EQ(request.filter.substr(0, 45), "All Files (*.*)|*.*|Text Files(*.wmf)|*.wmf|S");
     EXPECT_EQ(request.filterIndex, 2);
+    EXPECT_TRUE(request.promptOverwrite);
     platform.fileDialogs.answer("/site/picture.svg");
     EXPECT_EQ(files.ShowSaveImageDialog("wmf"), "/site/picture.svg");
     platform.fileDialogs.answer(std::nullopt);

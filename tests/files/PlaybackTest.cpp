@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
+
 #include "files/SeriesFrames.h"
 #include "tests/files/FileSession.h"
 
@@ -172,6 +174,23 @@ TEST_F(PlaybackTest, ContinuousView_RefusesPlay) {
     panel.PlaybackPlay.Click();
     panel.PlaybackBack.Click();
     EXPECT_TRUE(levels.empty());
+}
+
+TEST(SeriesFrames, Gap_IsThatOfTheStampsAndSharedWithinASecond) {
+    const auto gaps = [](const std::vector<std::string>& stamps) {
+        std::string text;
+        for (const std::string& stamp : stamps) text += "\nTime;" + stamp + "\nMark;;\n1;2";
+        const auto whole = std::make_shared<const std::string>(text);
+        SeriesFrames frames(whole, FieldList(*whole), 6, "Mark", "2026-11-22 10:00");
+        std::vector<int> found;
+        for (int i = 0; i < static_cast<int>(stamps.size()); ++i)
+            found.push_back(frames.gapAfter(i));
+        return found;
+    };
+    EXPECT_EQ(gaps({"23:59:58", "23:59:58", "00:00:01", "00:00:02"}),
+              (std::vector<int>{500, 2500, 1000, 1000}));
+    EXPECT_EQ(gaps({"10:00:00", "10:00:07"}), (std::vector<int>{7000, 1000}));
+    EXPECT_EQ(gaps({"noon", "10:00:07"}).front(), 0);
 }
 
 TEST(SecondOfDay, ReadsBothClocksAndRefusesTheRest) {

@@ -3,9 +3,11 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "link/CommandExchange.h"
+#include "support/Text.h"
 #include "tests/ShownBoxes.h"
 #include "tests/trace/ReadCycle.h"
 #include "trace/Interlock.h"
@@ -52,6 +54,104 @@ TEST_F(InterlockTest, ContinuousView_RefusesInTheWordsOfTheControl) {
         EXPECT_EQ(boxes.texts()[0].rfind(words, 0), 0U) << boxes.texts()[0];
         EXPECT_EQ(interlock.turnOf(*control), Turn::Now);  // it refuses by itself
     }
+}
+
+TEST_F(InterlockTest, EachControl_RefusesByItsOwnRules) {
+    const auto reasons = [this](const Control& control) {
+        std::string text;
+        const auto add = [&](const char* state) {
+            const std::string reason = interlock.reasonAgainst(control);
+            if (reason.empty()) return;
+            text += std::string(text.empty() ? "" : ", ") + state;
+            if (contains(reason, "instrument first")) text += " (instrument)";
+            if (contains(reason, "Continunous")) text += " (to end)";
+            if (contains(reason, "recording first")) text += " (recording)";
+        };
+        panel.isConnected = false;
+        add("offline");
+        panel.isConnected = true;
+        panel.ContinuosLoopActive = true;
+        add("view");
+        panel.ContinuosLoopActive = false;
+        panel.AcquisitionRunning = panel.STOPFlag = true;
+        add("between passes");
+        panel.RecordDataFlag = true;
+        add("recording");
+        panel.AcquisitionRunning = panel.STOPFlag = panel.RecordDataFlag = false;
+        forms.time.ContinuousRecording = true;
+        add("interval");
+        forms.time.ContinuousRecording = false;
+        panel.InstrumentMode = ControllerForm::POWERSENSOR;
+        add("sensor");
+        panel.InstrumentMode = ControllerForm::ANALYZER;
+        return text;
+    };
+    using All = std::vector<const Control*>;
+    All both{&panel.MarkPkButton,     &panel.NextPeakButton,  &panel.MinPeakButton,
+             &panel.MarkToCentButton, &panel.MarkToRefButton, &panel.OnOffButton,
+             &panel.LocalButton};
+    for (int i = 0; i < 5; ++i)
+        for (const Control* one :
+             All{&panel.SoftKey(i), &panel.SoftTextBox(i), &panel.ChoiceBox(i)})
+            both.push_back(one);
+    All files{&panel.LoadData, &panel.PlaybackBack, &panel.PlaybackPlay, &panel.PlaybackForward,
+              &panel.PlaybackPosition};
+    for (int i = 0; i < 8; ++i) files.push_back(&panel.RecentFile(i));
+    const std::vector<std::pair<std::string, All>> rows{
+        {"offline, view", both},
+        {"offline (instrument), view", {&panel.SendButton}},
+        {"sensor",
+         {&panel.SpanButton, &panel.AmplitudeButton, &panel.BWButton, &panel.SweepButton,
+          &panel.TraceButton, &panel.MeasButton}},
+        {"view, sensor", {&panel.MarkerButton}},
+        {"view",
+         {&panel.AnalyzerButton, &panel.TrackButton, &panel.TrackButton1, &panel.PwrButton,
+          &panel.ChnPwrButton, &panel.OccBWButton, &panel.TDMAButton, &panel.DistFaultButton,
+          &panel.ResetButton, &panel.MarkerCheckBox, &panel.DeltaCheckBox, &panel.ManualCommandText,
+          &panel.AnalyzerCheck, &panel.TrackingGenCheck, &panel.PowerSensorCheck,
+          &panel.ChannelPowerCheck, &panel.OccBWCheck, &panel.TDMAPowerCheck,
+          &panel.DistFaultCheck}},
+        {"view, between passes, recording (recording), interval (recording)", files},
+        {"view (to end)",
+         {&panel.Disconnect, &forms.main.DisconnectButton, &forms.main.DisconnectButton2}},
+        {"", {&panel.FrequencyButton, &panel.PlaySingleButton, &panel.StopButton}},
+    };
+    for (const auto& [wanted, controls] : rows)
+        for (const Control* control : controls)
+            EXPECT_EQ(reasons(*control), wanted) << control->name();
+}
+
+TEST_F(InterlockTest, WhileARecordingPlays_OnlyItsKeysActInTheBusyProgram) {
+    panel.MousePointer = 11;
+    EXPECT_EQ(interlock.turnOf(panel.PlaybackPlay), Turn::Never);
+    panel.SeriesPlays = true;
+    for (const Control* key : std::vector<const Control*>{
+             &panel.PlaybackBack, &panel.PlaybackPlay, &panel.PlaybackForward,
+             &panel.PlaybackPosition, &panel.PlaybackRepeat, &panel.PlaybackRealTime,
+             &panel.PlaybackClose})
+        EXPECT_EQ(interlock.turnOf(*key), Turn::Now) << key->name();
+    EXPECT_EQ(interlock.turnOf(panel.SpanButton), Turn::Never);
+}
+
+TEST_F(InterlockTest, ActsThatWait_AreSixtyFourAtMost) {
+    const DialogueScope exchange(program.link());
+    int taken = 0;
+    for (int i = 0; i < 100; ++i) taken += interlock.perform(panel.LocalButton, [] {}) ? 1 : 0;
+    EXPECT_EQ(taken, 64);
+    EXPECT_EQ(interlock.waiting(), 64U);
+}
+
+TEST_F(InterlockTest, FormThatIsShownAgain_IsWorkOfTheUser) {
+    EXPECT_FALSE(interlock.userWorks());
+    forms.time.Modal = true;
+    forms.time.Visible = true;
+    EXPECT_TRUE(interlock.userWorks());
+    interlock.beginCommand();
+    EXPECT_FALSE(interlock.userWorks());
+    forms.time.Visible = false;
+    forms.time.Visible = true;
+    EXPECT_TRUE(interlock.userWorks());
+    interlock.endCommand();
 }
 
 TEST_F(InterlockTest, RuleThatIsMet_ShowsNothing) {

@@ -5,6 +5,7 @@
 #include "ZELSim/InProcessPort.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
+#include "trace/PaceMonitor.h"
 
 namespace zel {
 namespace {
@@ -44,6 +45,35 @@ TEST_F(Pace, SingleTrace_TellsItsAgeAndIsNotMarkedOld) {
     EXPECT_FALSE(panel().CWGraph1.Old);
     platform.events.runFor(61000);
     EXPECT_EQ(line(), "1 min old");
+}
+
+TEST_F(Pace, AtRest_TheLineIsWrittenWithEachWholeSecondOfTheAge) {
+    connectTo(0);
+    EXPECT_EQ(panel().PaceTimer.Interval.get(), 250);
+    platform.events.runFor(400);
+    EXPECT_NEAR(panel().PaceTimer.Interval.get(), 750, 2);
+    platform.events.runFor(5000);
+    EXPECT_NEAR(panel().PaceTimer.Interval.get(), 1000, 2);
+    view(2010, [this] { EXPECT_EQ(panel().PaceTimer.Interval.get(), 250); });
+}
+
+TEST(PaceMonitor, PauseAboveFiveSeconds_IsNoPace) {
+    VirtualPlatform platform;
+    Forms forms;
+    PaceMonitor monitor(forms.controller, platform.clock);
+    monitor.drawn();
+    EXPECT_EQ(monitor.sweepsPerSecond(), 0);
+    platform.clock.advance(5000);
+    monitor.drawn();
+    EXPECT_DOUBLE_EQ(monitor.sweepsPerSecond(), 0.2);
+    platform.clock.advance(5000.001);
+    monitor.drawn();
+    EXPECT_EQ(monitor.sweepsPerSecond(), 0);
+    for (int i = 0; i < 20; ++i) {
+        platform.clock.advance(i < 10 ? 400 : 100);
+        monitor.drawn();
+    }
+    EXPECT_DOUBLE_EQ(monitor.sweepsPerSecond(), 10) << "of the last eight";
 }
 
 TEST_F(Pace, FastLine_SaysThatTheSweepSetsThePace) {

@@ -291,6 +291,13 @@ TEST_F(SweepControlTest, Stop_BringsTheKeyOfTheViewBackEnabled) {
     EXPECT_TRUE(panel.PlayContinuousButton.Enabled);
 }
 
+TEST_F(SweepControlTest, Stop_LetsWhatIsDueRun) {
+    bool ran = false;
+    platform.events.schedule(0, [&] { ran = panel.PlayContinuousButton.Visible; });
+    panel.StopButton.Click();
+    EXPECT_TRUE(ran);
+}
+
 TEST_F(SweepControlTest, Stop_InThePowerMenu_ClosesItsDialog) {
     panel.State = ControllerForm::POWER;
     forms.powerAndRefl.Show();

@@ -1,0 +1,111 @@
+// The texts around the graph, from the settings and the axes.
+
+#include <gtest/gtest.h>
+
+#include <vector>
+
+#include "forms/Forms.h"
+#include "model/CodeTables.h"
+#include "trace/ViewAnnotations.h"
+
+namespace zel {
+namespace {
+
+struct ViewAnnotationsTest : ::testing::Test {
+    ViewAnnotationsTest() {
+        panel.CWGraph1.plotY(std::vector<double>(301, -50), 900e6, 1e6 / 3);
+        panel.CWGraph1.setXRange(900e6, 1e9);
+        panel.InstrumentMode = ControllerForm::ANALYZER;
+        mirror.Span = 100e6;
+        mirror.CenterFrequency = 950e6;
+        mirror.ReferenceLevel = -20;
+        mirror.SweepTime = 0.02;
+        mirror.ResolutionBandwidth = 7;
+        mirror.TraceDetector = 3;
+    }
+    ViewAnnotations view() const { return annotateView(panel, mirror); }
+
+    Forms forms;
+    ControllerForm& panel = forms.controller;
+    ZEL3Variables mirror;
+};
+
+TEST_F(ViewAnnotationsTest, Settings_AreNamed) {
+    const ViewAnnotations shown = view();
+    EXPECT_TRUE(shown.ok);
+    EXPECT_EQ(shown.refLevel, "Ref -20 dBm");
+    EXPECT_EQ(shown.range, "10dB/DIV");
+    EXPECT_EQ(shown.rbw, "RBW 100 kHz");
+    EXPECT_EQ(shown.vbw, "VBW Auto");
+    EXPECT_EQ(shown.sweepTime, "SWT 20 ms");
+    EXPECT_EQ(shown.detector, "Det Sample");
+    EXPECT_EQ(shown.mode, "Analyzer");
+    EXPECT_EQ(shown.unit, "dBm");
+    EXPECT_EQ(shown.xUnit, "Hz");
+}
+
+TEST_F(ViewAnnotationsTest, Axis_HasItsEndsAndItsMiddle) {
+    EXPECT_EQ(view().left, "Start 900 MHz");
+    EXPECT_EQ(view().center, "Center 950 MHz");
+    EXPECT_EQ(view().right, "Stop 1 GHz");
+}
+
+TEST_F(ViewAnnotationsTest, ZoomedAxis_IsRoundedToFourDigitsOfItsWidth) {
+    panel.CWGraph1.setXRange(912345678, 923456789);
+    EXPECT_EQ(view().left, "Start 912.345678 MHz");
+    panel.GraphZoomed = true;
+    EXPECT_EQ(view().left, "Start 912.35 MHz");
+    EXPECT_EQ(view().center, "Center 917.905 MHz");
+    EXPECT_EQ(view().right, "Stop 923.46 MHz");
+}
+
+TEST_F(ViewAnnotationsTest, WithoutATrace_OnlyTheUnitsAreKnown) {
+    panel.CWGraph1.clearPlot();
+    EXPECT_FALSE(view().ok);
+    EXPECT_EQ(view().unit, "dBm");
+    EXPECT_EQ(view().left + view().center + view().right + view().refLevel, "");
+}
+
+TEST_F(ViewAnnotationsTest, Unit_IsThatOfTheRangeAndOfTheReference) {
+    mirror.ReferenceUnit = UNITDBUV;
+    EXPECT_EQ(view().unit, "dB\u00B5V");
+    mirror.ReferenceUnit = UNITDB;
+    EXPECT_EQ(view().unit, "dB");
+    mirror.ReferenceUnit = UNITV;
+    mirror.ReferenceLevel = 0.005;
+    EXPECT_EQ(view().unit, "dBm");
+    EXPECT_EQ(view().refLevel, "Ref 5 mV");
+    mirror.ReferenceRange = RANGELIN;
+    EXPECT_EQ(view().unit, "%");
+}
+
+TEST_F(ViewAnnotationsTest, RangeOfAFile_IsItsDecibelsADivision) {
+    mirror.ReferenceRange = 5;
+    EXPECT_EQ(shownRangeCode(panel, mirror), RANGEVSWR6);
+    panel.Shown.fromFile = true;
+    EXPECT_EQ(shownRangeCode(panel, mirror), RANGE5DB);
+    mirror.ReferenceRange = 1;
+    EXPECT_EQ(shownRangeCode(panel, mirror), RANGE1DB);
+    mirror.ReferenceRange = 10;
+    EXPECT_EQ(shownRangeCode(panel, mirror), RANGE10DB);
+    mirror.ReferenceRange = RANGELIN;
+    EXPECT_EQ(shownRangeCode(panel, mirror), RANGELIN);
+}
+
+TEST_F(ViewAnnotationsTest, File_SaysWhatOnlyItKnows) {
+    panel.Shown.fromFile = true;
+    panel.Shown.xUnit = "Hz";
+    panel.Shown.rbw = "300000";
+    panel.Shown.sweepTime = "0.5";
+    panel.Shown.detector = "RMS";
+    panel.Shown.mode = "Receiver";
+    const ViewAnnotations shown = view();
+    EXPECT_EQ(shown.rbw, "RBW 300 kHz");
+    EXPECT_EQ(shown.vbw, "");
+    EXPECT_EQ(shown.sweepTime, "SWT 500 ms");
+    EXPECT_EQ(shown.detector, "Det RMS");
+    EXPECT_EQ(shown.mode, "Receiver");
+}
+
+}  // namespace
+}  // namespace zel
