@@ -93,7 +93,7 @@ void ConnectionDialog::SetConnectionKind(std::int16_t kind) {
     dialog_.CancelConnButton1.Visible = direct;
     dialog_.ZELButton.Visible = direct;
     dialog_.DisconnectButton.Visible = direct;
-    dialog_.ModemConnectionFrame.Visible = !direct;
+    if (!direct) dialog_.ModemConnectionFrame.Visible = true;
     dialog_.DisconnectButton2.Visible = !direct;
     dialog_.CancelConnButton.Visible = !direct;
     if (!direct) {
@@ -110,7 +110,6 @@ void ConnectionDialog::showModal() { showModalForm(dialog_, session_.events); }
 void ConnectionDialog::Direct_Click() {
     panel_.immConnectState = false;
     SetConnectionKind(CF::DIRECTCON);
-    dialog_.ModemConnectionFrame.Visible = false;
     // The direct link stores its fields by itself.
     dialog_.LoadSettingsButton.Visible = false;
     dialog_.SaveSettingsButton.Visible = false;

@@ -121,7 +121,7 @@ bool Dialling::call(const std::string& number) {
     collectRest(dialled, collected_);
     if (!link_.bytes.portOpen()) return false;
     form_.AirBaudRateText.Text = bytesToUtf8(replaceAll(collected_, kCrLf, " "));
-    bool ok = false;
+    bool ok{};
     CheckAnswer(collected_, ok);
     return ok;
 }

@@ -58,12 +58,32 @@ TEST_F(DiallingTest, MenuEntries_ChooseTheirKinds) {
     }
 }
 
+TEST_F(DiallingTest, DialogShownAgainInASession_HidesCancelAndTheFrameOfTheOtherKind) {
+    panel.isConnected = true;  // what the dialog holds stays
+    dialog.CancelButton.Visible = true;
+    choose(panel.Modem);
+    EXPECT_FALSE(dialog.CancelButton.Visible);
+    EXPECT_TRUE(dialog.ModemConnectionFrame.Visible);
+    later(1, [this] {
+        EXPECT_FALSE(dialog.ModemConnectionFrame.Visible);
+        EXPECT_TRUE(dialog.DirectConnectionFrame.Visible);
+        dialog.Hide();
+    });
+    panel.Direct.Click();
+    EXPECT_FALSE(dialog.ModemConnectionFrame.Visible);
+    panel.isConnected = false;
+}
+
 TEST_F(DiallingTest, Call_DialsTheTrimmedNumberAndOpensTheSession) {
     dialled().answer(kNumber).answer(kConnected).after(3000);
     page().whole();
     LinkAddress address{LinkAddress::Kind::TwoModems, "COM3", 57600};
     address.phone = " 5551234 ";
+    bool answerSeen = false;
+    panel.DebugTextBox.Changed.connect(
+        [&] { answerSeen = answerSeen || status() == "----->" + std::string(kConnected); });
     EXPECT_TRUE(program.connect(address, false));
+    EXPECT_TRUE(answerSeen);
     expectPlayed();
     EXPECT_TRUE(panel.isConnected);
     EXPECT_TRUE(dialog.ModemConnected);

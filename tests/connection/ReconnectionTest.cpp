@@ -199,6 +199,17 @@ TEST_F(TcpReconnection, ClickInVain_SaysWhyAndCanBeRepeated) {
     EXPECT_EQ(bar(), again());
 }
 
+TEST_F(TcpReconnection, AfterAVainClick_AConnectionFromTheMenuTakesTheOfferAway) {
+    ASSERT_TRUE(connect());
+    goAway();
+    pass(1500);
+    panel.ReconnectButton.Click();
+    EXPECT_NE(bar(), "");
+    comeBack();
+    EXPECT_TRUE(connect());
+    EXPECT_EQ(bar(), "");
+}
+
 TEST_F(TcpReconnection, WithTheOption_TriesEachFiveSecondsAndSaysWhyNot) {
     ASSERT_TRUE(connect());
     panel.ReconnectAlways.Click();
