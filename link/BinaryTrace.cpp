@@ -90,7 +90,7 @@ BinaryTrace::Outcome BinaryTrace::readOnce(RawTrace& trace, bool doubleBlock, bo
     if (bytes.size() == 2 && bytes[1] == '\r') {
         status = bytes[0] - '0';
         if (status == 1) return Outcome::AskAgain;
-        if (status > 1 && status <= 7) {
+        if (status >= 2 && status <= 7) {
             ReportInstrumentError(state_, session_.boxes, status, "TRACEBIN");
             return Outcome::Done;
         }
@@ -175,9 +175,11 @@ BinaryTrace::Outcome BinaryTrace::readComplexOnce(std::vector<double>& values, b
     if (bytes.size() < static_cast<std::size_t>(kDoubleBytes)) return Outcome::AskAgain;
     bytes.erase(kBlockBytes, 1);  // the separator of the first block
     values.resize(kDoubleSamples);
-    for (std::size_t i = 0; i < kDoubleSamples; ++i)
-        values[i] =
-            int32FromLittleEndian(reinterpret_cast<const unsigned char*>(bytes.data()) + 4 * i);
+    const auto* sample = reinterpret_cast<const unsigned char*>(bytes.data());
+    for (double& value : values) {
+        value = int32FromLittleEndian(sample);
+        sample += kSampleBytes;
+    }
     success = true;
     session_.DebugLine("Trace complete");
     return Outcome::Done;

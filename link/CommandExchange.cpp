@@ -89,8 +89,7 @@ void CommandExchange::finishLine(const char* kind, const std::string& text, floa
 }
 
 void CommandExchange::delay(DelayPlace place) {
-    const int ms = linkDelay(place, panel_.ConnectionState);
-    if (ms > 0) session_.events.sleep(ms);
+    if (const int ms = linkDelay(place, panel_.ConnectionState)) session_.events.sleep(ms);
 }
 
 void CommandExchange::report(int status, const std::string& keyword) {

@@ -48,9 +48,13 @@ struct Bytes : Line {
 };
 
 TEST_F(Bytes, StatusAndItsCr_AreDroppedUnseen) {
+    state.TCPDataArrived = true;
     comes(0, "0\rabcdefghij");
     read(10);
     EXPECT_EQ(got, "abcdefghij");
+    EXPECT_FALSE(state.TCPDataArrived);
+    EXPECT_FALSE(state.RestFound) << "all of it was asked for";
+    EXPECT_FALSE(state.AnswerOverdue);
 }
 
 TEST_F(Bytes, OneByteFirst_IsJoinedWithTheNextChunk) {
@@ -70,9 +74,11 @@ TEST_F(Bytes, BareStatusFirst_SamplesComeWithTheNextChunk) {
 TEST_F(Bytes, RefusalWithItsCr_IsTheResult) {
     for (const char digit : {'1', '2', '3', '4', '5', '6', '7'}) {
         const std::string refusal = std::string(1, digit) + "\r";
+        state.TCPDataArrived = true;
         comes(0, refusal);
         EXPECT_LE(read(10), 20);
         EXPECT_EQ(got, refusal);
+        EXPECT_FALSE(state.TCPDataArrived);
     }
 }
 
@@ -112,6 +118,8 @@ TEST_F(Bytes, MoreThanAskedFor_IsCutAtTheLength) {
     comes(0, "0\rabcdefghijKLMN");
     read(10);
     EXPECT_EQ(got, "abcdefghij");
+    EXPECT_TRUE(state.RestFound);
+    EXPECT_TRUE(state.AnswerOverdue);
 }
 
 TEST_F(Bytes, LastBytesOfASlowLine_AreWaitedFor) {
@@ -146,7 +154,9 @@ TEST_F(Bytes, PortDiesInTheMiddle_EndsAtOnce) {
 
 TEST_F(Bytes, NoUsableLink_IsToldOnce) {
     dialog.IsConnectedToPort = false;
+    state.TCPDataArrived = true;
     EXPECT_EQ(read(10), 0);
+    EXPECT_FALSE(state.TCPDataArrived);
     read(10);
     EXPECT_EQ(got, "");
     EXPECT_EQ(shown(), Texts{"critical | ZELRemote | Not Connected To Port!"});

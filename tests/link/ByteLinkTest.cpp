@@ -87,6 +87,10 @@ TEST_F(PortFromDialog, LastPartOfAListedPath_MeansThatPath) {
     open("ttyUSB0");
     EXPECT_EQ(port.openings().back().CommPort, "/dev/ttyUSB0");
     EXPECT_EQ(serialDeviceName("USB0", dialog.CommPorts), "");
+    EXPECT_EQ(serialDeviceName("32767", {}), "COM32767");
+    EXPECT_EQ(serialDeviceName("32768", {}), "");
+    EXPECT_EQ(serialDeviceName("0", {}), "");
+    EXPECT_EQ(serialDeviceName("1.5", {}), "");
 }
 
 TEST_F(PortFromDialog, PathFromTheWorkingFolder_IsTakenAsItStands) {

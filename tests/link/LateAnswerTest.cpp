@@ -65,6 +65,19 @@ TEST_F(Line, TransferThatWasLongerThanAskedFor_IsPassedOverBeforeTheNextQuery) {
     expectPlayed();
 }
 
+TEST_F(Line, LineThatIsNoSingleDigit_IsNoStatus) {
+    for (const char* rest : {"12\r", "-\r", "0AB\r"}) {
+        state.RestFound = false;
+        port.expect("GET\r").answer(rest).answer("0\r").after(5);
+        port.expect("FREQ\r").answer("0\r1500000000\r").after(20);
+        std::string value;
+        EXPECT_TRUE(exchange.GetInstrument("FREQ", value)) << rest;
+        EXPECT_EQ(value, "1500000000");
+        EXPECT_TRUE(state.RestFound) << rest;
+    }
+    expectPlayed();
+}
+
 TEST_F(Line, LineThatIsNoStatus_WithNothingAfterIt_CountsAsAccepted) {
     port.expect("GET\r").answer("junk\r");
     port.expect("FREQ\r").answer("0\r1500000000\r");
@@ -129,9 +142,9 @@ TEST_F(Line, LateAnswer_BeforeTheNextOne_LeavesTheDigitOfTheLastLine) {
         EXPECT_EQ(state.InputBuffer, "");
     }
     state.AnswerOverdue = true;
-    port.expect("cmd\r").answer("\r");  // an empty line has none
+    port.expect("cmd\r").answer("5\r").answer("\r").after(100);  // an empty line has none
     link.WriteToLink("cmd\r");
-    EXPECT_EQ(reader.ReadAnswer(), "");
+    EXPECT_EQ(reader.ReadAnswer(), "5");
     expectPlayed();
 }
 
