@@ -64,7 +64,9 @@ LineInput::Got ReplayInput::next(std::string& line, bool /*block*/) {
         const SessionCompare& compare = progress_.compare;
         const bool over = compare.complete() || compare.difference() ||
                           clock_.micros() - origin_ > end_ + kPatience;
-        return over ? Got::End : Got::Nothing;
+        if (!over) return Got::Nothing;
+        if (const auto cut = std::exchange(cutShort, nullptr)) cut();
+        return Got::End;
     }
     if (!due(items_[at_])) return Got::Nothing;
     line = items_[at_++].line;

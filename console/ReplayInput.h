@@ -32,6 +32,10 @@ class ReplayInput : public LineInput {
                 Events& events, std::function<void(std::int64_t)> passTo);
     ~ReplayInput() override;
 
+    /// Ends the program after the last line, of a record that the user ended: how the session went
+    /// on is not in it. Empty where the end of the session is in the record.
+    std::function<void()> cutShort;
+
     Got next(std::string& line, bool block) override;
     /// Waits for the answer to a question that stands open, until its turn has come; events run
     /// meanwhile, as in a window. At once where the record goes on with another line.

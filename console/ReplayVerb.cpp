@@ -10,6 +10,7 @@
 #include "console/OverlayFiles.h"
 #include "console/ReplayFront.h"
 #include "console/ReplayInput.h"
+#include "desktop/platform/QtSignals.h"
 #include "desktop/platform/SystemFiles.h"
 #include "support/ExitStatus.h"
 #include "support/FileText.h"
@@ -45,6 +46,17 @@ std::string windowWords(const std::vector<std::string>& given) {
 bool beganConnected(const SessionRecord& record, Verb verb) {
     return verb == Verb::Panel && record.events.size() > 1 &&
            record.events[1].kind == SessionEvent::Kind::Open;
+}
+
+/// A record that ended with a click, and not with the session.
+bool endedByUser(const SessionRecord& record) {
+    constexpr std::string_view kEntry = "UtilityRecord";
+    for (auto event = record.events.rbegin(); event != record.events.rend(); ++event) {
+        if (event->kind == SessionEvent::Kind::Click) return event->text == kEntry;
+        if (event->kind == SessionEvent::Kind::Input)
+            return event->text == "click " + std::string(kEntry);
+    }
+    return false;
 }
 
 bool isOfWindow(const SessionRecord& record) {
@@ -145,24 +157,29 @@ int runReplay(const Options& options, const Streams& streams) {
     Rerun rerun;
     rerun.ofWindow = isOfWindow(record);
     rerun.begun = [&progress](Program& program) {
+        program.forms().controller.ReconnectAlways.Checked = false;  // the record has it clicked
         program.sessionLog().Noted.connect([&progress](const SessionEvent& event) {
             if (event.kind == SessionEvent::Kind::Sent) progress.compare.sent(event.text);
             if (event.kind == SessionEvent::Kind::Came) progress.came += event.text.size();
         });
     };
     rerun.files = [](FileService& disk) { return std::make_unique<OverlayFiles>(disk); };
+    const bool byUser = recorded.verb == Verb::Panel && endedByUser(record);
     ReplayInput* input = nullptr;
     rerun.input = [&](const Clock& clock, Events& events) {
         auto made = std::make_unique<ReplayInput>(record, progress, clock, events, passTo);
         input = made.get();
+        if (byUser)
+            made->cutShort = [&front] { front->endSignals().request("the end of the record"); };
         return made;
     };
     rerun.awaitAnswer = [&input](AnswerQueue& answers) { input->awaitAnswer(answers); };
     const int status = runTool(recorded, *front, streams, &rerun);
     const SessionCompare& compare = progress.compare;
-    // Of a log that was cut nobody knows how it went on.
-    const bool beyond =
-        damaged && (!compare.difference() || compare.difference()->event >= record.events.size());
+    // Of a log that was cut, or ended by the user, nobody knows how it went on.
+    const bool beyond = compare.difference() ? (damaged || byUser) && compare.difference()->event >=
+                                                                          record.events.size()
+                                             : damaged;
     const bool differs = !beyond && tellDifference(record, compare, output, errors);
     static_cast<void>(status);  // a session that failed then fails again
     return differs || damaged ? kLinkFailed : kDone;

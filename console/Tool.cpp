@@ -77,7 +77,11 @@ struct Stage {
     void beginRecord(const Options& options) {
         SessionLog& record = program.sessionLog();
         record.simulatorPort = kSimulatorPort;
+        record.arguments = options.given;
         if (!options.log.empty()) program.recordSession(options.log, options.given);
+        // Of what the settings hold this alone decides what the program does by itself.
+        const MenuItem& always = program.forms().controller.ReconnectAlways;
+        if (options.verb == Verb::Panel && always.Checked) record.clicked(always.name());
     }
 
     void watchFaults(LineOutput& errors) {
@@ -178,12 +182,15 @@ bool missesDrawing(const Options& options) {
     return wanted && findDrawingProgram().empty();
 }
 
-int runDoctor(const Options& options, Program& program, LineOutput& output) {
+int runDoctor(const Options& options, Program& program, LineOutput& output, LineOutput& errors) {
     std::optional<LinkAddress> address;
     if (options.address) address = options.address->link;
     program.start();
+    Handlers handlers;
+    handlers.on(program.Ended, [&program] { program.doctor().stop(); });
     const bool well = program.doctor().examine(
         address, [&output](const Finding& finding) { output.line(findingLine(finding)); });
+    if (!program.endedBy().empty()) errors.line("zelctl: ended by " + program.endedBy());
     return well && program.endedBy().empty() ? kDone : kLinkFailed;
 }
 
@@ -232,7 +239,7 @@ int runOneVerb(const Options& options, Front& front, const Streams& streams, Lin
                           script,
                           analysis ? &*analysis : nullptr};
     return stage.guarded(errors, [&] {
-        if (options.verb == Verb::Doctor) return runDoctor(options, stage.program, output);
+        if (options.verb == Verb::Doctor) return runDoctor(options, stage.program, output, errors);
         if (options.verb == Verb::Serve) return runServer(options, verbs);
         if (options.verb == Verb::Devices) return runDevices(options, verbs);
         return runVerb(options, verbs);

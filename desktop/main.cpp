@@ -62,7 +62,11 @@ int main(int argc, char** argv) {
     zel::Program program(platform.bundle(boxes, dialogs), options.words);
     boxes.log = dialogs.log = &program.sessionLog();
     zel::offerRehearsal(program, platform.boxes, platform.files);
-    if (!options.log.empty()) program.recordSession(options.log, "zelremote " + options.given);
+    program.sessionLog().arguments = "zelremote " + options.given;
+    if (!options.log.empty()) program.recordSession(options.log, program.sessionLog().arguments);
+    // Of what the settings hold this alone decides what the program does by itself.
+    if (program.forms().controller.ReconnectAlways.Checked)
+        program.sessionLog().clicked(program.forms().controller.ReconnectAlways.name());
     application.catchInto([&program] { program.showFailure(); });
     int result = 0;
     // Every wait and loop on the stack comes back, since the program has ended.
@@ -97,7 +101,7 @@ int main(int argc, char** argv) {
         if (const std::string trace = program.takeCrash(); !trace.empty())
             program.errorReport().displayCrash(trace);
         zel::traceFaultsInto({program.crashFile(), program.logs().rootDebug.FileName});
-        if (!options.file.empty()) program.forms().controller.OpenFile(options.file);
+        if (!options.file.empty()) window.openFile(QString::fromStdString(options.file));
         if (options.address) {
             program.sessionLog().input("connect");
             program.connect(*options.address, true);

@@ -42,10 +42,15 @@ void SessionKeys::UtilityRecord_Click() {
                                      .folder = {},
                                      .fileName = "session.log",
                                      .promptOverwrite = true});
-    if (!path || !begin(*path, startLine(panel_.CommandLine)) || !panel_.isConnected) return;
+    if (!path) return;
+    const std::string start =
+        log_.arguments.empty() ? startLine(panel_.CommandLine) : log_.arguments;
+    const bool whole = log_.whole();
+    if (!begin(*path, start) || whole || !panel_.isConnected) return;
     boxes_.show({BoxIcon::Information,
-                 "The record begins while ZELRemote is connected. It can be read, but not run "
-                 "again: for that, record from before the connection on."});
+                 "The session is too long to be written from its start, so the record begins here. "
+                 "It can be read, but not run again: for that, record from before the connection "
+                 "on."});
 }
 
 }  // namespace zel

@@ -1,5 +1,6 @@
 #include "support/SessionLog.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "support/FileText.h"
@@ -14,6 +15,8 @@ constexpr std::string_view kPin = "CPIN=";
 constexpr std::size_t kTail = 64;
 constexpr std::size_t kMostShown = 48;
 constexpr const char* kEnd = "\n";
+
+std::size_t bytesOf(const SessionEvent& event) { return sizeof event + event.text.size(); }
 
 }  // namespace
 
@@ -32,24 +35,28 @@ std::string withoutPins(std::string_view before, std::string_view bytes) {
 SessionLog::SessionLog(const Clock& clock, FileService& files)
     : clock_(clock), files_(files), began_(clock.micros()) {}
 
-std::string SessionLog::begin(const std::string& path, const std::string& arguments) {
+std::string SessionLog::begin(const std::string& path, const std::string& startArguments) {
     end();
-    const SessionEvent start{0, Kind::Start, arguments};
-    const std::string line = sessionLine(start) + kEnd;
-    if (const FileProblem why = files_.replace(path, line); !why.empty())
+    std::string text = sessionLine({0, Kind::Start, startArguments}) + kEnd;
+    if (whole_)
+        for (const SessionEvent& event : events_) text += sessionLine(event) + kEnd;
+    if (const FileProblem why = files_.replace(path, text); !why.empty())
         return writeProblem(path, why);
-    began_ = clock_.micros();
-    written_ = line.size();
+    written_ = text.size();
     path_ = path;
-    last_.clear();
-    last_.push_back(start);
+    if (whole_ && !events_.empty()) return {};
+    began_ = clock_.micros();
+    events_.clear();
+    kept_ = 0;
     if (open_) note(Kind::Open, address_);
     return {};
 }
 
 void SessionLog::end() {
     if (!writing()) return;
-    if (last_.empty() || last_.back().kind != Kind::Closed) note(Kind::Closed, "");
+    // The port stays as it is, so this is no event of the session.
+    if (events_.empty() || events_.back().kind != Kind::Closed)
+        write(sessionLine({clock_.micros() - began_, Kind::Closed, ""}) + kEnd);
     path_.clear();
 }
 
@@ -76,10 +83,19 @@ void SessionLog::closed() {
 }
 
 void SessionLog::note(Kind kind, std::string text) {
-    last_.push_back({clock_.micros() - began_, kind, std::move(text)});
-    if (last_.size() > kKept) last_.pop_front();
-    Noted(last_.back());
-    if (writing()) write(sessionLine(last_.back()) + kEnd);
+    events_.push_back({clock_.micros() - began_, kind, std::move(text)});
+    kept_ += bytesOf(events_.back());
+    forget();
+    Noted(events_.back());
+    if (writing()) write(sessionLine(events_.back()) + kEnd);
+}
+
+void SessionLog::forget() {
+    whole_ = whole_ && kept_ <= kMostKept;
+    while (!whole_ && events_.size() > kKept) {
+        kept_ -= bytesOf(events_.front());
+        events_.pop_front();
+    }
 }
 
 void SessionLog::write(const std::string& line) {
@@ -97,7 +113,9 @@ void SessionLog::write(const std::string& line) {
 
 std::vector<std::string> SessionLog::lastLines() const {
     std::vector<std::string> lines;
-    for (SessionEvent event : last_) {
+    const std::size_t shown = std::min(events_.size(), kKept);
+    for (auto at = events_.end() - static_cast<std::ptrdiff_t>(shown); at != events_.end(); ++at) {
+        SessionEvent event = *at;
         // A trace has thousands of bytes; a report is read by people.
         std::string rest;
         const bool bytes = event.kind == Kind::Sent || event.kind == Kind::Came;

@@ -4,6 +4,7 @@
 #include <QApplication>
 #include <QClipboard>
 #include <QCloseEvent>
+#include <QFileInfo>
 #include <QHBoxLayout>
 #include <QMessageBox>
 
@@ -65,7 +66,7 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     installEventFilter(new FileDrop(
         *this,
         [this, &interlock] { return interlock.turnOf(panel_.LoadData) != Interlock::Turn::Now; },
-        [this](const QString& path) { panel_.OpenFile(path.toStdString()); }));
+        [this](const QString& path) { openFile(path); }));
     buildWindows();
     addTraceTools(*this, program_, graph(), *menuOf(panel_.Utility, binder_));
     followState();
@@ -112,10 +113,25 @@ void MainWindow::buildCentre() {
     setCentralWidget(centre);
 }
 
+/// In the record as a choice in the dialog of the menu: another machine has no such entry.
+void MainWindow::tellOpened(const std::string& path) {
+    program_.sessionLog().clicked(panel_.LoadData.name());
+    program_.sessionLog().input("answer " + path);
+}
+
+void MainWindow::openFile(const QString& file) {
+    const std::string path = QFileInfo(file).absoluteFilePath().toStdString();
+    tellOpened(path);
+    panel_.OpenFile(path);
+}
+
 void MainWindow::buildWindows() {
     binder_.tell = [this](const std::string& act, const std::string& what) {
         SessionLog& record = program_.sessionLog();
-        act == "click" ? record.clicked(what) : record.input(act + " " + what);
+        if (act != "click") return record.input(act + " " + what);
+        for (const MenuItem& file : panel_.RecentFile)
+            if (file.name() == what) return tellOpened(file.ToolTip);
+        record.clicked(what);
     };
     graph().told = [this](const std::string& line) { program_.sessionLog().input(line); };
     Forms& forms = program_.forms();

@@ -43,6 +43,8 @@ class MainWindow : public QMainWindow {
     /// Shows everything as the forms have it, at once.
     void showNow();
     void copyPicture();
+    /// Loads a saved view, as the menu does.
+    void openFile(const QString& file);
 
   protected:
     void closeEvent(QCloseEvent* event) override;
@@ -70,6 +72,7 @@ class MainWindow : public QMainWindow {
     void greyWhatRefuses();
     QString titleText() const;
     void connectTo(const LinkAddress& address);
+    void tellOpened(const std::string& path);
     void drawImage(const std::string& path, std::string& problem);
 
     Program& program_;

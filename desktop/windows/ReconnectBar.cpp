@@ -26,7 +26,10 @@ ReconnectBar::ReconnectBar(ControllerForm& panel, Binder& binder, QWidget* paren
     always->setToolTip(QObject::tr(
         "Connects again as soon as the port or the server is back and the instrument answers"));
     always->setChecked(panel.ReconnectAlways.Checked);
-    connect(always, &QCheckBox::clicked, this, [&panel] { panel.ReconnectAlways.Click(); });
+    connect(always, &QCheckBox::clicked, this, [&panel, &binder] {
+        if (binder.tell) binder.tell("click", panel.ReconnectAlways.name());
+        panel.ReconnectAlways.Click();
+    });
     panel.ReconnectAlways.Changed.connect([tick = QPointer<QCheckBox>(always), &panel] {
         if (tick) tick->setChecked(panel.ReconnectAlways.Checked);
     });

@@ -69,7 +69,37 @@ TEST_F(ReplayVerbTest, WordsOfAWindow_HoldAgain) {
     EXPECT_EQ(out.str(), "false\n");
 }
 
-TEST_F(ReplayVerbTest, RecordBegunInsideASession_IsSaidNotToRunAgain) {
+TEST_F(ReplayVerbTest, RecordBegunInsideASession_RunsAgainFromItsStart) {
+    const std::string log = folder.file("inside.log");
+    folder.write("session.txt",
+                 "connect\ntype SoftTextBox(0) 900M\nkey SoftTextBox(0) enter\nanswer " + log +
+                     "\nclick UtilityRecord\ntype SoftTextBox(0) 1G\nkey SoftTextBox(0) enter\n"
+                     "show UtilityRecord.Checked\nclick UtilityRecord\n");
+    ASSERT_EQ(runConnected({"panel", folder.file("session.txt")}), kDone) << errors.str();
+    const std::string text = folder.read("inside.log");
+    EXPECT_NE(text.find("|FREQ,900000000.|"), std::string::npos) << "sent before the record";
+    EXPECT_NE(text.find("|FREQ,1000000000.|"), std::string::npos);
+    EXPECT_EQ(run({"replay", log}), kDone) << errors.str();
+    EXPECT_EQ(out.str(), "true\n") << "up to the end of the record";
+    std::string other = text;
+    other.replace(other.find("46 52 45 51 2C 39"), 2, "47");
+    folder.write("other.log", other);
+    EXPECT_EQ(run({"replay", folder.file("other.log")}), kLinkFailed);
+}
+
+TEST_F(ReplayVerbTest, ChoiceToReconnect_IsPartOfTheRecord) {
+    const std::string log = folder.file("again.log");
+    folder.write("first.txt", "click ReconnectAlways\n");
+    ASSERT_EQ(run({"panel", folder.file("first.txt")}), kDone);
+    folder.write("second.txt", "show ReconnectAlways.Checked\n");
+    ASSERT_EQ(run({"--log", log, "panel", folder.file("second.txt")}), kDone);
+    EXPECT_EQ(out.str(), "true\n");
+    EXPECT_EQ(run({"replay", log}), kDone) << errors.str();
+    EXPECT_EQ(out.str(), "true\n") << "at the desk where it was chosen";
+    EXPECT_NE(folder.read("again.log").find(" click ReconnectAlways\n"), std::string::npos);
+}
+
+TEST_F(ReplayVerbTest, RecordBegunInAVeryLongSession_IsSaidNotToRunAgain) {
     folder.write("late.log",
                  "0.000000 start zelremote\n0.000000 open serial:/dev/ttyUSB0@57600\n"
                  "0.100000 click SpanButton\n0.200000 > 0D |.|\n0.300000 closed\n");

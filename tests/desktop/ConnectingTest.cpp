@@ -4,9 +4,12 @@
 #include <QCheckBox>
 #include <QProgressBar>
 #include <QTest>
+#include <algorithm>
 
 #include "desktop/windows/ConnectCard.h"
 #include "desktop/windows/ReconnectBar.h"
+#include "support/SessionLog.h"
+#include "support/Text.h"
 #include "tests/connection/SwitchedPort.h"
 #include "tests/desktop/WindowTest.h"
 
@@ -176,6 +179,10 @@ TEST_F(Connecting, PortThatIsBack_IsOfferedOnALineOverTheGraph) {
     always->click();
     EXPECT_TRUE(panel.ReconnectAlways.Checked);
     EXPECT_TRUE(always->isChecked());
+    const std::vector<std::string> record = program->sessionLog().lastLines();
+    EXPECT_TRUE(std::any_of(record.begin(), record.end(), [](const std::string& line) {
+        return contains(line, " click ReconnectAlways");
+    }));
     again->click();
     EXPECT_TRUE(panel.isConnected);
     window->showNow();

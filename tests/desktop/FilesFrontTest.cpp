@@ -1,6 +1,7 @@
 // Files on the panel: the recent ones, a dropped one, the bar of a series that plays, the progress,
 // and the recording's dialog.
 
+#include <QDir>
 #include <QDropEvent>
 #include <QFile>
 #include <QMenu>
@@ -9,6 +10,7 @@
 #include <QTest>
 #include <QUrl>
 
+#include "support/SessionLog.h"
 #include "tests/desktop/WindowTest.h"
 
 namespace zel {
@@ -44,6 +46,14 @@ class FilesFrontTest : public WindowTest {
         return qobject_cast<QAction*>(window->binder().widgetOf(item));
     }
 
+    /// The last two lines of the session's record without their times.
+    std::string written() {
+        std::vector<std::string> lines = program->sessionLog().lastLines();
+        if (lines.size() < 2) return {};
+        for (std::string& line : lines) line.erase(0, line.find(' ') + 1);
+        return lines[lines.size() - 2] + ", " + lines.back();
+    }
+
     QTemporaryDir folder_;
     std::vector<std::string> opened_;
 };
@@ -52,6 +62,15 @@ TEST_F(FilesFrontTest, DroppedFile_IsOpened) {
     const QString path = makeFile("view.txt");
     EXPECT_TRUE(drop({QUrl::fromLocalFile(path)}));
     EXPECT_EQ(opened_, std::vector<std::string>{path.toStdString()});
+    // As a choice in the dialog: the session can run again.
+    EXPECT_EQ(written(), "click LoadData, input answer " + path.toStdString());
+}
+
+TEST_F(FilesFrontTest, FileOfTheCommandLine_IsOpenedAndWrittenDown) {
+    const QString path = makeFile("view.txt");
+    window->openFile(QDir::current().relativeFilePath(path));
+    EXPECT_EQ(opened_, std::vector<std::string>{path.toStdString()});
+    EXPECT_EQ(written(), "click LoadData, input answer " + path.toStdString());
 }
 
 TEST_F(FilesFrontTest, DropOfAnythingElse_IsRefused) {
@@ -103,6 +122,7 @@ TEST_F(FilesFrontTest, RecentMenu_ShowsNamesWithTheirPathsAndRunsThem) {
     EXPECT_FALSE(actionOf(panel().RecentFile(2))->isVisible());
     entry->trigger();
     EXPECT_EQ(clicks, 1);
+    EXPECT_EQ(written(), "click LoadData, input answer /data/R&D.txt");
 }
 
 TEST_F(FilesFrontTest, PlaybackBar_IsSeenWhileASeriesPlays) {

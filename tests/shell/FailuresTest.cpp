@@ -116,14 +116,28 @@ TEST_F(FailuresTest, MenuEntry_RecordsTheSessionUntilItIsClickedAgain) {
     EXPECT_FALSE(panel.UtilityRecord.Checked);
 }
 
-TEST_F(FailuresTest, RecordBegunWhileConnected_IsSaidNotToRunAgain) {
+TEST_F(FailuresTest, RecordBegunWhileConnected_BeginsWithTheStart) {
     startConnected();
+    program.sessionLog().input("connect");
+    program.sessionLog().opened("serial:A@57600");
+    platform.fileDialogs.answer("/home/a.log");
+    panel.UtilityRecord.Click();
+    EXPECT_TRUE(panel.UtilityRecord.Checked);
+    EXPECT_TRUE(platform.boxes.texts().empty());
+    EXPECT_TRUE(contains(platform.files.bytes("/home/a.log"),
+                         " input connect\n0.000000 open serial:A@57600\n"));
+}
+
+TEST_F(FailuresTest, RecordBegunInAVeryLongSession_IsSaidNotToRunAgain) {
+    startConnected();
+    program.sessionLog().opened("serial:A@57600");
+    program.sessionLog().came(std::string(SessionLog::kMostKept, 'x'));
     platform.fileDialogs.answer("/home/a.log");
     panel.UtilityRecord.Click();
     EXPECT_TRUE(panel.UtilityRecord.Checked);
     ASSERT_EQ(platform.boxes.texts().size(), 1U);
     EXPECT_TRUE(
-        startsWith(platform.boxes.texts()[0], "The record begins while ZELRemote is connected."));
+        startsWith(platform.boxes.texts()[0], "The session is too long to be written from its"));
 }
 
 TEST_F(FailuresTest, RecordBegunByTheMenu_NamesTheWordsOfTheStart) {

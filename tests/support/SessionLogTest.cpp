@@ -195,8 +195,38 @@ TEST_F(SessionLogTest, LastEvents_AreKeptWithoutAFile) {
     EXPECT_LT(log.lastLines().back().size(), 300U);
 }
 
-TEST_F(SessionLogTest, LogBegunInASession_SaysWhatIsOpen) {
+TEST_F(SessionLogTest, LogBegunInASession_HoldsTheSessionFromItsStart) {
+    clock.advance(1);
+    log.input("connect");
     log.opened("serial:A@57600");
+    log.sent("GET\r");
+    clock.advance(1);
+    ASSERT_EQ(log.begin("/logs/a.log", "x"), "");
+    log.clicked("SpanButton");
+    log.end();
+    const std::string session =
+        "0.000000 start x\n0.001000 input connect\n0.001000 open serial:A@57600\n"
+        "0.001000 > 47 45 54 0D |GET.|\n0.002000 click SpanButton\n";
+    EXPECT_EQ(text(), session + "0.002000 closed\n");
+    // The end of a record is no event: the port is still open in the next one.
+    clock.advance(1);
+    ASSERT_EQ(log.begin("/logs/a.log", "x"), "");
+    log.closed();
+    log.end();
+    EXPECT_EQ(text(), session + "0.003000 closed\n");
+    EXPECT_TRUE(log.whole());
+}
+
+TEST_F(SessionLogTest, LogBegunInAVeryLongSession_SaysWhatIsOpen) {
+    log.opened("serial:A@57600");
+    const std::string block(100'000, 'x');
+    for (int i = 0; i < 70; ++i) log.came(block);
+    EXPECT_TRUE(log.whole());
+    for (int i = 0; i < 20; ++i) log.came(block);
+    EXPECT_FALSE(log.whole());
+    for (int i = 0; i < 300; ++i) log.clicked("A");
+    EXPECT_EQ(log.lastLines().size(), SessionLog::kKept);
+    clock.advance(1);
     ASSERT_EQ(log.begin("/logs/a.log", "x"), "");
     log.end();
     EXPECT_EQ(text(), "0.000000 start x\n0.000000 open serial:A@57600\n0.000000 closed\n");
