@@ -300,6 +300,7 @@ void Doctor::askModem(const LinkAddress& address) {
     const Line line = portLine();
     line.send("AT\r");
     const std::string answer = collect(line, kModemMs, 0);
+    if (stopped_) return;
     if (contains(answer, "OK")) return tell(Grade::Ok, "modem", "a modem answers: OK");
     tell(Grade::Fault, "modem", "no modem answers; what came: " + bytesText(answer),
          "Switch the modem on and choose the baud rate that it works at.");

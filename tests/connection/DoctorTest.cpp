@@ -212,6 +212,27 @@ TEST_F(DoctorTest, ServerThatCannotBeReached_IsAFault) {
     EXPECT_FALSE(well);
 }
 
+/// An examination that is left while it waits for an answer finds nothing more.
+TEST_F(DoctorTest, ExaminationThatIsLeft_NamesNoFault) {
+    const LinkAddress addresses[] = {
+        {LinkAddress::Kind::Serial, kPath, 57600},
+        {LinkAddress::Kind::Tcp, "host", 2277},
+        {LinkAddress::Kind::TwoModems, kPath, 57600, "123", {}},
+    };
+    for (const LinkAddress& address : addresses) {
+        Doctor doctor({platform.portProbe, platform.port, platform.tcpSocket, platform.clock,
+                       platform.events});
+        platform.events.schedule(100, [&doctor] { doctor.stop(); });
+        const std::int64_t begun = platform.clock.micros();
+        EXPECT_TRUE(doctor.examine(address, [](const Finding& finding) {
+            EXPECT_EQ(finding.grade, Finding::Grade::Ok) << findingLine(finding);
+        }));
+        EXPECT_LT(platform.clock.micros() - begun, 200'000);
+        EXPECT_FALSE(platform.port.isOpen());
+        EXPECT_EQ(platform.tcpSocket.state(), SocketState::Closed);
+    }
+}
+
 TEST_F(DoctorTest, ServerWithoutAnAnswer_IsAFault) {
     platform.tcpSocket.expect("\r");
     platform.tcpSocket.expect("GET\r").silence();

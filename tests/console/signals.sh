@@ -59,6 +59,20 @@ wait_for() { # FILE TEXT
     done
 }
 
+# The doctor finds nothing wrong with what it was not let ask.
+start_simulator --fault silence:exchange=1
+(trap - INT; exec "$zelctl" --home "$scratch/home" doctor "tcp:$address") \
+    > "$scratch/doctor.log" 2>&1 &
+program=$!
+wait_for "$scratch/doctor.log" 'can be reached'
+kill -INT "$program"
+ended_in 2
+[ "$status" -eq 1 ] || fail "the doctor: status $status"
+grep -q 'ended by SIGINT' "$scratch/doctor.log" || fail "the doctor: SIGINT is not reported"
+! grep -q '^fault' "$scratch/doctor.log" || fail "the doctor: the end of the program is a fault"
+stop_simulator
+echo "doctor: no finding after the signal"
+
 # Idle, in a sweep that lasts for minutes, and at each of the three signals.
 for signal in INT TERM HUP; do
     start_simulator
