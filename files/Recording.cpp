@@ -163,7 +163,7 @@ bool Recording::takeTrace() {
         sweeps_.PlaySingleButton_Click();
     } else {
         sweeps_.nextRow();
-        bool success = false;
+        bool success{};
         sweeps_.traces().ReadSingleTrace2({}, success);
     }
     if (!power) return countTrace();

@@ -98,7 +98,7 @@ void MarkerKeys::MarkToCentButton_Click() {
         mirror_.CenterFrequency = leadingNumber(answer);
     }
     readout_.MakeMarkerReadout();
-    bool success = false;
+    bool success{};
     traces_.ReadSingleTrace2({}, success);
 }
 
@@ -119,7 +119,7 @@ void MarkerKeys::MarkToRefButton_Click() {
                 leadingNumber(replaceAll(formatPattern(leadingNumber(pieces[1]), "00,0"), ",", ""));
     }
     readout_.MakeMarkerReadout();
-    bool success = false;
+    bool success{};
     traces_.ReadSingleTrace2({}, success);
 }
 
@@ -158,7 +158,7 @@ void MarkerKeys::MarkerCheckBox_Click() {
     exchange_.SetInstrument("MARK1ON,1");
     mirror_.MarkerOn = true;
     events_.sleep(kSwitchMs);
-    bool success = false;
+    bool success{};
     traces_.ReadSingleTrace2({}, success);
     if (!success) return;
     readout_.MakeMarkerReadout();

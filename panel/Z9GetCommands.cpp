@@ -121,7 +121,7 @@ void Z9GetCommands::runQuery(const SoftPosition& query) {
 }
 
 void Z9GetCommands::readTrace() {
-    bool success = false;
+    bool success{};
     routines_.traces.ReadSingleTrace2({}, success);
 }
 

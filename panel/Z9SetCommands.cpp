@@ -134,7 +134,7 @@ void Z9SetCommands::showEdges() {
 void Z9SetCommands::showSpan() { panel_.SpanLabel.Caption = spanLabelText(mirror_.Span); }
 
 void Z9SetCommands::readTrace() {
-    bool success = false;
+    bool success{};
     routines_.traces.ReadSingleTrace2({}, success);
 }
 

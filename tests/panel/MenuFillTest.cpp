@@ -155,6 +155,16 @@ TEST_F(MenuFillTest, OccupiedBandwidth_FirstVisit_KeepsACopyOfTheValue) {
     EXPECT_EQ(field("OccBWValueCopy"), 250000);
 }
 
+TEST_F(MenuFillTest, OccupiedBandwidth_WithoutItsValue_KeepsTheOlderCopy) {
+    mirror.OccBWValue = 1000;
+    panel.InstrumentMode = CF::OCCBANDWIDTH;
+    get("OBWSTD", "1");
+    getRefused("OBW", "6");
+    panel.OccBWButton.Click();
+    expectPlayed();
+    EXPECT_EQ(field("OccBWValueCopy"), 0);
+}
+
 TEST_F(MenuFillTest, Marker_FirstVisit_TakesTheStateOfTheInstrument) {
     get("MARK1ON", "0");
     get("DELTA1ON", "0");
