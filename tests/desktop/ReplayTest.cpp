@@ -96,6 +96,29 @@ TEST_F(RecordedDesk, ClicksAnswersAndDrags_SendTheSameBytesAgain) {
         EXPECT_NE(log.find(line), std::string::npos) << line;
 }
 
+TEST_F(RecordedDesk, RecordBegunInsideTheSession_RunsAgainFromItsStart) {
+    program->sessionLog().input("connect");
+    connect();
+    window->showNow();
+    auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+    QTest::keyClicks(box, "900M");
+    QTest::keyClick(box, Qt::Key_Return);
+    platform.fileDialogs.answer("/session.log");
+    trigger(panel().UtilityRecord);
+    EXPECT_TRUE(panel().UtilityRecord.Checked);
+    QTest::keyClicks(box, "800M");
+    QTest::keyClick(box, Qt::Key_Return);
+    trigger(panel().UtilityRecord);
+    EXPECT_FALSE(panel().UtilityRecord.Checked);
+    QTest::keyClicks(box, "700M");
+    QTest::keyClick(box, Qt::Key_Return);
+    const std::string log = expectSameBytesAgain();
+    EXPECT_NE(log.find("|FREQ,900000000.|"), std::string::npos);
+    EXPECT_NE(log.find("|FREQ,800000000.|"), std::string::npos);
+    EXPECT_EQ(log.find("|FREQ,700000000.|"), std::string::npos) << "after the record";
+    program->disconnect();
+}
+
 TEST_F(RecordedDesk, KeysInABox_LeaveTheSameTextAgain) {
     recordConnected();
     auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
