@@ -5,6 +5,7 @@
 #include "panel/SoftPositions.h"
 #include "platform/Pointer.h"
 #include "trace/FrequencyLabels.h"
+#include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {
@@ -87,10 +88,7 @@ void ModeKeys::enterMode(std::int16_t mode) {
 
 /// The trace on the graph belongs to the mode before, until the next one is drawn.
 void ModeKeys::showPictureIsOld() {
-    const ShownView& shown = panel_.Shown;
-    if (!shown.fromFile && shown.instrumentMode != 0 &&
-        shown.instrumentMode != panel_.InstrumentMode)
-        panel_.CWGraph1.Old = true;
+    if (ofAnotherMode(panel_)) panel_.CWGraph1.Old = true;
 }
 
 void ModeKeys::AnalyzerButton_Click() {

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "support/NumberText.h"
+#include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {
@@ -69,8 +70,8 @@ void PaceMonitor::show() {
         text += "   " + formatPattern(sweepsPerSecond(), "0.0") + " sweeps/s   ";
         text += sweepSetsThePace() ? "the sweep sets the pace" : "the line sets the pace";
     }
-    panel_.CWGraph1.Old =
-        panel_.LinkLost || (running && age > 2 * std::max(cycleMicros_, kShortestCycle));
+    panel_.CWGraph1.Old = panel_.LinkLost || ofAnotherMode(panel_) ||
+                          (running && age > 2 * std::max(cycleMicros_, kShortestCycle));
     panel_.PaceLabel.Caption = text;
     // At rest the text changes with whole seconds of the age.
     if (!running) panel_.PaceTimer.Interval = kSecondMs - static_cast<int>(age / 1000 % kSecondMs);

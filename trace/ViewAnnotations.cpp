@@ -70,6 +70,12 @@ double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror) 
     return range;
 }
 
+bool ofAnotherMode(const ControllerForm& panel) {
+    const ShownView& shown = panel.Shown;
+    return panel.isConnected && !shown.fromFile && shown.instrumentMode != 0 &&
+           shown.instrumentMode != panel.InstrumentMode;
+}
+
 ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror) {
     ViewAnnotations view;
     const Graph& graph = panel.CWGraph1;

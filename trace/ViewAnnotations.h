@@ -32,6 +32,8 @@ struct ViewAnnotations {
 
 /// The range code of the view on the graph, also where a file gave dB a division.
 double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror);
+/// The trace on the graph is one of a mode that the instrument has left.
+bool ofAnotherMode(const ControllerForm& panel);
 /// From the mirror and from the axes as they are shown, zoomed or not.
 ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror);
 

@@ -76,6 +76,16 @@ TEST(PaceMonitor, PauseAboveFiveSeconds_IsNoPace) {
     EXPECT_DOUBLE_EQ(monitor.sweepsPerSecond(), 10) << "of the last eight";
 }
 
+TEST_F(Pace, TraceOfAnotherMode_StaysMarkedWhileItAges) {
+    connectTo(0);
+    panel().ChnPwrButton.Click();
+    platform.events.runFor(4000);
+    EXPECT_TRUE(panel().CWGraph1.Old);
+    panel().PlaySingleButton.Click();
+    platform.events.runFor(4000);
+    EXPECT_FALSE(panel().CWGraph1.Old);
+}
+
 TEST_F(Pace, FastLine_SaysThatTheSweepSetsThePace) {
     connectTo(0);
     view(2010, [this] {
