@@ -150,8 +150,9 @@ void TcpDialog::connect(bool readTrace) {
     const bool found = open(host, portText);
     dialog_.Connecting = false;
     if (dialog_.AdviceLabel.Caption.get() == step) dialog_.AdviceLabel.Caption = "";
-    if (!found) return;
+    if (!found) return stopClock();
     start_.connect();
+    if (!panel_.isConnected) stopClock();
     dialog_.Hide();
     if (readTrace) start_.readFirstSweep();
 }
@@ -183,7 +184,6 @@ bool TcpDialog::open(const std::string& host, const std::string& portText) {
     if (!quiet_)
         session_.boxes.show(
             {BoxIcon::Information, "No M&T ZEL3 found at the specified adress!", "No ZEL3 found"});
-    stopClock();
     return false;
 }
 
@@ -208,7 +208,6 @@ bool TcpDialog::left() const { return link_.state.mustLeave(session_.clock.micro
 void TcpDialog::giveUp() {
     socket_.close();
     dialog_.IDTextBox.Text = "";
-    stopClock();
 }
 
 /// The next attempt of its own is due when the clock says so.

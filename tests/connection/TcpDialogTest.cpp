@@ -193,6 +193,18 @@ TEST_F(TcpDialogTest, RecentServer_BringsItsTlsBack) {
     EXPECT_EQ(tcp.FingerprintTextBox.Text.get(), "");
 }
 
+TEST_F(TcpDialogTest, AttemptThatIsLeft_StopsTheClockOfTheSession) {
+    socket.connectsTo(SocketState::Connecting);
+    bool ran = false;
+    later(500, [&] {
+        ran = panel.UpNow.Enabled;
+        tcp.QuitTCPButton.Click();
+    });
+    tcp.ConnectTCPButton.Click();
+    EXPECT_TRUE(ran);
+    EXPECT_FALSE(panel.UpNow.Enabled);
+}
+
 TEST_F(TcpDialogTest, PeerClosing_IsShownAndTheWaitGoesOn) {
     socket.connectsTo(SocketState::Connecting);
     later(1000, [this] { socket.setState(SocketState::PeerClosing); });
