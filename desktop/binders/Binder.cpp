@@ -7,6 +7,7 @@
 #include <algorithm>
 
 #include "desktop/binders/EventGuards.h"
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/binders/ShortcutTable.h"
 #include "desktop/binders/ToolTips.h"
 
@@ -217,7 +218,7 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
 
 void Binder::bind(Label& control, QLabel* widget) {
     follow(control, widget, [&control, widget] {
-        widget->setText(text(control.Caption));
+        widget->setText(labelText(control, control.Caption));
         widget->setVisible(control.Visible);
         const Color ink = control.ForeColor;
         QString style;

@@ -8,7 +8,9 @@ namespace zel {
 namespace {
 
 constexpr double kCursorReach = 8;  // pixels
-constexpr double kLabelGap = 9;     // pixels from the point to its text
+constexpr double kLabelGap = 6;     // pixels from the point to its text
+constexpr double kLineGap = 4;      // pixels from the line to its text
+constexpr int kGroundAlpha = 200;   // of the ground under a text
 constexpr int kFontPoints = 9;
 
 }  // namespace
@@ -21,6 +23,7 @@ QFont plotFont() {
 
 CursorMarks::CursorMarks(QCustomPlot& plot, const GraphColors& colors)
     : plot_(plot), colors_(colors) {
+    // The texts come last: no line runs through them.
     for (Items& cursor : items_) {
         cursor.line = new QCPItemStraightLine(&plot_);
         cursor.point = new QCPItemTracer(&plot_);
@@ -28,7 +31,12 @@ CursorMarks::CursorMarks(QCustomPlot& plot, const GraphColors& colors)
         cursor.point->setSize(9);
         cursor.line->setVisible(false);
         cursor.point->setVisible(false);
+    }
+    QColor ground = colors_.plotArea;
+    ground.setAlpha(kGroundAlpha);
+    for (Items& cursor : items_) {
         cursor.text = new QCPItemText(&plot_);
+        cursor.text->setBrush(ground);
         cursor.text->position->setType(QCPItemPosition::ptAbsolute);
         cursor.text->setFont(plotFont());
         cursor.text->setClipToAxisRect(false);
@@ -73,14 +81,19 @@ void CursorMarks::write(std::size_t index, const QPointF& point, const Trace& tr
     const QRectF area = plot_.axisRect()->rect();
     const QPointF pixel(plot_.xAxis->coordToPixel(point.x()), plot_.yAxis->coordToPixel(point.y()));
     label.setVisible(area.adjusted(-1, -1, 1, 1).contains(pixel));
-    const double half = QFontMetricsF(label.font()).horizontalAdvance(label.text()) / 2 + 4;
-    const double line = QFontMetricsF(label.font()).height();
-    const double right = std::max(area.left() + half, area.right() - half);
-    const double place = pixel.y() - kLabelGap - line;
-    label.setPositionAlignment(Qt::AlignHCenter | Qt::AlignTop);
-    // The second one goes a line lower where both would stand at one place.
-    label.position->setCoords(std::clamp(pixel.x(), area.left() + half, right),
-                              std::max(place, area.top() + 2 + (index == 1 ? line : 0)));
+    const QFontMetricsF letters(label.font());
+    const QSizeF size(letters.horizontalAdvance(label.text()) + 2, letters.height());
+    QRectF place(pixel + QPointF(kLineGap, -kLabelGap - size.height()), size);
+    // Left of its line where the right has no room.
+    if (place.right() > area.right()) place.moveRight(pixel.x() - kLineGap);
+    place.moveLeft(std::max(place.left(), area.left() + 2));
+    place.moveTop(std::max(place.top(), area.top() + 2));
+    // The second one goes below the first where both would stand at one place.
+    if (index == 1 && items_[0].text->visible() && place.intersects(items_[0].place))
+        place.moveTop(items_[0].place.bottom() + 1);
+    items_.at(index).place = place;
+    label.setPositionAlignment(Qt::AlignLeft | Qt::AlignTop);
+    label.position->setCoords(place.topLeft());
 }
 
 int CursorMarks::at(const QPointF& pixel) const {

@@ -39,6 +39,7 @@ class CursorMarks {
         QCPItemStraightLine* line = nullptr;
         QCPItemTracer* point = nullptr;
         QCPItemText* text = nullptr;
+        QRectF place;  ///< of the text, in pixels
         bool visible = false;
         double x = 0;
     };

@@ -1,6 +1,7 @@
 #include "desktop/graph/GraphNavigator.h"
 
 #include <cmath>
+#include <utility>
 
 namespace zel {
 namespace {
@@ -52,6 +53,32 @@ void GraphNavigator::show(const View& view) {
     if (view.bottom != old.bottom || view.top != old.top)
         panel_.CWGraph1.setYRange(view.bottom, view.top);
     last_ = now();
+    zoomed_ = panel_.GraphZoomed;
+}
+
+void GraphNavigator::keepView() {
+    const bool newTrace =
+        std::exchange(serial_, panel_.CWGraph1.plotSerial()) != panel_.CWGraph1.plotSerial();
+    const View view = now();
+    if (!whole_ || view == last_) return;
+    const View whole = *whole_;
+    const auto levelsOf = [&view](const View& other) {
+        return view.bottom == other.bottom && view.top == other.top;
+    };
+    const auto widthOf = [&view](const View& other) {
+        return view.left == other.left && view.right == other.right;
+    };
+    if (zoomed_ && !panel_.GraphZoomed) {
+        // The key shows the whole width; the levels go with it.
+        const bool closer = levelsOf(last_);
+        forget();
+        if (closer) panel_.CWGraph1.setYRange(whole.bottom, whole.top);
+        return;
+    }
+    const bool laidOut = (levelsOf(whole) || levelsOf(last_)) && (widthOf(whole) || widthOf(last_));
+    // The manual scale and other settings are a whole view of their own.
+    if (newTrace && laidOut) return show(View(last_));
+    forget();
 }
 
 void GraphNavigator::zoomX(double about, double factor) {
@@ -121,6 +148,10 @@ void GraphNavigator::whole() {
         last_.bottom == panel_.CWGraph1.yAxis().Minimum &&
         last_.top == panel_.CWGraph1.yAxis().Maximum)
         panel_.CWGraph1.setYRange(whole_->bottom, whole_->top);
+    forget();
+}
+
+void GraphNavigator::forget() {
     past_.clear();
     future_.clear();
     whole_.reset();

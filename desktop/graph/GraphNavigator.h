@@ -35,6 +35,9 @@ class GraphNavigator {
     bool canGoForward() const { return !future_.empty(); }
     /// Both axes as they were before the first step.
     void whole();
+    /// A new trace lays out the axes as the instrument has them; where these are still the ones of
+    /// the whole view, the closer view stays. To be called before each drawing.
+    void keepView();
     /// The next step begins a new one of the history.
     void endStep() { step_ = Step::None; }
 
@@ -46,6 +49,7 @@ class GraphNavigator {
     View now() const;
     void show(const View& view);
     void markZoomed();
+    void forget();
 
     ControllerForm& panel_;
     std::vector<View> past_;
@@ -53,6 +57,8 @@ class GraphNavigator {
     std::optional<View> whole_;
     View last_;
     Step step_ = Step::None;
+    bool zoomed_ = false;       ///< the last view was a closer one on the x axis
+    unsigned long serial_ = 0;  ///< of the trace that was drawn last
 };
 
 }  // namespace zel

@@ -24,6 +24,8 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
       graph_(graph),
       annotate_(std::move(annotate)),
       band_(new QRubberBand(QRubberBand::Rectangle, this)) {
+    // Nothing is drawn there: a picture of its own would be 2 MB, laid over each frame.
+    layer("overlay")->setMode(QCPLayer::lmLogical);
     picture_ = std::make_unique<GraphPlot>(*this);
     picture_->setMarkerTexts(true);
     setAccessibleName(QObject::tr("Graph"));
@@ -35,13 +37,22 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
 
 void GraphWidget::refresh() {
     picture_->setTraceWidth(devicePixelRatioF() >= kSharpScreen ? 1.5 : 1);
-    picture_->update(graph_, annotate_());
+    takeGraph();
     showPointer(mapFromGlobal(QCursor::pos()));
     replot(QCustomPlot::rpQueuedReplot);
 }
 
-void GraphWidget::drawNow() {
+void GraphWidget::takeGraph() {
+    if (navigator_ != nullptr) navigator_->keepView();
+    const QCPRange x = xAxis->range();
+    const QCPRange y = yAxis->range();
     picture_->update(graph_, annotate_());
+    // The pointer rests, and the axes move under it.
+    if (pointer_ && (x != xAxis->range() || y != yAxis->range())) track(*pointer_);
+}
+
+void GraphWidget::drawNow() {
+    takeGraph();
     replot(QCustomPlot::rpImmediateRefresh);
 }
 
@@ -102,10 +113,16 @@ void GraphWidget::mouseMoveEvent(QMouseEvent* event) {
         return hostMarkerMoved(hostDragged_, xAxis->pixelToCoord(clamped(pixel).x()));
     showPointer(pixel);
     if (dragged_ > 0) return moveCursor(dragged_, xAxis->pixelToCoord(clamped(pixel).x()));
+    track(pixel);
+}
+
+void GraphWidget::track(const QPointF& pixel) {
+    pointer_.reset();
     if (!picture_->axisRect().rect().contains(pixel.toPoint()) || graph_.values().empty()) {
         if (pointed) pointed(std::nullopt);
         return;
     }
+    pointer_ = pixel;
     if (tracking) tracking(true);
     graph_.PlotAreaTracking(xAxis->pixelToCoord(pixel.x()), yAxis->pixelToCoord(pixel.y()));
     if (tracking) tracking(false);
@@ -121,6 +138,7 @@ void GraphWidget::panTo(const QPointF& pixel) {
 
 void GraphWidget::leaveEvent(QEvent* event) {
     QCustomPlot::leaveEvent(event);
+    pointer_.reset();
     if (pointed) pointed(std::nullopt);
 }
 
@@ -132,6 +150,13 @@ void GraphWidget::mouseDoubleClickEvent(QMouseEvent* event) {
 
 void GraphWidget::wholeView() {
     if (navigator_ != nullptr) navigator_->whole();
+}
+
+void GraphWidget::showLevels(double bottom, double top) {
+    const GraphAxis& x = graph_.xAxis();
+    if (navigator_ != nullptr)
+        return navigator_->showRectangle({x.Minimum, x.Maximum, bottom, top});
+    graph_.setYRange(bottom, top);
 }
 
 void GraphWidget::wheelEvent(QWheelEvent* event) {

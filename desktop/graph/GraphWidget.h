@@ -27,6 +27,8 @@ class GraphWidget : public QCustomPlot {
     void setNavigator(GraphNavigator* navigator) { navigator_ = navigator; }
     /// Both axes as they were before the user looked closer.
     void wholeView();
+    /// The level axis from `bottom` to `top`, as a step of the history.
+    void showLevels(double bottom, double top);
     /// Where the trace is drawn, in pixels of the widget.
     QRect plotArea() const { return picture_->axisRect().rect(); }
     const GraphPlot& picture() const { return *picture_; }
@@ -57,6 +59,10 @@ class GraphWidget : public QCustomPlot {
     void keyReleaseEvent(QKeyEvent* event) override;
 
   private:
+    /// The graph's state into the picture.
+    void takeGraph();
+    /// Position and level under a pixel, or that the pointer is elsewhere.
+    void track(const QPointF& pixel);
     bool zooming() const;
     bool navigate(const QKeyEvent& event);
     void panTo(const QPointF& pixel);
@@ -76,6 +82,7 @@ class GraphWidget : public QCustomPlot {
     int dragged_ = 0;
     int hostDragged_ = 0;  ///< marker of the host
     bool spaceHeld_ = false;
+    std::optional<QPointF> pointer_;  ///< pixel of the pointer over the plot
     std::optional<QPointF> panFrom_;  ///< pixel where the pan has got to
 };
 

@@ -42,7 +42,9 @@ QColor TraceOverlay::ink(const QColor& color) const {
     return paper_ ? color.darker(kDarker) : color;
 }
 
-TraceOverlay::TraceOverlay(QCustomPlot& plot, bool paper) : plot_(plot), paper_(paper) {
+TraceOverlay::TraceOverlay(QCustomPlot& plot, bool paper) : plot_(plot), paper_(paper) {}
+
+void TraceOverlay::build() {
     plot_.addLayer(kLayer, plot_.layer("main"), QCustomPlot::limBelow);
     foot_ = addText(plot_, 0.01, 0.985, Qt::AlignLeft | Qt::AlignBottom);
     notice_ = addText(plot_, 0.5, 0.16, Qt::AlignHCenter | Qt::AlignTop);
@@ -56,6 +58,10 @@ TraceOverlay::TraceOverlay(QCustomPlot& plot, bool paper) : plot_(plot), paper_(
 }
 
 void TraceOverlay::show(const OverlayPicture& picture) {
+    if (foot_ == nullptr) {
+        if (picture.empty()) return;
+        build();
+    }
     while (curves_.size() > picture.curves.size()) {
         plot_.removeGraph(curves_.back());
         curves_.pop_back();

@@ -46,6 +46,7 @@ class TraceOverlay {
     void clipToView();
 
   private:
+    void build();
     QColor ink(const QColor& color) const;
 
     QCustomPlot& plot_;
@@ -53,8 +54,8 @@ class TraceOverlay {
     std::vector<QCPGraph*> curves_;
     std::vector<QCPItemTracer*> points_;
     std::vector<QCPItemText*> labels_;
-    QCPItemText* foot_;
-    QCPItemText* notice_;
+    QCPItemText* foot_ = nullptr;  ///< nothing is built before there is something to show
+    QCPItemText* notice_ = nullptr;
 };
 
 }  // namespace zel

@@ -626,14 +626,6 @@ oder eine Aufzeichnung laden</translation>
         <translation>Leistung</translation>
     </message>
     <message>
-        <source>Highest %1</source>
-        <translation>Höchster Wert %1</translation>
-    </message>
-    <message>
-        <source>Lowest %1 of the last %2 readings</source>
-        <translation>Niedrigster Wert %1 der letzten %2 Ablesungen</translation>
-    </message>
-    <message>
         <source>Level of the trace under the pointer</source>
         <translation>Pegel der Messkurve unter dem Mauszeiger</translation>
     </message>
@@ -987,23 +979,23 @@ oder eine Aufzeichnung laden</translation>
     </message>
     <message>
         <source>refused: not understood</source>
-        <translation>abgelehnt: nicht verstanden</translation>
+        <translation>nicht verstanden</translation>
     </message>
     <message>
         <source>refused: not in this mode</source>
-        <translation>abgelehnt: nicht in dieser Betriebsart</translation>
+        <translation>falsche Betriebsart</translation>
     </message>
     <message>
         <source>refused: storage full</source>
-        <translation>abgelehnt: Speicher voll</translation>
+        <translation>Speicher voll</translation>
     </message>
     <message>
         <source>refused: not allowed</source>
-        <translation>abgelehnt: nicht erlaubt</translation>
+        <translation>nicht erlaubt</translation>
     </message>
     <message>
         <source>refused: out of range</source>
-        <translation>abgelehnt: außerhalb</translation>
+        <translation>außerhalb des Bereichs</translation>
     </message>
     <message>
         <source>unsure</source>
@@ -1456,6 +1448,250 @@ oder eine Aufzeichnung laden</translation>
     <message>
         <source>Reconnect by Itself</source>
         <translation>Von selbst wieder verbinden</translation>
+    </message>
+    <message>
+        <source>The connection to %1 was lost. What is shown stays until it is back.</source>
+        <translation>Die Verbindung zu %1 ist verloren. Was zu sehen ist, bleibt, bis sie wieder da ist.</translation>
+    </message>
+    <message>
+        <source>%1 has gone. Plug it in again; what is shown stays until then.</source>
+        <translation>%1 ist weg. Wieder einstecken; bis dahin bleibt, was zu sehen ist.</translation>
+    </message>
+    <message>
+        <source>%1 has gone again. Plug it in; what is shown stays until then.</source>
+        <translation>%1 ist wieder weg. Einstecken; bis dahin bleibt, was zu sehen ist.</translation>
+    </message>
+    <message>
+        <source>%1 is back.</source>
+        <translation>%1 ist wieder da.</translation>
+    </message>
+    <message>
+        <source>%1 is back, but no instrument answers at %2 baud yet. It is asked again each 5 s.</source>
+        <translation>%1 ist wieder da, aber bei %2 Baud antwortet noch kein Gerät. Es wird alle 5 s wieder gefragt.</translation>
+    </message>
+    <message>
+        <source>No connection to %1 yet: %2 It is tried again each 5 s.</source>
+        <translation>Noch keine Verbindung zu %1: %2 Es wird alle 5 s wieder versucht.</translation>
+    </message>
+    <message>
+        <source>No instrument answers on %1 at %2 baud. Check that it is on, then try again.</source>
+        <translation>An %1 antwortet bei %2 Baud kein Gerät. Prüfen, ob es eingeschaltet ist, dann noch einmal versuchen.</translation>
+    </message>
+    <message>
+        <source>No connection to %1. %2</source>
+        <translation>Keine Verbindung zu %1. %2</translation>
+    </message>
+    <message>
+        <source>%1 The recording has ended; begin it again.</source>
+        <translation>%1 Die Aufzeichnung ist zu Ende; sie ist neu zu beginnen.</translation>
+    </message>
+    <message>
+        <source>Connected to %1 again. All settings are as before.</source>
+        <translation>Wieder mit %1 verbunden. Alle Einstellungen sind wie zuvor.</translation>
+    </message>
+    <message>
+        <source>Connected to %1 again. Changed: %2.</source>
+        <translation>Wieder mit %1 verbunden. Geändert: %2.</translation>
+    </message>
+    <message>
+        <source>Connecting to %1 again</source>
+        <translation>Verbindet wieder mit %1</translation>
+    </message>
+    <message>
+        <source>The attempt was left.</source>
+        <translation>Der Versuch wurde abgebrochen.</translation>
+    </message>
+    <message>
+        <source>The server is there, but no instrument answers.</source>
+        <translation>Der Server ist da, aber kein Gerät antwortet.</translation>
+    </message>
+    <message>
+        <source>The server did not answer within 30 seconds.</source>
+        <translation>Der Server hat 30 Sekunden nicht geantwortet.</translation>
+    </message>
+    <message>
+        <source>The server closed the connection. It may be at work for another client, or not let this computer in.</source>
+        <translation>Der Server hat die Verbindung geschlossen. Vielleicht arbeitet er für einen anderen Rechner oder lässt diesen nicht zu.</translation>
+    </message>
+    <message>
+        <source>Port open, waiting for the instrument</source>
+        <translation>Anschluss offen, wartet auf das Gerät</translation>
+    </message>
+    <message>
+        <source>Server reached, waiting for the instrument</source>
+        <translation>Server erreicht, wartet auf das Gerät</translation>
+    </message>
+    <message>
+        <source>Line up, waiting for the instrument</source>
+        <translation>Leitung steht, wartet auf das Gerät</translation>
+    </message>
+    <message>
+        <source>The instrument answers, reading its settings</source>
+        <translation>Das Gerät antwortet, seine Einstellungen werden gelesen</translation>
+    </message>
+    <message>
+        <source>Waiting for the instrument, at most %1 more</source>
+        <translation>Wartet auf das Gerät, höchstens noch %1</translation>
+    </message>
+    <message>
+        <source>Waiting for the instrument</source>
+        <translation>Wartet auf das Gerät</translation>
+    </message>
+    <message>
+        <source>Searching the instrument at %1 baud, rate %2 of %3</source>
+        <translation>Sucht das Gerät bei %1 Baud, Rate %2 von %3</translation>
+    </message>
+    <message>
+        <source>No instrument answers on %1 at %2 baud. Check that it is on and that its cable is at this port</source>
+        <translation>An %1 antwortet bei %2 Baud kein Gerät. Prüfen, ob es eingeschaltet ist und sein Kabel an diesem Anschluss steckt</translation>
+    </message>
+    <message>
+        <source>%1 at %2 baud: check that the instrument is on, that its cable is at this port, and that it is set to %3 baud</source>
+        <translation>%1 bei %2 Baud: prüfen, ob das Gerät eingeschaltet ist, ob sein Kabel an diesem Anschluss steckt und ob es auf %3 Baud eingestellt ist</translation>
+    </message>
+    <message>
+        <source>%1: check that the server runs there, that its instrument is on and connected, and that no firewall is between</source>
+        <translation>%1: prüfen, ob der Server dort läuft, ob sein Gerät eingeschaltet und verbunden ist und ob keine Firewall dazwischen ist</translation>
+    </message>
+    <message>
+        <source>%1, next in %2 s</source>
+        <translation>%1, nächste in %2 s</translation>
+    </message>
+    <message>
+        <source>%1, waits for the trigger</source>
+        <translation>%1, wartet auf den Trigger</translation>
+    </message>
+    <message>
+        <source>%1, the interval of 0 s takes no trace</source>
+        <translation>%1, der Abstand von 0 s nimmt keine Kurve auf</translation>
+    </message>
+    <message>
+        <source>%1: 1 trace, %2</source>
+        <translation>%1: 1 Kurve, %2</translation>
+    </message>
+    <message>
+        <source>%1: %2 traces, %3</source>
+        <translation>%1: %2 Kurven, %3</translation>
+    </message>
+    <message>
+        <source>%1 incomplete, %2</source>
+        <translation>%1 unvollständig, %2</translation>
+    </message>
+    <message>
+        <source>%1 failed, %2</source>
+        <translation>%1 fehlgeschlagen, %2</translation>
+    </message>
+    <message>
+        <source>%1 old   %2 sweeps/s   the sweep sets the pace</source>
+        <translation>%1 alt   %2 Sweeps/s   der Sweep bestimmt das Tempo</translation>
+    </message>
+    <message>
+        <source>%1 old   %2 sweeps/s   the line sets the pace</source>
+        <translation>%1 alt   %2 Sweeps/s   die Leitung bestimmt das Tempo</translation>
+    </message>
+    <message>
+        <source>%1 old</source>
+        <translation>%1 alt</translation>
+    </message>
+    <message>
+        <source>pass %1/%2</source>
+        <translation>bestanden %1/%2</translation>
+    </message>
+    <message>
+        <source>Held traces ended: frequency changed</source>
+        <translation>Gehaltene Kurven beendet: Frequenz geändert</translation>
+    </message>
+    <message>
+        <source>Held traces ended: span changed</source>
+        <translation>Gehaltene Kurven beendet: Span geändert</translation>
+    </message>
+    <message>
+        <source>Held traces ended: sweep time changed</source>
+        <translation>Gehaltene Kurven beendet: Sweepzeit geändert</translation>
+    </message>
+    <message>
+        <source>Held traces ended: unit changed</source>
+        <translation>Gehaltene Kurven beendet: Einheit geändert</translation>
+    </message>
+    <message>
+        <source>Held traces ended: mode changed</source>
+        <translation>Gehaltene Kurven beendet: Betriebsart geändert</translation>
+    </message>
+    <message>
+        <source>Held traces ended: correction changed</source>
+        <translation>Gehaltene Kurven beendet: Korrektur geändert</translation>
+    </message>
+    <message>
+        <source>%1, %2 of %3 s</source>
+        <translation>%1, %2 von %3 s</translation>
+    </message>
+    <message>
+        <source>The mask was not taken, %1</source>
+        <translation>Die Maske wurde nicht übernommen, %1</translation>
+    </message>
+    <message>
+        <source>The correction was not taken, %1</source>
+        <translation>Die Korrektur wurde nicht übernommen, %1</translation>
+    </message>
+    <message>
+        <source>Pass</source>
+        <translation>Bestanden</translation>
+    </message>
+    <message>
+        <source>FAIL</source>
+        <translation>NICHT BESTANDEN</translation>
+    </message>
+    <message>
+        <source>, margin %1 at %2</source>
+        <translation>, Abstand %1 bei %2</translation>
+    </message>
+    <message>
+        <source>, no sample covered</source>
+        <translation>, kein Messpunkt erfasst</translation>
+    </message>
+    <message>
+        <source>Connect to an instrument first</source>
+        <translation>Zuerst mit einem Gerät verbinden</translation>
+    </message>
+    <message>
+        <source>There is no trace yet</source>
+        <translation>Es gibt noch keine Kurve</translation>
+    </message>
+    <message>
+        <source>The last %1 readings</source>
+        <translation>Die letzten %1 Messwerte</translation>
+    </message>
+    <message>
+        <source>Lowest %1, highest %2</source>
+        <translation>Niedrigster %1, höchster %2</translation>
+    </message>
+    <message>
+        <source>Sweep</source>
+        <translation>Sweep</translation>
+    </message>
+    <message>
+        <source>Sweep: %1 of %2 s</source>
+        <translation>Sweep: %1 von %2 s</translation>
+    </message>
+    <message>
+        <source>No figures: %1</source>
+        <translation>Keine Werte: %1</translation>
+    </message>
+    <message>
+        <source>Reference %1 has another span or unit</source>
+        <translation>Referenz %1 hat einen anderen Span oder eine andere Einheit</translation>
+    </message>
+    <message>
+        <source>Sweep less reference %1, dB</source>
+        <translation>Sweep minus Referenz %1, dB</translation>
+    </message>
+    <message>
+        <source>Mask: %1</source>
+        <translation>Maske: %1</translation>
+    </message>
+    <message>
+        <source>pass</source>
+        <translation>bestanden</translation>
     </message>
 </context>
 </TS>

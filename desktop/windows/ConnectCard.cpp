@@ -5,6 +5,7 @@
 #include <QRegularExpression>
 #include <QVBoxLayout>
 
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/platform/SimulatorChild.h"
 
 namespace zel {
@@ -115,7 +116,7 @@ void ConnectCard::take() {
         heading_->setText(failed           ? QObject::tr("No instrument was found")
                           : form.Searching ? QObject::tr("Searching the baud rate")
                                            : QObject::tr("Connecting to %1").arg(heading()));
-        step_->setText(QString::fromStdString(step));
+        step_->setText(ownText(step));
         showWait(*wait_, step);
         for (QPushButton* key : {again_, search_, close_}) key->setVisible(failed);
         cancel_->setVisible(work);

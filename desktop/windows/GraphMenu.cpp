@@ -30,7 +30,10 @@ void addMarker(double x, GraphWidget& graph, ControllerForm& panel, Binder& bind
 void showGraphMenu(QPoint place, double x, GraphWidget& graph, GraphNavigator& navigator,
                    ControllerForm& panel, Binder& binder,
                    const std::function<void()>& copyPicture) {
-    QMenu menu;
+    // No loop of its own: a sweep that is under way goes on below an open menu.
+    auto* shown = new QMenu(&graph);
+    shown->setAttribute(Qt::WA_DeleteOnClose);
+    QMenu& menu = *shown;
     const bool trace = !panel.CWGraph1.values().empty();
     menu.addAction(themeIcon("copy"), QObject::tr("Copy Picture"), &menu, copyPicture)
         ->setEnabled(trace);
@@ -38,7 +41,7 @@ void showGraphMenu(QPoint place, double x, GraphWidget& graph, GraphNavigator& n
     addControl(menu, "save", QObject::tr("Save View..."), panel.SaveCurrentView, binder);
     menu.addSeparator();
     QAction* marker = menu.addAction(QObject::tr("Add Marker Here"), &menu,
-                                     [&] { addMarker(x, graph, panel, binder); });
+                                     [&, x] { addMarker(x, graph, panel, binder); });
     const auto* box = qobject_cast<QAbstractButton*>(binder.widgetOf(panel.MarkerCheckBox));
     marker->setEnabled(trace && (panel.CWGraph1.cursor(1).Visible ||
                                  (panel.isConnected && box != nullptr && box->isEnabled())));
@@ -53,7 +56,7 @@ void showGraphMenu(QPoint place, double x, GraphWidget& graph, GraphNavigator& n
         ->setEnabled(trace);
     addControl(menu, "zoom", QObject::tr("Manual Scale..."), panel.UtilityGraphSettings, binder);
     giveLetters(menu);
-    menu.exec(place);
+    menu.popup(place);
 }
 
 }  // namespace zel

@@ -132,6 +132,8 @@ void GraphSide::showPower() {
     if (power == power_->isVisibleTo(graph_)) return;
     if (!power) power_->clear();
     power_->setVisible(power);
+    // Of a trace that is not seen.
+    readouts_->setVisible(!power);
     place();
 }
 

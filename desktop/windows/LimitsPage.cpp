@@ -5,6 +5,8 @@
 #include <QVBoxLayout>
 #include <stdexcept>
 
+#include "desktop/binders/OwnTexts.h"
+
 namespace zel {
 namespace {
 
@@ -80,7 +82,7 @@ void LimitsPage::applyMask(const QString& table) {
         word_->clear();
         tools_.setMask(std::move(mask));
     } catch (const std::runtime_error& wrong) {
-        word_->setText("The mask was not taken, " + QString::fromUtf8(wrong.what()));
+        word_->setText(QObject::tr("The mask was not taken, %1").arg(wrong.what()));
     }
 }
 
@@ -91,7 +93,7 @@ void LimitsPage::addCorrection(CorrectionKind kind, const QString& name, const Q
         word_->clear();
         tools_.setCorrections(std::move(all));
     } catch (const std::runtime_error& wrong) {
-        word_->setText("The correction was not taken, " + QString::fromUtf8(wrong.what()));
+        word_->setText(QObject::tr("The correction was not taken, %1").arg(wrong.what()));
     }
 }
 
@@ -100,13 +102,13 @@ void LimitsPage::showState() {
     QString verdict = tools_.request.mask ? QObject::tr("No sweep was held against the mask yet")
                                           : QObject::tr("No mask");
     if (result.mask) {
-        verdict = result.mask->pass ? "Pass" : "FAIL";
-        verdict += result.mask->margin ? ", margin " + levelText(result.mask->margin, "dB") +
-                                             " at " + placeText(result.mask->x, result.xUnit)
-                                       : QString(", the mask covers no sample");
+        verdict = result.mask->pass ? QObject::tr("Pass") : QObject::tr("FAIL");
+        verdict += result.mask->margin ? QObject::tr(", margin %1 at %2")
+                                             .arg(levelText(result.mask->margin, "dB"),
+                                                  placeText(result.mask->x, result.xUnit))
+                                       : QObject::tr(", no sample covered");
     }
-    if (tools_.maskCount().sweeps > 0)
-        verdict += "; " + QString::fromStdString(tools_.maskCount().text());
+    if (tools_.maskCount().sweeps > 0) verdict += "; " + ownText(tools_.maskCount().text());
     verdict_->setText(verdict);
     const std::string names = correctionNames(tools_.corrections());
     corrections_->setText(names.empty()

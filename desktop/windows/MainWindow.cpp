@@ -7,6 +7,7 @@
 #include <QFileInfo>
 #include <QHBoxLayout>
 #include <QMessageBox>
+#include <QTimer>
 
 #include "desktop/graph/GraphImage.h"
 #include "desktop/platform/Language.h"
@@ -22,6 +23,7 @@
 #include "desktop/windows/ThemeIcons.h"
 #include "desktop/windows/TraceToolsDock.h"
 #include "desktop/windows/WaterfallWindow.h"
+#include "model/CodeTables.h"
 #include "support/SessionLog.h"
 #include "trace/Interlock.h"
 #include "trace/ViewAnnotations.h"
@@ -32,12 +34,19 @@ namespace {
 constexpr int kSpacing = 6;
 constexpr int kInstrumentBaud = 57600;
 constexpr QSize kSmallestImage(800, 500);
+constexpr int kIconMs = 100;
+
+QString modeText(int mode) {
+    const CodeRow* row = findCode(CodeTable::MeasurementMode, mode);
+    return row == nullptr ? QString() : QString::fromUtf8(row->text.data());
+}
 
 }  // namespace
 
 MainWindow::MainWindow(Program& program) : program_(program), panel_(program.forms().controller) {
     setObjectName("ControllerForm");
-    setWindowIcon(applicationIcon());
+    // The icon is not part of the first picture.
+    QTimer::singleShot(kIconMs, this, [this] { setWindowIcon(applicationIcon()); });
     setMinimumSize(1000, 570);
     resize(1280, 760);
     Interlock& interlock = program_.interlock();
@@ -51,12 +60,13 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     binder_.perform = [&interlock](const Control& control, std::function<void()> act) {
         interlock.perform(control, std::move(act));
     };
-    binder_.reasonAgainst = [&interlock](const Control& control) {
-        return interlock.reasonAgainst(control);
+    binder_.reasonAgainst = [this, &interlock](const Control& control) {
+        const std::string reason = interlock.reasonAgainst(control);
+        return reason.empty() ? reasonHere(control) : reason;
     };
     buildMainMenus(*this, panel_, binder_);
     buildCentre();
-    status_ = new StatusLine(*this, program_.forms(), binder_);
+    status_ = new StatusLine(*this, program_.forms(), program_.variables(), binder_);
     tools_ = new ToolStrip(program_.forms(), binder_,
                            {[this] { copyPicture(); }, [this] { graph().wholeView(); }}, this);
     addToolBar(tools_);
@@ -229,7 +239,7 @@ QString MainWindow::titleText() const {
         const Forms& forms = program_.forms();
         shown = shortIdentity(QString::fromStdString(tcp ? forms.tcpConnection.IDTextBox.Text
                                                          : forms.main.IDText.Text)) +
-                ", " + QString::fromStdString(view.mode);
+                ", " + modeText(panel_.InstrumentMode);
     }
     return shown.isEmpty() ? program : shown + QString::fromUtf8(" – ") + program;
 }
@@ -238,6 +248,7 @@ void MainWindow::showState() {
     if (const QString title = titleText(); title != windowTitle()) setWindowTitle(title);
     status_->showState();
     tools_->showConnected(panel_.isConnected);
+    tools_->showTrace(!panel_.CWGraph1.values().empty());
     graphSide_->showEmpty();
     graphSide_->showPower();
     greyWhatRefuses();
@@ -247,12 +258,23 @@ void MainWindow::showState() {
         recent_->add(address);
 }
 
+std::string MainWindow::reasonHere(const Control& control) const {
+    const bool sweeps =
+        &control == &panel_.PlaySingleButton || &control == &panel_.PlayContinuousButton;
+    if (sweeps && !panel_.isConnected)
+        return QObject::tr("Connect to an instrument first").toStdString();
+    const bool looks = &control == &panel_.cmdZoom || &control == &panel_.MenuFileSaveImage;
+    if (looks && panel_.CWGraph1.values().empty())
+        return QObject::tr("There is no trace yet").toStdString();
+    return {};
+}
+
 void MainWindow::greyWhatRefuses() {
     const bool view = panel_.ContinuosLoopActive ||
                       (panel_.AcquisitionRunning && panel_.STOPFlag && !panel_.RecordDataFlag);
     const int state = (panel_.isConnected ? 1 : 0) + (view ? 2 : 0) +
                       (panel_.InstrumentMode == ControllerForm::POWERSENSOR ? 4 : 0) +
-                      (panel_.RecordDataFlag ? 8 : 0);
+                      (panel_.RecordDataFlag ? 8 : 0) + (panel_.CWGraph1.values().empty() ? 0 : 16);
     side_->showState(view, panel_.isConnected && panel_.Shown.fromFile);
     if (state == lockState_) return;
     lockState_ = state;
@@ -336,6 +358,7 @@ void MainWindow::addLanguageMenu(const QString& now,
 
 void MainWindow::drawImage(const std::string& path, std::string& problem) {
     QString error;
+    graph().drawNow();
     saveGraphImage(panel_.CWGraph1, annotateView(panel_, program_.variables()),
                    QString::fromStdString(path), &error, graph().size().expandedTo(kSmallestImage),
                    true, findChild<TraceToolsDock*>()->picture());

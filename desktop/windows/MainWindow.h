@@ -70,6 +70,8 @@ class MainWindow : public QMainWindow {
     void followState();
     void showState();
     void greyWhatRefuses();
+    /// Why a control would do nothing for who looks at the window; empty when it does something.
+    std::string reasonHere(const Control& control) const;
     QString titleText() const;
     void connectTo(const LinkAddress& address);
     void tellOpened(const std::string& path);

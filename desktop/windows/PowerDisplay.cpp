@@ -4,6 +4,7 @@
 #include <QPainter>
 #include <QPainterPath>
 #include <algorithm>
+#include <cmath>
 
 #include "desktop/graph/AxisText.h"
 #include "desktop/graph/GraphPlot.h"
@@ -16,6 +17,16 @@ constexpr std::size_t kMostReadings = 300;
 constexpr double kLowest = -80;  // dBm, ends of the bar and of the history
 constexpr double kHighest = 30;
 constexpr int kScaleStep = 10;
+constexpr double kFinestStep = 0.05;  // dB between two lines of the history
+constexpr double kHistoryLines = 5;
+
+/// The least of 1, 2, 5 and their decades that is no smaller; not below what a reading resolves.
+double roundStep(double least) {
+    double step = kFinestStep;
+    // 0.05, 0.1, 0.2, 0.5, ...
+    for (int i = 0; step < least; ++i) step *= i % 3 == 2 ? 2.5 : 2;
+    return step;
+}
 
 double shareOf(double level) {
     return (std::clamp(level, kLowest, kHighest) - kLowest) / (kHighest - kLowest);
@@ -76,11 +87,22 @@ void PowerDisplay::drawHistory(QPainter& painter, const QRectF& place) const {
         return;
     }
     const auto [low, high] = std::minmax_element(history_.begin(), history_.end());
-    const double bottom = *low - 1;
-    const double top = *high + 1;
+    const double step = roundStep((*high - *low) / kHistoryLines);
+    const double bottom = (std::floor(*low / step) - 1) * step;
+    const double top = (std::ceil(*high / step) + 1) * step;
     const auto yOf = [&](double level) {
         return place.bottom() - (level - bottom) / (top - bottom) * place.height();
     };
+    const int lines = static_cast<int>(std::lround((top - bottom) / step));
+    for (int i = 0; i <= lines; ++i) {
+        const double level = bottom + i * step;
+        const double y = yOf(level);
+        painter.setPen(QPen(colors.grid, 1));
+        painter.drawLine(QPointF(place.left(), y), QPointF(place.right(), y));
+        painter.setPen(colors.text);
+        painter.drawText(QRectF(0, y - 9, place.left() - 6, 18), Qt::AlignRight | Qt::AlignVCenter,
+                         QString::fromStdString(generalNumber(roundHalfEven(level, 3))));
+    }
     QPolygonF line;
     for (std::size_t i = 0; i < history_.size(); ++i) {
         const double age = static_cast<double>(history_.size() - 1 - i);
@@ -90,14 +112,13 @@ void PowerDisplay::drawHistory(QPainter& painter, const QRectF& place) const {
     painter.setPen(QPen(colors.trace, 1.2));
     painter.drawPolyline(line);
     painter.setPen(colors.text);
-    const QRectF texts = place.adjusted(6, 3, -6, -3);
-    painter.drawText(
-        texts, Qt::AlignLeft | Qt::AlignTop,
-        QObject::tr("Highest %1").arg(QString::fromStdString(levelText(*high, "dBm"))));
-    painter.drawText(texts, Qt::AlignLeft | Qt::AlignBottom,
-                     QObject::tr("Lowest %1 of the last %2 readings")
-                         .arg(QString::fromStdString(levelText(*low, "dBm")))
-                         .arg(history_.size()));
+    const QRectF texts(place.left(), place.top() - 22, place.width(), 18);
+    painter.drawText(texts, Qt::AlignLeft | Qt::AlignVCenter,
+                     QObject::tr("The last %1 readings").arg(history_.size()));
+    painter.drawText(texts, Qt::AlignRight | Qt::AlignVCenter,
+                     QObject::tr("Lowest %1, highest %2")
+                         .arg(QString::fromStdString(levelText(*low, "dBm")),
+                              QString::fromStdString(levelText(*high, "dBm"))));
 }
 
 void PowerDisplay::paintEvent(QPaintEvent*) {
@@ -105,7 +126,7 @@ void PowerDisplay::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
     painter.fillRect(rect(), colors.background);
-    const QRectF area = QRectF(rect()).adjusted(40, 24, -40, -24);
+    const QRectF area = QRectF(rect()).adjusted(56, 24, -40, -24);
     QFont large = font();
     large.setPixelSize(std::clamp(height() / 6, 36, 96));
     large.setBold(true);
@@ -119,8 +140,8 @@ void PowerDisplay::paintEvent(QPaintEvent*) {
     painter.setFont(font());
     const QRectF bar(area.left(), digits.bottom() + 16, area.width(), 26);
     drawBar(painter, bar);
-    const QRectF history(area.left(), bar.bottom() + 40, area.width(),
-                         area.bottom() - bar.bottom() - 40);
+    const QRectF history(area.left(), bar.bottom() + 58, area.width(),
+                         area.bottom() - bar.bottom() - 58);
     if (history.height() > 40) drawHistory(painter, history);
 }
 

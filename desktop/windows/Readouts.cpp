@@ -4,6 +4,7 @@
 #include <QGridLayout>
 #include <QHBoxLayout>
 
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/windows/StillLabel.h"
 
 namespace zel {
@@ -45,7 +46,7 @@ QGridLayout* card(QHBoxLayout& row, int stretch) {
 
 /// The last part of a text whose parts stand apart goes to a line of its own.
 QString inTwoLines(const std::string& parts) {
-    QString text = QString::fromStdString(parts);
+    QString text = ownText(parts);
     if (const qsizetype gap = text.lastIndexOf("   "); gap > 0) text.replace(gap, 3, "\n");
     return text;
 }
@@ -87,11 +88,12 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     showTrace({}, {});
     QGridLayout* pace = card(*row, 0);
     auto* line = new StillLabel(kPaceWidth, 2);
+    pace_ = line;
     line->setObjectName("caption");
     line->setTextFormat(Qt::PlainText);
     binder.bindShow(panel.PaceLabel, line, [&panel, line] {
         line->showText(inTwoLines(panel.PaceLabel.Caption));
-        line->setVisible(panel.PaceLabel.Visible);
+        line->setVisible(panel.PaceLabel.Visible && !panel.Shown.fromFile);
     });
     pace->addWidget(line, 0, 0, 2, 1);
 }
@@ -115,6 +117,8 @@ void Readouts::showTrace(const QString& atMarker, const QString& atDelta) {
 
 void Readouts::showFile(bool fromFile) {
     for (QLabel* label : {centre_, span_}) setMark(label, "file", fromFile);
+    // The age is that of the last sweep, which is not on the graph.
+    pace_->setVisible(!fromFile);
 }
 
 }  // namespace zel

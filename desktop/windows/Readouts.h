@@ -29,6 +29,7 @@ class Readouts : public QWidget {
     QLabel* pointerLevel_;
     QLabel* atMarker_;
     QLabel* atDelta_;
+    QLabel* pace_ = nullptr;
 };
 
 }  // namespace zel

@@ -4,15 +4,20 @@
 #include <QPointer>
 #include <QStatusBar>
 
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/platform/SimulatorChild.h"
 #include "desktop/windows/StillLabel.h"
 #include "platform/Pointer.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {
 
 constexpr int kActivityMs = 150;
 constexpr int kSaidMs = 12000;
+constexpr int kWaitStepMs = 250;
+constexpr int kNoticeMs = 1000;   // a wait is written when it has lasted that long
+constexpr double kLongSweep = 2;  // seconds
 constexpr const char* kDot = "<span style='color:%1'>●</span>";
 constexpr const char* kQuiet = "#77818b";
 constexpr const char* kThere = "#27ae60";
@@ -26,14 +31,18 @@ QString shortIdentity(const QString& identity) {
     return parts[1].trimmed() + " #" + parts[2].trimmed();
 }
 
-StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
+StatusLine::StatusLine(QMainWindow& window, Forms& forms, const ZEL3Variables& mirror,
+                       Binder& binder)
     : QObject(&window),
       window_(window),
       forms_(forms),
       panel_(forms.controller),
+      mirror_(mirror),
       state_(new QLabel),
       activity_(new QLabel),
-      busy_(new QProgressBar) {
+      busy_(new QProgressBar),
+      sweep_(new QProgressBar),
+      wait_(new QLabel) {
     QStatusBar* bar = window.statusBar();
     bar->setSizeGripEnabled(false);
     auto* line = new PanelLineEdit;
@@ -52,12 +61,18 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, Binder& binder)
     busy_->setTextVisible(false);
     busy_->setAccessibleName(QObject::tr("Work is under way"));
     auto* progress = new QLabel;
-    auto* wait = new QLabel;
-    for (QWidget* widget : {static_cast<QWidget*>(wait), static_cast<QWidget*>(progress),
-                            static_cast<QWidget*>(busy_)})
+    sweep_->setFixedSize(150, 16);
+    sweep_->setAccessibleName(QObject::tr("Sweep"));
+    sweep_->hide();
+    for (QWidget* widget : {static_cast<QWidget*>(wait_), static_cast<QWidget*>(progress),
+                            static_cast<QWidget*>(sweep_), static_cast<QWidget*>(busy_)})
         bar->addPermanentWidget(widget);
     binder.bind(panel_.FileLabel, progress);
-    binder.bind(panel_.WaitLabel, wait);
+    connect(&waitTimer_, &QTimer::timeout, this, [this] {
+        waitedMs_ += kWaitStepMs;
+        showWait();
+    });
+    binder.bindShow(panel_.WaitLabel, wait_, [this] { showWait(); });
 
     activity_->setTextFormat(Qt::RichText);
     activity_->setToolTip(QObject::tr("Traffic on the link"));
@@ -120,6 +135,31 @@ void StatusLine::showState() {
     const bool shown = busy() && !panel_.ContinuosLoopActive;
     busy_->setVisible(shown);
     window_.setCursor(shown ? Qt::BusyCursor : Qt::ArrowCursor);
+}
+
+void StatusLine::showWait() {
+    const QString text = ownText(panel_.WaitLabel.Caption);
+    const bool reads =
+        panel_.isConnected && (panel_.ContinuosLoopActive || panel_.AcquisitionRunning);
+    const bool sweeps = !text.isEmpty() && reads && mirror_.SweepTime >= kLongSweep;
+    if (!sweeps) {
+        waitTimer_.stop();
+    } else if (!waitTimer_.isActive()) {
+        waitedMs_ = kNoticeMs;
+        waitTimer_.start(kWaitStepMs);
+    }
+    const double length = mirror_.SweepTime * kNoticeMs;
+    const bool within = sweeps && waitedMs_ <= length;
+    if (within) {
+        sweep_->setRange(0, static_cast<int>(length));
+        sweep_->setValue(waitedMs_);
+        sweep_->setFormat(QObject::tr("Sweep: %1 of %2 s")
+                              .arg(waitedMs_ / kNoticeMs)
+                              .arg(QString::fromStdString(shortestNumber(mirror_.SweepTime))));
+    }
+    sweep_->setVisible(within);
+    wait_->setText(text);
+    wait_->setVisible(!within);
 }
 
 bool StatusLine::busy() const {

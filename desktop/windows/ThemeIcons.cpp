@@ -21,7 +21,7 @@ class InkEngine : public QIconEngine {
             disabled ? QPalette::Disabled : QPalette::Active, QPalette::ButtonText);
         painter->save();
         painter->setRenderHint(QPainter::Antialiasing);
-        drawKeyPicture(*painter, name_, rect, ink_.isValid() && !disabled ? ink_ : own);
+        drawKeyPicture(*painter, name_, rect, ink_.isValid() ? ink_ : own);
         painter->restore();
     }
     QPixmap pixmap(const QSize& size, QIcon::Mode mode, QIcon::State state) override {

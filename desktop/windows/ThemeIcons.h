@@ -8,7 +8,7 @@
 namespace zel {
 
 /// An icon of the picture set ("open"), sharp at each scale. It takes the ink of the theme in use
-/// at each drawing; with `ink` it keeps that colour while it is enabled.
+/// at each drawing; with `ink` it keeps that colour.
 QIcon themeIcon(const QString& name, const QColor& ink = {});
 /// The program's own.
 QIcon applicationIcon();

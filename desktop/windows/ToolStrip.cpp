@@ -1,6 +1,7 @@
 #include "desktop/windows/ToolStrip.h"
 
 #include <QMenu>
+#include <QPointer>
 #include <QToolButton>
 
 #include "desktop/windows/MainMenus.h"
@@ -67,9 +68,13 @@ ToolStrip::ToolStrip(Forms& forms, Binder& binder, Own own, QWidget* parent)
     binder_.twin(panel.SaveCurrentView, save);
     QAction* record = add("record", QObject::tr("Record"));
     binder_.twin(panel.RecordData, record, [this, &panel, record] {
-        const bool runs = forms_.time.ContinuousRecording || panel.RecordDataFlag;
+        // While the dialog asks nothing is recorded yet.
+        const bool runs = panel.RecordData.Checked && !forms_.time.Visible;
         record->setIcon(runs ? themeIcon("recording", kLamp) : themeIcon("record"));
         record->setEnabled(record->isEnabled() && panel.RecordData.Visible);
+    });
+    forms_.time.Changed.connect([self = QPointer<ToolStrip>(this)] {
+        if (self) self->binder_.refresh(self->forms_.controller.RecordData);
     });
     QAction* picture = add("picture", QObject::tr("Picture"));
     binder_.twin(panel.MenuFileSaveImage, picture);
@@ -77,6 +82,7 @@ ToolStrip::ToolStrip(Forms& forms, Binder& binder, Own own, QWidget* parent)
     copy->setToolTip(QObject::tr("Copy a picture of the graph (Ctrl+C)"));
     QObject::connect(copy, &QAction::triggered, this, [act = own.copyPicture] { act(); });
     wordless_ = {single, run, stop, whole, spectrogram, open, save, record, picture, copy};
+    ofTrace_ = {whole, copy};
     showConnected(false);
 }
 
@@ -105,6 +111,10 @@ QToolButton* ToolStrip::buttonOf(QAction* action) const {
 void ToolStrip::showConnected(bool connected) {
     connect_->setVisible(!connected);
     disconnect_->setVisible(connected);
+}
+
+void ToolStrip::showTrace(bool there) {
+    for (QAction* action : ofTrace_) action->setEnabled(there);
 }
 
 void ToolStrip::resizeEvent(QResizeEvent* event) {

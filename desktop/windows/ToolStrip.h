@@ -20,6 +20,8 @@ class ToolStrip : public QToolBar {
 
     /// The connection has come or gone.
     void showConnected(bool connected);
+    /// There is a trace to look at, or none.
+    void showTrace(bool there);
 
   protected:
     /// Words stand beside the icons where there is room.
@@ -34,6 +36,7 @@ class ToolStrip : public QToolBar {
     Binder& binder_;
     QAction* connect_;
     QAction* disconnect_;
+    QList<QAction*> ofTrace_;   ///< do nothing without a trace
     QList<QAction*> wordless_;  ///< have an icon alone in a narrow window
 };
 

@@ -8,6 +8,7 @@
 #include <cmath>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/windows/FaultPage.h"
 #include "desktop/windows/PowerPage.h"
 #include "desktop/windows/StatisticsPage.h"
@@ -205,7 +206,7 @@ OverlayPicture TraceToolsDock::picture() const {
     const std::optional<SpectrumTrace>& now = tools.trace();
     QStringList foot;
     if (!tools.problem().empty() && (tools.request.mask || !tools.corrections().empty()))
-        foot << "No figures: " + QString::fromStdString(tools.problem());
+        foot << QObject::tr("No figures: %1").arg(QString::fromStdString(tools.problem()));
     if (now) {
         for (std::size_t i = 0; i < kHolds; ++i)
             if (tools.traces().isOn(static_cast<HoldKind>(i)))
@@ -217,13 +218,13 @@ OverlayPicture TraceToolsDock::picture() const {
             if (closeAxes(*memory, *now)) {
                 addCurve(picture, *memory, self->traces().color(kHolds + i));
             } else {
-                foot << "Reference " + QString::number(i + 1) + " has another span or unit";
+                foot << QObject::tr("Reference %1 has another span or unit").arg(i + 1);
             }
         }
         if (const auto less = self->traces_ == nullptr ? std::nullopt : traces_->normalisedBy()) {
             if (const auto trace = tools.traces().normalised(*now, *less)) {
                 addCurve(picture, *trace, self->traces().color(kHolds + kMemories));
-                foot << "Sweep less reference " + QString::number(*less + 1) + ", dB";
+                foot << QObject::tr("Sweep less reference %1, dB").arg(*less + 1);
             }
         }
         if (!tools.corrections().empty())
@@ -251,20 +252,21 @@ OverlayPicture TraceToolsDock::picture() const {
         const AnalysisResult& result = tools.result();
         if (result.mask) {
             picture.failed = !result.mask->pass;
-            QString verdict = picture.failed ? "Mask: FAIL" : "Mask: pass";
-            verdict += result.mask->margin ? ", margin " + levelText(result.mask->margin, "dB") +
-                                                 " at " + placeText(result.mask->x, result.xUnit)
-                                           : QString(", no sample covered");
-            if (tools.maskCount().sweeps > 0)
-                verdict += "; " + QString::fromStdString(tools.maskCount().text());
+            QString verdict = QObject::tr("Mask: %1")
+                                  .arg(picture.failed ? QObject::tr("FAIL") : QObject::tr("pass"));
+            verdict += result.mask->margin ? QObject::tr(", margin %1 at %2")
+                                                 .arg(levelText(result.mask->margin, "dB"),
+                                                      placeText(result.mask->x, result.xUnit))
+                                           : QObject::tr(", no sample covered");
+            if (tools.maskCount().sweeps > 0) verdict += "; " + ownText(tools.maskCount().text());
             foot << verdict;
         }
     }
     if (const std::string names = correctionNames(tools.corrections()); !names.empty())
-        foot << "Corrected: " + QString::fromStdString(names) +
+        foot << QObject::tr("Corrected: %1").arg(QString::fromStdString(names)) +
                     (now ? ", " + QString::fromStdString(now->unit) : QString());
     picture.foot = foot.join('\n');
-    picture.notice = QString::fromStdString(tools.traces().ended());
+    picture.notice = ownText(tools.traces().ended());
     return picture;
 }
 
@@ -283,7 +285,7 @@ void TraceToolsDock::scaleLevelAxis() {
         for (const double value : curve.y) add(value);
     if (!any) return;
     const double room = std::max(1.0, (high - low) * kHeadroom);
-    panel_.CWGraph1.setYRange(std::floor(low - room), std::ceil(high + room));
+    graph_.showLevels(std::floor(low - room), std::ceil(high + room));
 }
 
 void TraceToolsDock::fill(QMenu& menu) {

@@ -4,6 +4,7 @@
 #include <QStatusBar>
 #include <QTranslator>
 
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/binders/ToolTips.h"
 #include "desktop/platform/Language.h"
 #include "tests/desktop/WindowTest.h"
@@ -37,6 +38,44 @@ TEST_F(LanguageTest, German_LeavesThePanelsTexts) {
     EXPECT_EQ(ownCaption(panel.StopButton, "Stop"), "Stop");
     EXPECT_EQ(ownCaption(panel.PlaySingleButton, "Single"), "Single");
     EXPECT_EQ(ownCaption(panel.FileMenu, "File"), "File");
+}
+
+struct Sentence {
+    const char* english;
+    const char* german;
+};
+
+class OwnSentence : public LanguageTest, public testing::WithParamInterface<Sentence> {};
+
+TEST_P(OwnSentence, HasItsWordsInEachLanguage) {
+    useLanguage("en", folder());
+    EXPECT_EQ(ownText(std::string(GetParam().english)).toStdString(), GetParam().english);
+    useLanguage("de", folder());
+    EXPECT_EQ(ownText(std::string(GetParam().english)).toStdString(), GetParam().german);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Sentences, OwnSentence,
+    testing::Values(
+        Sentence{"/dev/ttyUSB0 is back.", "/dev/ttyUSB0 ist wieder da."},
+        Sentence{
+            "No connection to lab:7000 yet: The server did not answer within 30 seconds. It is "
+            "tried again each 5 s.",
+            "Noch keine Verbindung zu lab:7000: Der Server hat 30 Sekunden nicht geantwortet. "
+            "Es wird alle 5 s wieder versucht."},
+        Sentence{"Port open, waiting for the instrument, 4 of 9 s",
+                 "Anschluss offen, wartet auf das Gerät, 4 von 9 s"},
+        Sentence{"a 1 old.csv: 12 traces, 2 incomplete, 1 failed, 93 kB, 00:00:05, next in 3 s",
+                 "a 1 old.csv: 12 Kurven, 2 unvollständig, 1 fehlgeschlagen, 93 kB, 00:00:05, "
+                 "nächste in 3 s"},
+        Sentence{"0.5 s old   1.0 sweeps/s   the sweep sets the pace",
+                 "0.5 s alt   1.0 Sweeps/s   der Sweep bestimmt das Tempo"},
+        Sentence{"Nobody knows this one", "Nobody knows this one"}));
+
+TEST_F(LanguageTest, LabelsOfTheInstrumentsPanel_KeepTheirTexts) {
+    useLanguage("de", folder());
+    EXPECT_EQ(labelText(panel.CFLabel, "5 s old").toStdString(), "5 s old");
+    EXPECT_EQ(labelText(panel.PaceLabel, "5 s old").toStdString(), "5 s alt");
 }
 
 TEST_F(LanguageTest, LanguageWithoutTexts_IsEnglish) {

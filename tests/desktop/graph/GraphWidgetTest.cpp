@@ -1,8 +1,10 @@
 // The graph's widget: zoom rectangle, pointer readout, cursors; pictures in files.
 
+#include <QContextMenuEvent>
 #include <QFile>
 #include <QTemporaryDir>
 #include <QTest>
+#include <QWheelEvent>
 #include <QXmlStreamReader>
 
 #include "desktop/graph/GraphImage.h"
@@ -21,6 +23,13 @@ class GraphWidgetTest : public WindowTest {
         GraphWidget& graph = window->graph();
         return {static_cast<int>(graph.xAxis->coordToPixel(x)),
                 static_cast<int>(graph.yAxis->coordToPixel(y))};
+    }
+    void turn(QPoint place, Qt::KeyboardModifiers keys) {
+        GraphWidget& graph = window->graph();
+        QWheelEvent wheel(place, graph.mapToGlobal(QPointF(place)), {}, {0, 120}, Qt::NoButton,
+                          keys, Qt::NoScrollPhase, false);
+        QApplication::sendEvent(&graph, &wheel);
+        window->showNow();
     }
     void drag(QPoint from, QPoint to) {
         QTest::mousePress(&window->graph(), Qt::LeftButton, {}, from);
@@ -48,6 +57,67 @@ TEST_F(GraphWidgetTest, ZoomRectangle_OfAFewPixels_ChangesNothing) {
     const QPoint start = at(1e9, -40);
     drag(start, start + QPoint(2, 2));
     EXPECT_EQ(panel().CWGraph1.xAxis().Maximum, 3e9);
+}
+
+TEST_F(GraphWidgetTest, CloserLevels_StayOverTheNextSweepAndGoWithTheWholeView) {
+    turn(at(1.5e9, -70), Qt::ShiftModifier);
+    const double top = panel().CWGraph1.yAxis().Maximum;
+    ASSERT_LT(top, -20);
+    panel().PlaySingleButton.Click();
+    window->showNow();
+    EXPECT_EQ(panel().CWGraph1.yAxis().Maximum, top);
+    window->graph().wholeView();
+    panel().PlaySingleButton.Click();
+    window->showNow();
+    EXPECT_EQ(panel().CWGraph1.yAxis().Maximum, -20);
+}
+
+TEST_F(GraphWidgetTest, OutKey_ShowsTheWholeLevelsToo) {
+    panel().cmdZoom.Click();
+    window->showNow();
+    drag(at(1e9, -40), at(2e9, -90));
+    panel().PlaySingleButton.Click();
+    window->showNow();
+    ASSERT_NEAR(panel().CWGraph1.yAxis().Maximum, -40, 1);
+    panel().cmdZoom.Click();
+    window->showNow();
+    EXPECT_EQ(panel().CWGraph1.xAxis().Maximum, 3e9);
+    EXPECT_EQ(panel().CWGraph1.yAxis().Maximum, -20);
+}
+
+TEST_F(GraphWidgetTest, ManualScaleOfTheWholeRange_EndsTheCloserLevels) {
+    turn(at(1.5e9, -70), Qt::ShiftModifier);
+    panel().CWGraph1.setYRange(-120, -20);
+    window->showNow();
+    EXPECT_EQ(panel().CWGraph1.yAxis().Maximum, -20);
+    panel().PlaySingleButton.Click();
+    window->showNow();
+    EXPECT_EQ(panel().CWGraph1.yAxis().Maximum, -20);
+}
+
+TEST_F(GraphWidgetTest, AnotherReferenceLevel_EndsTheCloserLevels) {
+    turn(at(1.5e9, -70), Qt::ShiftModifier);
+    port.device().edit().referenceLevel = -10;
+    panel().PlaySingleButton.Click();
+    window->showNow();
+    EXPECT_EQ(panel().CWGraph1.yAxis().Maximum, -10);
+}
+
+TEST_F(GraphWidgetTest, PointerThatRests_ReadsTheAxisThatComesUnderIt) {
+    QTest::mouseMove(&window->graph(), at(1.5e9, -70));
+    panel().CWGraph1.setXRange(0, 300e6);
+    window->showNow();
+    EXPECT_EQ(panel().DeltaLabel.Caption.get().rfind("Cursor:150", 0), 0U)
+        << panel().DeltaLabel.Caption.get();
+}
+
+TEST_F(GraphWidgetTest, MenuOfTheGraph_LeavesTheEventsToTheSweeps) {
+    QContextMenuEvent ask(QContextMenuEvent::Mouse, at(1.5e9, -70),
+                          window->graph().mapToGlobal(at(1.5e9, -70)));
+    QApplication::sendEvent(&window->graph(), &ask);  // comes back while the menu is open
+    QWidget* menu = QApplication::activePopupWidget();
+    ASSERT_NE(menu, nullptr);
+    delete menu;  // its pointer is the next test's as well
 }
 
 TEST_F(GraphWidgetTest, PointerOverThePlot_ShowsItsPlace) {
