@@ -7,6 +7,7 @@
 #include <QFileInfo>
 #include <QGuiApplication>
 #include <QInputDialog>
+#include <QMainWindow>
 #include <QMessageBox>
 #include <QStandardPaths>
 
@@ -42,6 +43,15 @@ const ButtonSet kButtonSets[] = {
     {BoxButtons::YesNoCancel, QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel,
      QMessageBox::Cancel},
 };
+
+/// The window that a box belongs to. Between two boxes none may be the active one yet.
+QWidget* windowInFront() {
+    if (QWidget* active = QApplication::activeWindow()) return active;
+    if (QWidget* modal = QApplication::activeModalWidget()) return modal;
+    for (QWidget* window : QApplication::topLevelWidgets())
+        if (window->isVisible() && qobject_cast<QMainWindow*>(window) != nullptr) return window;
+    return nullptr;
+}
 
 QString linesOf(const std::string& text) {
     return QString::fromStdString(text).replace("\r\n", "\n");
@@ -80,11 +90,20 @@ constexpr const char* kApplication = "ZELRemote";
 constexpr const char* kSection = "Desktop";
 constexpr const char* kFolderKey = "Folder";
 
-/// In a folder that file managers hide nobody would find the file again.
-QString startFolder(const QString& last, const QString& asked) {
+/// A folder or one below it.
+bool isWithin(const QString& folder, const QString& outer) {
+    const QString inner = QFileInfo(folder).canonicalFilePath();
+    const QString whole = QFileInfo(outer).canonicalFilePath();
+    return !inner.isEmpty() && (inner == whole || inner.startsWith(whole + '/'));
+}
+
+/// In a folder that file managers hide nobody would find the file again, nor among the program's
+/// own files.
+QString startFolder(const QString& last, const QString& asked, const QString& own) {
     if (!last.isEmpty() && QFileInfo(last).isDir()) return last;
-    const bool hidden = asked.isEmpty() || asked.contains("/.") || !QFileInfo(asked).isDir();
-    if (!hidden) return asked;
+    const bool apart = asked.isEmpty() || asked.contains("/.") || !QFileInfo(asked).isDir() ||
+                       isWithin(asked, own);
+    if (!apart) return asked;
     const QString documents = QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation);
     return QFileInfo(documents).isDir() ? documents : QDir::homePath();
 }
@@ -100,8 +119,9 @@ QString endingOf(const QString& filter) {
 std::optional<std::string> QtFileDialogs::chosen(const FileDialogRequest& request, bool save) {
     const std::string last = settings_.get(kApplication, kSection, kFolderKey, "");
     QFileDialog dialog(
-        QApplication::activeWindow(), QString::fromStdString(request.title),
-        startFolder(QString::fromStdString(last), QString::fromStdString(request.folder)));
+        windowInFront(), QString::fromStdString(request.title),
+        startFolder(QString::fromStdString(last), QString::fromStdString(request.folder),
+                    QString::fromStdString(own_.path())));
     dialog.setAcceptMode(save ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
     dialog.setFileMode(save ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
     dialog.setOption(QFileDialog::DontConfirmOverwrite, !request.promptOverwrite);
@@ -147,7 +167,7 @@ class NormalPointer {
 
 BoxAnswer QtMessageBoxes::show(const Box& box) {
     const NormalPointer pointer;
-    QMessageBox window(QApplication::activeWindow());
+    QMessageBox window(windowInFront());
     window.setIcon(iconOf(box.icon));
     window.setWindowTitle(QString::fromStdString(box.title));
     window.setTextFormat(Qt::PlainText);
@@ -167,9 +187,9 @@ std::optional<std::string> QtMessageBoxes::prompt(const std::string& text, const
                                                   const std::string& preset) {
     const NormalPointer pointer;
     bool accepted = false;
-    const QString reply = QInputDialog::getText(
-        QApplication::activeWindow(), QString::fromStdString(title), linesOf(text),
-        QLineEdit::Normal, QString::fromStdString(preset), &accepted);
+    const QString reply =
+        QInputDialog::getText(windowInFront(), QString::fromStdString(title), linesOf(text),
+                              QLineEdit::Normal, QString::fromStdString(preset), &accepted);
     if (!accepted) return std::nullopt;
     return reply.toStdString();
 }

@@ -17,10 +17,12 @@ class QtMessageBoxes : public MessageBoxes {
 };
 
 /// A dialog begins in the folder of the last one, be it of an earlier run; the first of all in the
-/// folder that is asked for, but never in one that file managers hide: then in that of documents.
+/// folder that is asked for, but never in one that file managers hide or that is the program's own:
+/// then in that of documents.
 class QtFileDialogs : public FileDialogs {
   public:
-    explicit QtFileDialogs(SettingsStore& settings) : settings_(settings) {}
+    QtFileDialogs(SettingsStore& settings, ApplicationFolder& own)
+        : settings_(settings), own_(own) {}
     std::optional<std::string> save(const FileDialogRequest& request) override;
     std::optional<std::string> open(const FileDialogRequest& request) override;
 
@@ -28,6 +30,7 @@ class QtFileDialogs : public FileDialogs {
     std::optional<std::string> chosen(const FileDialogRequest& request, bool save);
 
     SettingsStore& settings_;
+    ApplicationFolder& own_;
 };
 
 class QtClipboard : public Clipboard {

@@ -15,7 +15,7 @@ struct QtPlatform : QtSystem {
     QtMessageBoxes boxes;
     QtClipboard clipboard;
     SimulatorChild launcher;
-    QtFileDialogs fileDialogs{settings};
+    QtFileDialogs fileDialogs{settings, folder};
 
     Platform bundle() { return bundle(boxes, fileDialogs); }
     /// With boxes and file dialogs of another front.

@@ -1,6 +1,9 @@
 #include "desktop/windows/EntryMarks.h"
 
+#include <QApplication>
+#include <QComboBox>
 #include <QPointer>
+#include <utility>
 
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
@@ -42,6 +45,18 @@ const Rest* restOf(std::int16_t state, int box) {
     return nullptr;
 }
 
+/// Only the choice is struck: the entries that open below it can be chosen as ever.
+void plainEntries(QComboBox& list, bool set) {
+    QFont font = list.font();
+    font.setStrikeOut(false);
+    for (int i = 0; i < list.count(); ++i) {
+        list.setItemData(i, set ? QVariant(font) : QVariant(), Qt::FontRole);
+        list.setItemData(i,
+                         set ? QVariant(QApplication::palette().brush(QPalette::Text)) : QVariant(),
+                         Qt::ForegroundRole);
+    }
+}
+
 }  // namespace
 
 EntryMarks::EntryMarks(Program& program, Binder& binder,
@@ -71,13 +86,32 @@ void EntryMarks::follow(int box) {
     text.KeyPress.connect([self](int& key) {
         if (self && key == kKeyEnter) self->entering_ = -1;
     });
-    text.Changed.connect([self, box] {
+    const auto changed = [self, box] {
         if (!self) return;
         if (self->panel_.State != self->state_) return self->takeMenu();
         const Mark& mark = self->marks_.at(static_cast<std::size_t>(box));
-        const bool other = self->panel_.SoftTextBox(box).Text.get() != mark.text;
-        if (!mark.reason.isEmpty() && other && !mark.onAxis) self->clear(box);
+        if (!mark.reason.isEmpty() && self->shownText(box) != mark.text && !mark.onAxis)
+            self->clear(box);
+    };
+    text.Changed.connect(changed);
+    panel_.ChoiceBox(box).Changed.connect(changed);
+    // The panel's own handler sends the choice; this one comes after it.
+    panel_.ChoiceBox(box).Clicked.connect([self, box] {
+        if (self) self->chosen(box);
     });
+}
+
+void EntryMarks::chosen(int box) {
+    const std::optional<int> status = std::exchange(refusedChoice_, std::nullopt);
+    if (!status) return;
+    entering_ = box;
+    refused(*status);
+    entering_ = -1;
+}
+
+std::string EntryMarks::shownText(int box) const {
+    const DropDownList& list = panel_.ChoiceBox(box);
+    return list.Visible ? list.Text() : panel_.SoftTextBox(box).Text.get();
 }
 
 /// The boxes are those of another menu.
@@ -88,7 +122,10 @@ void EntryMarks::takeMenu() {
 }
 
 void EntryMarks::refused(int status) {
-    if (entering_ < 0) return;
+    if (entering_ < 0) {
+        if (panel_.ChoiceBoxActivated) refusedChoice_ = status;
+        return;
+    }
     if (panel_.State != state_) takeMenu();
     const int row = status > 0 && status < kKnownRefusals ? status : 0;
     const Rest* rest = restOf(panel_.State, entering_);
@@ -140,7 +177,7 @@ void EntryMarks::showInstrument() {
 }
 
 void EntryMarks::mark(int box, const QString& reason, bool onAxis) {
-    marks_.at(static_cast<std::size_t>(box)) = {reason, panel_.SoftTextBox(box).Text.get(), onAxis};
+    marks_.at(static_cast<std::size_t>(box)) = {reason, shownText(box), onAxis};
     show(box);
 }
 
@@ -151,9 +188,15 @@ void EntryMarks::clear(int box) {
 
 void EntryMarks::show(int box) {
     const QString& reason = marks_.at(static_cast<std::size_t>(box)).reason;
-    refusals_.at(static_cast<std::size_t>(box))->setText(reason);
-    if (auto* line = qobject_cast<QWidget*>(binder_.widgetOf(panel_.SoftTextBox(box))))
-        setMark(line, "struck", !reason.isEmpty());
+    QLabel* beside = refusals_.at(static_cast<std::size_t>(box));
+    beside->setText(reason);
+    beside->setToolTip(reason);
+    for (const Control* control : {static_cast<const Control*>(&panel_.SoftTextBox(box)),
+                                   static_cast<const Control*>(&panel_.ChoiceBox(box))})
+        if (auto* field = qobject_cast<QWidget*>(binder_.widgetOf(*control)))
+            setMark(field, "struck", !reason.isEmpty());
+    auto* list = qobject_cast<QComboBox*>(binder_.widgetOf(panel_.ChoiceBox(box)));
+    if (list != nullptr) plainEntries(*list, !reason.isEmpty());
 }
 
 }  // namespace zel

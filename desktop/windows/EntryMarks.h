@@ -4,15 +4,16 @@
 #include <QLabel>
 #include <QObject>
 #include <array>
+#include <optional>
 
 #include "desktop/binders/Binder.h"
 #include "shell/Program.h"
 
 namespace zel {
 
-/// The box of a refused entry is struck, with the refusal beside it, until its text changes or the
-/// instrument is asked. Boxes that were worked out of a refused frequency or span are struck with
-/// it; when a sweep has asked what the instrument has, they show that.
+/// The box or list of a refused entry is struck, with the refusal beside it, until its text changes
+/// or the instrument is asked. Boxes that were worked out of a refused frequency or span are struck
+/// with it; when a sweep has asked what the instrument has, they show that.
 class EntryMarks : public QObject {
   public:
     static constexpr int kBoxes = 5;
@@ -30,6 +31,9 @@ class EntryMarks : public QObject {
     void follow(int box);
     void takeMenu();
     void refused(int status);
+    void chosen(int box);
+    /// What stands in the box or in the list at its place.
+    std::string shownText(int box) const;
     void takeUnsure();
     void showInstrument();
     void mark(int box, const QString& reason, bool onAxis);
@@ -42,7 +46,8 @@ class EntryMarks : public QObject {
     Binder& binder_;
     std::array<QLabel*, kBoxes> refusals_;
     std::array<Mark, kBoxes> marks_;
-    int entering_ = -1;  ///< the box whose Enter is at work
+    int entering_ = -1;                 ///< the box whose Enter is at work
+    std::optional<int> refusedChoice_;  ///< answer to the choice that is at work
     std::int16_t state_ = 0;
     bool unsure_ = false;
 };

@@ -1,6 +1,8 @@
 #include "desktop/windows/FoldGroup.h"
 
 #include <QLayout>
+#include <QScrollArea>
+#include <QTimer>
 #include <QVBoxLayout>
 
 namespace zel {
@@ -59,7 +61,14 @@ bool FoldGroup::offers(const QWidget& widget) {
 
 void FoldGroup::reveal(const QWidget& widget) {
     FoldGroup* group = around(widget);
-    if (group != nullptr) group->setOpen(true);
+    if (group == nullptr || group->isOpen()) return;
+    // Who goes to a part by a key wants it, whether there is room for it or not.
+    group->choice_ = Choice::Open;
+    group->setOpen(true);
+    QTimer::singleShot(0, group, [group] {
+        for (QWidget* at = group->parentWidget(); at != nullptr; at = at->parentWidget())
+            if (auto* area = qobject_cast<QScrollArea*>(at)) area->ensureWidgetVisible(group);
+    });
 }
 
 }  // namespace zel

@@ -123,8 +123,10 @@ void FormWindow::focusFirst() {
         auto* widget = qobject_cast<QWidget*>(binder_.widgetOf(*control));
         if (widget == nullptr || !widget->isVisible() || !widget->isEnabled()) continue;
         const auto* line = qobject_cast<QLineEdit*>(widget);
+        const auto* list = qobject_cast<QComboBox*>(widget);
+        // From a list without entries nothing can be chosen.
         const bool entry = (line != nullptr && !line->isReadOnly()) ||
-                           qobject_cast<QComboBox*>(widget) != nullptr ||
+                           (list != nullptr && (list->isEditable() || list->count() > 0)) ||
                            (control->kind() == ControlKind::OptionButton &&
                             static_cast<const OptionButton*>(control)->Value());
         if (!entry) continue;
@@ -315,6 +317,16 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     layout->addLayout(keys);
     layout->setSizeConstraint(QLayout::SetMinimumSize);
     followForm();
+}
+
+// As high as the page on show needs: that of the serial port and that of the modem differ.
+bool ConnectionWindow::event(QEvent* event) {
+    const bool taken = FormWindow::event(event);
+    if (event->type() != QEvent::LayoutRequest || layout() == nullptr) return taken;
+    const int wanted = layout()->hasHeightForWidth() ? layout()->totalHeightForWidth(width())
+                                                     : layout()->totalSizeHint().height();
+    if (height() != wanted) resize(width(), wanted);
+    return taken;
 }
 
 }  // namespace zel

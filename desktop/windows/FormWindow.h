@@ -56,6 +56,9 @@ class MainForm;
 class ConnectionWindow : public FormWindow {
   public:
     ConnectionWindow(MainForm& form, Binder& binder, QWidget* parent);
+
+  protected:
+    bool event(QEvent* event) override;
 };
 
 }  // namespace zel

@@ -3,6 +3,8 @@
 #include <QCoreApplication>
 #include <QGridLayout>
 #include <QHBoxLayout>
+#include <QPainter>
+#include <QStyle>
 #include <QVBoxLayout>
 
 #include "desktop/windows/KeyPictures.h"
@@ -28,6 +30,24 @@ Layout* layoutOf(QWidget* widget) {
     layout->setContentsMargins(0, 0, 0, 0);
     return layout;
 }
+
+/// Ends in dots where there is no room for all of it: no text makes the column wider.
+class ShortLabel : public QLabel {
+  public:
+    ShortLabel() {
+        setObjectName("caption");
+        setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
+    }
+    QSize minimumSizeHint() const override { return {0, QLabel::minimumSizeHint().height()}; }
+
+  protected:
+    void paintEvent(QPaintEvent*) override {
+        QPainter painter(this);
+        const QString shown = fontMetrics().elidedText(text(), Qt::ElideRight, width());
+        style()->drawItemText(&painter, rect(), Qt::AlignRight | Qt::AlignVCenter, palette(),
+                              isEnabled(), shown, foregroundRole());
+    }
+};
 
 QLabel* smallCaption(const QString& text = {}) {
     auto* label = new QLabel(text);
@@ -174,12 +194,12 @@ QWidget* PanelSide::softPosition(int index) {
     QLabel* caption = smallCaption();
     beside->addStretch(1);
     auto* head = new QHBoxLayout;
-    head->addWidget(caption, 1);
-    QLabel* refusal = smallCaption();
+    head->addWidget(caption);
+    QLabel* refusal = new ShortLabel;
     refusal->setProperty("problem", true);
     refusal->setAccessibleName(QObject::tr("Refusal"));
     refusals_.at(static_cast<std::size_t>(index)) = refusal;
-    head->addWidget(refusal);
+    head->addWidget(refusal, 1);
     beside->addLayout(head);
     auto* fields = new QWidget;
     auto* places = layoutOf<QHBoxLayout>(fields);

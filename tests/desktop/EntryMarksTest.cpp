@@ -1,5 +1,6 @@
 // Entries that the instrument did not take, in the window.
 
+#include <QComboBox>
 #include <QTest>
 
 #include "tests/desktop/WindowTest.h"
@@ -23,6 +24,12 @@ class EntryMarksTest : public WindowTest {
             ->text()
             .toStdString();
     }
+    void sendLine(const char* setting) {
+        for (const char* line : {"SET", setting}) {
+            panel().ManualCommandText.Text = line;
+            panel().SendButton.Click();
+        }
+    }
     void enter(int position, const char* text) {
         QLineEdit* line = box(position);
         line->setFocus();
@@ -43,6 +50,28 @@ TEST_F(EntryMarksTest, RefusedTime_IsStruckUntilTheNextText) {
     enter(0, "1 s");
     EXPECT_FALSE(struck(0));
     EXPECT_EQ(beside(0), "");
+}
+
+TEST_F(EntryMarksTest, RefusedChoice_IsStruckUntilTheInstrumentIsAsked) {
+    panel().ChnPwrButton.Click();
+    show();
+    auto* list = widgetOf<QComboBox>(panel().ChoiceBox(1));
+    const auto struckList = [list] { return list->property("struck").toBool(); };
+    emit list->activated(1);
+    show();
+    EXPECT_FALSE(struckList());
+    // By the line, so that the panel does not know of the other mode.
+    sendLine("MEAS,1");
+    emit list->activated(2);
+    show();
+    EXPECT_TRUE(struckList());
+    EXPECT_EQ(beside(1), "refused: not in this mode");
+    sendLine("MEAS,4");
+    panel().GetOption.Click();
+    panel().SoftKey(1).Click();
+    show();
+    EXPECT_FALSE(struckList());
+    EXPECT_EQ(beside(1), "");
 }
 
 TEST_F(EntryMarksTest, AnotherMenu_HasNoMarks) {

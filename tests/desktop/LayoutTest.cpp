@@ -87,6 +87,21 @@ TEST_F(WindowTest, ShortcutOfAFoldedBox_OpensItsGroup) {
     EXPECT_EQ(window->focusWidget(), widgetOf<QWidget>(panel().ManualCommandText));
 }
 
+TEST_F(WindowTest, ShortcutOfAFoldedBox_OpensItsGroupInALowWindowToo) {
+    window->resize(1024, 600);
+    show();
+    FoldGroup* command = window->side().groups()[2];
+    ASSERT_FALSE(command->isOpen());
+    QTest::keyClick(window.get(), Qt::Key_F7);
+    QApplication::processEvents();
+    show();
+    EXPECT_TRUE(command->isOpen());
+    EXPECT_EQ(window->focusWidget(), widgetOf<QWidget>(panel().ManualCommandText));
+    QWidget* box = window->focusWidget();
+    const QWidget* view = window->side().viewport();
+    EXPECT_TRUE(view->rect().contains(box->mapTo(view, box->rect().center())));
+}
+
 TEST_F(WindowTest, PlaceOfAFoldedKey_HasNothingToPress) {
     connect();
     window->resize(1280, 1000);
