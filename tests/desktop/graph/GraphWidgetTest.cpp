@@ -1,6 +1,7 @@
 // The graph's widget: zoom rectangle, pointer readout, cursors; pictures in files.
 
 #include <QContextMenuEvent>
+#include <QCursor>
 #include <QFile>
 #include <QTemporaryDir>
 #include <QTest>
@@ -117,7 +118,8 @@ TEST_F(GraphWidgetTest, MenuOfTheGraph_LeavesTheEventsToTheSweeps) {
     QApplication::sendEvent(&window->graph(), &ask);  // comes back while the menu is open
     QWidget* menu = QApplication::activePopupWidget();
     ASSERT_NE(menu, nullptr);
-    delete menu;  // its pointer is the next test's as well
+    delete menu;
+    QCursor::setPos(0, 0);  // the pointer is that of the next test as well
 }
 
 TEST_F(GraphWidgetTest, PointerOverThePlot_ShowsItsPlace) {
