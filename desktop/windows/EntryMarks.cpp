@@ -1,6 +1,5 @@
 #include "desktop/windows/EntryMarks.h"
 
-#include <QApplication>
 #include <QComboBox>
 #include <QPointer>
 #include <utility>
@@ -49,12 +48,8 @@ const Rest* restOf(std::int16_t state, int box) {
 void plainEntries(QComboBox& list, bool set) {
     QFont font = list.font();
     font.setStrikeOut(false);
-    for (int i = 0; i < list.count(); ++i) {
+    for (int i = 0; i < list.count(); ++i)
         list.setItemData(i, set ? QVariant(font) : QVariant(), Qt::FontRole);
-        list.setItemData(i,
-                         set ? QVariant(QApplication::palette().brush(QPalette::Text)) : QVariant(),
-                         Qt::ForegroundRole);
-    }
 }
 
 }  // namespace

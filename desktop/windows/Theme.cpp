@@ -57,8 +57,8 @@ QLabel#caption { color: @caption; font-size: 11px; }
 QLabel[readout="true"] { font-size: 13px; font-weight: 600; }
 QLabel[file="true"] { color: @file; }
 QLabel#caption[problem="true"] { color: @problem; }
-QLineEdit[struck="true"], QComboBox[struck="true"] { color: @problem;
-    text-decoration: line-through; }
+QLineEdit[struck="true"] { color: @problem; text-decoration: line-through; }
+QComboBox[struck="true"] { border-color: @problem; text-decoration: line-through; }
 QFrame#group, QScrollArea#panel { background: @panel; border: 1px solid @hairline;
     border-radius: 6px; }
 QWidget#column { background: transparent; }

@@ -1,7 +1,9 @@
 // Pictures of the states that are rarer than the panel's menus, in both themes and at three sizes.
 
+#include <QAction>
 #include <QDialog>
 #include <QDockWidget>
+#include <QToolBar>
 
 #include "tests/desktop/Looks.h"
 #include "tests/desktop/WindowTest.h"
@@ -98,11 +100,19 @@ TEST_P(LooksOfStates, LostLine_IsSaid) {
 TEST_P(LooksOfStates, Recording_HasTheRedLamp) {
     connect();
     sweeps(1);
-    program->forms().time.ContinuousRecording = true;
-    panel().RecordData.noteChange();
+    panel().RecordData.Checked = true;
     panel().FileLabel.Caption = "trace.csv: 5 traces, 52 kB, 00:00:03, next in 0 s";
     picture(*window, "recording");
-    program->forms().time.ContinuousRecording = false;
+    const auto lamp = [this] {
+        for (QAction* action : window->findChildren<QToolBar*>().first()->actions())
+            if (action->text() == "Record")
+                return action->icon().pixmap(20, QIcon::Disabled).toImage().pixelColor(10, 10);
+        return QColor();
+    };
+    EXPECT_GT(lamp().red(), 2 * lamp().blue());
+    panel().RecordData.Checked = false;
+    show();
+    EXPECT_LT(lamp().red(), 2 * lamp().blue());
 }
 
 TEST_P(LooksOfStates, Windows_ArePictures) {
