@@ -44,7 +44,7 @@ bool MarkerReadout::MakeMarkerReadout() {
 void MarkerReadout::showAnswer(MarkerKind kind, const std::string& answer) {
     const MarkerRow& row = rowOf(kind);
     const auto comma = answer.find(',');
-    const std::string xText = comma == std::string::npos ? answer : answer.substr(0, comma);
+    const std::string xText = answer.substr(0, comma);
     const std::string levelText = comma == std::string::npos ? "" : answer.substr(comma + 1);
     const double x = leadingNumber(xText);
     const double level = leadingNumber(levelText);
