@@ -348,15 +348,20 @@ TEST_F(SettingTest, NumberThatItsWordCannotHold_IsRefusedInABoxAndNotSent) {
 
 TEST_F(SettingTest, LargestNumbersOfTheirWords_AreSent) {
     open(kChnPower);
-    type(3, "32767");
-    set("CHPWRUNIT,32767");
-    enter(3);
+    for (const char* value : {"32767", "-32768"}) {
+        type(3, value);
+        set(std::string("CHPWRUNIT,") + value);
+        enter(3);
+    }
     expectPlayed();
     visited();
     panel.InstrumentMode = CF::OCCBANDWIDTH;
     panel.OccBWButton.Click();
     type(2, "2147483647.9");  // its fraction is cut first
     set("OBWCHBW,2147483647");
+    enter(2);
+    type(2, "-2147483648");
+    set("OBWCHBW,-2147483648");
     enter(2);
     expectPlayed();
     EXPECT_EQ(boxes.texts(), Texts{});
