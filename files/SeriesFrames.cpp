@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <optional>
 
 #include "files/ViewFormat.h"
 #include "support/Text.h"
@@ -50,17 +51,17 @@ SeriesFrames::SeriesFrames(std::shared_ptr<const std::string> text, FieldList li
       fileTime_(fileTime),
       searchFrom_(start),
       count_(markWord.empty() ? 1 : occurrences(*text_, markWord)) {
-    int time = -1;
-    for (int i = 0; i < start && time < 0; ++i)
+    std::optional<int> time;
+    for (int i = 0; i < start && !time; ++i)
         if (contains(lines_[i], kTime)) time = i;
     add(start, time);
 }
 
-void SeriesFrames::add(int start, int time) {
+void SeriesFrames::add(int start, std::optional<int> time) {
     Frame frame;
     frame.start = start;
-    if (time >= 0) {
-        const std::string stamp(lines_[time + 1]);
+    if (time) {
+        const std::string stamp(lines_[*time + 1]);
         frame.label = stamp + " " + fileTime_.substr(0, kDayLength);
         frame.time = stamp;
         frame.second = secondOfDay(stamp);
@@ -85,19 +86,19 @@ void SeriesFrames::endAt(int index) {
 bool SeriesFrames::reach(int index) {
     if (index < 0) return false;
     while (static_cast<int>(frames_.size()) <= index && !complete_) {
-        int time = -1;
-        int mark = -1;
-        for (int i = searchFrom_; i <= lines_.last() && mark < 0 && !markWord_.empty(); ++i) {
+        std::optional<int> time;
+        std::optional<int> mark;
+        for (int i = searchFrom_; i <= lines_.last() && !mark && !markWord_.empty(); ++i) {
             const std::string_view entry = lines_[i];
-            if (time < 0 && contains(entry, kTime)) time = i;
+            if (!time && contains(entry, kTime)) time = i;
             if (contains(entry, markWord_)) mark = i;
         }
-        if (mark < 0) {
+        if (!mark) {
             complete_ = true;
             count_ = static_cast<int>(frames_.size());
             break;
         }
-        searchFrom_ = mark + kRowsAfterMark;
+        searchFrom_ = *mark + kRowsAfterMark;
         add(searchFrom_, time);
     }
     return index < static_cast<int>(frames_.size());

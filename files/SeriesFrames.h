@@ -2,6 +2,7 @@
 // Where the traces of a recording stand in its text, found as far as they are asked for.
 
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -32,7 +33,7 @@ class SeriesFrames {
     /// Whether there is a trace of that index.
     bool reach(int index);
     /// After `reach`.
-    const Frame& at(int index) const { return frames_[static_cast<std::size_t>(index)]; }
+    const Frame& at(int index) const { return frames_.at(static_cast<std::size_t>(index)); }
     /// The rows of the last trace that is known end before that entry, which saves a search.
     void rowsEnd(int index, int entry);
     /// There are no rows at that index and after it.
@@ -42,7 +43,7 @@ class SeriesFrames {
     int gapAfter(int index);
 
   private:
-    void add(int start, int time);
+    void add(int start, std::optional<int> time);
 
     std::shared_ptr<const std::string> text_;
     FieldList lines_;

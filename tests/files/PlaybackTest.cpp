@@ -87,7 +87,10 @@ TEST_F(PlaybackTest, Scrub_ShowsTheTraceAndTheWaterfallUpToIt) {
 
 TEST_F(PlaybackTest, Play_AtTheEndBeginsAgain) {
     loadFive();
+    int kept = 0;
+    forms.waterfall.saveGraphView.connect([&kept] { ++kept; });
     panel.PlaybackPlay.Click();
+    EXPECT_EQ(kept, 1);
     EXPECT_EQ(levels, (Levels{-30, -31, -32, -33, -34}));
     EXPECT_EQ(panel.PlaybackPosition.Value, 5);
 }
@@ -190,6 +193,7 @@ TEST(SeriesFrames, Gap_IsThatOfTheStampsAndSharedWithinASecond) {
     EXPECT_EQ(gaps({"23:59:58", "23:59:58", "00:00:01", "00:00:02"}),
               (std::vector<int>{500, 2500, 1000, 1000}));
     EXPECT_EQ(gaps({"10:00:00", "10:00:07"}), (std::vector<int>{7000, 1000}));
+    EXPECT_EQ(gaps({"00:00:00", "00:00:02"}).front(), 2000);
     EXPECT_EQ(gaps({"noon", "10:00:07"}).front(), 0);
 }
 

@@ -436,6 +436,7 @@ TEST_F(ViewReaderTest, OldLinearLog_RunsFromZeroToHundred) {
 
 TEST_F(ViewReaderTest, OldZeroSpanLog_SetsTheStop) {
     load(logText("Data(ZeroSpan) at;", rowsText(301)));
+    EXPECT_TRUE(panel.Shown.fromFile);
     EXPECT_EQ(panel.ViewStop, 3100);
     EXPECT_EQ(panel.SpanLabel.Caption.get(), "Span: 0 Hz");
 }
