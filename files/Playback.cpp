@@ -106,19 +106,20 @@ bool Playback::stands(int ms) const {
                                                  : forms_.specialMeas.seriesPauseMs());
 }
 
-int Playback::next() {
+std::optional<int> Playback::next() {
     const std::shared_ptr<SeriesFrames> mine = frames_;
-    if (!mine) return -1;
+    if (!mine) return std::nullopt;
     wanted_ = -1;
     const bool last = !mine->reach(position_ + 1);
-    if (last && !panel_.PlaybackRepeat.Value()) return -1;
+    if (last && !panel_.PlaybackRepeat.Value()) return std::nullopt;
     const Stopwatch watch(clock_);
     while (panel_.STOPFlag && frames_ == mine && wanted_ < 0 && stands(watch.Elapsed()))
         events_.wait(kSliceMs);
     // However quick the pace, a short series leaves time for other work before it begins again.
     if (last && panel_.STOPFlag) events_.wait(kShortestRoundMs);
     events_.pump();
-    if (frames_ != mine || !panel_.STOPFlag || forms_.specialMeas.sldSpeed.Value < 0) return -1;
+    if (frames_ != mine || !panel_.STOPFlag || forms_.specialMeas.sldSpeed.Value < 0)
+        return std::nullopt;
     if (wanted_ >= 0) return wanted_;
     return last ? 0 : position_ + 1;
 }

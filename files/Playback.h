@@ -3,6 +3,7 @@
 
 #include <functional>
 #include <memory>
+#include <optional>
 
 #include "files/SeriesFrames.h"
 #include "forms/Forms.h"
@@ -30,9 +31,9 @@ class Playback {
     /// The loop that shows the traces begins or ends.
     void setPlaying(bool playing);
     bool playing() const { return panel_.SeriesPlays; }
-    /// Waits as long as the trace at hand stands. Returns the index of the one to show then, -1
-    /// when the loop has to end.
-    int next();
+    /// Waits as long as the trace at hand stands. Returns the index of the one to show then,
+    /// or nothing when the loop has to end.
+    std::optional<int> next();
 
   private:
     void PlaybackPlay_Click();

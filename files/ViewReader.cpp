@@ -4,6 +4,7 @@
 #include <cmath>
 #include <filesystem>
 #include <new>
+#include <optional>
 #include <stdexcept>
 
 #include "files/ViewFormat.h"
@@ -261,7 +262,7 @@ bool ViewReader::showUpTo(SeriesFrames& frames, Header& header, int index) {
 void ViewReader::showSeries(const std::shared_ptr<SeriesFrames>& frames, Header header, int first) {
     bool begun = playback_.frames() == frames;
     const AtEnd done([this] { playback_.setPlaying(false); });
-    for (int index = first; index >= 0;) {
+    for (int index = first;;) {
         events_.pump();
         const bool jumps = begun && index != playback_.position() + 1;
         if (jumps ? !showUpTo(*frames, header, index) : !showFrame(*frames, header, index)) {
@@ -280,8 +281,9 @@ void ViewReader::showSeries(const std::shared_ptr<SeriesFrames>& frames, Header 
             percentText(more ? static_cast<double>(frames->at(index + 1).start) /
                                    frames->lines().count()
                              : 1);
-        index = playback_.next();
-        if (playback_.frames() != frames) break;
+        const std::optional<int> next = playback_.next();
+        if (!next || playback_.frames() != frames) break;
+        index = *next;
     }
 }
 

@@ -42,6 +42,16 @@ TEST_F(GraphInteractionTest, FinishCursors_LeavesThemHiddenAndTheTrackModePlain)
     EXPECT_EQ(graph.TrackMode.get(), 1);
 }
 
+TEST_F(GraphInteractionTest, FinishCursors_PutsThemAtTheFootOfTheMiddle) {
+    graph.setXRange(200, 500);
+    graph.setYRange(-90, -20);
+    interaction.finishCursors();
+    for (int index = 1; index <= 2; ++index) {
+        EXPECT_EQ(graph.cursor(index).X, 350);
+        EXPECT_EQ(graph.cursor(index).Y, -90);
+    }
+}
+
 TEST_F(GraphInteractionTest, Zoom_FirstClick_LetsTheUserDrawARectangle) {
     panel.cmdZoom.Click();
     EXPECT_EQ(graph.TrackMode.get(), 7);

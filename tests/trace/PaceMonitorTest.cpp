@@ -55,6 +55,8 @@ TEST_F(Pace, AtRest_TheLineIsWrittenWithEachWholeSecondOfTheAge) {
     platform.events.runFor(5000);
     EXPECT_NEAR(panel().PaceTimer.Interval.get(), 1000, 2);
     view(2010, [this] { EXPECT_EQ(panel().PaceTimer.Interval.get(), 250); });
+    platform.events.runFor(1500);
+    EXPECT_EQ(line(), "1 s old") << "and no pace";
 }
 
 TEST(PaceMonitor, PauseAboveFiveSeconds_IsNoPace) {
