@@ -108,11 +108,10 @@ std::vector<double> TraceConversion::colour(const std::vector<double>& shown) co
     const double low = graph3D_.axis(3).Minimum;
     const double height = graph3D_.axis(3).Maximum - low;
     std::vector<double> colours(shown.size());
-    for (std::size_t i = 0; i < shown.size(); ++i)
-        colours[i] = height == 0 ? 0 : 100 * (shown[i] - low) / height;
     if (colours.empty()) return colours;
-    // The first and the last pin the colour scale.
-    colours.front() = 0;
+    // The first and the last pin the colour scale, at 0 and 100.
+    for (std::size_t i = 1; i + 1 < shown.size(); ++i)
+        colours[i] = height == 0 ? 0 : 100 * (shown[i] - low) / height;
     colours.back() = 100;
     return colours;
 }

@@ -142,6 +142,11 @@ TEST_F(GraphInteractionTest, Tracking_ShowsThePointerInTheUnitOfTheAxis) {
     EXPECT_EQ(panel.DeltaLabel.ForeColor.get(), kCyan);
 }
 
+TEST_F(GraphInteractionTest, Tracking_LevelNearZero_HasAPrefix) {
+    graph.PlotAreaTracking(1e9, 0.0125);
+    EXPECT_EQ(panel.DeltaLabel.Caption.get(), "Cursor:1 GHz; 12.5 mdBm");
+}
+
 TEST_F(GraphInteractionTest, Tracking_AtZeroSpan_ShowsSeconds) {
     mirror.Span = 0;
     graph.PlotAreaTracking(0.0125, -3);
