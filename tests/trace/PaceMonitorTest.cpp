@@ -78,6 +78,28 @@ TEST(PaceMonitor, PauseAboveFiveSeconds_IsNoPace) {
     EXPECT_DOUBLE_EQ(monitor.sweepsPerSecond(), 10) << "of the last eight";
 }
 
+TEST(PaceMonitor, AgeAboveTwoCycles_IsOldInAViewThatRuns) {
+    VirtualPlatform platform;
+    Forms forms;
+    PaceMonitor monitor(forms.controller, platform.clock);
+    const auto oldAfter = [&](double cycleMs, double ageMs) {
+        monitor.cycleBegins();
+        platform.clock.advance(cycleMs);
+        forms.controller.CWGraph1.Old = false;
+        monitor.drawn();
+        platform.clock.advance(ageMs);
+        monitor.show();
+        return forms.controller.CWGraph1.Old.get();
+    };
+    forms.controller.AcquisitionRunning = forms.controller.STOPFlag = true;
+    EXPECT_FALSE(oldAfter(300, 600));
+    EXPECT_TRUE(oldAfter(300, 600.001));
+    EXPECT_FALSE(oldAfter(1, 100)) << "no cycle counts as shorter than 50 ms";
+    EXPECT_TRUE(oldAfter(1, 100.001));
+    forms.controller.STOPFlag = false;
+    EXPECT_FALSE(oldAfter(1, 60000));
+}
+
 TEST_F(Pace, TraceOfAnotherMode_StaysMarkedWhileItAges) {
     connectTo(0);
     panel().ChnPwrButton.Click();

@@ -161,6 +161,7 @@ TEST_F(SelectiveCycleTest, FailedLink_AbortsAheadOfEverything) {
 TEST_F(SelectiveCycleTest, NotConnected_IsToldOnce) {
     panel.isConnected = false;
     EXPECT_FALSE(readAgain(kNothing));
+    EXPECT_EQ(boxes.texts().size(), 1U);
     EXPECT_FALSE(readAgain(kNothing));
     EXPECT_EQ(boxes.texts(), Texts{"Please connect to the intrument first."});
     EXPECT_TRUE(panel.ErrorFlag);
