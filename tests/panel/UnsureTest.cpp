@@ -4,7 +4,6 @@
 
 #include "tests/panel/Panel.h"
 #include "trace/TraceReader.h"
-#include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {
@@ -212,35 +211,6 @@ TEST_F(UnsureTest, Preset_ClearsAllMarks) {
     cmd("PRESET");
     panel.ResetButton.Click();
     EXPECT_FALSE(mirror.Unsure.any());
-}
-
-TEST_F(UnsureTest, Annotations_AreStruckWithTheAxesThatRestOnThem) {
-    sweep();
-    ASSERT_TRUE(readAgain());
-    const auto marks = [this](const char* word) {
-        mirror.Unsure.clear();
-        mirror.Unsure.sent(word, false);
-        const ViewAnnotations view = annotateView(panel, mirror);
-        std::string text;
-        if (view.refLevelUnsure) text += "level ";
-        if (view.rangeUnsure) text += "range ";
-        if (view.detectorUnsure) text += "detector ";
-        if (view.xUnsure) text += "x ";
-        if (view.yUnsure) text += "y ";
-        return text;
-    };
-    EXPECT_EQ(marks("FREQ"), "x ");
-    EXPECT_EQ(marks("SPAN"), "x ");
-    EXPECT_EQ(marks("REFLVL"), "level y ");
-    EXPECT_EQ(marks("RANGE"), "range y ");
-    EXPECT_EQ(marks("TRACEDET"), "detector ");
-    panel.Shown.xUnit = "s";
-    EXPECT_EQ(marks("FREQ"), "");
-    EXPECT_EQ(marks("SPAN"), "x ");
-    panel.Shown.xUnit = "m";
-    EXPECT_EQ(marks("SPAN"), "");
-    panel.Shown.fromFile = true;
-    EXPECT_EQ(marks("REFLVL"), "");
 }
 
 TEST_F(UnsureTest, Readouts_AreStruckAndTheGraphIsDrawnAgain) {

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <string>
 #include <vector>
 
 #include "forms/Forms.h"
@@ -90,6 +91,34 @@ TEST_F(ViewAnnotationsTest, RangeOfAFile_IsItsDecibelsADivision) {
     EXPECT_EQ(shownRangeCode(panel, mirror), RANGE10DB);
     mirror.ReferenceRange = RANGELIN;
     EXPECT_EQ(shownRangeCode(panel, mirror), RANGELIN);
+}
+
+TEST_F(ViewAnnotationsTest, RefusedSetting_MarksWhatRestsOnIt) {
+    const auto marks = [this](const char* word) {
+        mirror.Unsure.clear();
+        if (*word != 0) mirror.Unsure.sent(word, false);
+        const ViewAnnotations shown = view();
+        std::string text;
+        if (shown.refLevelUnsure) text += "level ";
+        if (shown.rangeUnsure) text += "range ";
+        if (shown.detectorUnsure) text += "detector ";
+        if (shown.xUnsure) text += "x ";
+        if (shown.yUnsure) text += "y ";
+        return text;
+    };
+    EXPECT_EQ(marks(""), "");
+    EXPECT_EQ(marks("FREQ"), "x ");
+    EXPECT_EQ(marks("SPAN"), "x ");
+    EXPECT_EQ(marks("REFLVL"), "level y ");
+    EXPECT_EQ(marks("RANGE"), "range y ");
+    EXPECT_EQ(marks("TRACEDET"), "detector ");
+    panel.Shown.xUnit = "s";
+    EXPECT_EQ(marks("FREQ"), "");
+    EXPECT_EQ(marks("SPAN"), "x ");
+    panel.Shown.xUnit = "m";
+    EXPECT_EQ(marks("FREQ") + marks("SPAN"), "");
+    panel.Shown.fromFile = true;
+    EXPECT_EQ(marks("REFLVL"), "");
 }
 
 TEST_F(ViewAnnotationsTest, File_SaysWhatOnlyItKnows) {
