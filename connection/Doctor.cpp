@@ -86,7 +86,8 @@ bool Doctor::examine(const std::optional<LinkAddress>& address,
     for (const std::string& manager : s_.probe.modemManagers())
         tell(Grade::Warning, "manager", manager + " runs and may open serial ports",
              "Stop it with \"systemctl stop " + manager +
-                 "\", or add a udev rule that keeps it off the port.");
+                 "\", or install the udev rule of the package zelremote-server, which keeps it off "
+                 "the port.");
     if (address) {
         examinePort(*address);
         return !faults_;
@@ -134,7 +135,8 @@ bool Doctor::mayUse(const std::string& path) {
         return true;
     }
     std::string remedy =
-        "Install the udev rule of the program, or ask the administrator for rights.";
+        "Install the udev rule of the package zelremote-server, or ask the administrator for "
+        "rights.";
     if (!access.group.empty())
         remedy =
             access.member
