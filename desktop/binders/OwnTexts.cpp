@@ -67,6 +67,8 @@ constexpr Row kRows[] = {
     {QT_TRANSLATE_NOOP("QObject", "%1 old   %2 sweeps/s   the sweep sets the pace")},
     {QT_TRANSLATE_NOOP("QObject", "%1 old   %2 sweeps/s   the line sets the pace")},
     {QT_TRANSLATE_NOOP("QObject", "%1 old")},
+    {QT_TRANSLATE_NOOP("QObject", "Trace %1 of %2, %3")},
+    {QT_TRANSLATE_NOOP("QObject", "%1 of %2   %3")},
     {QT_TRANSLATE_NOOP("QObject", "pass %1/%2")},
     {QT_TRANSLATE_NOOP("QObject", "Held traces ended: frequency changed")},
     {QT_TRANSLATE_NOOP("QObject", "Held traces ended: span changed")},
@@ -80,8 +82,8 @@ constexpr Row kRows[] = {
 constexpr const char* kSeconds = QT_TRANSLATE_NOOP("QObject", "%1, %2 of %3 s");
 
 /// Labels whose texts are sentences of the program's own.
-constexpr const char* kLabels[] = {"ReconnectLabel", "AdviceLabel", "lblReason",
-                                   "FileLabel",      "WaitLabel",   "PaceLabel"};
+constexpr const char* kLabels[] = {"ReconnectLabel", "AdviceLabel", "lblReason",    "FileLabel",
+                                   "WaitLabel",      "PaceLabel",   "PlaybackLabel"};
 
 QRegularExpression patternOf(const char* text) {
     QString pattern = QRegularExpression::escape(QString::fromUtf8(text));

@@ -1693,5 +1693,13 @@ oder eine Aufzeichnung laden</translation>
         <source>pass</source>
         <translation>bestanden</translation>
     </message>
+    <message>
+        <source>Trace %1 of %2, %3</source>
+        <translation>Kurve %1 von %2, %3</translation>
+    </message>
+    <message>
+        <source>%1 of %2   %3</source>
+        <translation>%1 von %2   %3</translation>
+    </message>
 </context>
 </TS>

@@ -90,6 +90,10 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, const ZEL3Variables& m
     });
     for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
         binder.bindShow(*picture, state_, [this] { showState(); });
+    // An attempt by TCP begins and ends with the words of its step.
+    forms_.tcpConnection.AdviceLabel.Changed.connect([self = QPointer<StatusLine>(this)] {
+        if (self) self->showState();
+    });
     activityOff_.setSingleShot(true);
     connect(&activityOff_, &QTimer::timeout, this, [this] { showActivity(false); });
     panel_.DebugTextBox.Changed.connect([self = QPointer<StatusLine>(this)] {

@@ -70,6 +70,7 @@ INSTANTIATE_TEST_SUITE_P(
                  "nächste in 3 s"},
         Sentence{"0.5 s old   1.0 sweeps/s   the sweep sets the pace",
                  "0.5 s alt   1.0 Sweeps/s   der Sweep bestimmt das Tempo"},
+        Sentence{"10 of 40   11:50:20", "10 von 40   11:50:20"},
         Sentence{"Nobody knows this one", "Nobody knows this one"}));
 
 TEST_F(LanguageTest, LabelsOfTheInstrumentsPanel_KeepTheirTexts) {

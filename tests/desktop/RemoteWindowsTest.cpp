@@ -1,5 +1,6 @@
 #include <QComboBox>
 #include <QLabel>
+#include <QLayout>
 #include <QListWidget>
 #include <QPushButton>
 
@@ -60,6 +61,40 @@ TEST_F(RemoteWindowsTest, Dialling_HasNumberKeysAndSpeed) {
                        EXPECT_TRUE(widgetOf<QWidget>(*control)->isVisible()) << control->name();
                    }
                    bothThemes(dial.TelNumberBox, "dialling");
+               });
+}
+
+TEST_F(RemoteWindowsTest, Tcp_StatusLineSaysThatItConnectsAndFocusIsInTheAddress) {
+    const auto says = [this](const char* text) {
+        for (const QLabel* label : window->findChildren<QLabel*>())
+            if (label->text() == text && label->isVisible()) return true;
+        return false;
+    };
+    whileShown([this] { panel().TCPConnection.Click(); }, tcp,
+               [&] {
+                   QWidget* dialog = windowOf(tcp.IPAdressTextBox);
+                   EXPECT_EQ(dialog->focusWidget(), widgetOf<QWidget>(tcp.IPAdressTextBox));
+                   EXPECT_TRUE(says("Not connected"));
+                   tcp.Connecting = true;
+                   tcp.AdviceLabel.Caption = "Connecting to 192.168.1.20:2277";
+                   EXPECT_TRUE(says("Connecting..."));
+                   tcp.Connecting = false;
+                   tcp.AdviceLabel.Caption = "";
+                   EXPECT_TRUE(says("Not connected"));
+               });
+}
+
+TEST_F(RemoteWindowsTest, SerialPort_DialogIsAsHighAsItsPageNeeds) {
+    whileShown([this] { panel().Direct.Click(); }, dial,
+               [this] {
+                   QApplication::processEvents();
+                   QWidget* dialog = windowOf(dial.COMList);
+                   QLayout& page = *dialog->layout();
+                   const int wanted = page.hasHeightForWidth()
+                                          ? page.totalHeightForWidth(dialog->width())
+                                          : page.totalSizeHint().height();
+                   EXPECT_EQ(dialog->height(), wanted);
+                   EXPECT_LT(dialog->height(), 280);
                });
 }
 
