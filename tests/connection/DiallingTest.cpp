@@ -190,6 +190,12 @@ TEST_F(DiallingTest, AnswerOfLessThanFiveCharacters_WaitsForTheFifth) {
     EXPECT_EQ(shown(), Texts{"critical | ZELRemote | The line was busy!\r\nPlease try again"});
 }
 
+TEST_F(DiallingTest, BytesThatComeInAPause_DoNotLengthenIt) {
+    dialled().answer(kNumber).answer("\r\nBUSY").after(1100).answer("\r\n").after(500);
+    EXPECT_LE(time([this] { dial(); }), 3100);
+    expectRest();
+}
+
 TEST_F(DiallingTest, SpeedThatComesBehindConnect_IsWaitedFor) {
     dialled().answer("\r\nCONNECT ").after(1200).answer("12000\r\n").after(1300);
     dial();
