@@ -240,5 +240,19 @@ TEST_F(DoctorTest, ServerWithoutAnAnswer_IsAFault) {
                          "fault server: nothing answers at host:2277; Check"));
 }
 
+TEST_F(DoctorTest, BytesThatAreNoAnswer_AreShownTwelveAtMost) {
+    const auto came = [this](const char* bytes) {
+        platform.tcpSocket.expect("\r").answer(bytes);
+        platform.tcpSocket.expect("GET\r").silence();
+        const std::string text =
+            look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277});
+        const std::size_t start = text.find("what came: ");
+        return start == std::string::npos ? text
+                                          : text.substr(start, text.find(';', start) - start);
+    };
+    EXPECT_EQ(came("ABCDEFGHIJKL"), "what came: 41 42 43 44 45 46 47 48 49 4A 4B 4C");
+    EXPECT_EQ(came("ABCDEFGHIJKLM"), "what came: 41 42 43 44 45 46 47 48 49 4A 4B 4C ...");
+}
+
 }  // namespace
 }  // namespace zel

@@ -205,6 +205,16 @@ TEST_F(TcpDialogTest, AttemptThatIsLeft_StopsTheClockOfTheSession) {
     EXPECT_FALSE(panel.UpNow.Enabled);
 }
 
+TEST_F(TcpDialogTest, ProbeThatIsLeft_ClosesTheConnection) {
+    socket.connectsTo(SocketState::Connected);
+    socket.expect("\r").silence();
+    later(500, [this] { program.exchange().leaveWait(0); });
+    EXPECT_LE(time([this] { tcp.ConnectTCPButton.Click(); }), 600);
+    EXPECT_EQ(socket.state(), SocketState::Closed);
+    EXPECT_EQ(tcp.IDTextBox.Text.get(), "");
+    EXPECT_EQ(shown(), Texts{});
+}
+
 TEST_F(TcpDialogTest, PeerClosing_IsShownAndTheWaitGoesOn) {
     socket.connectsTo(SocketState::Connecting);
     later(1000, [this] { socket.setState(SocketState::PeerClosing); });
