@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include "link/CommandExchange.h"
+#include "support/Text.h"
 #include "tests/connection/Bench.h"
 #include "trace/TraceReader.h"
 
@@ -66,6 +67,19 @@ TEST_F(TcpDialogTest, PortThatIsNoNumber_IsToldAndNothingElseDone) {
     }
     EXPECT_TRUE(platform.settings.values.empty());
     EXPECT_EQ(socket.host(), "");
+}
+
+TEST_F(TcpDialogTest, LowestAndHighestPort_AreTried) {
+    socket.connectsTo(SocketState::Error);
+    socket.setProblem("Connection refused.");
+    for (const char* text : {"1", "65535"}) {
+        boxes.clear();
+        tcp.RemotePortTextBox.Text = text;
+        tcp.ConnectTCPButton.Click();
+        EXPECT_EQ(stored("RemotePort"), text);
+        ASSERT_EQ(shown().size(), 1U);
+        EXPECT_TRUE(contains(shown()[0], std::string("host:") + text + " failed")) << shown()[0];
+    }
 }
 
 TEST_F(TcpDialogTest, BlanksAroundPortAndAddress_AreTrimmed) {
