@@ -66,7 +66,8 @@ void PaceMonitor::show() {
     const std::int64_t age = clock_.micros() - drawnAt_.back();
     const bool running = viewRuns();
     std::string text = ageText(static_cast<double>(age) / kSecond, running) + " old";
-    if (running && sweepsPerSecond() > 0) {
+    // A view that reads no sweeps, such as that of a power, has no pace of them.
+    if (running && sweepsPerSecond() > 0 && age <= kLongGap) {
         text += "   " + formatPattern(sweepsPerSecond(), "0.0") + " sweeps/s   ";
         text += sweepSetsThePace() ? "the sweep sets the pace" : "the line sets the pace";
     }

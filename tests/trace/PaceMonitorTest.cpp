@@ -110,6 +110,16 @@ TEST_F(Pace, TraceOfAnotherMode_StaysMarkedWhileItAges) {
     EXPECT_FALSE(panel().CWGraph1.Old);
 }
 
+TEST_F(Pace, ViewThatReadsAPower_HasNoPaceOfSweeps) {
+    connectTo(57600);  // on a line that takes no time none would pass
+    view(2000, [] {});
+    panel().TDMAButton.Click();
+    view(8000, [this] {
+        EXPECT_EQ(line().find("sweeps/s"), std::string::npos) << line();
+        EXPECT_NE(line().find(" s old"), std::string::npos) << line();
+    });
+}
+
 TEST_F(Pace, FastLine_SaysThatTheSweepSetsThePace) {
     connectTo(0);
     view(2010, [this] {
