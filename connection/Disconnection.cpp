@@ -108,7 +108,6 @@ void Disconnection::notConnectedLook() {
     showLinkLost(panel_, false);
     dialog_.AirBaudRateText.Text = "";
     dialog_.ModemConnected = false;
-    dialog_.Hide();
     dialog_.ZELButton.Visible = true;
     dialog_.DisconnectButton2.Visible = false;
     dialog_.DialButton.Visible = true;

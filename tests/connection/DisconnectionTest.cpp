@@ -73,6 +73,7 @@ TEST_F(Connected, Disconnect_ContinuousView_IsRefused) {
 }
 
 TEST_F(Connected, Disconnect_NotConnectedLook) {
+    dialog.Visible = true;
     dialog.AirBaudRateText.Text = "9600";
     dialog.ModemConnected = true;
     page().cmd("LOCAL");
