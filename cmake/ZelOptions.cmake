@@ -3,6 +3,7 @@
 option(ZEL_WERROR "Treat warnings as errors" OFF)
 option(ZEL_BENCH "Build the benches" ON)
 option(ZEL_FUZZ "Build the fuzzers (needs Clang)" OFF)
+option(ZEL_PRECOMPILE "Read the headers of the toolkit once for many sources" ON)
 
 if(NOT CMAKE_BUILD_TYPE AND NOT CMAKE_CONFIGURATION_TYPES)
     set(CMAKE_BUILD_TYPE Release CACHE STRING "Kind of build" FORCE)
@@ -16,7 +17,9 @@ set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
 find_program(ZEL_CCACHE ccache)
 mark_as_advanced(ZEL_CCACHE)
 if(ZEL_CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
-    set(CMAKE_CXX_COMPILER_LAUNCHER "${ZEL_CCACHE}")
+    # Without this the cache leaves out what uses precompiled headers.
+    set(CMAKE_CXX_COMPILER_LAUNCHER "${CMAKE_COMMAND}" -E env
+        CCACHE_SLOPPINESS=pch_defines,time_macros "${ZEL_CCACHE}")
 endif()
 
 add_compile_options(-Wall -Wextra -Wpedantic -Wshadow)
@@ -52,6 +55,23 @@ function(zel_strict target)
     target_compile_options(${target} PRIVATE -Wconversion -Wsign-conversion -Wold-style-cast
         -Wnon-virtual-dtor -Woverloaded-virtual)
 endfunction()
+
+# zel_precompile(TARGET HEADERS...)
+#
+# Headers of libraries, never of this tree: a source names all that it uses, and a change of ours
+# compiles what it touches and nothing more.
+function(zel_precompile target)
+    if(ZEL_PRECOMPILE)
+        target_precompile_headers(${target} PRIVATE ${ARGN})
+        if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
+            target_compile_options(${target} PRIVATE -fpch-preprocess)
+        endif()
+    endif()
+endfunction()
+
+# What most windows use.
+set(ZEL_WINDOW_HEADERS <QtWidgets> <qcustomplot.h> <functional> <map> <memory> <optional> <string>
+    <vector>)
 
 if(ZEL_FUZZ AND NOT CMAKE_CXX_COMPILER_ID MATCHES "Clang")
     message(FATAL_ERROR "ZEL_FUZZ needs Clang: -DCMAKE_CXX_COMPILER=clang++")

@@ -192,7 +192,7 @@ void GraphWidget::mouseReleaseEvent(QMouseEvent* event) {
 void GraphWidget::tell(const char* word, std::initializer_list<double> numbers) {
     if (!told) return;
     std::string line = word;
-    for (const double number : numbers) line += " " + shortestNumber(number);
+    for (const double number : numbers) line.append(1, ' ').append(shortestNumber(number));
     told(line);
 }
 
