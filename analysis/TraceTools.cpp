@@ -37,38 +37,44 @@ void TraceTools::take(const Sweep& sweep, const SweepSource& source) {
             statistics_->add(*trace_);
         }
     }
-    workOut();
-    if (result_.mask && result_.mask->margin) {
+    found_.reset();
+    if (!request.mask) return Changed();
+    const std::optional<MaskVerdict> verdict = result().mask;
+    if (verdict && verdict->margin) {
         ++maskCount_.sweeps;
-        if (result_.mask->pass) ++maskCount_.passed;
+        if (verdict->pass) ++maskCount_.passed;
     }
     Changed();
-    if (result_.mask && !result_.mask->pass) MaskFailed();
+    if (verdict && !verdict->pass) MaskFailed();
 }
 
-void TraceTools::workOut() {
-    result_ = {};
-    readings_ = {};
-    adjacentFound_ = {};
-    if (!trace_) return;
-    result_ = analyseTrace(*trace_, request);
+const TraceTools::Found& TraceTools::found() const {
+    if (!found_) found_ = workOut();
+    return *found_;
+}
+
+TraceTools::Found TraceTools::workOut() const {
+    Found found;
+    if (!trace_) return found;
+    found.result = analyseTrace(*trace_, request);
+    const std::vector<Peak>& peaks = found.result.peaks;
     std::size_t wanted = 0;
     for (const HostMarker& marker : markers)
         if (marker.on) wanted = std::max(wanted, marker.peak);
     // A marker may follow a peak that the table does not show.
-    readings_ = readMarkers(
-        *trace_, markers,
-        wanted > result_.peaks.size() ? findPeaks(*trace_, request.search) : result_.peaks);
-    if (!adjacent) return;
+    found.readings = readMarkers(
+        *trace_, markers, wanted > peaks.size() ? findPeaks(*trace_, request.search) : peaks);
+    if (!adjacent) return found;
     std::optional<double> center = adjacent->center;
-    if (!center && !result_.peaks.empty()) center = result_.peaks.front().x;
+    if (!center && !peaks.empty()) center = peaks.front().x;
     if (center)
-        adjacentFound_ =
+        found.adjacent =
             adjacentChannels(*trace_, *center, adjacent->width, adjacent->spacing, adjacent->pairs);
+    return found;
 }
 
 void TraceTools::refresh() {
-    workOut();
+    found_.reset();
     Changed();
 }
 

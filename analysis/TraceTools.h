@@ -52,9 +52,11 @@ class TraceTools {
 
     /// The sweep with all corrections; nothing before the first.
     const std::optional<SpectrumTrace>& trace() const { return trace_; }
-    const AnalysisResult& result() const { return result_; }
-    const MarkerReadings& readings() const { return readings_; }
-    const AdjacentChannels& adjacentFound() const { return adjacentFound_; }
+    /// What was asked of the sweep. It is worked out when it is first asked for: of quick sweeps
+    /// that nobody looks at, nothing is.
+    const AnalysisResult& result() const { return found().result; }
+    const MarkerReadings& readings() const { return found().readings; }
+    const AdjacentChannels& adjacentFound() const { return found().adjacent; }
     const MaskCount& maskCount() const { return maskCount_; }
     const std::optional<TraceStatistics>& statistics() const { return statistics_; }
     /// Why the last sweep could not be worked on; empty when it could.
@@ -66,7 +68,13 @@ class TraceTools {
     Event<> MaskFailed;
 
   private:
-    void workOut();
+    struct Found {
+        AnalysisResult result;
+        MarkerReadings readings;
+        AdjacentChannels adjacent;
+    };
+    const Found& found() const;
+    Found workOut() const;
 
     HostTraces traces_;
     std::vector<Correction> corrections_;
@@ -74,9 +82,7 @@ class TraceTools {
     std::optional<TraceStatistics> statistics_;
     std::optional<SpectrumTrace> plain_;  ///< without corrections
     std::optional<SpectrumTrace> trace_;
-    AnalysisResult result_;
-    MarkerReadings readings_;
-    AdjacentChannels adjacentFound_;
+    mutable std::optional<Found> found_;  ///< nothing: not worked out yet
     MaskCount maskCount_;
     std::string problem_;
     int mode_ = -1;

@@ -106,7 +106,10 @@ void TraceToolsDock::takeSweep(bool loaded) {
     if (panel_.Shown.fromFile) source.rbw = leadingNumber(panel_.Shown.rbw);
     tools_.take(program_.sweep(), source);
     // What was saved once is not watched again.
-    if (!loaded) watch_.take(program_.sweep(), tools_.result().mask.value_or(MaskVerdict{}));
+    if (!loaded)
+        watch_.take(program_.sweep(), tools_.request.mask
+                                          ? tools_.result().mask.value_or(MaskVerdict{})
+                                          : MaskVerdict{});
 }
 
 void TraceToolsDock::showLater() {
@@ -230,6 +233,7 @@ OverlayPicture TraceToolsDock::picture() const {
         if (!tools.corrections().empty())
             addCurve(picture, *now, self->traces().color(kHolds + kMemories));
         for (std::size_t i = 0; i < kHostMarkers; ++i) {
+            if (!tools.markers.at(i).on) continue;
             const MarkerReading& reading = tools.readings().at(i);
             if (!reading.x || !reading.level) continue;
             if (const auto y = graphY(*reading.level))
