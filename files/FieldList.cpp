@@ -1,5 +1,7 @@
 #include "files/FieldList.h"
 
+#include <array>
+
 namespace zel {
 namespace {
 
@@ -7,13 +9,23 @@ constexpr std::size_t kYieldEvery = std::size_t{4} * 1024 * 1024;
 constexpr int kStep = 16;
 constexpr std::size_t kUsualField = 8;
 
-bool isSeparator(char c) { return c == ';' || c == '\r' || c == '\n'; }
+// One look a character: it is most of the work.
+constexpr std::array<bool, 256> kSeparators = [] {
+    std::array<bool, 256> separators{};
+    for (const char c : {';', '\r', '\n'}) separators[static_cast<unsigned char>(c)] = true;
+    return separators;
+}();
+
+bool isSeparator(char c) { return kSeparators[static_cast<unsigned char>(c)]; }
 
 }  // namespace
 
 std::size_t FieldList::endOf(std::size_t start) const {
-    while (start < text_.size() && !isSeparator(text_[start])) ++start;
-    return start;
+    const char* const begin = text_.data();
+    const char* const end = begin + text_.size();
+    const char* at = begin + start;
+    while (at < end && !isSeparator(*at)) ++at;
+    return static_cast<std::size_t>(at - begin);
 }
 
 /// The start of the entry after the separator at `end`.
@@ -38,19 +50,15 @@ FieldList::FieldList(std::string_view text, const std::function<void(double)>& y
     }
 }
 
-std::string_view FieldList::at(int index) const {
-    if (index < 0 || index > last()) return {};
-    if (index != index_) {
-        if (index_ >= 0 && index == index_ + 1) {
-            start_ = next(end_);
-        } else {
-            start_ = starts_[static_cast<std::size_t>(index / kStep)];
-            for (int i = index % kStep; i > 0; --i) start_ = next(endOf(start_));
-        }
-        index_ = index;
-        end_ = endOf(start_);
+void FieldList::find(int index) const {
+    if (index_ >= 0 && index == index_ + 1) {
+        start_ = next(end_);
+    } else {
+        start_ = starts_[static_cast<std::size_t>(index / kStep)];
+        for (int i = index % kStep; i > 0; --i) start_ = next(endOf(start_));
     }
-    return text_.substr(start_, end_ - start_);
+    index_ = index;
+    end_ = endOf(start_);
 }
 
 }  // namespace zel

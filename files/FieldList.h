@@ -21,10 +21,15 @@ class FieldList {
     int last() const { return count_ - 1; }
     /// Empty beyond the last. Quick for the entry of the call before and the one after it; else a
     /// few entries are walked.
-    std::string_view at(int index) const;
+    std::string_view at(int index) const {
+        if (index < 0 || index > last()) return {};
+        if (index != index_) find(index);
+        return {text_.data() + start_, end_ - start_};
+    }
     std::string_view operator[](int index) const { return at(index); }
 
   private:
+    void find(int index) const;
     std::size_t endOf(std::size_t start) const;
     std::size_t next(std::size_t end) const;
 
