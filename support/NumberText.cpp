@@ -16,13 +16,23 @@ constexpr double kFixedLimit = 1e15;
 constexpr int kMostRounding = 15;  // finer steps than a double has
 constexpr int kMostPatternDecimals = 20;
 
-/// Length of the number at the head of a text that begins with sign, digit or point; 0 for none.
+/// 10 to the power of `exponent`, as the library gives it.
+double powerOfTen(int exponent) {
+    // These are exact and asked for with each sample.
+    constexpr std::array<double, 16> kPowers{1e0, 1e1, 1e2,  1e3,  1e4,  1e5,  1e6,  1e7,
+                                             1e8, 1e9, 1e10, 1e11, 1e12, 1e13, 1e14, 1e15};
+    if (exponent >= 0 && exponent < static_cast<int>(kPowers.size()))
+        return kPowers[static_cast<std::size_t>(exponent)];
+    return std::pow(10.0, exponent);
+}
+
 std::string_view withoutBlanks(std::string_view text) {
     while (!text.empty() && (text.front() == ' ' || text.front() == '\t' || text.front() == '\n'))
         text.remove_prefix(1);
     return text;
 }
 
+/// Length of the number at the head of a text that begins with sign, digit or point; 0 for none.
 std::size_t numberLength(std::string_view text) {
     std::size_t i = 0;
     if (i < text.size() && (text[i] == '+' || text[i] == '-')) ++i;
@@ -93,6 +103,9 @@ std::optional<double> parseNumber(std::string_view text) {
 
 std::string generalNumber(double value) {
     if (!std::isfinite(value) || value == 0) return "0";
+    // A whole number of so few digits is shown as it is.
+    if (std::fabs(value) < kFixedLimit && value == std::trunc(value))
+        return std::to_string(static_cast<long long>(value));
     // The 15 significant digits and the exponent decide the form.
     const std::string digits = printed(value, std::chars_format::scientific, kSignificant - 1);
     const auto mark = digits.find('e');
@@ -134,7 +147,7 @@ std::string formatPattern(double value, std::string_view pattern) {
         if (fraction[static_cast<std::size_t>(i)] == '0') fractionZeros = i + 1;
     // Ties go away from zero here; the shortest digits of the value decide what a tie is.
     const double magnitude = std::fabs(value);
-    const double scale = std::pow(10.0, decimals);
+    const double scale = powerOfTen(decimals);
     const double scaled = magnitude * scale;
     const double rounded =
         scaled < 1e15 ? std::floor(scaled + 0.5 + scaled * 1e-15) / scale : magnitude;
@@ -152,7 +165,7 @@ std::string formatPattern(double value, std::string_view pattern) {
 
 double roundHalfEven(double value, int digits) {
     if (!std::isfinite(value) || digits > kMostRounding) return value;
-    const double scale = std::pow(10.0, digits);
+    const double scale = powerOfTen(digits);
     const double scaled = value * scale;
     if (std::fabs(scaled) > 9e15) return value;  // whole already
     return std::nearbyint(scaled) / scale;

@@ -4,6 +4,8 @@
 #include <QLocale>
 #include <chrono>
 #include <cmath>
+#include <string>
+#include <utility>
 
 namespace zel {
 
@@ -20,11 +22,16 @@ constexpr double kDayMilliseconds = 86400000;
 }  // namespace
 
 std::string QtClock::dateText(double date) const {
+    // Each sweep asks for the date of the same day; to ask the system for its form takes long.
+    thread_local std::pair<double, std::string> last{NAN, ""};
+    const double today = std::floor(date);
+    if (last.first == today) return last.second;
     const QLocale locale = QLocale::system();
     QString format = locale.dateFormat(QLocale::ShortFormat);
     if (!format.contains("yyyy")) format.replace("yy", "yyyy");
-    const QDate day = kFirstDay.addDays(static_cast<qint64>(std::floor(date)));
-    return locale.toString(day, format).toStdString();
+    const QDate day = kFirstDay.addDays(static_cast<qint64>(today));
+    last = {today, locale.toString(day, format).toStdString()};
+    return last.second;
 }
 
 std::string QtClock::timeText(double date) const {
