@@ -1,6 +1,7 @@
 #include "platform/Graph3D.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace zel {
 namespace {
@@ -109,14 +110,14 @@ void Graph3D::stampNext(int row, std::string time) {
     nextTime_ = std::move(time);
 }
 
-void Graph3D::plotCurve(const std::vector<double>& depth, const std::vector<double>& x,
-                        const std::vector<double>& level, const std::vector<double>& colour) {
+void Graph3D::plotCurve(std::vector<double> depth, std::vector<double> x, std::vector<double> level,
+                        std::vector<double> colour) {
     if (plots_.empty() || !plots_.back().level.empty()) plots_.emplace_back();
     GraphCurve3D& curve = plots_.back();
-    curve.depth = depth;
-    curve.x = x;
-    curve.level = level;
-    curve.colour = colour;
+    curve.depth = std::move(depth);
+    curve.x = std::move(x);
+    curve.level = std::move(level);
+    curve.colour = std::move(colour);
     curve.row = nextRow_;
     curve.time = nextTime_;
     noteRows();

@@ -115,8 +115,8 @@ class Graph3D : public Control {
     /// The stamp that the next curve takes.
     void stampNext(int row, std::string time);
     /// Plots a curve into the last plot if that is empty, else into a new one after it.
-    void plotCurve(const std::vector<double>& depth, const std::vector<double>& x,
-                   const std::vector<double>& level, const std::vector<double>& colour);
+    void plotCurve(std::vector<double> depth, std::vector<double> x, std::vector<double> level,
+                   std::vector<double> colour);
     /// A curve was plotted: the last plot holds it.
     Event<> Plotted;
     /// Counts what changes the rows; a front compares it to see that they are new.

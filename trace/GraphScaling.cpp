@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
@@ -126,7 +127,7 @@ void GraphScaling::DisplayDataOnGraph(const Sweep& sweep) {
     std::vector<double> xs(sweep.shown.size());
     for (std::size_t i = 0; i < xs.size(); ++i)
         xs[i] = sweep.axis.first + static_cast<double>(i) * sweep.axis.increment;
-    waterfall_.Graph3D.plotCurve(panel_.YVector, xs, sweep.shown, sweep.colours);
+    waterfall_.Graph3D.plotCurve(panel_.YVector, std::move(xs), sweep.shown, sweep.colours);
 }
 
 void GraphScaling::SetAnnotation(double percent) {

@@ -36,11 +36,11 @@ HistoryRow::HistoryRow(const std::vector<double>& shown, double low, double high
     : low_(std::isfinite(low) ? low : 0),
       step_(std::isfinite(high - low) ? (high - low) / kSteps : 0) {
     const std::size_t count = std::min(shown.size(), SweepHistory::kLongestRow);
-    shown_.reserve(count);
-    for (std::size_t i = 0; i < count; ++i) {
-        const double place = step_ == 0 ? 0 : (shown[i] - low_) / step_;
-        shown_.push_back(
-            place > 0 ? static_cast<std::uint16_t>(std::min(std::nearbyint(place), kSteps)) : 0);
+    shown_.resize(count);
+    for (std::size_t i = 0; i < count && step_ != 0; ++i) {
+        // Values below the axis and those that are no numbers are its lowest step.
+        const double place = (shown[i] - low_) / step_ + 0.5;
+        shown_[i] = place > 0 ? static_cast<std::uint16_t>(std::min(place, kSteps)) : 0;
     }
     raw_.assign(raw.begin(), raw.begin() + static_cast<std::ptrdiff_t>(
                                                std::min(raw.size(), SweepHistory::kLongestRow)));
