@@ -365,7 +365,8 @@ void Binder::addTwin(T& control, QAction* action, std::function<void()> show) {
         if (tip.isEmpty()) tip = text(control.Caption);
         if (const QString keys = shortcutOf(control); !keys.isEmpty()) tip += " (" + keys + ")";
         action->setToolTip(reason.isEmpty() ? tip : tip + "\n" + reason);
-        action->setEnabled(control.Enabled && hasHandler(control) && reason.isEmpty());
+        action->setEnabled(control.Visible && control.Enabled && hasHandler(control) &&
+                           reason.isEmpty());
         if (then) then();
     };
     markDirty(&control);

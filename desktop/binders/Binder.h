@@ -28,7 +28,7 @@
 namespace zel {
 
 /// What changes is drawn once in this time, however often it changes.
-inline constexpr int kFrameMs = 16;
+inline constexpr int kFrameMs = 25;
 
 class PanelLineEdit;
 

@@ -3,6 +3,7 @@
 #include <QMenu>
 #include <QPointer>
 #include <QToolButton>
+#include <utility>
 
 #include "desktop/windows/MainMenus.h"
 #include "desktop/windows/ThemeIcons.h"
@@ -67,11 +68,12 @@ ToolStrip::ToolStrip(Forms& forms, Binder& binder, Own own, QWidget* parent)
     QAction* save = add("save", QObject::tr("Save"));
     binder_.twin(panel.SaveCurrentView, save);
     QAction* record = add("record", QObject::tr("Record"));
-    binder_.twin(panel.RecordData, record, [this, &panel, record] {
+    // A new icon lays the whole strip out again: not with every sweep.
+    binder_.twin(panel.RecordData, record, [this, &panel, record, lamp = -1]() mutable {
         // While the dialog asks nothing is recorded yet.
         const bool runs = panel.RecordData.Checked && !forms_.time.Visible;
+        if (std::exchange(lamp, runs ? 1 : 0) == (runs ? 1 : 0)) return;
         record->setIcon(runs ? themeIcon("recording", kLamp) : themeIcon("record"));
-        record->setEnabled(record->isEnabled() && panel.RecordData.Visible);
     });
     forms_.time.Changed.connect([self = QPointer<ToolStrip>(this)] {
         if (self) self->binder_.refresh(self->forms_.controller.RecordData);

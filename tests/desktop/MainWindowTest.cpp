@@ -1,9 +1,12 @@
 // The panel's window: every control bound, shown as its form says, reachable by keyboard.
 
+#include <QAction>
 #include <QClipboard>
 #include <QMenu>
 #include <QSet>
 #include <QTest>
+#include <QToolBar>
+#include <algorithm>
 
 #include "desktop/windows/FoldGroup.h"
 #include "tests/desktop/WindowTest.h"
@@ -54,6 +57,33 @@ TEST_F(WindowTest, StopKey_IsHiddenUntilAViewRuns) {
     EXPECT_FALSE(widgetOf<QWidget>(panel().StopButton)->isVisible());
     panel().StopButton.Visible = true;
     EXPECT_TRUE(widgetOf<QWidget>(panel().StopButton)->isVisible());
+}
+
+TEST_F(WindowTest, ToolbarShownAgain_ChangesNothing) {
+    connect();
+    show();
+    window->binder().flush();
+    int changes = 0;
+    for (QAction* action : window->findChild<QToolBar*>("Toolbar")->actions())
+        QObject::connect(action, &QAction::changed, window.get(), [&changes] { ++changes; });
+    window->binder().refreshAll();
+    window->binder().flush();
+    EXPECT_EQ(changes, 0);  // each one would lay the toolbar out again, with each sweep
+}
+
+TEST_F(WindowTest, SecondWayToAHiddenControl_IsDisabled) {
+    connect();
+    show();
+    const QList<QAction*> actions = window->findChild<QToolBar*>("Toolbar")->actions();
+    const auto record = std::find_if(actions.begin(), actions.end(),
+                                     [](QAction* action) { return action->text() == "Record"; });
+    ASSERT_NE(record, actions.end());
+    panel().RecordData.Visible = true;
+    window->binder().flush();
+    EXPECT_TRUE((*record)->isEnabled());
+    panel().RecordData.Visible = false;
+    window->binder().flush();
+    EXPECT_FALSE((*record)->isEnabled());
 }
 
 TEST_F(WindowTest, EntryWithoutAHandler_IsDisabled) {
