@@ -37,7 +37,7 @@ void TraceTools::take(const Sweep& sweep, const SweepSource& source) {
             statistics_->add(*trace_);
         }
     }
-    found_.reset();
+    worked_ = false;
     if (!request.mask) return Changed();
     const std::optional<MaskVerdict> verdict = result().mask;
     if (verdict && verdict->margin) {
@@ -49,8 +49,9 @@ void TraceTools::take(const Sweep& sweep, const SweepSource& source) {
 }
 
 const TraceTools::Found& TraceTools::found() const {
-    if (!found_) found_ = workOut();
-    return *found_;
+    if (!worked_) found_ = workOut();
+    worked_ = true;
+    return found_;
 }
 
 TraceTools::Found TraceTools::workOut() const {
@@ -74,7 +75,8 @@ TraceTools::Found TraceTools::workOut() const {
 }
 
 void TraceTools::refresh() {
-    found_.reset();
+    worked_ = false;
+    found();
     Changed();
 }
 

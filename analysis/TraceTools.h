@@ -52,8 +52,9 @@ class TraceTools {
 
     /// The sweep with all corrections; nothing before the first.
     const std::optional<SpectrumTrace>& trace() const { return trace_; }
-    /// What was asked of the sweep. It is worked out when it is first asked for: of quick sweeps
-    /// that nobody looks at, nothing is.
+    /// What was asked of the sweep. It is worked out when it is first looked at: of quick sweeps
+    /// that nobody looks at, nothing is. The objects stay; their contents are those of the sweep
+    /// at the last call.
     const AnalysisResult& result() const { return found().result; }
     const MarkerReadings& readings() const { return found().readings; }
     const AdjacentChannels& adjacentFound() const { return found().adjacent; }
@@ -82,7 +83,8 @@ class TraceTools {
     std::optional<TraceStatistics> statistics_;
     std::optional<SpectrumTrace> plain_;  ///< without corrections
     std::optional<SpectrumTrace> trace_;
-    mutable std::optional<Found> found_;  ///< nothing: not worked out yet
+    mutable Found found_;
+    mutable bool worked_ = true;  ///< found_ is of the sweep on the graph and of what is asked
     MaskCount maskCount_;
     std::string problem_;
     int mode_ = -1;
