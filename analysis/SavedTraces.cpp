@@ -208,9 +208,9 @@ class Cutter {
 
 }  // namespace
 
-DateOrder dateOrderOf(std::string_view third_of_february_2001) {
+DateOrder dateOrderOf(std::string_view sample) {
     std::size_t count = 0;
-    const std::array<int, 3> numbers = wholeNumbers(third_of_february_2001, count);
+    const std::array<int, 3> numbers = wholeNumbers(sample, count);
     if (numbers[0] == 3) return DateOrder::DayMonthYear;
     if (numbers[0] == 2) return DateOrder::MonthDayYear;
     return DateOrder::YearMonthDay;

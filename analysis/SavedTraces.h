@@ -13,7 +13,7 @@ namespace zel {
 enum class DateOrder { YearMonthDay, DayMonthYear, MonthDayYear };
 
 /// The order that a desk writes, from its text of 3 February 2001 ("03.02.2001").
-DateOrder dateOrderOf(std::string_view third_of_february_2001);
+DateOrder dateOrderOf(std::string_view sample);
 
 /// "2026-11-21T14:05:09" of a date and a time as a file holds them; empty when one of them makes no
 /// sense. The place of the year decides where it can; `order` decides about the rest.

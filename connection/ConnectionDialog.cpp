@@ -33,9 +33,9 @@ ConnectionDialog::ConnectionDialog(Forms& forms, ByteLink& link, SessionStart& s
                                                           {&panel_.ModemToGSM, CF::MODEMGSMCON},
                                                           {&panel_.GSMToModem, CF::GSMMODEMCON}};
     for (const auto& [item, kind] : dialled) {
-        handlers_.on(item->Clicked, [this, kind = kind] {
+        handlers_.on(item->Clicked, [this, chosen = kind] {
             panel_.immConnectState = false;
-            SetConnectionKind(kind);
+            SetConnectionKind(chosen);
         });
     }
     handlers_.on(dialog_.ZELButton.Clicked, [this] { ZELButton_Click(); });

@@ -191,10 +191,11 @@ void RootDebug::openFile() {
     if (files_.stat(FileName).exists()) return;
     // A new file: of those of earlier runs the newest stay. Their names sort by their time.
     std::vector<std::string> old;
-    for (const std::string& name : files_.list(folder_))
+    for (const std::string& name : files_.list(folder_)) {
         if (startsWith(name, kFileHead) && name.size() > 4 &&
             name.substr(name.size() - 4) == kFileTail)
             old.push_back(name);
+    }
     std::sort(old.begin(), old.end());
     for (std::size_t i = 0; i + kKeptFiles <= old.size(); ++i)
         files_.remove(folder_ + "/" + old[i]);
