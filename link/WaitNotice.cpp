@@ -39,8 +39,9 @@ void WaitNotice::showStep(std::int64_t elapsedMs, std::int64_t timeoutMs) {
     if (!stepShown_) step_ = label.Caption;
     stepShown_ = true;
     const std::string what = step_.empty() ? "Waiting for the instrument" : step_;
-    const std::string text =
-        what + ", " + std::to_string(elapsedMs / 1000) + " of " + lengthText(timeoutMs / 1000);
+    // A wait is not over before the last second that is named.
+    const std::string text = what + ", " + std::to_string(elapsedMs / 1000) + " of " +
+                             lengthText((timeoutMs + 999) / 1000);
     if (label.Caption.get() != text) label.Caption = text;
 }
 

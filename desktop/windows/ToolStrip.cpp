@@ -3,6 +3,7 @@
 #include <QMenu>
 #include <QPointer>
 #include <QToolButton>
+#include <optional>
 #include <utility>
 
 #include "desktop/windows/MainMenus.h"
@@ -69,12 +70,13 @@ ToolStrip::ToolStrip(Forms& forms, Binder& binder, Own own, QWidget* parent)
     binder_.twin(panel.SaveCurrentView, save);
     QAction* record = add("record", QObject::tr("Record"));
     // A new icon lays the whole strip out again: not with every sweep.
-    binder_.twin(panel.RecordData, record, [this, &panel, record, lamp = -1]() mutable {
-        // While the dialog asks nothing is recorded yet.
-        const bool runs = panel.RecordData.Checked && !forms_.time.Visible;
-        if (std::exchange(lamp, runs ? 1 : 0) == (runs ? 1 : 0)) return;
-        record->setIcon(runs ? themeIcon("recording", kLamp) : themeIcon("record"));
-    });
+    binder_.twin(panel.RecordData, record,
+                 [this, &panel, record, lamp = std::optional<bool>()]() mutable {
+                     // While the dialog asks nothing is recorded yet.
+                     const bool runs = panel.RecordData.Checked && !forms_.time.Visible;
+                     if (std::exchange(lamp, runs) == runs) return;
+                     record->setIcon(runs ? themeIcon("recording", kLamp) : themeIcon("record"));
+                 });
     forms_.time.Changed.connect([self = QPointer<ToolStrip>(this)] {
         if (self) self->binder_.refresh(self->forms_.controller.RecordData);
     });
