@@ -130,7 +130,13 @@ TEST_F(NavigationTest, PeakOfTheBand_StandsWhereTheInstrumentHasIt) {
 TEST(AxisText, Digits_TellNeighboursApart) {
     EXPECT_EQ(axisText(2.41234e9, 1e4, "Hz"), "2.41234 GHz");
     EXPECT_EQ(axisText(2.4e9, 1e7, "Hz"), "2.40 GHz");
-    EXPECT_EQ(axisText(0, 1e7, "Hz"), "0 MHz");
+    EXPECT_EQ(axisText(0, 1e7, "Hz"), "0 Hz");
+    EXPECT_EQ(axisText(-4.9e6, 1e7, "Hz"), "0 Hz");
+    EXPECT_EQ(axisText(1e7, 1e7, "Hz"), "10 MHz");
+    EXPECT_EQ(axisText(0, 7e-5, "s"), "0 s");
+    EXPECT_EQ(axisText(0.00014, 7e-5, "s"), "140 µs");
+    EXPECT_EQ(axisText(0, 0.05, "m"), "0 m");
+    EXPECT_EQ(axisText(7.5, 0.05, "m"), "7.50 m");
     EXPECT_EQ(axisText(0.0123, 1e-4, "s"), "12.3 ms");
     EXPECT_EQ(levelText(-0.001, "dBm"), "0.00 dBm");
     EXPECT_EQ(levelText(std::nan(""), "dBm"), "");
