@@ -14,6 +14,9 @@ namespace zel {
 namespace {
 
 constexpr std::size_t kMostReadings = 300;
+constexpr std::size_t kSpans[] = {10, 20, 50, 100, 200, kMostReadings};
+constexpr std::size_t kDottedSpan = 50;  // the single readings can be told apart
+constexpr int kSpanParts = 5;
 constexpr double kLowest = -80;  // dBm, ends of the bar and of the history
 constexpr double kHighest = 30;
 constexpr int kScaleStep = 10;
@@ -52,6 +55,11 @@ void PowerDisplay::take(const std::string& answer) {
     if (history_.size() > kMostReadings) history_.pop_front();
     setAccessibleDescription(QString::fromStdString(levelText(history_.back(), "dBm")));
     update();
+}
+
+std::size_t PowerDisplay::span() const {
+    return *std::find_if(std::begin(kSpans), std::end(kSpans) - 1,
+                         [this](std::size_t span) { return history_.size() <= span; });
 }
 
 void PowerDisplay::drawBar(QPainter& painter, const QRectF& place) const {
@@ -103,14 +111,34 @@ void PowerDisplay::drawHistory(QPainter& painter, const QRectF& place) const {
         painter.drawText(QRectF(0, y - 9, place.left() - 6, 18), Qt::AlignRight | Qt::AlignVCenter,
                          QString::fromStdString(generalNumber(roundHalfEven(level, 3))));
     }
-    QPolygonF line;
-    for (std::size_t i = 0; i < history_.size(); ++i) {
-        const double age = static_cast<double>(history_.size() - 1 - i);
-        line << QPointF(place.right() - age / (kMostReadings - 1) * place.width(),
-                        yOf(history_[i]));
+    const auto xOf = [&](double age) {
+        return place.right() - age / static_cast<double>(span()) * place.width();
+    };
+    for (int i = 0; i <= kSpanParts; ++i) {
+        const int age = static_cast<int>(span()) / kSpanParts * i;
+        const double x = xOf(age);
+        painter.setPen(QPen(colors.grid, 1));
+        painter.drawLine(QPointF(x, place.top()), QPointF(x, place.bottom()));
+        painter.setPen(colors.text);
+        const QRectF below(x - 60, place.bottom() + 4, 120, 18);
+        if (i < kSpanParts) {
+            painter.drawText(below, Qt::AlignHCenter, QString::number(-age));
+        } else {
+            painter.drawText(below.translated(60, 0), Qt::AlignLeft,
+                             QObject::tr("%1 readings").arg(-age));
+        }
     }
+    QPolygonF line;
+    for (std::size_t i = 0; i < history_.size(); ++i)
+        line << QPointF(xOf(static_cast<double>(history_.size() - 1 - i)), yOf(history_[i]));
     painter.setPen(QPen(colors.trace, 1.2));
+    painter.setBrush(Qt::NoBrush);
     painter.drawPolyline(line);
+    if (span() <= kDottedSpan) {
+        painter.setPen(Qt::NoPen);
+        painter.setBrush(colors.trace);
+        for (const QPointF& reading : line) painter.drawEllipse(reading, 2, 2);
+    }
     painter.setPen(colors.text);
     const QRectF texts(place.left(), place.top() - 22, place.width(), 18);
     painter.drawText(texts, Qt::AlignLeft | Qt::AlignVCenter,
@@ -126,7 +154,7 @@ void PowerDisplay::paintEvent(QPaintEvent*) {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
     painter.fillRect(rect(), colors.background);
-    const QRectF area = QRectF(rect()).adjusted(56, 24, -40, -24);
+    const QRectF area = QRectF(rect()).adjusted(56, 24, -40, -32);
     QFont large = font();
     large.setPixelSize(std::clamp(height() / 6, 36, 96));
     large.setBold(true);

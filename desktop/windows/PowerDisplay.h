@@ -17,6 +17,9 @@ class PowerDisplay : public QWidget {
     void clear();
     /// dBm, the newest last; 300 at most.
     const std::deque<double>& history() const { return history_; }
+    /// How many readings the width of the history stands for: the least of some round numbers that
+    /// has room, so that few readings are no stub at the edge.
+    std::size_t span() const;
 
   protected:
     void paintEvent(QPaintEvent* event) override;

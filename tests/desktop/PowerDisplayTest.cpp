@@ -63,6 +63,19 @@ TEST_F(PowerDisplayTest, AnotherModeForgetsTheReadings) {
     EXPECT_TRUE(display->history().empty());
 }
 
+TEST_F(PowerDisplayTest, FewReadingsUseTheWidth) {
+    ASSERT_NE(display, nullptr);
+    display->clear();
+    const std::pair<int, std::size_t> spans[] = {{2, 10},   {10, 10},   {11, 20},   {50, 50},
+                                                 {51, 100}, {201, 300}, {300, 300}, {450, 300}};
+    int taken = 0;
+    for (const auto& [readings, span] : spans) {
+        for (; taken < readings; ++taken) display->take("-30");
+        EXPECT_EQ(display->span(), span) << readings;
+    }
+    EXPECT_EQ(display->history().size(), 300U);
+}
+
 TEST_F(PowerDisplayTest, AnswerThatIsNoNumber_IsNoReading) {
     panel().PwrButton.Click();
     read(1);
