@@ -54,6 +54,11 @@ const TraceTools::Found& TraceTools::found() const {
     return found_;
 }
 
+MaskVerdict TraceTools::verdict() const {
+    // Without a mask nothing is worked out for it.
+    return request.mask ? result().mask.value_or(MaskVerdict{}) : MaskVerdict{};
+}
+
 TraceTools::Found TraceTools::workOut() const {
     Found found;
     if (!trace_) return found;

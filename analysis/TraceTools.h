@@ -56,6 +56,9 @@ class TraceTools {
     /// that nobody looks at, nothing is. The objects stay; their contents are those of the sweep
     /// at the last call.
     const AnalysisResult& result() const { return found().result; }
+    /// Of the last sweep. Without a mask, or where nothing could be worked out, it counts as
+    /// passed.
+    MaskVerdict verdict() const;
     const MarkerReadings& readings() const { return found().readings; }
     const AdjacentChannels& adjacentFound() const { return found().adjacent; }
     const MaskCount& maskCount() const { return maskCount_; }

@@ -106,10 +106,7 @@ void TraceToolsDock::takeSweep(bool loaded) {
     if (panel_.Shown.fromFile) source.rbw = leadingNumber(panel_.Shown.rbw);
     tools_.take(program_.sweep(), source);
     // What was saved once is not watched again.
-    if (!loaded)
-        watch_.take(program_.sweep(), tools_.request.mask
-                                          ? tools_.result().mask.value_or(MaskVerdict{})
-                                          : MaskVerdict{});
+    if (!loaded) watch_.take(program_.sweep(), tools_.verdict());
 }
 
 void TraceToolsDock::showLater() {

@@ -34,6 +34,21 @@ TEST(TraceTools, MaskIsCountedSweepBySweep) {
     EXPECT_EQ(tools.maskCount().text(), "pass 1/2");
 }
 
+TEST(TraceTools, VerdictIsThatOfTheMask_AndAPassWithoutOne) {
+    TraceTools tools;
+    tools.take(sweepOf({-90, -20, -90, -90, -90}), {});
+    EXPECT_TRUE(tools.verdict().pass);
+    EXPECT_FALSE(tools.verdict().margin);
+    tools.setMask(readMask("x;upper;lower\n0;-30;\n4;-30;\n"));
+    EXPECT_FALSE(tools.verdict().pass);
+    EXPECT_EQ(tools.verdict().x, 1);
+    Sweep cut = sweepOf({-90, -10, std::numeric_limits<double>::quiet_NaN()});
+    cut.came = 2;
+    tools.take(cut, {});
+    EXPECT_TRUE(tools.verdict().pass);
+    EXPECT_FALSE(tools.verdict().margin);
+}
+
 TEST(TraceTools, IncompleteSweep_LeavesNoFigureOfTheOneBefore) {
     TraceTools tools;
     tools.traces().switchOn(HoldKind::Max, true);
