@@ -151,6 +151,17 @@ std::string withPoint(std::string number, std::string& problem) {
     return decimal;
 }
 
+/// A bare number of hertz with the prefix that the panel writes it with, where that reads back as
+/// the same number.
+std::string withPrefix(const std::string& number, double hertz) {
+    for (const auto& [factor, prefix] : {std::pair{1e9, " GHz"}, {1e6, " MHz"}, {1e3, " kHz"}}) {
+        if (std::fabs(hertz) < factor) continue;
+        const std::string scaled = generalNumber(hertz / factor);
+        return parseNumber(scaled).value_or(0) * factor == hertz ? scaled + prefix : number;
+    }
+    return number;
+}
+
 std::string unitProblem(std::string_view unit, EntryUnit kind) {
     const KindName& name = nameOf(kind);
     return "\"" + std::string(unit) + "\" is no unit of " + name.name + ", such as " + name.example;
@@ -175,6 +186,7 @@ EntryReading readEntry(std::string_view typed, EntryUnit unit) {
             continue;
         const double base = *value * row.factor;
         if (!row.written.empty()) return {true, number + " " + std::string(row.written), {}, base};
+        if (unit == EntryUnit::Hertz) return {true, withPrefix(number, base), {}, base};
         return {true, row.factor == 1 ? number : generalNumber(base), {}, base};
     }
     if (unit == EntryUnit::Hertz && rest.front() == 'm')
