@@ -159,18 +159,6 @@ TEST_P(Looks, ContinuousView_FitsTheWindowWithNothingCut) {
     EXPECT_FALSE(panel().ContinuosLoopActive);
 }
 
-TEST_P(Looks, PlaybackBarAndProgress_FitTheWindowWithNothingCut) {
-    panel().PlaybackFrame.Visible = true;
-    panel().FileLabel.Caption = "Trace 117 of 300 (12/24/2026 11:59:59)";
-    panel().StopButton.Visible = true;
-    panel().ManualCommandText.Text = "TRACEDET";
-    panel().ManualCommandTextAnsw.Text = "0";
-    panel().ManualCommandTextAnsw.ForeColor = 32896;
-    show();
-    expectSound("playback");
-    EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-playback"));
-}
-
 TEST_P(Looks, CloserViewWithMarkers_FitsTheWindowWithNothingCut) {
     panel().MarkerCheckBox.Click();
     panel().DeltaCheckBox.Click();

@@ -81,6 +81,24 @@ TEST_P(LooksOfStates, LoadedRecording_HasTheBar) {
     EXPECT_EQ(widgetOf<QSlider>(panel().PlaybackPosition)->maximum(), 40);
 }
 
+TEST_P(LooksOfStates, PlayingRecording_HasTheBarAtWork) {
+    load(40);
+    widgetOf<QSlider>(panel().PlaybackPosition)->setValue(12);
+    program->forms().specialMeas.sldSpeed.Value = 5;
+    const int pause = program->forms().specialMeas.seriesPauseMs();
+    ASSERT_GT(pause, 0);
+    platform.events.schedule(4 * pause + pause / 2, [this] {
+        picture(*window, "playback");
+        EXPECT_TRUE(panel().SeriesPlays);
+        EXPECT_EQ(widgetOf<QPushButton>(panel().PlaybackPlay)->text(), "Pause");
+        EXPECT_EQ(widgetOf<QLabel>(panel().PlaybackLabel)->text(), "16 of 40   10:25:00");
+        EXPECT_EQ(widgetOf<QSlider>(panel().PlaybackPosition)->value(), 16);
+        panel().PlaybackPlay.Click();
+    });
+    panel().PlaybackPlay.Click();
+    EXPECT_FALSE(panel().SeriesPlays);
+}
+
 TEST_P(LooksOfStates, PowerReading_IsLarge) {
     connect();
     panel().PwrButton.Click();
