@@ -97,6 +97,12 @@ QMenuBar::item:disabled, QMenu::item:disabled { color: @dim; }
 QRadioButton, QCheckBox, QSlider { border: 1px solid transparent; }
 QRadioButton:focus, QCheckBox:focus { background: @buttonHover; border: 1px solid @focus; }
 QSlider:focus { border: 1px solid @focus; }
+QTabWidget::pane { background: @panel; border: 1px solid @hairline; }
+QTabBar::tab { background: transparent; color: @caption; border: 1px solid transparent;
+    padding: 4px 10px; }
+QTabBar::tab:hover { color: @text; }
+QTabBar::tab:selected { background: @panel; color: @text; border-color: @hairline;
+    border-bottom: 2px solid @accent; }
 QTabBar::tab:focus { border: 1px solid @focus; }
 QRadioButton::indicator, QCheckBox::indicator { width: 12px; height: 12px;
     border: 1px solid @dim; background: @base; }
