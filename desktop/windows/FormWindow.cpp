@@ -316,6 +316,19 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
     });
     layout->addLayout(keys);
     layout->setSizeConstraint(QLayout::SetMinimumSize);
+    // Of what the form says; "Disconnect" without a connection would only show a box.
+    const auto noteConnection = [self = QPointer<ConnectionWindow>(this), &form] {
+        if (!self) return;
+        const bool begun = form.OnPic.Visible || form.IsConnectedToPort || form.ModemConnected ||
+                           form.Attempting || form.Searching;
+        const std::string reason = begun ? "" : QObject::tr("Not connected").toStdString();
+        for (const Button* key : {&form.DisconnectButton, &form.DisconnectButton2})
+            self->binder_.block(*key, reason);
+    };
+    form.OnPic.Changed.connect(noteConnection);
+    form.AdviceLabel.Changed.connect(noteConnection);
+    form.Changed.connect(noteConnection);
+    noteConnection();
     followForm();
 }
 

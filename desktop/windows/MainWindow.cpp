@@ -7,6 +7,7 @@
 #include <QFileInfo>
 #include <QHBoxLayout>
 #include <QMessageBox>
+#include <QPushButton>
 #include <QTimer>
 
 #include "desktop/graph/GraphImage.h"
@@ -374,6 +375,11 @@ void MainWindow::copyPicture() {
 }
 
 void MainWindow::keyPressEvent(QKeyEvent* event) {
+    // Enter presses the button that has the focus, here as in the dialogs.
+    const bool enters = event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
+    if (auto* focused = qobject_cast<QPushButton*>(focusWidget());
+        enters && focused != nullptr && focused->isEnabled() && !event->isAutoRepeat())
+        return focused->click();
     if (!terminators_->typeAhead(*event)) QMainWindow::keyPressEvent(event);
 }
 

@@ -86,7 +86,11 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, const ZEL3Variables& m
         bar->addPermanentWidget(label);
     binder.bindShow(panel_.TimeLabel, clock, [this, clock] {
         clock->showText(QString::fromStdString(panel_.TimeLabel.Caption));
-        clock->setVisible(panel_.TimeLabel.Visible);
+        // It runs on after an attempt that has failed, which is the time of no session.
+        const bool failed = !panel_.isConnected && panel_.UpNow.Enabled && panel_.StartT != 0 &&
+                            !forms_.main.Attempting && !forms_.main.Searching &&
+                            !forms_.tcpConnection.Connecting;
+        clock->setVisible(panel_.TimeLabel.Visible && !failed);
     });
     for (Picture* picture : {&panel_.ConnectedPic, &panel_.Picture3})
         binder.bindShow(*picture, state_, [this] { showState(); });

@@ -131,6 +131,34 @@ TEST_F(Connecting, Close_PutsTheFailureAway) {
     EXPECT_FALSE(card()->isVisible());
 }
 
+TEST_F(Connecting, EnterPressesTheKeyThatHasTheFocus) {
+    port.on = false;
+    EXPECT_FALSE(connect(57600));
+    window->showNow();
+    QPushButton* search = key("Search Baud Rates");
+    ASSERT_NE(search, nullptr);
+    search->setFocus();
+    port.on = true;
+    QTest::keyClick(search, Qt::Key_Return);
+    EXPECT_TRUE(program->forms().controller.isConnected);
+}
+
+TEST_F(Connecting, FailedAttempt_LeavesNoTimeOfASession) {
+    const auto shown = [this] {
+        platform.events.runFor(2000);
+        window->showNow();
+        const Label& time = program->forms().controller.TimeLabel;
+        return qobject_cast<QWidget*>(window->binder().widgetOf(time))->isVisible();
+    };
+    EXPECT_TRUE(shown()) << "the time of day";
+    port.on = false;
+    EXPECT_FALSE(connect(57600));
+    EXPECT_FALSE(shown());
+    port.on = true;
+    ASSERT_TRUE(connect(38400));
+    EXPECT_TRUE(shown());
+}
+
 TEST_F(Connecting, Dialog_OffersTheSearchToo) {
     port.on = false;
     MainForm& form = program->forms().main;
@@ -151,6 +179,29 @@ TEST_F(Connecting, Dialog_OffersTheSearchToo) {
     program->forms().controller.Direct.Click();
     EXPECT_TRUE(program->forms().controller.isConnected);
     EXPECT_FALSE(form.Visible);
+}
+
+TEST_F(Connecting, DialogWithoutAConnection_HasNothingToDisconnect) {
+    MainForm& form = program->forms().main;
+    const auto usable = [&] {
+        window->showNow();
+        return qobject_cast<QWidget*>(window->binder().widgetOf(form.DisconnectButton))
+            ->isEnabled();
+    };
+    bool meanwhile = false;
+    platform.events.schedule(0, [&] {
+        EXPECT_FALSE(usable());
+        port.on = false;
+        form.COMList.setText(kPath);
+        form.BaudList.setText("57600");
+        platform.events.schedule(500, [&] { meanwhile = usable(); });
+        form.ZELButton.Click();
+        EXPECT_TRUE(meanwhile) << "it ends an attempt";
+        EXPECT_FALSE(usable());
+        EXPECT_TRUE(form.DisconnectButton.Enabled) << "who clicks by name hears why";
+        form.CancelConnButton1.Click();
+    });
+    program->forms().controller.Direct.Click();
 }
 
 TEST_F(Connecting, PortThatIsBack_IsOfferedOnALineOverTheGraph) {
