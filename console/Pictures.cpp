@@ -61,7 +61,9 @@ std::string findDrawingProgram() {
 
 std::string drawGraphImage(Program& program, const std::string& file) {
     const ControllerForm& panel = program.forms().controller;
-    return draw(graphJson(panel.CWGraph1, annotateView(panel, program.variables())), file);
+    return draw(
+        graphJson(panel.CWGraph1, annotateSweep(panel, program.variables(), program.sweep())),
+        file);
 }
 
 std::string writeGraphImage(Program& program, const std::string& file) {

@@ -29,6 +29,9 @@ void forEachAnnotationFlag(View& view, Visit visit) {
     visit("ref_level_unsure", view.refLevelUnsure);
     visit("range_unsure", view.rangeUnsure);
     visit("detector_unsure", view.detectorUnsure);
+    visit("rbw_unsure", view.rbwUnsure);
+    visit("vbw_unsure", view.vbwUnsure);
+    visit("sweep_time_unsure", view.sweepTimeUnsure);
     visit("x_unsure", view.xUnsure);
     visit("y_unsure", view.yUnsure);
 }

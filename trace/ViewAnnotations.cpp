@@ -60,23 +60,9 @@ void markUnsure(const UnsureSettings& unsure, ViewAnnotations& view) {
                    (view.xUnit != "m" && unsure.has(AxisSetting::Span));
 }
 
-}  // namespace
-
-double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror) {
-    const double range = mirror.ReferenceRange;
-    if (!panel.Shown.fromFile || range == RANGELIN) return range;
-    for (int code = RANGE10DB; code <= RANGE1DB; ++code)
-        if (decibelsPerDivision(code) == range) return code;
-    return range;
-}
-
-bool ofAnotherMode(const ControllerForm& panel) {
-    const ShownView& shown = panel.Shown;
-    return panel.isConnected && !shown.fromFile && shown.instrumentMode != 0 &&
-           shown.instrumentMode != panel.InstrumentMode;
-}
-
-ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror) {
+/// The texts for settings; `unsure` are those that the instrument may have otherwise.
+ViewAnnotations annotate(const ControllerForm& panel, const ZEL3Variables& mirror,
+                         const UnsureSettings& unsure) {
     ViewAnnotations view;
     const Graph& graph = panel.CWGraph1;
     view.ok = !graph.values().empty();
@@ -99,7 +85,7 @@ ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& m
     if (shown.fromFile) {
         annotateFile(shown, view);
     } else {
-        markUnsure(mirror.Unsure, view);
+        markUnsure(unsure, view);
     }
     double left = graph.xAxis().Minimum;
     double right = graph.xAxis().Maximum;
@@ -113,6 +99,44 @@ ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& m
     view.left = "Start " + FormatValue(left, view.xUnit);
     view.center = "Center " + FormatValue((left + right) / 2, view.xUnit);
     view.right = "Stop " + FormatValue(right, view.xUnit);
+    return view;
+}
+
+}  // namespace
+
+double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror) {
+    const double range = mirror.ReferenceRange;
+    if (!panel.Shown.fromFile || range == RANGELIN) return range;
+    for (int code = RANGE10DB; code <= RANGE1DB; ++code)
+        if (decibelsPerDivision(code) == range) return code;
+    return range;
+}
+
+bool ofAnotherMode(const ControllerForm& panel) {
+    const ShownView& shown = panel.Shown;
+    return panel.isConnected && !shown.fromFile && shown.instrumentMode != 0 &&
+           shown.instrumentMode != panel.InstrumentMode;
+}
+
+ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror) {
+    return annotate(panel, mirror, mirror.Unsure);
+}
+
+ViewAnnotations annotateSweep(const ControllerForm& panel, const ZEL3Variables& mirror,
+                              const Sweep& sweep) {
+    const ZEL3Variables& then = sweep.settings;
+    if (panel.Shown.fromFile || sweep.wanted == 0 || !sweep.settingsKept)
+        return annotateView(panel, mirror);
+    ViewAnnotations view = annotate(panel, then, mirror.Unsure);
+    if (!view.ok) return view;
+    // The axes stay those of the trace: they are right for it.
+    view.refLevelUnsure |=
+        then.ReferenceLevel != mirror.ReferenceLevel || then.ReferenceUnit != mirror.ReferenceUnit;
+    view.rangeUnsure |= then.ReferenceRange != mirror.ReferenceRange;
+    view.detectorUnsure |= then.TraceDetector != mirror.TraceDetector;
+    view.rbwUnsure = then.ResolutionBandwidth != mirror.ResolutionBandwidth;
+    view.vbwUnsure = then.VideoBandwidth != mirror.VideoBandwidth;
+    view.sweepTimeUnsure = then.SweepTime != mirror.SweepTime;
     return view;
 }
 

@@ -5,6 +5,7 @@
 
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 
@@ -26,6 +27,9 @@ struct ViewAnnotations {
     bool refLevelUnsure = false;
     bool rangeUnsure = false;
     bool detectorUnsure = false;
+    bool rbwUnsure = false;
+    bool vbwUnsure = false;
+    bool sweepTimeUnsure = false;
     bool xUnsure = false;  ///< the labels of the x axis and left, center, right
     bool yUnsure = false;  ///< the labels of the y axis
 };
@@ -36,5 +40,9 @@ double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror);
 bool ofAnotherMode(const ControllerForm& panel);
 /// From the mirror and from the axes as they are shown, zoomed or not.
 ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror);
+/// The same for the sweep that is on the graph: what was set since does not change what it was read
+/// with, and the texts that differ from the mirror are unsure.
+ViewAnnotations annotateSweep(const ControllerForm& panel, const ZEL3Variables& mirror,
+                              const Sweep& sweep);
 
 }  // namespace zel

@@ -86,7 +86,8 @@ GraphPlot::GraphPlot(QCustomPlot& plot, const GraphColors& colors) : plot_(plot)
     source_ = new AnnotationText(&plot_, plotFont());
     source_->setTextColor(colors_.file);
     source_->setTextFlags(static_cast<int>((Qt::AlignLeft | Qt::AlignVCenter).toInt()));
-    source_->setMargins(QMargins(kLeftMargin, 1, kRightMargin, 1));
+    // In line with the texts above, whose margins add up.
+    source_->setMargins(QMargins(kLeftMargin + 2, 1, kRightMargin, 1));
     source_->setVisible(false);
 }
 
@@ -299,7 +300,9 @@ void GraphPlot::strike(const ViewAnnotations& view) {
     };
     top_[0]->setStruck(ifUnsure(view.refLevelUnsure, view.refLevel) +
                        (view.rangeUnsure ? top_[0]->text().split("    ").mid(1) : QStringList()));
+    top_[1]->setStruck(ifUnsure(view.rbwUnsure, view.rbw) + ifUnsure(view.vbwUnsure, view.vbw));
     top_[2]->setStruck(ifUnsure(view.detectorUnsure, view.detector));
+    top_[3]->setStruck(ifUnsure(view.sweepTimeUnsure, view.sweepTime));
     bottom_[0]->setStruck(ifUnsure(view.xUnsure, view.left));
     bottom_[1]->setStruck(ifUnsure(view.xUnsure, view.center));
     bottom_[2]->setStruck(ifUnsure(view.xUnsure, view.right));

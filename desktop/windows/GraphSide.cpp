@@ -29,8 +29,9 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(kSpacing);
-    graph_ = new GraphWidget(panel_.CWGraph1,
-                             [this] { return annotateView(panel_, program_.variables()); });
+    graph_ = new GraphWidget(panel_.CWGraph1, [this] {
+        return annotateSweep(panel_, program_.variables(), program_.sweep());
+    });
     connecting_ =
         new ConnectCard(program.forms(), binder, {ways.again, [this] { showEmpty(); }}, graph_);
     empty_ = new EmptyScreen(std::move(ways), graph_);
@@ -47,6 +48,11 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
     binder_.bindShow(panel_.CWGraph1, graph_, [this] { refreshGraph(); });
     readings_.on(program_.Answered, [this](const std::string& word, const std::string& value) {
         if (word == kPowerReading && showsPower()) power_->take(value);
+    });
+    // A setting makes the texts around the trace those of an earlier one.
+    panel_.DebugTextBox.Changed.connect([self = QPointer<GraphSide>(this)] {
+        if (self && self->program_.sweep().settingsKept)
+            self->binder_.refresh(self->panel_.CWGraph1);
     });
     graph_->installEventFilter(this);
     // The wheel looks closer whatever has the focus; so does the way back.

@@ -360,7 +360,7 @@ void MainWindow::addLanguageMenu(const QString& now,
 void MainWindow::drawImage(const std::string& path, std::string& problem) {
     QString error;
     graph().drawNow();
-    saveGraphImage(panel_.CWGraph1, annotateView(panel_, program_.variables()),
+    saveGraphImage(panel_.CWGraph1, annotateSweep(panel_, program_.variables(), program_.sweep()),
                    QString::fromStdString(path), &error, graph().size().expandedTo(kSmallestImage),
                    true, findChild<TraceToolsDock*>()->picture());
     problem = error.toStdString();

@@ -45,6 +45,33 @@ TEST_F(ViewAnnotationsTest, Settings_AreNamed) {
     EXPECT_EQ(shown.xUnit, "Hz");
 }
 
+TEST_F(ViewAnnotationsTest, SettingSentSince_StrikesTheTextAndLeavesItThatOfTheSweep) {
+    Sweep sweep;
+    sweep.wanted = sweep.came = 301;
+    sweep.settings = mirror;
+    mirror.ResolutionBandwidth = 3;
+    EXPECT_NE(annotateSweep(panel, mirror, sweep).rbw, "RBW 100 kHz") << "only asked for";
+    sweep.settingsKept = true;
+    mirror.VideoBandwidth = 3;
+    mirror.SweepTime = 2;
+    mirror.ReferenceRange = RANGE5DB;
+    mirror.TraceDetector = 0;
+    const ViewAnnotations view = annotateSweep(panel, mirror, sweep);
+    EXPECT_EQ(view.rbw, "RBW 100 kHz");
+    EXPECT_EQ(view.vbw, "VBW Auto");
+    EXPECT_EQ(view.sweepTime, "SWT 20 ms");
+    EXPECT_EQ(view.range, "10dB/DIV");
+    EXPECT_EQ(view.detector, "Det Sample");
+    EXPECT_TRUE(view.rbwUnsure && view.vbwUnsure && view.sweepTimeUnsure && view.rangeUnsure &&
+                view.detectorUnsure);
+    EXPECT_FALSE(view.refLevelUnsure || view.yUnsure || view.xUnsure);
+    mirror.ReferenceLevel = -30;
+    EXPECT_TRUE(annotateSweep(panel, mirror, sweep).refLevelUnsure);
+    EXPECT_EQ(annotateSweep(panel, mirror, sweep).refLevel, "Ref -20 dBm");
+    panel.Shown.fromFile = true;
+    EXPECT_EQ(annotateSweep(panel, mirror, sweep).refLevel, annotateView(panel, mirror).refLevel);
+}
+
 TEST_F(ViewAnnotationsTest, Axis_HasItsEndsAndItsMiddle) {
     EXPECT_EQ(view().left, "Start 900 MHz");
     EXPECT_EQ(view().center, "Center 950 MHz");

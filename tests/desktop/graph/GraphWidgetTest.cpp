@@ -3,6 +3,7 @@
 #include <QContextMenuEvent>
 #include <QCursor>
 #include <QFile>
+#include <QLineEdit>
 #include <QTemporaryDir>
 #include <QTest>
 #include <QWheelEvent>
@@ -231,6 +232,39 @@ TEST_F(GraphWidgetTest, LongTextsAroundTheGraph_AreNotCutInTheSmallestWindow) {
         const int needed = QFontMetrics(element->font()).horizontalAdvance(element->text());
         EXPECT_GE(element->rect().width(), needed) << element->text().toStdString();
     }
+}
+
+TEST_F(GraphWidgetTest, SettingsSince_StrikeTheTextsOfTheTraceAndChangeNone) {
+    const auto texts = [this] {
+        platform.events.runFor(100);
+        window->binder().flush();
+        QList<QCPTextElement*> found;
+        collectTexts(*window->graph().plotLayout(), found);
+        QStringList parts;
+        QStringList struck;
+        for (QCPTextElement* element : found) {
+            parts << element->text();
+            struck += dynamic_cast<AnnotationText&>(*element).struck();
+        }
+        return (parts.join("|") + " struck: " + struck.join("|")).toStdString();
+    };
+    const auto entered = [this](const Button& menu, const char* entry) {
+        const_cast<Button&>(menu).Click();
+        auto* box = widgetOf<QLineEdit>(panel().SoftTextBox(0));
+        QTest::keyClicks(box, entry);
+        QTest::keyClick(box, Qt::Key_Return);
+    };
+    EXPECT_NE(texts().find("Ref -20 dBm"), std::string::npos) << texts();
+    entered(panel().AmplitudeButton, "-30");
+    EXPECT_NE(texts().find("Ref -20 dBm"), std::string::npos) << texts();
+    EXPECT_NE(texts().find("struck: Ref -20 dBm"), std::string::npos) << texts();
+    EXPECT_FALSE(window->graph().yAxis->tickLabelFont().strikeOut()) << "the trace's own";
+    entered(panel().SweepButton, "2 s");
+    EXPECT_NE(texts().find("struck: Ref -20 dBm|SWT 20 ms"), std::string::npos) << texts();
+    panel().PlaySingleButton.Click();
+    EXPECT_NE(texts().find("Ref -30 dBm"), std::string::npos) << texts();
+    EXPECT_NE(texts().find("SWT 2 s"), std::string::npos) << texts();
+    EXPECT_EQ(texts().substr(texts().size() - 8), "struck: ");
 }
 
 TEST_F(GraphWidgetTest, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
