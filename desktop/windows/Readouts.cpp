@@ -93,7 +93,7 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     line->setTextFormat(Qt::PlainText);
     binder.bindShow(panel.PaceLabel, line, [&panel, line] {
         line->showText(inTwoLines(panel.PaceLabel.Caption));
-        line->setVisible(panel.PaceLabel.Visible && !panel.Shown.fromFile);
+        line->parentWidget()->setVisible(panel.PaceLabel.Visible && !panel.Shown.fromFile);
     });
     pace->addWidget(line, 0, 0, 2, 1);
 }
@@ -118,7 +118,7 @@ void Readouts::showTrace(const QString& atMarker, const QString& atDelta) {
 void Readouts::showFile(bool fromFile) {
     for (QLabel* label : {centre_, span_}) setMark(label, "file", fromFile);
     // The age is that of the last sweep, which is not on the graph.
-    pace_->setVisible(!fromFile);
+    pace_->parentWidget()->setVisible(!fromFile);
 }
 
 }  // namespace zel

@@ -93,6 +93,7 @@ QScrollBar::handle:vertical { background: @border; border-radius: 4px; min-heigh
 QScrollBar::add-line:vertical, QScrollBar::sub-line:vertical { height: 0; }
 QToolTip { background: @base; color: @text; border: 1px solid @border; }
 QStatusBar QLabel { padding: 0 6px; }
+QMenu { background: @panel; border: 1px solid @border; }
 QMenuBar::item:disabled, QMenu::item:disabled { color: @dim; }
 QRadioButton, QCheckBox, QSlider { border: 1px solid transparent; }
 QRadioButton:focus, QCheckBox:focus { background: @buttonHover; border: 1px solid @focus; }

@@ -3,6 +3,7 @@
 #include <QAction>
 #include <QDialog>
 #include <QDockWidget>
+#include <QTest>
 #include <QToolBar>
 
 #include "tests/desktop/Looks.h"
@@ -66,6 +67,7 @@ TEST_P(LooksOfStates, LoadedFile_BearsItsNameAndHasNoBar) {
     load(1);
     picture(*window, "file");
     EXPECT_FALSE(widgetOf<QWidget>(panel().PlaybackFrame)->isVisible());
+    EXPECT_FALSE(widgetOf<QWidget>(panel().PaceLabel)->parentWidget()->isVisible()) << "empty";
 }
 
 TEST_P(LooksOfStates, LoadedRecording_HasTheBar) {
@@ -79,6 +81,30 @@ TEST_P(LooksOfStates, LoadedRecording_HasTheBar) {
     EXPECT_TRUE(widgetOf<QWidget>(panel().PlaybackFrame)->isVisible());
     EXPECT_EQ(widgetOf<QSlider>(panel().PlaybackPosition)->value(), 39);
     EXPECT_EQ(widgetOf<QSlider>(panel().PlaybackPosition)->maximum(), 40);
+}
+
+TEST_P(LooksOfStates, PressOnTheGroove_ShowsTheTraceOfThatPlace) {
+    load(40);
+    show();
+    auto* slider = widgetOf<QSlider>(panel().PlaybackPosition);
+    const auto at = [slider](double share) {
+        return QPoint(qRound(slider->width() * share), slider->height() / 2);
+    };
+    const auto shown = [this]() -> int { return panel().PlaybackPosition.Value; };
+    ASSERT_EQ(shown(), 40);
+    QTest::mousePress(slider, Qt::LeftButton, {}, at(0.25));
+    EXPECT_NEAR(shown(), 10.5, 1);
+    QTest::mouseMove(slider, at(0.5));
+    EXPECT_NEAR(shown(), 20.5, 1);
+    QTest::mouseMove(slider, at(0.75));
+    QTest::mouseRelease(slider, Qt::LeftButton, {}, at(0.75));
+    EXPECT_NEAR(shown(), 30.5, 1);
+    EXPECT_FALSE(slider->isSliderDown());
+    const int there = shown();
+    QTest::mouseMove(slider, at(0.1));
+    EXPECT_EQ(shown(), there) << "the button is up";
+    QTest::mouseClick(slider, Qt::LeftButton, {}, at(1));
+    EXPECT_EQ(shown(), 40);
 }
 
 TEST_P(LooksOfStates, PlayingRecording_HasTheBarAtWork) {
