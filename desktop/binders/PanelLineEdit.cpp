@@ -94,6 +94,8 @@ void PanelLineEdit::showProblem(const QString& problem) {
     style()->unpolish(this);
     style()->polish(this);
     setToolTip(marked ? problem : ownTip_);
+    // What was mended needs its reason no more.
+    if (!marked) QToolTip::hideText();
     if (marked && hasFocus()) QToolTip::showText(mapToGlobal(QPoint(0, height())), problem, this);
 }
 

@@ -140,6 +140,9 @@ void GraphNavigator::forward() {
 }
 
 void GraphNavigator::whole() {
+    const View left = now();
+    const bool own = whole_ && left == last_;
+    std::vector<View> past = past_;
     // The key's own way knows the range that the instrument has by now.
     if (panel_.cmdZoom.Caption.get() == kZoomedCaption) panel_.cmdZoom.Click();
     if (whole_ &&
@@ -149,6 +152,14 @@ void GraphNavigator::whole() {
         last_.top == panel_.CWGraph1.yAxis().Maximum)
         panel_.CWGraph1.setYRange(whole_->bottom, whole_->top);
     forget();
+    const View view = now();
+    if (!own || view == left) return;
+    // Who came here by mistake goes back to the closer view.
+    past_ = std::move(past);
+    past_.push_back(left);
+    whole_ = last_ = view;
+    zoomed_ = false;
+    step_ = Step::History;
 }
 
 void GraphNavigator::forget() {

@@ -30,7 +30,7 @@ GraphWidget::GraphWidget(Graph& graph, std::function<ViewAnnotations()> annotate
     picture_->setMarkerTexts(true);
     setAccessibleName(QObject::tr("Graph"));
     setMouseTracking(true);
-    setFocusPolicy(Qt::StrongFocus);
+    setFocusPolicy(Qt::WheelFocus);  // Space and Home then mean the view
     setMinimumSize(320, 220);
     refresh();
 }

@@ -110,6 +110,7 @@ void TerminatorRow::followPositions() {
         follow(panel_.SoftKey(i));
         follow(panel_.SoftTextBox(i));
     }
+    follow(panel_.StopButton);  // a view that begins or ends has another menu than before
 }
 
 PanelLineEdit* TerminatorRow::boxOf(int position) const {

@@ -67,6 +67,31 @@ TEST_F(NavigationTest, Home_ShowsTheWholeView) {
     EXPECT_EQ(panel().cmdZoom.Caption.get(), "Zoom");
 }
 
+TEST_F(NavigationTest, WholeView_IsAStepOfTheHistory) {
+    wheel(at(1e9, -60), 3);
+    wheel(at(1e9, -60), 3, Qt::ShiftModifier);
+    const double left = graph().xAxis().Minimum;
+    const double top = graph().yAxis().Maximum;
+    QTest::keyClick(&window->graph(), Qt::Key_Home);
+    window->showNow();
+    QTest::keyClick(&window->graph(), Qt::Key_Left, Qt::AltModifier);
+    window->showNow();
+    EXPECT_EQ(graph().xAxis().Minimum, left);
+    EXPECT_EQ(graph().yAxis().Maximum, top);
+    EXPECT_TRUE(panel().GraphZoomed);
+    QTest::keyClick(&window->graph(), Qt::Key_Right, Qt::AltModifier);
+    EXPECT_EQ(graph().xAxis().Minimum, 0);
+    EXPECT_EQ(graph().yAxis().Maximum, -20);
+    QTest::keyClick(&window->graph(), Qt::Key_Home);
+    panel().PlaySingleButton.Click();
+    window->showNow();
+    EXPECT_EQ(graph().xAxis().Maximum, 3e9) << "the next sweep lays out the whole";
+}
+
+TEST_F(NavigationTest, TurnOfTheWheel_TakesTheFocusForTheKeysOfTheView) {
+    EXPECT_EQ(window->graph().focusPolicy(), Qt::WheelFocus);
+}
+
 TEST_F(NavigationTest, MiddleButton_PansBothAxes) {
     GraphWidget& widget = window->graph();
     const QPoint start = at(1e9, -60).toPoint();
