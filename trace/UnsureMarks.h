@@ -1,6 +1,8 @@
 #pragma once
-// Strikes the readouts of centre and span, and has the graph drawn again, when a setting that they
-// rest on becomes unsure or known.
+// Strikes the readouts that rest on what is unsure: centre and span after a setting that was not
+// taken, the markers when the axis has become one of another kind since they were read.
+
+#include <string>
 
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
@@ -9,21 +11,23 @@ namespace zel {
 
 class UnsureMarks {
   public:
-    UnsureMarks(ControllerForm& panel, ZEL3Variables& mirror) {
-        changes_.on(mirror.Unsure.Changed, [&panel, &mirror] {
-            strike(panel.CFLabel, mirror.Unsure.has(AxisSetting::Frequency));
-            strike(panel.SpanLabel, mirror.Unsure.has(AxisSetting::Span));
-            panel.CWGraph1.Refresh();
-        });
-    }
+    UnsureMarks(ControllerForm& panel, ZEL3Variables& mirror);
 
   private:
-    static void strike(Label& label, bool unsure) {
-        label.Struck = unsure;
-        label.ToolTip =
-            unsure ? "The instrument did not take this value. The next sweep asks it." : "";
-    }
+    /// The text of a marker and the unit of the axis that it was read on.
+    struct Reading {
+        std::string text;
+        std::string unit;
+    };
 
+    void strikeSettings();
+    void strikeMarkers();
+    void strikeMarker(Label& label, Reading& reading);
+
+    ControllerForm& panel_;
+    ZEL3Variables& mirror_;
+    Reading marker_;
+    Reading delta_;
     Handlers changes_;
 };
 

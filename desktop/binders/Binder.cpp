@@ -153,7 +153,9 @@ void Binder::follow(Control& control, QObject* widget, std::function<void()> sho
 void Binder::describe(const Control& control, QWidget* widget) {
     if (widget->property("refused").toBool()) return;  // the tip says why
     const std::string& own = control.ToolTip;
-    const QString words = own.empty() ? toolTipOf(control) : text(own);
+    const QString words = own.empty()                            ? toolTipOf(control)
+                          : control.kind() == ControlKind::Label ? ownText(own)
+                                                                 : text(own);
     const QString keys = shortcutOf(control);
     QString tip = keys.isEmpty() ? words : words + " (" + keys + ")";
     if (const QString reason = reasonFor(control); !reason.isEmpty()) tip += "\n" + reason;

@@ -1701,5 +1701,17 @@ oder eine Aufzeichnung laden</translation>
         <source>%1 of %2   %3</source>
         <translation>%1 von %2   %3</translation>
     </message>
+    <message>
+        <source>The instrument did not take this value. The next sweep asks it.</source>
+        <translation>Das Gerät hat diesen Wert nicht angenommen. Der nächste Sweep fragt ihn ab.</translation>
+    </message>
+    <message>
+        <source>Read before the axis changed. The marker&apos;s keys read it again.</source>
+        <translation>Vor dem Wechsel der Achse gelesen. Die Tasten des Markers lesen neu.</translation>
+    </message>
+    <message>
+        <source>%1 readings</source>
+        <translation>%1 Messwerte</translation>
+    </message>
 </context>
 </TS>
