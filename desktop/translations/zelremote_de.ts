@@ -1583,11 +1583,11 @@ oder eine Aufzeichnung laden</translation>
     </message>
     <message>
         <source>%1 old   %2 sweeps/s   the sweep sets the pace</source>
-        <translation>%1 alt   %2 Sweeps/s   der Sweep bestimmt das Tempo</translation>
+        <translation>%1 alt   %2 Sweeps/s   der Sweep gibt den Takt</translation>
     </message>
     <message>
         <source>%1 old   %2 sweeps/s   the line sets the pace</source>
-        <translation>%1 alt   %2 Sweeps/s   die Leitung bestimmt das Tempo</translation>
+        <translation>%1 alt   %2 Sweeps/s   die Leitung gibt den Takt</translation>
     </message>
     <message>
         <source>%1 old</source>

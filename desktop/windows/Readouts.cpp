@@ -37,7 +37,7 @@ QGridLayout* card(QHBoxLayout& row, int stretch) {
     auto* frame = new QFrame;
     frame->setObjectName("group");
     auto* grid = new QGridLayout(frame);
-    grid->setContentsMargins(6, 4, 6, 4);
+    grid->setContentsMargins(4, 4, 4, 4);
     grid->setHorizontalSpacing(8);
     grid->setVerticalSpacing(0);
     row.addWidget(frame, stretch);
@@ -61,7 +61,7 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
       atDelta_(small(QObject::tr("Trace at the delta marker"))) {
     auto* row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(6);
+    row->setSpacing(4);
     const auto bound = [&binder](Label& control) {
         QLabel* label = value();
         binder.bind(control, label);
@@ -87,7 +87,7 @@ Readouts::Readouts(ControllerForm& panel, Binder& binder, QWidget* parent)
     showPointer({}, {});
     showTrace({}, {});
     QGridLayout* pace = card(*row, 0);
-    auto* line = new StillLabel(kPaceWidth, 2);
+    auto* line = new StillLabel(kPaceWidth, 2, 0);
     pace_ = line;
     line->setObjectName("caption");
     line->setTextFormat(Qt::PlainText);

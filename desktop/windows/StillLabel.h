@@ -11,8 +11,12 @@ namespace zel {
 /// needs more of it. A window at rest does hardly anything then.
 class StillLabel : public QLabel {
   public:
-    /// `least` is the width in pixels that it has always.
-    explicit StillLabel(int least = 0, int lines = 1) : least_(least), lines_(lines) { fit({}); }
+    /// `least` is the width in pixels that it has always, `padding` what the style sheet adds at
+    /// most, both sides.
+    explicit StillLabel(int least = 0, int lines = 1, int padding = 12)
+        : least_(least), lines_(lines), padding_(padding) {
+        fit({});
+    }
 
     void showText(const QString& text) {
         if (text == this->text()) return;
@@ -34,17 +38,16 @@ class StillLabel : public QLabel {
     void fit(const QString& text) {
         const QSize needed = fontMetrics().size(0, text);
         const QMargins around = contentsMargins();
-        const int wide = needed.width() + around.left() + around.right() + kAround;
-        const int width = std::max(least_, (wide + kStep - 1) / kStep * kStep);
+        const int wide = needed.width() + around.left() + around.right() + padding_;
+        const int width = wide <= least_ ? least_ : (wide + kStep - 1) / kStep * kStep;
         const int height = lines_ * fontMetrics().lineSpacing() + around.top() + around.bottom();
         const QSize wanted(text.isEmpty() ? least_ : width, std::max(height, needed.height()));
         if (wanted != minimumSize() || wanted != maximumSize()) setFixedSize(wanted);
     }
 
-    static constexpr int kAround = 12;  // what the style sheet adds at most, both sides
-
     int least_;
     int lines_;
+    int padding_;
 };
 
 }  // namespace zel

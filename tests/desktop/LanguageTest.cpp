@@ -1,6 +1,7 @@
 // The window in another language.
 
 #include <QAction>
+#include <QLabel>
 #include <QStatusBar>
 #include <QTranslator>
 
@@ -69,7 +70,7 @@ INSTANTIATE_TEST_SUITE_P(
                  "a 1 old.csv: 12 Kurven, 2 unvollständig, 1 fehlgeschlagen, 93 kB, 00:00:05, "
                  "nächste in 3 s"},
         Sentence{"0.5 s old   1.0 sweeps/s   the sweep sets the pace",
-                 "0.5 s alt   1.0 Sweeps/s   der Sweep bestimmt das Tempo"},
+                 "0.5 s alt   1.0 Sweeps/s   der Sweep gibt den Takt"},
         Sentence{"10 of 40   11:50:20", "10 von 40   11:50:20"},
         Sentence{"Nobody knows this one", "Nobody knows this one"}));
 
@@ -90,6 +91,44 @@ TEST_F(LanguageTest, EveryLanguage_NamesItself) {
     EXPECT_EQ(std::string(languages()[0].code), "");
     EXPECT_EQ(std::string(languages()[2].name), "Deutsch");
 }
+
+class WindowIn : public WindowTest, public testing::WithParamInterface<const char*> {
+  protected:
+    void SetUp() override {
+        useLanguage(GetParam(), QCoreApplication::applicationDirPath() + "/..");
+        window = std::make_unique<MainWindow>(*program);
+        connect();
+        window->resize(1024, 600);
+    }
+    ~WindowIn() override {
+        for (QTranslator* texts : testApplication().findChildren<QTranslator*>()) {
+            QCoreApplication::removeTranslator(texts);
+            delete texts;
+        }
+    }
+};
+
+TEST_P(WindowIn, ReadoutsOfTheSmallestWindow_AreWhole) {
+    panel().MarkerLabel.Caption = "Marker: 2.41 GHz; -101.25 dBm";
+    panel().DeltaLabel.Caption = "Delta: -222.22 MHz; -53.22 dBm";
+    panel().CFLabel.Caption = "Center: 2.415 GHz";
+    panel().PaceLabel.Visible = true;
+    panel().PaceLabel.Caption = "0.5 s old   49.9 sweeps/s   the line sets the pace";
+    show();
+    const int right = window->graph().mapTo(window.get(), QPoint(window->graph().width(), 0)).x();
+    for (const Label* control :
+         {&panel().MarkerLabel, &panel().DeltaLabel, &panel().CFLabel, &panel().PaceLabel}) {
+        const auto* label = widgetOf<QLabel>(*control);
+        ASSERT_TRUE(label->isVisible());
+        EXPECT_GE(label->width(), label->fontMetrics().size(0, label->text()).width())
+            << label->text().toStdString();
+        EXPECT_LE(label->mapTo(window.get(), QPoint(label->width(), 0)).x(), right)
+            << label->text().toStdString();
+    }
+    EXPECT_TRUE(savePicture(*window, QString("readouts-") + GetParam()));
+}
+
+INSTANTIATE_TEST_SUITE_P(Languages, WindowIn, testing::Values("en", "de"));
 
 TEST_F(WindowTest, LanguageMenu_StoresTheChoiceAndSaysWhenItCounts) {
     QString chosen = "none";
