@@ -55,10 +55,14 @@ bool SimulatorChild::startChild(const QString& path) {
     child_->setChildProcessModifier([] { prctl(PR_SET_PDEATHSIG, SIGTERM); });
     child_->setStandardOutputFile(QProcess::nullDevice());
     QObject::connect(child_.get(), &QProcess::finished, &poll_,
-                     [this] { report("The instrument simulator has ended"); });
+                     [this] { report(QObject::tr("The instrument simulator has ended")); });
     child_->start(path, {"--pty", "--link", link_});
     if (!child_->waitForStarted(kEndMs)) {
-        report("The instrument simulator cannot be started: " + child_->errorString());
+        report(QFileInfo::exists(path)
+                   ? QObject::tr("The instrument simulator cannot be started: %1")
+                         .arg(child_->errorString())
+                   : QObject::tr("The instrument simulator is not installed: there is no %1")
+                         .arg(path));
         return false;
     }
     looks_ = 0;
@@ -71,7 +75,7 @@ void SimulatorChild::look() {
         poll_.stop();
         if (ready) ready();
     } else if (++looks_ >= kMostLooks) {
-        report("The instrument simulator does not come up");
+        report(QObject::tr("The instrument simulator does not come up"));
     }
 }
 

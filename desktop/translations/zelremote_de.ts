@@ -1713,5 +1713,77 @@ oder eine Aufzeichnung laden</translation>
         <source>%1 readings</source>
         <translation>%1 Messwerte</translation>
     </message>
+    <message>
+        <source>The instrument simulator has ended</source>
+        <translation>Das simulierte Gerät wurde beendet</translation>
+    </message>
+    <message>
+        <source>The instrument simulator cannot be started: %1</source>
+        <translation>Das simulierte Gerät lässt sich nicht starten: %1</translation>
+    </message>
+    <message>
+        <source>The instrument simulator is not installed: there is no %1</source>
+        <translation>Das simulierte Gerät ist nicht installiert: %1 fehlt</translation>
+    </message>
+    <message>
+        <source>The instrument simulator does not come up</source>
+        <translation>Das simulierte Gerät kommt nicht in Gang</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is not %2, such as %3</source>
+        <translation>&quot;%1&quot; ist keine Angabe für %2, etwa %3</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no unit of %2, such as %3</source>
+        <translation>&quot;%1&quot; ist keine Einheit für %2, etwa %3</translation>
+    </message>
+    <message>
+        <source>a frequency</source>
+        <translation>eine Frequenz</translation>
+    </message>
+    <message>
+        <source>a time</source>
+        <translation>eine Zeit</translation>
+    </message>
+    <message>
+        <source>a level</source>
+        <translation>einen Pegel</translation>
+    </message>
+    <message>
+        <source>a difference</source>
+        <translation>eine Differenz</translation>
+    </message>
+    <message>
+        <source>a length</source>
+        <translation>eine Länge</translation>
+    </message>
+    <message>
+        <source>a height</source>
+        <translation>eine Höhe</translation>
+    </message>
+    <message>
+        <source>a number</source>
+        <translation>eine Zahl</translation>
+    </message>
+    <message>
+        <source>Of comma and point only one can be the decimal mark</source>
+        <translation>Von Komma und Punkt kann nur eines das Dezimalzeichen sein</translation>
+    </message>
+    <message>
+        <source>%1 can be %2 or %3: write it without the comma</source>
+        <translation>%1 kann %2 oder %3 sein: bitte ohne das Komma schreiben</translation>
+    </message>
+    <message>
+        <source>A small m is a thousandth: write %1 MHz</source>
+        <translation>Ein kleines m ist ein Tausendstel: bitte %1 MHz schreiben</translation>
+    </message>
+    <message>
+        <source>It is to be more than 0</source>
+        <translation>Es muss mehr als 0 sein</translation>
+    </message>
+    <message>
+        <source>Who may connect: addresses or networks such as 192.168.1.0/24, with blanks between them. Empty: this machine and the private networks.</source>
+        <translation>Wer sich verbinden darf: Adressen oder Netze wie 192.168.1.0/24, mit Leerzeichen dazwischen. Leer: dieser Rechner und die privaten Netze.</translation>
+    </message>
 </context>
 </TS>

@@ -7,6 +7,7 @@
 #include <QPointer>
 #include <QVBoxLayout>
 
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/binders/ToolTips.h"
 #include "desktop/windows/ConnectCard.h"
 #include "forms/MainForm.h"
@@ -42,8 +43,9 @@ Field fieldOf(const Control& control) {
 QString problemOf(const Field& field, const QString& text) {
     if (!field.number) return {};
     const EntryReading reading = readEntry(text.toStdString(), *field.number);
-    if (!reading.ok) return QString::fromStdString(reading.problem);
-    return field.aboveZero && !(reading.value > 0) ? QString("It is to be more than 0") : QString();
+    if (!reading.ok) return ownText(reading.problem);
+    return field.aboveZero && !(reading.value > 0) ? QObject::tr("It is to be more than 0")
+                                                   : QString();
 }
 
 /// Buttons that leave a dialog without doing what it is for.

@@ -247,8 +247,8 @@ QWidget* ServerWindow::settings() {
     PanelLineEdit* allowed = box(binder_, server_.txtAllowed);
     allowed->setPlaceholderText(QObject::tr("private networks"));
     allowed->setToolTip(
-        "Who may connect: addresses or networks such as 192.168.1.0/24, with "
-        "blanks between them. Empty: this machine and the private networks.");
+        QObject::tr("Who may connect: addresses or networks such as 192.168.1.0/24, with "
+                    "blanks between them. Empty: this machine and the private networks."));
     networkFields->addRow(QObject::tr("Allowed networks"), allowed);
     QCheckBox* keep = check(binder_, server_.chkKeep);
     networkFields->addRow(keep);

@@ -72,6 +72,14 @@ INSTANTIATE_TEST_SUITE_P(
         Sentence{"0.5 s old   1.0 sweeps/s   the sweep sets the pace",
                  "0.5 s alt   1.0 Sweeps/s   der Sweep gibt den Takt"},
         Sentence{"10 of 40   11:50:20", "10 von 40   11:50:20"},
+        Sentence{"\"dBm\" is no unit of a frequency, such as 2.4 GHz",
+                 "\"dBm\" ist keine Einheit für eine Frequenz, etwa 2.4 GHz"},
+        Sentence{"\"x\" is not a time, such as 5 s",
+                 "\"x\" ist keine Angabe für eine Zeit, etwa 5 s"},
+        Sentence{"1,500 can be 1.500 or 1500: write it without the comma",
+                 "1,500 kann 1.500 oder 1500 sein: bitte ohne das Komma schreiben"},
+        Sentence{"The instrument did not take this value. The next sweep asks it.",
+                 "Das Gerät hat diesen Wert nicht angenommen. Der nächste Sweep fragt ihn ab."},
         Sentence{"Nobody knows this one", "Nobody knows this one"}));
 
 TEST_F(LanguageTest, LabelsOfTheInstrumentsPanel_KeepTheirTexts) {
