@@ -9,6 +9,7 @@
 #include <QMessageBox>
 #include <QPushButton>
 #include <QTimer>
+#include <algorithm>
 
 #include "desktop/graph/GraphImage.h"
 #include "desktop/platform/Language.h"
@@ -260,9 +261,18 @@ void MainWindow::showState() {
 }
 
 std::string MainWindow::reasonHere(const Control& control) const {
-    const bool sweeps =
-        &control == &panel_.PlaySingleButton || &control == &panel_.PlayContinuousButton;
-    if (sweeps && !panel_.isConnected)
+    const Control* const needLine[] = {&panel_.PlaySingleButton,  &panel_.PlayContinuousButton,
+                                       &panel_.ResetButton,       &panel_.AnalyzerButton,
+                                       &panel_.AnalyzerCheck,     &panel_.TrackButton,
+                                       &panel_.TrackingGenCheck,  &panel_.PwrButton,
+                                       &panel_.PowerSensorCheck,  &panel_.ChnPwrButton,
+                                       &panel_.ChannelPowerCheck, &panel_.OccBWButton,
+                                       &panel_.OccBWCheck,        &panel_.TDMAButton,
+                                       &panel_.TDMAPowerCheck,    &panel_.DistFaultButton,
+                                       &panel_.DistFaultCheck};
+    const bool instrument =
+        std::find(std::begin(needLine), std::end(needLine), &control) != std::end(needLine);
+    if (instrument && !panel_.isConnected)
         return QObject::tr("Connect to an instrument first").toStdString();
     const bool looks = &control == &panel_.cmdZoom || &control == &panel_.MenuFileSaveImage;
     if (looks && panel_.CWGraph1.values().empty())

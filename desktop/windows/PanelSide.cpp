@@ -4,9 +4,11 @@
 #include <QGridLayout>
 #include <QHBoxLayout>
 #include <QPainter>
+#include <QPointer>
 #include <QStyle>
 #include <QVBoxLayout>
 
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/windows/KeyPictures.h"
 #include "panel/EntryText.h"
 
@@ -172,7 +174,7 @@ bool PanelSide::readPosition(int index, QString& text, QString& problem) const {
     if (unit == EntryUnit::Enter || panel_.SoftBoxFirstKey == 1) return true;
     // Of a marker's readout the position counts.
     const EntryReading reading = readEntry(text.section(';', 0, 0).toStdString(), unit);
-    problem = QString::fromStdString(reading.problem);
+    problem = ownText(reading.problem);
     if (reading.ok) text = QString::fromStdString(reading.text);
     return reading.ok;
 }
@@ -217,7 +219,19 @@ QWidget* PanelSide::softPosition(int index) {
         return readPosition(index, text, problem);
     });
     binder_.bind(panel_.ChoiceBox(index), list);
-    binder_.bind(panel_.SoftFrame(index), fields, caption);
+    // A menu may leave the caption of another one over a place without a box.
+    const auto show = [&frame = panel_.SoftFrame(index), &text = panel_.SoftTextBox(index),
+                       &choice = panel_.ChoiceBox(index), caption, fields] {
+        caption->setText(QString::fromStdString(frame.Caption));
+        caption->setVisible(frame.Visible && (text.Visible || choice.Visible));
+        fields->setVisible(frame.Visible);
+    };
+    binder_.bindShow(panel_.SoftFrame(index), fields, show);
+    for (Control* field : {static_cast<Control*>(&panel_.SoftTextBox(index)),
+                           static_cast<Control*>(&panel_.ChoiceBox(index))})
+        field->Changed.connect([self = QPointer<PanelSide>(this), index] {
+            if (self) self->binder_.refresh(self->panel_.SoftFrame(index));
+        });
     beside->addWidget(fields);
     beside->addStretch(1);
     row->addLayout(beside, 1);

@@ -113,6 +113,12 @@ void TerminatorRow::followPositions() {
     follow(panel_.StopButton);  // a view that begins or ends has another menu than before
 }
 
+// Keys of a grey box are grey with it.
+bool TerminatorRow::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() == QEvent::EnabledChange && !changed_.isActive()) changed_.start(0);
+    return QWidget::eventFilter(watched, event);
+}
+
 PanelLineEdit* TerminatorRow::boxOf(int position) const {
     return static_cast<PanelLineEdit*>(
         qobject_cast<QLineEdit*>(binder_.widgetOf(panel_.SoftTextBox(position))));
@@ -138,10 +144,16 @@ void TerminatorRow::refresh() {
     const int at = position();
     static const std::vector<Terminator> none;
     const std::vector<Terminator>& terminators = at < 0 ? none : terminatorsOf(panel_, mirror_, at);
+    PanelLineEdit* box = at < 0 ? nullptr : boxOf(at);
+    if (box != nullptr) {
+        box->removeEventFilter(this);  // one is enough
+        box->installEventFilter(this);
+    }
     for (std::size_t i = 0; i < keys_.size(); ++i) {
         QPushButton& key = *keys_.at(i);
         key.setVisible(i < terminators.size());
         if (i >= terminators.size()) continue;
+        key.setEnabled(box == nullptr || box->isEnabled());
         const Terminator& row = terminators[i];
         key.setText(row.caption);
         const QString keys = row.letter != 0 ? QString("Alt+") + row.letter : QString("Enter");

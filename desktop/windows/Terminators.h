@@ -49,6 +49,9 @@ class TerminatorRow : public QWidget {
     void refresh();
     const std::array<QPushButton*, 4>& keys() const { return keys_; }
 
+  protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
   private:
     void followPositions();
     PanelLineEdit* boxOf(int position) const;

@@ -100,7 +100,7 @@ QRadioButton:focus, QCheckBox:focus { background: @buttonHover; border: 1px soli
 QSlider:focus { border: 1px solid @focus; }
 QTabWidget::pane { background: @panel; border: 1px solid @hairline; }
 QTabBar::tab { background: transparent; color: @caption; border: 1px solid transparent;
-    padding: 4px 10px; }
+    padding: 4px 5px; }
 QTabBar::tab:hover { color: @text; }
 QTabBar::tab:selected { background: @panel; color: @text; border-color: @hairline;
     border-bottom: 2px solid @accent; }

@@ -193,6 +193,41 @@ TEST(RecentConnections, FourthOne_TakesThePlaceOfTheOldest) {
     EXPECT_EQ(read.names().join(" ").toStdString(), "host:2 host:4 host:3");
 }
 
+TEST_F(WindowTest, PlaceWithoutABox_HasNoCaptionOfAnotherMenu) {
+    connect();
+    panel().SweepButton.Click();
+    show();
+    const auto captions = [this] {
+        QStringList texts;
+        for (const QLabel* label : window->side().findChildren<QLabel*>("caption"))
+            if (label->isVisible()) texts << label->text();
+        return texts;
+    };
+    EXPECT_TRUE(captions().contains("Lev/Del"));
+    panel().TraceButton.Click();
+    show();
+    EXPECT_TRUE(captions().contains("Detector"));
+    EXPECT_FALSE(captions().contains("Lev/Del"));
+}
+
+TEST_F(WindowTest, KeysOfTheInstrument_AreGreyWithoutOne) {
+    ControllerForm& p = panel();
+    const std::vector<const Control*> keys = {&p.ResetButton,     &p.AnalyzerButton, &p.PwrButton,
+                                              &p.DistFaultButton, &p.TDMAPowerCheck, &p.OccBWCheck};
+    const auto usable = [&] {
+        show();
+        return std::count_if(keys.begin(), keys.end(), [this](const Control* key) {
+            return widgetOf<QWidget>(*key)->isEnabled();
+        });
+    };
+    EXPECT_EQ(usable(), 0);
+    EXPECT_TRUE(p.ResetButton.Enabled);
+    EXPECT_TRUE(widgetOf<QWidget>(p.ResetButton)->toolTip().contains("Connect to an instrument"));
+    EXPECT_TRUE(widgetOf<QWidget>(p.SpanButton)->isEnabled()) << "it lays out its menu";
+    connect();
+    EXPECT_EQ(usable(), static_cast<long>(keys.size()));
+}
+
 TEST_F(WindowTest, KeyThatWouldOnlyRefuse_IsGreyWithTheReason) {
     show();
     const auto* key = widgetOf<QPushButton>(panel().MarkPkButton);

@@ -186,5 +186,24 @@ TEST(BareNumber, IsANumberWithoutAUnit) {
         EXPECT_FALSE(isBareNumber(text)) << text;
 }
 
+TEST_F(WindowTest, TerminatorsOfAGreyBox_AreGrey) {
+    const auto usable = [this] {
+        show();
+        platform.events.runFor(100);
+        QApplication::processEvents();
+        auto* row = window->findChild<TerminatorRow*>("TerminatorRow");
+        return row->keys()[0]->isVisible() && row->keys()[0]->isEnabled();
+    };
+    EXPECT_FALSE(usable()) << "not connected";
+    connect();
+    EXPECT_TRUE(usable());
+    platform.events.schedule(500, [&] {
+        EXPECT_FALSE(usable()) << "a continuous view";
+        panel().StopButton.Click();
+    });
+    panel().PlayContinuousButton.Click();
+    EXPECT_TRUE(usable());
+}
+
 }  // namespace
 }  // namespace zel
