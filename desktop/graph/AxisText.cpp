@@ -40,7 +40,7 @@ std::string axisText(double value, double resolution, const std::string& unit) {
     const double size = std::max(std::fabs(value), std::fabs(resolution));
     static constexpr Prefix kNone{1, ""};
     const bool scaled = unit == "Hz" || unit == "s" || unit == "m";
-    // What the resolution does not tell from zero is zero, without the prefix of the resolution.
+    // What is below the resolution is zero, without the prefix of the resolution.
     if (2 * std::fabs(value) < std::fabs(resolution)) return "0 " + unit;
     const Prefix& prefix = scaled && size > 0 ? prefixOf(size) : kNone;
     int decimals = 0;

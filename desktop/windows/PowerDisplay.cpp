@@ -15,7 +15,7 @@ namespace {
 
 constexpr std::size_t kMostReadings = 300;
 constexpr std::size_t kSpans[] = {10, 20, 50, 100, 200, kMostReadings};
-constexpr std::size_t kDottedSpan = 50;  // the single readings can be told apart
+constexpr std::size_t kDottedSpan = 50;  // single readings can be seen
 constexpr int kSpanParts = 5;
 constexpr double kLowest = -80;  // dBm, ends of the bar and of the history
 constexpr double kHighest = 30;
