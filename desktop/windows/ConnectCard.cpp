@@ -1,6 +1,7 @@
 #include "desktop/windows/ConnectCard.h"
 
 #include <QHBoxLayout>
+#include <QKeyEvent>
 #include <QPointer>
 #include <QRegularExpression>
 #include <QVBoxLayout>
@@ -132,6 +133,20 @@ void ConnectCard::take() {
     if (wanted && work && !focused) cancel_->setFocus(Qt::OtherFocusReason);
     failed_ = failed;
     if (!wanted && focused) parentWidget()->setFocus(Qt::OtherFocusReason);
+}
+
+bool ConnectCard::event(QEvent* event) {
+    if (event->type() == QEvent::ShortcutOverride &&
+        static_cast<QKeyEvent*>(event)->key() == Qt::Key_Escape) {
+        event->accept();
+        return true;
+    }
+    return QFrame::event(event);
+}
+
+void ConnectCard::keyPressEvent(QKeyEvent* event) {
+    if (event->key() != Qt::Key_Escape) return QFrame::keyPressEvent(event);
+    (connecting() ? cancel_ : close_)->click();
 }
 
 void ConnectCard::cancel() {

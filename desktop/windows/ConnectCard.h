@@ -31,6 +31,11 @@ class ConnectCard : public QFrame {
     void take();
     bool wanted() const { return wanted_; }
 
+  protected:
+    /// Esc is Cancel, or Close after a failure; it comes here first, not to the panel's Stop.
+    bool event(QEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+
   private:
     bool connecting() const;
     QString heading() const;

@@ -143,6 +143,29 @@ TEST_F(Connecting, EnterPressesTheKeyThatHasTheFocus) {
     EXPECT_TRUE(program->forms().controller.isConnected);
 }
 
+TEST_F(Connecting, EscLeavesTheSearchAndPutsTheFailureAway) {
+    port.on = false;
+    EXPECT_FALSE(connect(57600));
+    window->showNow();
+    int left = 0;
+    platform.events.schedule(1000, [&] {
+        window->showNow();
+        QPushButton* cancel = key("Cancel");
+        ASSERT_NE(cancel, nullptr);
+        ++left;
+        QTest::keyClick(cancel, Qt::Key_Escape);
+    });
+    const double begun = platform.clock.date();
+    key("Search Baud Rates")->click();
+    EXPECT_EQ(left, 1);
+    EXPECT_LT((platform.clock.date() - begun) * 86400, 5) << "five silent rates take longer";
+    EXPECT_FALSE(connect(57600));
+    window->showNow();
+    ASSERT_NE(key("Close"), nullptr);
+    QTest::keyClick(key("Close"), Qt::Key_Escape);
+    EXPECT_FALSE(card()->isVisible());
+}
+
 TEST_F(Connecting, FailedAttempt_LeavesNoTimeOfASession) {
     const auto shown = [this] {
         platform.events.runFor(2000);
