@@ -1785,5 +1785,13 @@ oder eine Aufzeichnung laden</translation>
         <source>Who may connect: addresses or networks such as 192.168.1.0/24, with blanks between them. Empty: this machine and the private networks.</source>
         <translation>Wer sich verbinden darf: Adressen oder Netze wie 192.168.1.0/24, mit Leerzeichen dazwischen. Leer: dieser Rechner und die privaten Netze.</translation>
     </message>
+    <message>
+        <source>%1 (before: %2); %3</source>
+        <translation>%1 (vorher: %2); %3</translation>
+    </message>
+    <message>
+        <source>%1 (before: %2)</source>
+        <translation>%1 (vorher: %2)</translation>
+    </message>
 </context>
 </TS>

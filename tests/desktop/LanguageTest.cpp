@@ -71,6 +71,10 @@ INSTANTIATE_TEST_SUITE_P(
                  "nächste in 3 s"},
         Sentence{"0.5 s old   1.0 sweeps/s   the sweep sets the pace",
                  "0.5 s alt   1.0 Sweeps/s   der Sweep gibt den Takt"},
+        Sentence{"Connected to lab:7000 again. Changed: Ref -20 dBm (before: -30 dBm); Sweep time "
+                 "20 ms (before: 8 s).",
+                 "Wieder mit lab:7000 verbunden. Geändert: Ref -20 dBm (vorher: -30 dBm); Sweep "
+                 "time 20 ms (vorher: 8 s)."},
         Sentence{"10 of 40   11:50:20", "10 von 40   11:50:20"},
         Sentence{"\"dBm\" is no unit of a frequency, such as 2.4 GHz",
                  "\"dBm\" ist keine Einheit für eine Frequenz, etwa 2.4 GHz"},
