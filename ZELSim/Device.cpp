@@ -2,10 +2,18 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
 #include <limits>
+#include <optional>
+#include <string>
+#include <utility>
 
 #include "ZELSim/Levels.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Settings.h"
+#include "ZELSim/Signals.h"
+#include "ZELSim/Sweep.h"
 
 namespace zelsim {
 namespace {

@@ -3,8 +3,14 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
 #include <utility>
+#include <vector>
 
+#include "ZELSim/Noise.h"
 #include "ZELSim/Numbers.h"
 
 namespace zelsim {

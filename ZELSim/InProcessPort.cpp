@@ -1,8 +1,17 @@
 #include "ZELSim/InProcessPort.h"
 
+#include <cstddef>
+#include <cstdint>
+#include <string_view>
 #include <utility>
 
+#include "ZELSim/Device.h"
+#include "ZELSim/HostLine.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Wire.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/SerialPort.h"
 
 namespace zelsim {
 namespace {

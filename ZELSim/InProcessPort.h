@@ -7,7 +7,9 @@
 #include <string_view>
 
 #include "ZELSim/Device.h"
+#include "ZELSim/HostLine.h"
 #include "ZELSim/Modem.h"
+#include "ZELSim/Phonebook.h"
 #include "ZELSim/Wire.h"
 #include "platform/Clock.h"
 #include "platform/Events.h"

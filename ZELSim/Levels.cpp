@@ -1,12 +1,16 @@
 #include "ZELSim/Levels.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <cstddef>
 #include <cstdint>
 #include <limits>
+#include <string>
 
 #include "ZELSim/Network.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Settings.h"
 
 namespace zelsim {
 namespace {

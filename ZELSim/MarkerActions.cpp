@@ -1,7 +1,14 @@
 #include <algorithm>
+#include <cstddef>
+#include <string>
+#include <string_view>
 
 #include "ZELSim/AnswerTexts.h"
+#include "ZELSim/Device.h"
 #include "ZELSim/Levels.h"
+#include "ZELSim/Markers.h"
+#include "ZELSim/Numbers.h"
+#include "ZELSim/Settings.h"
 #include "ZELSim/WordActions.h"
 #include "ZELSim/Words.h"
 

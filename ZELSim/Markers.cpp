@@ -2,7 +2,10 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <iterator>
+
+#include "ZELSim/Settings.h"
 
 namespace zelsim {
 

@@ -3,12 +3,16 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstdint>
 #include <cstring>
 
 #include "ZELSim/Levels.h"
 #include "ZELSim/Network.h"
 #include "ZELSim/Noise.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Settings.h"
+#include "ZELSim/Signals.h"
+#include "ZELSim/Sweep.h"
 
 namespace zelsim {
 namespace {

@@ -4,6 +4,7 @@
 #include <cstdint>
 
 #include "ZELSim/Settings.h"
+#include "ZELSim/Signals.h"
 #include "ZELSim/Sweep.h"
 
 namespace zelsim {

@@ -2,9 +2,15 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
 #include <utility>
 
+#include "ZELSim/HostLine.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Phonebook.h"
 
 namespace zelsim {
 namespace {

@@ -1,9 +1,11 @@
 #pragma once
 // A modem with AT commands between the host and the instrument, with a telephone net beyond it.
 
-#include <cstdint>
+#include <cstddef>
 #include <deque>
+#include <optional>
 #include <string>
+#include <string_view>
 
 #include "ZELSim/HostLine.h"
 #include "ZELSim/Phonebook.h"

@@ -3,7 +3,10 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <complex>
 #include <cstdint>
+#include <string>
+#include <string_view>
 
 #include "ZELSim/Noise.h"
 #include "ZELSim/Numbers.h"

@@ -2,6 +2,8 @@
 
 #include <array>
 #include <charconv>
+#include <string>
+#include <string_view>
 
 namespace zelsim {
 

@@ -2,6 +2,10 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
+#include <istream>
+#include <string>
+#include <string_view>
 #include <utility>
 
 #include "ZELSim/Numbers.h"

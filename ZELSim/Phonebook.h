@@ -1,9 +1,11 @@
 #pragma once
 // What becomes of a call to a number of the simulated telephone net.
 
+#include <cstddef>
 #include <istream>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace zelsim {

@@ -1,10 +1,13 @@
 #pragma once
 // Answers as the instrument of a recorded session did, as long as the host sends the same.
 
+#include <cstddef>
 #include <cstdint>
 #include <deque>
 #include <functional>
+#include <optional>
 #include <string>
+#include <string_view>
 
 #include "ZELSim/HostLine.h"
 #include "support/SessionCompare.h"

@@ -1,6 +1,16 @@
 #include "ZELSim/ReplayPort.h"
 
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <string_view>
 #include <utility>
+
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/SerialPort.h"
+#include "platform/Socket.h"
+#include "support/SessionText.h"
 
 namespace zelsim {
 namespace {

@@ -1,6 +1,7 @@
 #pragma once
 // A recorded session at the program's port or socket, in the program's own time.
 
+#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <optional>
@@ -9,9 +10,12 @@
 
 #include "ZELSim/ReplayLine.h"
 #include "platform/Clock.h"
+#include "platform/Event.h"
 #include "platform/Events.h"
 #include "platform/SerialPort.h"
 #include "platform/Socket.h"
+#include "support/SessionCompare.h"
+#include "support/SessionText.h"
 
 namespace zelsim {
 

@@ -1,13 +1,18 @@
 #include "ZELSim/Sweep.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <complex>
+#include <cstdint>
 #include <cstring>
 #include <utility>
 
 #include "ZELSim/Network.h"
 #include "ZELSim/Noise.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Settings.h"
+#include "ZELSim/Signals.h"
 
 namespace zelsim {
 namespace {

@@ -1,7 +1,9 @@
 #include "ZELSim/SweepTimer.h"
 
 #include <cmath>
+#include <cstdint>
 #include <limits>
+#include <optional>
 
 namespace zelsim {
 namespace {

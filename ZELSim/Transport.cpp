@@ -1,15 +1,21 @@
 #include "ZELSim/Transport.h"
 
 #include <poll.h>
+#include <signal.h>
+#include <sys/types.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <chrono>
 #include <cmath>
 #include <csignal>
+#include <cstddef>
+#include <ctime>
 #include <optional>
-#include <utility>
+
+#include "ZELSim/HostLine.h"
 
 namespace zelsim {
 namespace {

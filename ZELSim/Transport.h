@@ -1,9 +1,6 @@
 #pragma once
 // The loop that carries bytes between the wire and one file descriptor, in real time.
 
-#include <functional>
-#include <string>
-
 #include "ZELSim/HostLine.h"
 
 namespace zelsim {

@@ -1,6 +1,5 @@
 #include "ZELSim/TransportTcp.h"
 
-#include <fcntl.h>
 #include <netdb.h>
 #include <netinet/in.h>
 #include <netinet/tcp.h>
@@ -12,6 +11,7 @@
 #include <cmath>
 #include <cstring>
 #include <memory>
+#include <string>
 
 #include "ZELSim/Numbers.h"
 

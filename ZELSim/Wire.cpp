@@ -3,10 +3,16 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
 #include <utility>
 
+#include "ZELSim/Device.h"
 #include "ZELSim/Numbers.h"
 #include "ZELSim/Settings.h"
+#include "ZELSim/Words.h"
 
 namespace zelsim {
 namespace {

@@ -1,13 +1,18 @@
 #include "ZELSim/WordActions.h"
 
-#include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstddef>
+#include <string>
+#include <string_view>
 
 #include "ZELSim/AnswerTexts.h"
+#include "ZELSim/Device.h"
 #include "ZELSim/Levels.h"
+#include "ZELSim/Markers.h"
 #include "ZELSim/Measurements.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Settings.h"
 #include "ZELSim/Words.h"
 
 namespace zelsim {

@@ -5,6 +5,7 @@
 #include <string_view>
 
 #include "ZELSim/Device.h"
+#include "ZELSim/Settings.h"
 
 namespace zelsim {
 

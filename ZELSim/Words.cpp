@@ -3,9 +3,15 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstddef>
+#include <span>
+#include <string>
+#include <string_view>
 #include <unordered_map>
 
+#include "ZELSim/Device.h"
 #include "ZELSim/Numbers.h"
+#include "ZELSim/Settings.h"
 #include "ZELSim/WordActions.h"
 
 namespace zelsim {

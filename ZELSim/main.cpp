@@ -5,12 +5,16 @@
 #include <iostream>
 #include <locale>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "ZELSim/Device.h"
 #include "ZELSim/Faults.h"
+#include "ZELSim/HostLine.h"
 #include "ZELSim/Modem.h"
+#include "ZELSim/Phonebook.h"
 #include "ZELSim/ReplayLine.h"
+#include "ZELSim/Transport.h"
 #include "ZELSim/TransportPty.h"
 #include "ZELSim/TransportTcp.h"
 #include "ZELSim/Wire.h"

@@ -1,9 +1,16 @@
 #include "analysis/AnalysisText.h"
 
+#include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <optional>
+#include <string>
 #include <vector>
 
+#include "analysis/ChannelPower.h"
+#include "analysis/Mask.h"
+#include "analysis/Peaks.h"
+#include "analysis/TraceAnalysis.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -1,6 +1,10 @@
 #include "analysis/ChannelPower.h"
 
+#include <cstddef>
+#include <optional>
 #include <vector>
+
+#include "analysis/SpectrumTrace.h"
 
 namespace zel {
 namespace {

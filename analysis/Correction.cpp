@@ -2,8 +2,13 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <optional>
 #include <stdexcept>
+#include <string>
+#include <vector>
 
+#include "analysis/SpectrumTrace.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

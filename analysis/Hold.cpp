@@ -2,6 +2,11 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+#include "analysis/SpectrumTrace.h"
 
 namespace zel {
 namespace {

@@ -1,8 +1,13 @@
 #include "analysis/HostMarkers.h"
 
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <vector>
 
 #include "analysis/ChannelPower.h"
+#include "analysis/Peaks.h"
+#include "analysis/SpectrumTrace.h"
 
 namespace zel {
 

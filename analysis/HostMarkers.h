@@ -4,7 +4,7 @@
 #include <array>
 #include <cstddef>
 #include <optional>
-#include <string>
+#include <vector>
 
 #include "analysis/Peaks.h"
 #include "analysis/SpectrumTrace.h"

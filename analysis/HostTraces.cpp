@@ -2,6 +2,12 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <string>
+
+#include "analysis/Hold.h"
+#include "analysis/SpectrumTrace.h"
 
 namespace zel {
 namespace {

@@ -2,6 +2,7 @@
 // The traces that the host keeps beside the live one: holds, averages, references.
 
 #include <array>
+#include <cstddef>
 #include <cstdint>
 #include <optional>
 #include <string>

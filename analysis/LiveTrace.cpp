@@ -2,11 +2,15 @@
 
 #include <chrono>
 #include <cmath>
+#include <cstddef>
 #include <stdexcept>
+#include <string>
 
+#include "analysis/SpectrumTrace.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
 #include "trace/PointPairs.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {

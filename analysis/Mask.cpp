@@ -4,9 +4,15 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstddef>
+#include <optional>
 #include <stdexcept>
+#include <string>
 #include <string_view>
+#include <system_error>
+#include <vector>
 
+#include "analysis/SpectrumTrace.h"
 #include "support/Text.h"
 
 namespace zel {

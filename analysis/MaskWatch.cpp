@@ -1,11 +1,18 @@
 #include "analysis/MaskWatch.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <string>
 #include <utility>
+#include <vector>
 
 #include "analysis/LiveTrace.h"
+#include "analysis/Mask.h"
 #include "files/SweepFile.h"
 #include "support/NumberText.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {

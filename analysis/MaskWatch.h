@@ -2,6 +2,7 @@
 // What happens when a sweep fails the mask: it is saved, sweeps after it are recorded, a command
 // runs.
 
+#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <optional>

@@ -1,6 +1,11 @@
 #include "analysis/Peaks.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <optional>
+#include <vector>
+
+#include "analysis/SpectrumTrace.h"
 
 namespace zel {
 namespace {

@@ -4,11 +4,17 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstddef>
 #include <limits>
 #include <optional>
 #include <stdexcept>
+#include <string>
+#include <string_view>
 #include <system_error>
+#include <utility>
+#include <vector>
 
+#include "analysis/SpectrumTrace.h"
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"

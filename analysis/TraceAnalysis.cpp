@@ -1,8 +1,17 @@
 #include "analysis/TraceAnalysis.h"
 
 #include <algorithm>
+#include <cstdint>
+#include <optional>
 #include <stdexcept>
+#include <string>
 #include <utility>
+#include <vector>
+
+#include "analysis/ChannelPower.h"
+#include "analysis/Mask.h"
+#include "analysis/Peaks.h"
+#include "analysis/SpectrumTrace.h"
 
 namespace zel {
 

@@ -1,6 +1,7 @@
 #pragma once
 // What is asked about traces, and what came out for one of them.
 
+#include <cstddef>
 #include <cstdint>
 #include <optional>
 #include <string>

@@ -1,5 +1,10 @@
 #include "analysis/TraceStatistics.h"
 
+#include <cstddef>
+#include <string>
+#include <vector>
+
+#include "analysis/SpectrumTrace.h"
 #include "support/NumberText.h"
 
 namespace zel {

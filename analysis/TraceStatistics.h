@@ -1,9 +1,12 @@
 #pragma once
 // Many traces as statistics: lowest, mean and highest level and the occupancy, sample by sample.
 
+#include <cstdint>
 #include <string>
+#include <vector>
 
 #include "analysis/Hold.h"
+#include "analysis/SpectrumTrace.h"
 
 namespace zel {
 

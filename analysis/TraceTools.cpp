@@ -1,10 +1,20 @@
 #include "analysis/TraceTools.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <optional>
 #include <stdexcept>
 #include <utility>
+#include <vector>
 
+#include "analysis/Correction.h"
+#include "analysis/HostMarkers.h"
 #include "analysis/LiveTrace.h"
+#include "analysis/Mask.h"
+#include "analysis/Peaks.h"
+#include "analysis/SpectrumTrace.h"
+#include "analysis/TraceAnalysis.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {

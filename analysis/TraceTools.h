@@ -1,6 +1,7 @@
 #pragma once
 // All trace tools over the sweeps that come: what is on, and what they found in the last sweep.
 
+#include <cstddef>
 #include <optional>
 #include <string>
 #include <vector>
@@ -8,6 +9,8 @@
 #include "analysis/Correction.h"
 #include "analysis/HostMarkers.h"
 #include "analysis/HostTraces.h"
+#include "analysis/Mask.h"
+#include "analysis/SpectrumTrace.h"
 #include "analysis/TraceAnalysis.h"
 #include "analysis/TraceStatistics.h"
 #include "platform/Event.h"

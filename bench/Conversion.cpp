@@ -1,12 +1,16 @@
 #include "bench/Conversion.h"
 
-#include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <random>
+#include <string>
+#include <vector>
 
+#include "bench/Figures.h"
 #include "forms/Forms.h"
 #include "model/CodeTables.h"
 #include "model/ZEL3Variables.h"
+#include "trace/Sweep.h"
 #include "trace/TraceConversion.h"
 
 namespace zelbench {

@@ -1,7 +1,16 @@
 #include "bench/CoreSession.h"
 
+#include <memory>
+#include <optional>
 #include <stdexcept>
+#include <string>
+#include <string_view>
 
+#include "platform/LinkAddress.h"
+#include "platform/MessageBox.h"
+#include "platform/Platform.h"
+#include "platform/SerialPort.h"
+#include "shell/Program.h"
 #include "trace/TraceReader.h"
 
 namespace zelbench {

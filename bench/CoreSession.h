@@ -4,9 +4,14 @@
 #include <QTemporaryDir>
 #include <cstddef>
 #include <memory>
+#include <optional>
 #include <string>
+#include <string_view>
 
 #include "desktop/platform/QtPlatform.h"
+#include "platform/LinkAddress.h"
+#include "platform/MessageBox.h"
+#include "platform/SerialPort.h"
 #include "shell/Program.h"
 
 namespace zelbench {

@@ -5,6 +5,10 @@
 #include <charconv>
 #include <chrono>
 #include <cmath>
+#include <cstddef>
+#include <functional>
+#include <string>
+#include <vector>
 
 namespace zelbench {
 namespace {

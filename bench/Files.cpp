@@ -3,16 +3,24 @@
 #include <QApplication>
 #include <QTemporaryDir>
 #include <charconv>
+#include <cmath>
+#include <cstddef>
 #include <filesystem>
 #include <fstream>
+#include <ios>
 #include <locale>
 #include <random>
 #include <stdexcept>
+#include <string>
+#include <vector>
 
+#include "bench/Figures.h"
 #include "desktop/platform/QtPlatform.h"
+#include "desktop/platform/SystemFiles.h"
 #include "desktop/windows/MainWindow.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Event.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "shell/Program.h"
 #include "trace/Sweep.h"

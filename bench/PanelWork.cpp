@@ -1,12 +1,19 @@
 #include "bench/PanelWork.h"
 
 #include <QApplication>
+#include <cstddef>
 #include <stdexcept>
+#include <string>
+#include <vector>
 
 #include "bench/BareLine.h"
 #include "bench/CoreSession.h"
+#include "bench/Figures.h"
 #include "bench/Process.h"
 #include "desktop/windows/MainWindow.h"
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
+#include "platform/Event.h"
 #include "platform/KeyInput.h"
 
 namespace zelbench {

@@ -1,9 +1,13 @@
 #include "bench/Redraw.h"
 
 #include <QApplication>
+#include <cstddef>
 #include <random>
+#include <vector>
 
+#include "bench/Figures.h"
 #include "desktop/graph/GraphWidget.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
 #include "trace/ViewAnnotations.h"

@@ -4,9 +4,10 @@
 // when every figure keeps its limit, 1 when one does not, 2 on wrong use.
 
 #include <QApplication>
+#include <exception>
 #include <functional>
 #include <iostream>
-#include <stdexcept>
+#include <vector>
 
 #include "bench/Conversion.h"
 #include "bench/Figures.h"

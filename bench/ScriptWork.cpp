@@ -3,18 +3,22 @@
 #include <QApplication>
 #include <QTemporaryDir>
 #include <QThread>
+#include <cstddef>
 #include <stdexcept>
+#include <vector>
 
 #include "bench/BareLine.h"
 #include "bench/CoreSession.h"
+#include "bench/Figures.h"
 #include "bench/Process.h"
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/MainWindow.h"
+#include "forms/ScriptForms.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "rehearsal/Rehearsal.h"
 #include "script/ScriptFile.h"
-#include "script/Scripts.h"
 #include "script/Statistics.h"
+#include "shell/Program.h"
 #include "support/NumberText.h"
 
 namespace zelbench {

@@ -1,18 +1,23 @@
 #include "bench/ServedLine.h"
 
+#include <sys/types.h>
 #include <unistd.h>
 
 #include <QByteArray>
 #include <QFile>
 #include <QList>
 #include <QTemporaryDir>
-#include <memory>
+#include <chrono>
 #include <stdexcept>
+#include <string>
 #include <thread>
+#include <vector>
 
 #include "bench/CoreSession.h"
+#include "bench/Figures.h"
 #include "bench/Process.h"
 #include "link/CommandExchange.h"
+#include "platform/LinkAddress.h"
 #include "support/NumberText.h"
 
 namespace zelbench {

@@ -1,10 +1,14 @@
 #include "bench/SweepRate.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <stdexcept>
+#include <string>
+#include <vector>
 
 #include "bench/BareLine.h"
 #include "bench/CoreSession.h"
+#include "bench/Figures.h"
 #include "bench/Process.h"
 
 namespace zelbench {

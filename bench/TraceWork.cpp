@@ -1,12 +1,26 @@
 #include "bench/TraceWork.h"
 
+#include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
 #include <random>
+#include <string>
+#include <vector>
 
+#include "analysis/Correction.h"
+#include "analysis/Hold.h"
+#include "analysis/HostMarkers.h"
+#include "analysis/HostTraces.h"
+#include "analysis/Mask.h"
 #include "analysis/SavedTraces.h"
+#include "analysis/SpectrumTrace.h"
+#include "analysis/TraceAnalysis.h"
 #include "analysis/TraceTools.h"
+#include "bench/Figures.h"
 #include "model/CodeTables.h"
 #include "support/NumberText.h"
+#include "trace/Sweep.h"
 
 namespace zelbench {
 namespace {

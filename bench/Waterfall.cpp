@@ -2,12 +2,19 @@
 
 #include <sys/resource.h>
 
+#include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <random>
 #include <string>
+#include <vector>
 
+#include "bench/Figures.h"
+#include "forms/Forms.h"
+#include "platform/Graph3D.h"
 #include "waterfall/Graph3dOps.h"
 #include "waterfall/SpectrogramImage.h"
+#include "waterfall/SweepHistory.h"
 #include "waterfall/WaterfallPicture.h"
 
 namespace zelbench {

@@ -1,5 +1,9 @@
 #include "bench/Windows.h"
 
+#include <string>
+#include <vector>
+
+#include "bench/Figures.h"
 #include "bench/Process.h"
 #include "support/NumberText.h"
 

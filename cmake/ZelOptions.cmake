@@ -36,11 +36,12 @@ if(ZEL_WERROR)
     add_compile_options(-Werror)
 endif()
 
-# A release checks what the library can check at little cost, and is hard to misuse: bounds of the
-# standard containers and of the C functions, the stack, the tables of the linker.
+# Every build checks what the library can check at little cost: bounds of the standard containers.
+# A release is hard to misuse: bounds of the C functions, the stack, the tables of the linker.
 if(CMAKE_SYSTEM_NAME STREQUAL "Linux")
     add_compile_options(
-        "$<$<CONFIG:Release>:-D_GLIBCXX_ASSERTIONS;-U_FORTIFY_SOURCE;-D_FORTIFY_SOURCE=3>"
+        -D_GLIBCXX_ASSERTIONS
+        "$<$<CONFIG:Release>:-U_FORTIFY_SOURCE;-D_FORTIFY_SOURCE=3>"
         "$<$<CONFIG:Release>:-fstack-protector-strong;-fstack-clash-protection>")
     if(CMAKE_SYSTEM_PROCESSOR MATCHES "x86_64|AMD64")
         add_compile_options("$<$<CONFIG:Release>:-fcf-protection>")

@@ -1,9 +1,19 @@
 #include "connection/ConnectionDialog.h"
 
+#include <cstddef>
+#include <cstdint>
+#include <string>
 #include <utility>
 
+#include "connection/Profiles.h"
+#include "connection/SessionStart.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/ByteLink.h"
 #include "link/RS232Ops.h"
 #include "platform/ModalForm.h"
+#include "platform/SerialPort.h"
+#include "platform/Session.h"
 
 namespace zel {
 namespace {

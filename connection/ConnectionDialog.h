@@ -6,8 +6,11 @@
 
 #include "connection/Profiles.h"
 #include "connection/SessionStart.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
 #include "link/ByteLink.h"
+#include "platform/Event.h"
 #include "platform/SerialPort.h"
 #include "platform/Session.h"
 

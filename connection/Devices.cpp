@@ -1,12 +1,23 @@
 #include "connection/Devices.h"
 
-#include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <utility>
+#include <vector>
 
+#include "forms/Forms.h"
 #include "link/ByteLink.h"
 #include "link/RS232Ops.h"
+#include "platform/Clock.h"
+#include "platform/Files.h"
+#include "platform/MessageBox.h"
 #include "platform/ModalForm.h"
 #include "platform/Pointer.h"
+#include "platform/SerialPort.h"
+#include "platform/Session.h"
 #include "support/FileText.h"
+#include "support/IniFile.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"

@@ -4,8 +4,13 @@
 #include <string>
 #include <vector>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
 #include "platform/Files.h"
+#include "platform/MessageBox.h"
 #include "platform/SerialPort.h"
 #include "platform/Services.h"
 #include "platform/Session.h"

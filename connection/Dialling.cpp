@@ -1,8 +1,18 @@
 #include "connection/Dialling.h"
 
-#include <algorithm>
+#include <cstddef>
+#include <string>
 
+#include "connection/ConnectionDialog.h"
+#include "connection/Disconnection.h"
+#include "connection/SessionStart.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/InstrumentLink.h"
+#include "platform/Clock.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/Text.h"
 
 namespace zel {

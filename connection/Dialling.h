@@ -6,8 +6,11 @@
 #include "connection/ConnectionDialog.h"
 #include "connection/Disconnection.h"
 #include "connection/SessionStart.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
 #include "link/InstrumentLink.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 
 namespace zel {

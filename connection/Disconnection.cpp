@@ -1,10 +1,20 @@
 #include "connection/Disconnection.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 
+#include "connection/SessionClock.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/InstrumentLink.h"
 #include "link/WaitNotice.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Socket.h"
 #include "support/CommandWord.h"
+#include "trace/GraphInteraction.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 namespace {

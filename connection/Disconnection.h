@@ -2,8 +2,14 @@
 // The end of a session, and the panel's way back to its not-connected look.
 
 #include "connection/SessionClock.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
+#include "link/ByteLink.h"
+#include "link/CommandExchange.h"
 #include "link/InstrumentLink.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 #include "platform/Socket.h"
 #include "trace/GraphInteraction.h"

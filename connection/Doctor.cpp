@@ -1,8 +1,18 @@
 #include "connection/Doctor.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <vector>
 
 #include "platform/ByteText.h"
+#include "platform/LinkAddress.h"
+#include "platform/PortProbe.h"
+#include "platform/SerialPort.h"
+#include "platform/Socket.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -2,7 +2,6 @@
 // Finds out what is wrong on the way to the instrument: the ports, their rights and holders, what
 // comes back over the line.
 
-#include <cstdint>
 #include <functional>
 #include <optional>
 #include <string>

@@ -1,6 +1,14 @@
 #include "connection/DoctorKeys.h"
 
+#include <optional>
+#include <string>
+
+#include "connection/Doctor.h"
+#include "forms/Forms.h"
+#include "platform/Events.h"
+#include "platform/LinkAddress.h"
 #include "platform/ModalForm.h"
+#include "platform/Services.h"
 #include "support/AtEnd.h"
 #include "support/LinkAddressText.h"
 #include "support/Text.h"

@@ -3,6 +3,10 @@
 
 #include "connection/Doctor.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
+#include "forms/SupportForms.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
 #include "platform/Services.h"
 
 namespace zel {

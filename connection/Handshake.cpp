@@ -2,14 +2,27 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <vector>
 
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/InstrumentLink.h"
 #include "link/WaitNotice.h"
+#include "link/ZELBas.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MenuFill.h"
 #include "panel/ModeOptions.h"
 #include "panel/SoftPanel.h"
+#include "platform/Controls.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/CommandWord.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {

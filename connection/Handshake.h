@@ -1,12 +1,17 @@
 #pragma once
 // The start of a session: wakes the instrument, identifies it and reads its whole state.
 
-#include <string>
-
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
+#include "link/AnswerReader.h"
+#include "link/ByteLink.h"
+#include "link/CommandExchange.h"
 #include "link/InstrumentLink.h"
+#include "link/ZELBas.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 #include "trace/FrequencyLabels.h"
 

@@ -1,7 +1,11 @@
 #include "connection/KeptSettings.h"
 
+#include <string>
+
+#include "forms/ControllerForm.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
 #include "support/NumberText.h"
 
 namespace zel {

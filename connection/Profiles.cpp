@@ -1,5 +1,10 @@
 #include "connection/Profiles.h"
 
+#include <cstdint>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
 #include "support/NumberText.h"
 
 namespace zel {

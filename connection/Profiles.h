@@ -1,9 +1,6 @@
 #pragma once
 // The connection dialog's fields, kept between runs: one section a kind of connection.
 
-#include <cstdint>
-#include <string>
-
 #include "forms/ControllerForm.h"
 #include "forms/MainForm.h"
 #include "platform/Services.h"

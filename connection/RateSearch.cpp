@@ -1,10 +1,18 @@
 #include "connection/RateSearch.h"
 
 #include <algorithm>
+#include <optional>
+#include <string>
+#include <vector>
 
+#include "connection/ConnectionDialog.h"
+#include "connection/Doctor.h"
+#include "forms/Forms.h"
 #include "link/ByteLink.h"
+#include "link/ZELBas.h"
 #include "platform/LinkAddress.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/AtEnd.h"
 #include "support/NumberText.h"
 

@@ -1,13 +1,14 @@
 #pragma once
 // After an attempt that found no instrument: tries each baud rate and connects at the right one.
 
-#include <string>
 #include <vector>
 
 #include "connection/ConnectionDialog.h"
 #include "connection/Doctor.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
 #include "link/ZELBas.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 
 namespace zel {

@@ -1,11 +1,24 @@
 #include "connection/Reconnection.h"
 
+#include <cstdint>
+#include <string>
+
+#include "connection/Disconnection.h"
+#include "connection/KeptSettings.h"
 #include "connection/Profiles.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
 #include "link/ByteLink.h"
 #include "link/WaitNotice.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Form.h"
+#include "platform/LinkAddress.h"
+#include "platform/PortProbe.h"
+#include "platform/Socket.h"
 #include "support/AtEnd.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 namespace {

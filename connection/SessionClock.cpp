@@ -1,5 +1,7 @@
 #include "connection/SessionClock.h"
 
+#include <string_view>
+
 #include "support/TimeText.h"
 
 namespace zel {

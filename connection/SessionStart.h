@@ -1,6 +1,8 @@
 #pragma once
 // What every kind of connection does once its link is up: clock, handshake, first sweep.
 
+#include <string_view>
+
 #include "connection/Handshake.h"
 #include "connection/SessionClock.h"
 #include "forms/ControllerForm.h"

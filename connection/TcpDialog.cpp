@@ -1,13 +1,24 @@
 #include "connection/TcpDialog.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
 #include "connection/Profiles.h"
+#include "connection/SessionStart.h"
+#include "forms/Forms.h"
+#include "link/InstrumentLink.h"
 #include "link/WaitNotice.h"
+#include "link/ZELBas.h"
+#include "platform/MessageBox.h"
 #include "platform/ModalForm.h"
 #include "platform/Pointer.h"
+#include "platform/Services.h"
+#include "platform/Session.h"
+#include "platform/Socket.h"
 #include "support/AtEnd.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"

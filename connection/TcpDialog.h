@@ -4,8 +4,11 @@
 #include <string>
 
 #include "connection/SessionStart.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "link/InstrumentLink.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
 #include "platform/Services.h"
 #include "platform/Session.h"
 #include "platform/Socket.h"

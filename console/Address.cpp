@@ -1,6 +1,10 @@
 #include "console/Address.h"
 
+#include <optional>
+#include <string_view>
+
 #include "desktop/platform/DeviceName.h"
+#include "platform/LinkAddress.h"
 #include "support/LinkAddressText.h"
 
 namespace zel {

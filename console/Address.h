@@ -2,10 +2,9 @@
 // Where the instrument of a run is, as `--connect` says it.
 
 #include <optional>
-#include <string>
 #include <string_view>
 
-#include "shell/Program.h"
+#include "platform/LinkAddress.h"
 
 namespace zel {
 

@@ -1,10 +1,17 @@
 #include "console/AnalysisOptions.h"
 
+#include <cstdint>
 #include <map>
 #include <optional>
+#include <string>
+#include <vector>
 
+#include "analysis/AnalysisText.h"
+#include "analysis/Hold.h"
+#include "analysis/MaskWatch.h"
+#include "analysis/TraceAnalysis.h"
 #include "support/NumberOption.h"
-#include "support/Text.h"
+#include "support/NumberText.h"
 
 namespace zel {
 namespace {

@@ -1,8 +1,19 @@
 #include "console/AnalysisVerb.h"
 
+#include <cstdint>
+#include <optional>
 #include <stdexcept>
+#include <string>
+#include <vector>
 
+#include "analysis/AnalysisText.h"
+#include "analysis/Mask.h"
 #include "analysis/SavedTraces.h"
+#include "analysis/SpectrumTrace.h"
+#include "console/AnalysisOptions.h"
+#include "console/LineOutput.h"
+#include "platform/Clock.h"
+#include "platform/Files.h"
 #include "support/ExitStatus.h"
 #include "support/FileText.h"
 

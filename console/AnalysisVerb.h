@@ -1,11 +1,12 @@
 #pragma once
 // The verb analyse, and the analysis of live sweeps.
 
-#include <cstddef>
+#include <cstdint>
 #include <optional>
 #include <string>
 #include <vector>
 
+#include "analysis/Mask.h"
 #include "analysis/SpectrumTrace.h"
 #include "analysis/TraceAnalysis.h"
 #include "console/AnalysisOptions.h"

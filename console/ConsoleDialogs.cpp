@@ -1,9 +1,13 @@
 #include "console/ConsoleDialogs.h"
 
 #include <array>
+#include <optional>
+#include <string>
 #include <string_view>
 #include <utility>
 
+#include "platform/MessageBox.h"
+#include "platform/Services.h"
 #include "support/Text.h"
 
 namespace zel {

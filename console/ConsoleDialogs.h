@@ -5,6 +5,7 @@
 #include <functional>
 #include <optional>
 #include <string>
+#include <utility>
 
 #include "console/LineOutput.h"
 #include "platform/MessageBox.h"

@@ -1,9 +1,17 @@
 #include "console/ControlAccess.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <optional>
+#include <string>
 #include <type_traits>
+#include <variant>
+#include <vector>
 
+#include "forms/Forms.h"
+#include "model/ZEL3Variables.h"
 #include "platform/Controls.h"
+#include "platform/Form.h"
 #include "platform/Graph.h"
 #include "support/NumberText.h"
 #include "support/RTFGen.h"

@@ -1,8 +1,11 @@
 #include "console/ControlActions.h"
 
 #include <optional>
+#include <string>
+#include <string_view>
 
 #include "platform/Controls.h"
+#include "platform/Form.h"
 #include "platform/Graph.h"
 #include "platform/KeyInput.h"
 #include "support/NumberText.h"

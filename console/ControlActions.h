@@ -1,7 +1,6 @@
 #pragma once
 // What a user does to a control, by words: click, type, key, choose, set.
 
-#include <functional>
 #include <string>
 #include <string_view>
 

@@ -1,13 +1,23 @@
 #include "console/Fronts.h"
 
 #include <QCoreApplication>
+#include <memory>
 #include <optional>
+#include <string>
 
 #include "ZELSim/InProcessPort.h"
+#include "console/Address.h"
 #include "console/VirtualFront.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtSystem.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "platform/Platform.h"
+#include "platform/Services.h"
+#include "platform/Socket.h"
 #include "platform/virtual/FixedMachine.h"
+#include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/ScriptedSocket.h"
 
 namespace zel {

@@ -4,8 +4,11 @@
 #include <memory>
 #include <string>
 
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
 #include "platform/Platform.h"
-#include "shell/Program.h"
+#include "platform/Services.h"
 
 namespace zel {
 

@@ -1,9 +1,14 @@
 #include "console/Graph3DCommands.h"
 
 #include <cmath>
+#include <cstddef>
 #include <optional>
+#include <string>
+#include <string_view>
 #include <vector>
 
+#include "platform/Graph.h"
+#include "platform/Graph3D.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -1,5 +1,9 @@
 #include "console/Graph3DText.h"
 
+#include <string>
+#include <vector>
+
+#include "platform/Graph3D.h"
 #include "support/NumberText.h"
 
 namespace zel {

@@ -2,10 +2,17 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <functional>
+#include <string>
+#include <utility>
+#include <vector>
 
+#include "forms/ControllerForm.h"
+#include "platform/Graph.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {

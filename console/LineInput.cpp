@@ -1,10 +1,14 @@
 #include "console/LineInput.h"
 
 #include <poll.h>
+#include <sys/types.h>
 #include <unistd.h>
 
 #include <array>
 #include <cerrno>
+#include <cstddef>
+#include <streambuf>
+#include <string>
 #include <utility>
 
 namespace zel {

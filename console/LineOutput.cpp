@@ -1,8 +1,12 @@
 #include "console/LineOutput.h"
 
 #include <cerrno>
+#include <ostream>
+#include <string>
+#include <string_view>
 #include <system_error>
 #include <utility>
+#include <vector>
 
 #include "platform/ByteText.h"
 #include "support/Text.h"

@@ -1,12 +1,20 @@
 #include "console/LogAccess.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <cstdint>
 #include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
 #include <utility>
 #include <variant>
+#include <vector>
 
+#include "shell/Logs.h"
+#include "support/DebugIf.h"
 #include "support/NumberText.h"
+#include "support/RootDebug.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -2,15 +2,22 @@
 
 #include <CLI/CLI.hpp>
 #include <algorithm>
+#include <cstddef>
 #include <map>
+#include <optional>
+#include <ostream>
 #include <string>
 #include <vector>
 
+#include "console/Address.h"
+#include "console/AnalysisOptions.h"
 #include "desktop/platform/CommonOptions.h"
 #include "desktop/platform/DeviceName.h"
 #include "link/WireText.h"
 #include "server/Networks.h"
+#include "support/ExitStatus.h"
 #include "support/NumberOption.h"
+#include "support/NumberText.h"
 #include "support/SessionText.h"
 #include "support/Text.h"
 

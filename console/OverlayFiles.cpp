@@ -1,8 +1,18 @@
 #include "console/OverlayFiles.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <filesystem>
+#include <memory>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
+#include "platform/Files.h"
 #include "support/FileText.h"
 
 namespace zel {

@@ -3,8 +3,11 @@
 // nothing on the disk.
 
 #include <map>
+#include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
+#include <vector>
 
 #include "platform/Files.h"
 

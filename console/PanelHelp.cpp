@@ -1,8 +1,13 @@
 #include "console/PanelHelp.h"
 
+#include <optional>
+#include <string>
+#include <vector>
+
 #include "console/ControlAccess.h"
 #include "console/ControlActions.h"
-#include "platform/Controls.h"
+#include "forms/Forms.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

@@ -1,14 +1,27 @@
 #include "console/PanelSession.h"
 
 #include <algorithm>
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
 #include <utility>
 
 #include "console/ControlAccess.h"
+#include "console/ControlActions.h"
 #include "console/Graph3DCommands.h"
 #include "console/Graph3DText.h"
 #include "console/GraphText.h"
+#include "console/LineInput.h"
 #include "console/LogAccess.h"
 #include "console/PanelHelp.h"
+#include "platform/Controls.h"
+#include "platform/Event.h"
+#include "platform/Form.h"
+#include "platform/LinkAddress.h"
+#include "shell/Program.h"
+#include "support/ExitStatus.h"
 #include "support/NumberText.h"
 #include "support/RoboHelp_CSH.h"
 #include "support/RunTimeError.h"

@@ -7,13 +7,15 @@
 #include <string>
 #include <string_view>
 
-#include "console/Address.h"
 #include "console/ConsoleDialogs.h"
 #include "console/ControlActions.h"
 #include "console/LineInput.h"
 #include "console/LineOutput.h"
 #include "console/ServingEvents.h"
 #include "platform/Clock.h"
+#include "platform/Event.h"
+#include "platform/Form.h"
+#include "platform/LinkAddress.h"
 #include "shell/Program.h"
 #include "support/ExitStatus.h"
 #include "trace/Interlock.h"

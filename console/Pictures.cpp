@@ -5,9 +5,16 @@
 #include <QProcess>
 #include <QStandardPaths>
 #include <algorithm>
+#include <string>
 
+#include "forms/ControllerForm.h"
+#include "forms/WaterfallForm.h"
 #include "picture/PictureJson.h"
+#include "platform/Graph3D.h"
+#include "shell/Program.h"
+#include "trace/ViewAnnotations.h"
 #include "waterfall/PictureOptions.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

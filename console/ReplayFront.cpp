@@ -1,8 +1,15 @@
 #include "console/ReplayFront.h"
 
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <utility>
+
 #include "ZELSim/ReplayPort.h"
 #include "console/VirtualFront.h"
+#include "desktop/platform/SystemPortProbe.h"
 #include "platform/virtual/ScriptedPort.h"
+#include "support/SessionText.h"
 
 namespace zel {
 namespace {

@@ -1,8 +1,18 @@
 #include "console/ReplayInput.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <string_view>
 #include <utility>
 
+#include "console/ConsoleDialogs.h"
+#include "console/LineInput.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "support/SessionCompare.h"
+#include "support/SessionText.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -1,6 +1,7 @@
 #pragma once
 // The lines and clicks of a recorded session, each in its turn.
 
+#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <string>
@@ -11,6 +12,7 @@
 #include "platform/Clock.h"
 #include "platform/Events.h"
 #include "support/SessionCompare.h"
+#include "support/SessionText.h"
 
 namespace zel {
 

@@ -1,22 +1,39 @@
 #include "console/ReplayVerb.h"
 
 #include <QTemporaryDir>
+#include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <functional>
 #include <locale>
 #include <memory>
+#include <optional>
 #include <sstream>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
+#include "console/Address.h"
+#include "console/ConsoleDialogs.h"
+#include "console/Fronts.h"
 #include "console/LineOutput.h"
+#include "console/Options.h"
 #include "console/OverlayFiles.h"
 #include "console/ReplayFront.h"
 #include "console/ReplayInput.h"
+#include "console/Tool.h"
 #include "desktop/platform/QtSignals.h"
 #include "desktop/platform/SystemFiles.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/Files.h"
+#include "shell/Program.h"
 #include "support/ExitStatus.h"
 #include "support/FileText.h"
-#include "support/LinkAddressText.h"
 #include "support/SessionCompare.h"
 #include "support/SessionLog.h"
+#include "support/SessionText.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -1,6 +1,7 @@
 #pragma once
 // Runs a recorded session again and compares what the program sends.
 
+#include "console/Options.h"
 #include "console/Tool.h"
 
 namespace zel {

@@ -3,9 +3,14 @@
 #include <algorithm>
 #include <filesystem>
 #include <optional>
+#include <string>
 
-#include "console/PanelSession.h"
+#include "console/LineOutput.h"
+#include "console/Options.h"
+#include "forms/ScriptForms.h"
+#include "platform/Files.h"
 #include "rehearsal/Rehearsal.h"
+#include "support/ExitStatus.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -6,6 +6,7 @@
 
 #include "console/ConsoleDialogs.h"
 #include "console/LineInput.h"
+#include "console/LineOutput.h"
 #include "console/Options.h"
 #include "console/ServingEvents.h"
 #include "platform/Files.h"

@@ -1,7 +1,12 @@
 #include "console/ServeVerb.h"
 
 #include <algorithm>
+#include <string>
+#include <vector>
 
+#include "console/Options.h"
+#include "console/Verbs.h"
+#include "forms/ServerForm.h"
 #include "server/ServerBridge.h"
 #include "server/ServerDialog.h"
 #include "support/ExitStatus.h"

@@ -3,16 +3,26 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <cstddef>
 #include <fstream>
+#include <functional>
+#include <ios>
 #include <locale>
 #include <memory>
+#include <optional>
+#include <ostream>
+#include <string>
+#include <vector>
 
 #include "connection/Doctor.h"
+#include "console/Address.h"
 #include "console/AnalysisVerb.h"
 #include "console/ConsoleDialogs.h"
 #include "console/DebugWatch.h"
+#include "console/Fronts.h"
 #include "console/LineInput.h"
 #include "console/LineOutput.h"
+#include "console/Options.h"
 #include "console/PanelSession.h"
 #include "console/Pictures.h"
 #include "console/RunScript.h"
@@ -22,9 +32,15 @@
 #include "desktop/platform/CrashTrace.h"
 #include "desktop/platform/QtSignals.h"
 #include "model/InstrumentWords.h"
+#include "platform/Clock.h"
+#include "platform/Controls.h"
+#include "platform/Event.h"
+#include "platform/Files.h"
+#include "platform/LinkAddress.h"
 #include "rehearsal/Rehearsal.h"
 #include "shell/Logs.h"
 #include "support/ErrorReport.h"
+#include "support/ExitStatus.h"
 #include "support/SessionLog.h"
 #include "support/Text.h"
 

@@ -8,6 +8,10 @@
 #include "console/Fronts.h"
 #include "console/LineInput.h"
 #include "console/Options.h"
+#include "platform/Clock.h"
+#include "platform/Events.h"
+#include "platform/Files.h"
+#include "shell/Program.h"
 
 namespace zel {
 

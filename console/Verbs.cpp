@@ -3,16 +3,25 @@
 #include <cstdint>
 #include <memory>
 #include <stdexcept>
+#include <string>
 #include <utility>
-#include <vector>
 
 #include "analysis/LiveTrace.h"
+#include "analysis/Mask.h"
 #include "analysis/MaskWatch.h"
 #include "console/GraphText.h"
-#include "console/PanelSession.h"
+#include "console/LineOutput.h"
+#include "console/Options.h"
 #include "desktop/platform/SystemCommand.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "forms/WaterfallForm.h"
 #include "link/CommandExchange.h"
+#include "model/ZEL3Variables.h"
+#include "shell/Program.h"
+#include "support/ExitStatus.h"
 #include "support/NumberText.h"
+#include "trace/Sweep.h"
 #include "trace/TraceReader.h"
 
 namespace zel {

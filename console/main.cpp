@@ -1,5 +1,6 @@
 // zelctl, the program without a window.
 
+#include <signal.h>
 #include <unistd.h>
 
 #include <csignal>

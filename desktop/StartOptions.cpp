@@ -2,11 +2,16 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <optional>
+#include <ostream>
+#include <string>
 #include <string_view>
+#include <system_error>
 #include <vector>
 
 #include "desktop/platform/CommonOptions.h"
 #include "desktop/platform/DeviceName.h"
+#include "desktop/windows/Theme.h"
 #include "support/LinkAddressText.h"
 #include "support/NumberText.h"
 #include "support/SessionText.h"

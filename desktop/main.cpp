@@ -4,6 +4,7 @@
 #include <QTimer>
 #include <cstdio>
 #include <iostream>
+#include <string>
 
 #include "desktop/StartOptions.h"
 #include "desktop/help/HelpKeyFilter.h"

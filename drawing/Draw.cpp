@@ -1,11 +1,13 @@
 #include "drawing/Draw.h"
 
 #include <memory>
+#include <string>
 
 #include "desktop/graph/GraphImage.h"
 #include "desktop/graph/SpectrogramPicture.h"
 #include "desktop/graph/WaterfallImage.h"
 #include "drawing/PictureReader.h"
+#include "forms/WaterfallForm.h"
 
 namespace zel {
 

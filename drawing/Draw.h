@@ -2,7 +2,6 @@
 // One run of the program that draws pictures.
 
 #include <QIODevice>
-#include <iosfwd>
 #include <string>
 
 namespace zel {

@@ -1,8 +1,12 @@
 #include "drawing/JsonReader.h"
 
 #include <cmath>
+#include <cstddef>
+#include <functional>
 #include <limits>
 #include <optional>
+#include <string>
+#include <vector>
 
 namespace zel {
 namespace {

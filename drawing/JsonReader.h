@@ -6,6 +6,7 @@
 #include <QString>
 #include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace zel {

@@ -2,10 +2,22 @@
 
 #include <QJsonDocument>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <utility>
+#include <vector>
 
 #include "drawing/JsonReader.h"
+#include "forms/WaterfallForm.h"
 #include "picture/AnnotationFields.h"
 #include "picture/PictureJson.h"
+#include "platform/Form.h"
+#include "platform/Graph.h"
+#include "platform/Graph3D.h"
+#include "trace/ViewAnnotations.h"
+#include "waterfall/SweepHistory.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

@@ -1,6 +1,9 @@
 #include "files/FieldList.h"
 
 #include <array>
+#include <cstddef>
+#include <cstdint>
+#include <functional>
 
 namespace zel {
 namespace {

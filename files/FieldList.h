@@ -1,9 +1,9 @@
 #pragma once
 // A file's text cut into its entries: the fields between semicolons and line ends.
 
+#include <cstddef>
 #include <cstdint>
 #include <functional>
-#include <string>
 #include <string_view>
 #include <vector>
 

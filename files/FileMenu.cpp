@@ -2,6 +2,14 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <string>
+#include <vector>
+
+#include "files/FileOps.h"
+#include "forms/ControllerForm.h"
+#include "platform/Files.h"
+#include "platform/MessageBox.h"
+#include "platform/Services.h"
 
 namespace zel {
 namespace {

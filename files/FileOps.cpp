@@ -1,10 +1,16 @@
 #include "files/FileOps.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <filesystem>
+#include <optional>
 #include <stdexcept>
+#include <string>
 #include <utility>
 
+#include "platform/Files.h"
+#include "platform/Services.h"
+#include "support/FileText.h"
 #include "support/Text.h"
 
 namespace zel {

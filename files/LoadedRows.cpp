@@ -2,12 +2,19 @@
 
 #include <charconv>
 #include <cmath>
+#include <cstddef>
 #include <string>
+#include <string_view>
+#include <system_error>
+#include <vector>
 
+#include "files/FieldList.h"
 #include "files/ViewFormat.h"
 #include "model/CodeTables.h"
+#include "model/LevelRange.h"
 #include "model/Numeric.h"
 #include "support/Text.h"
+#include "trace/VerticalScale.h"
 
 namespace zel {
 namespace {

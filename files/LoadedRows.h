@@ -1,13 +1,12 @@
 #pragma once
 // Reads the rows of one trace out of a file's entries, converted for display.
 
+#include <cstddef>
 #include <string_view>
-#include <vector>
 
 #include "files/FieldList.h"
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
-#include "trace/VerticalScale.h"
 
 namespace zel {
 

@@ -1,7 +1,9 @@
 #include "files/OutputFile.h"
 
+#include <string>
 #include <utility>
 
+#include "platform/Files.h"
 #include "support/FileText.h"
 
 namespace zel {

@@ -1,6 +1,16 @@
 #include "files/Playback.h"
 
 #include <algorithm>
+#include <memory>
+#include <optional>
+#include <string>
+#include <utility>
+
+#include "files/SeriesFrames.h"
+#include "forms/Forms.h"
+#include "platform/Clock.h"
+#include "platform/Form.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 namespace {

@@ -1,12 +1,14 @@
 #pragma once
 // The keys that play a loaded recording: pace, position, forth and back, again and again.
 
-#include <functional>
 #include <memory>
 #include <optional>
 
 #include "files/SeriesFrames.h"
 #include "forms/Forms.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
 #include "trace/Interlock.h"
 
 namespace zel {

@@ -1,7 +1,13 @@
 #include "files/RecentFiles.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <filesystem>
+#include <string>
+#include <system_error>
+
+#include "forms/ControllerForm.h"
+#include "platform/Services.h"
 
 namespace zel {
 namespace {

@@ -2,17 +2,29 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdint>
 #include <filesystem>
 #include <limits>
+#include <string>
 
+#include "files/OutputFile.h"
 #include "files/ViewFormat.h"
+#include "files/ViewWriter.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/InstrumentLink.h"
+#include "link/ZELBas.h"
 #include "model/CodeTables.h"
-#include "platform/KeyInput.h"
+#include "model/ZEL3Variables.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/AtEnd.h"
 #include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/TimeText.h"
+#include "trace/Sweep.h"
+#include "trace/SweepControl.h"
 
 namespace zel {
 namespace {

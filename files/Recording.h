@@ -6,8 +6,11 @@
 
 #include "files/ViewWriter.h"
 #include "forms/Forms.h"
+#include "link/CommandExchange.h"
 #include "link/InstrumentLink.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 #include "trace/SweepControl.h"
 

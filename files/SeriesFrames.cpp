@@ -3,8 +3,15 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <cstddef>
+#include <memory>
 #include <optional>
+#include <string>
+#include <string_view>
+#include <system_error>
+#include <utility>
 
+#include "files/FieldList.h"
 #include "files/ViewFormat.h"
 #include "support/Text.h"
 

@@ -1,6 +1,7 @@
 #pragma once
 // Where the traces of a recording stand in its text, found as far as they are asked for.
 
+#include <cstddef>
 #include <memory>
 #include <optional>
 #include <string>

@@ -1,7 +1,15 @@
 #include "files/SweepFile.h"
 
+#include <cstddef>
+#include <string>
+#include <vector>
+
+#include "files/OutputFile.h"
 #include "files/ViewHeader.h"
+#include "platform/Clock.h"
+#include "platform/Files.h"
 #include "support/NumberText.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {

@@ -5,6 +5,7 @@
 
 #include "files/OutputFile.h"
 #include "platform/Clock.h"
+#include "platform/Files.h"
 #include "trace/Sweep.h"
 
 namespace zel {

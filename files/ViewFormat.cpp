@@ -1,6 +1,7 @@
 #include "files/ViewFormat.h"
 
 #include <filesystem>
+#include <string>
 
 #include "model/CodeTables.h"
 #include "support/Text.h"

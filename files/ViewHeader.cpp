@@ -1,7 +1,12 @@
 #include "files/ViewHeader.h"
 
+#include <string>
+
+#include "files/OutputFile.h"
 #include "files/ViewFormat.h"
+#include "forms/ControllerForm.h"
 #include "model/CodeTables.h"
+#include "model/ZEL3Variables.h"
 #include "support/NumberText.h"
 
 namespace zel {

@@ -2,10 +2,8 @@
 // The header of a saved view: the settings of the instrument, a line each.
 
 #include <functional>
-#include <string>
 
 #include "files/OutputFile.h"
-#include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
 #include "platform/Clock.h"
 

@@ -2,19 +2,38 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdint>
 #include <filesystem>
+#include <functional>
+#include <memory>
 #include <new>
 #include <optional>
 #include <stdexcept>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
+#include "files/FieldList.h"
+#include "files/FileOps.h"
+#include "files/LoadedRows.h"
+#include "files/SeriesFrames.h"
 #include "files/ViewFormat.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
 #include "model/CodeTables.h"
+#include "model/LevelRange.h"
+#include "model/ZEL3Variables.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
 #include "support/AtEnd.h"
 #include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "trace/FrequencyLabels.h"
+#include "trace/Interlock.h"
+#include "trace/Sweep.h"
+#include "trace/TraceOnGraph.h"
 
 namespace zel {
 namespace {

@@ -1,17 +1,28 @@
 #pragma once
 // Shows saved files on the graph: one view, a series of them, a log of the older format.
 
+#include <cstdint>
 #include <functional>
 #include <memory>
 #include <string>
+#include <string_view>
 
 #include "files/FieldList.h"
 #include "files/FileOps.h"
 #include "files/LoadedRows.h"
 #include "files/Playback.h"
+#include "files/SeriesFrames.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
+#include "trace/GraphScaling.h"
 #include "trace/Interlock.h"
+#include "trace/Sweep.h"
+#include "trace/TraceConversion.h"
 #include "trace/TraceOnGraph.h"
 
 namespace zel {

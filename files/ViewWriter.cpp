@@ -1,15 +1,24 @@
 #include "files/ViewWriter.h"
 
-#include <algorithm>
-#include <iterator>
+#include <string>
+#include <string_view>
 
+#include "files/FileOps.h"
+#include "files/OutputFile.h"
 #include "files/SweepFile.h"
 #include "files/ViewFormat.h"
 #include "files/ViewHeader.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
 #include "model/CodeTables.h"
+#include "model/ZEL3Variables.h"
+#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "support/AtEnd.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {

@@ -5,6 +5,7 @@
 
 #include "files/FileOps.h"
 #include "files/OutputFile.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"

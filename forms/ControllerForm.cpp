@@ -1,5 +1,7 @@
 #include "forms/ControllerForm.h"
 
+#include "platform/Form.h"
+
 namespace zel {
 
 ControllerForm::ControllerForm() : Form("ControllerForm") {

@@ -1,5 +1,10 @@
 #include "forms/Forms.h"
 
+#include <string_view>
+#include <vector>
+
+#include "platform/Form.h"
+
 namespace zel {
 
 std::vector<Form*> Forms::all() {

@@ -12,6 +12,8 @@
 #include "forms/SupportForms.h"
 #include "forms/WaterfallForm.h"
 #include "platform/Controls.h"
+#include "platform/Event.h"
+#include "platform/Form.h"
 
 namespace zel {
 

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "platform/Form.h"
+
 namespace zel {
 
 SpecialMeasForm::SpecialMeasForm() : Form("SpecialMeasForm") {

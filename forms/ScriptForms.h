@@ -6,6 +6,8 @@
 #include <vector>
 
 #include "platform/Controls.h"
+#include "platform/Event.h"
+#include "platform/Form.h"
 
 namespace zel {
 

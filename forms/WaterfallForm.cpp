@@ -1,5 +1,7 @@
 #include "forms/WaterfallForm.h"
 
+#include "platform/Form.h"
+
 namespace zel {
 
 WaterfallForm::WaterfallForm() : Form("WaterfallForm") {

@@ -5,6 +5,8 @@
 #include <string>
 
 #include "platform/Controls.h"
+#include "platform/Event.h"
+#include "platform/Form.h"
 #include "platform/Graph3D.h"
 
 namespace zel {

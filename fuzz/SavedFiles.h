@@ -8,10 +8,12 @@
 #include "files/FileOps.h"
 #include "files/ViewReader.h"
 #include "forms/Forms.h"
+#include "link/ZELBas.h"
 #include "model/ZEL3Variables.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "trace/GraphScaling.h"
 #include "trace/Interlock.h"
+#include "trace/Sweep.h"
 #include "trace/TraceConversion.h"
 
 namespace zel {

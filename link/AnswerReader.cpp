@@ -2,9 +2,18 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <string>
 #include <utility>
 
+#include "forms/Forms.h"
+#include "link/ByteLink.h"
+#include "link/WaitNotice.h"
+#include "link/ZELBas.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
 

@@ -4,10 +4,14 @@
 #include <cstdint>
 #include <string>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
 #include "link/ByteLink.h"
 #include "link/WaitNotice.h"
 #include "link/ZELBas.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
 
 namespace zel {

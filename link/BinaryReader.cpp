@@ -1,9 +1,16 @@
 #include "link/BinaryReader.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <string>
 
+#include "forms/Forms.h"
+#include "link/ByteLink.h"
+#include "link/ZELBas.h"
+#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "support/NumberText.h"
-#include "support/Text.h"
 
 namespace zel {
 namespace {

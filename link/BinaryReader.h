@@ -1,12 +1,16 @@
 #pragma once
 // Reads the bytes of a binary transfer: knows where the status ends and the samples begin.
 
+#include <cstddef>
 #include <cstdint>
 #include <string>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
 #include "link/ByteLink.h"
 #include "link/ZELBas.h"
+#include "platform/Clock.h"
 #include "platform/Session.h"
 
 namespace zel {

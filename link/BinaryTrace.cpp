@@ -1,7 +1,20 @@
 #include "link/BinaryTrace.h"
 
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+#include "forms/ControllerForm.h"
+#include "link/AnswerReader.h"
+#include "link/BinaryReader.h"
+#include "link/ByteLink.h"
 #include "link/CommandExchange.h"
 #include "link/InstrumentErrors.h"
+#include "link/LinkDelays.h"
+#include "link/RawTrace.h"
+#include "link/ZELBas.h"
+#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "support/ByteCast.h"
 #include "support/NumberText.h"
 #include "support/Text.h"

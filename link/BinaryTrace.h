@@ -1,6 +1,7 @@
 #pragma once
 // The binary transfer of a sweep: TRACEBIN and CTRACEBIN, with their ways of asking again.
 
+#include <cstddef>
 #include <cstdint>
 #include <string>
 #include <vector>
@@ -12,6 +13,7 @@
 #include "link/LinkDelays.h"
 #include "link/RawTrace.h"
 #include "link/ZELBas.h"
+#include "platform/Clock.h"
 #include "platform/Session.h"
 
 namespace zel {

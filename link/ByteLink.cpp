@@ -1,11 +1,22 @@
 #include "link/ByteLink.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <optional>
+#include <string>
 #include <utility>
+#include <vector>
 
+#include "forms/Forms.h"
 #include "link/WaitNotice.h"
+#include "link/ZELBas.h"
 #include "platform/LinkAddress.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/SerialPort.h"
+#include "platform/Services.h"
+#include "platform/Session.h"
+#include "platform/Socket.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "support/Text.h"

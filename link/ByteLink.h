@@ -1,10 +1,18 @@
 #pragma once
 // The lowest layer of the instrument's connection: one serial port or one socket, text in and out.
 
+#include <cstddef>
 #include <string>
+#include <vector>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
 #include "link/ZELBas.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
 #include "platform/SerialPort.h"
 #include "platform/Services.h"
 #include "platform/Session.h"

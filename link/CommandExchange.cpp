@@ -1,12 +1,22 @@
 #include "link/CommandExchange.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <iterator>
+#include <string>
 #include <string_view>
 
+#include "forms/ControllerForm.h"
+#include "link/AnswerReader.h"
+#include "link/ByteLink.h"
 #include "link/InstrumentErrors.h"
+#include "link/LinkDelays.h"
 #include "link/WireText.h"
+#include "link/ZELBas.h"
+#include "platform/Clock.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"

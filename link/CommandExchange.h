@@ -9,6 +9,7 @@
 #include "link/ByteLink.h"
 #include "link/LinkDelays.h"
 #include "link/ZELBas.h"
+#include "platform/Clock.h"
 #include "platform/Event.h"
 #include "platform/Session.h"
 

@@ -1,7 +1,10 @@
 #include "link/InstrumentErrors.h"
 
+#include <string>
 #include <string_view>
 
+#include "link/ZELBas.h"
+#include "platform/MessageBox.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -1,6 +1,12 @@
 #include "link/RS232Ops.h"
 
+#include <string>
+#include <utility>
+#include <vector>
+
 #include "link/ByteLink.h"
+#include "platform/MessageBox.h"
+#include "platform/SerialPort.h"
 #include "support/NumberText.h"
 
 namespace zel {

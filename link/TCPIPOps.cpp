@@ -1,5 +1,9 @@
 #include "link/TCPIPOps.h"
 
+#include <string>
+
+#include "platform/ServerSocket.h"
+#include "platform/Socket.h"
 #include "support/NumberText.h"
 
 namespace zel {

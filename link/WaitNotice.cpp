@@ -1,5 +1,11 @@
 #include "link/WaitNotice.h"
 
+#include <cstdint>
+#include <string>
+
+#include "forms/Forms.h"
+#include "platform/Controls.h"
+
 namespace zel {
 namespace {
 

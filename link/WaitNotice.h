@@ -2,8 +2,11 @@
 // Shows that an answer is waited for and how long that may still take, with a key to leave it.
 
 #include <cstdint>
+#include <string>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "platform/Controls.h"
 
 namespace zel {
 

@@ -1,5 +1,9 @@
 #include "link/WireText.h"
 
+#include <string>
+#include <string_view>
+
+#include "platform/MessageBox.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
 

@@ -1,7 +1,8 @@
 #include "model/CodeTables.h"
 
 #include <cmath>
-#include <iterator>
+#include <span>
+#include <string>
 
 namespace zel {
 namespace {

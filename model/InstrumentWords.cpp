@@ -1,6 +1,10 @@
 #include "model/InstrumentWords.h"
 
-#include "support/Text.h"
+#include <span>
+#include <string>
+#include <string_view>
+
+#include "model/CodeTables.h"
 
 namespace zel {
 namespace {

@@ -2,8 +2,12 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdint>
 #include <limits>
+#include <string>
+#include <variant>
 
+#include "model/ZEL3Variables.h"
 #include "support/NumberText.h"
 
 namespace zel {

@@ -1,8 +1,11 @@
 #include "model/Numeric.h"
 
 #include <cmath>
+#include <cstddef>
 #include <stdexcept>
+#include <string>
 #include <string_view>
+#include <vector>
 
 #include "support/NumberText.h"
 #include "support/StringOp.h"

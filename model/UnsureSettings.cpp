@@ -1,6 +1,9 @@
 #include "model/UnsureSettings.h"
 
 #include <algorithm>
+#include <array>
+#include <cstddef>
+#include <string_view>
 
 #include "support/NumberText.h"
 

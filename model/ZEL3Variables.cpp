@@ -1,8 +1,15 @@
 #include "model/ZEL3Variables.h"
 
 #include <algorithm>
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <vector>
 
 #include "model/CodeTables.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

@@ -3,7 +3,14 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
+#include "panel/SoftPositions.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -1,7 +1,16 @@
 #include "panel/HardKeys.h"
 
+#include <cstdint>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MenuFill.h"
 #include "panel/SoftPositions.h"
+#include "platform/Controls.h"
 #include "support/NumberText.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 namespace {

@@ -1,11 +1,14 @@
 #pragma once
 // The hard keys: each lays out its menu and fills it.
 
+#include <cstdint>
+
 #include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
 #include "panel/SoftPanel.h"
+#include "platform/Event.h"
 #include "trace/Interlock.h"
 
 namespace zel {

@@ -2,8 +2,11 @@
 
 #include <string_view>
 
+#include "forms/Forms.h"
+#include "platform/Controls.h"
+#include "platform/Event.h"
+#include "platform/Form.h"
 #include "platform/Graph.h"
-#include "platform/KeyInput.h"
 
 namespace zel {
 namespace {

@@ -3,7 +3,9 @@
 
 #include <string_view>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "platform/Event.h"
 
 namespace zel {
 

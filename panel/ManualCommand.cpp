@@ -1,12 +1,20 @@
 #include "panel/ManualCommand.h"
 
 #include <algorithm>
+#include <string>
 #include <string_view>
 
+#include "forms/ControllerForm.h"
+#include "link/InstrumentLink.h"
 #include "link/WireText.h"
+#include "link/ZELBas.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 namespace {

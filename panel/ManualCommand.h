@@ -4,7 +4,13 @@
 #include <string>
 
 #include "forms/ControllerForm.h"
+#include "link/AnswerReader.h"
+#include "link/ByteLink.h"
 #include "link/InstrumentLink.h"
+#include "link/ZELBas.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
 #include "trace/Interlock.h"
 
 namespace zel {

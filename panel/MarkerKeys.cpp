@@ -1,10 +1,22 @@
 #include "panel/MarkerKeys.h"
 
-#include "model/Numeric.h"
+#include <string_view>
+#include <vector>
+
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MarkerReadout.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
+#include "platform/Graph.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "trace/FrequencyLabels.h"
+#include "trace/Interlock.h"
+#include "trace/TraceReader.h"
 
 namespace zel {
 namespace {

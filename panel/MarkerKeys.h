@@ -5,6 +5,10 @@
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MarkerReadout.h"
+#include "platform/Controls.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
 #include "trace/Interlock.h"
 #include "trace/TraceReader.h"
 

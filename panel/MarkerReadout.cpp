@@ -1,6 +1,11 @@
 #include "panel/MarkerReadout.h"
 
+#include <string>
+
+#include "forms/ControllerForm.h"
 #include "model/Numeric.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
 #include "support/NumberText.h"
 #include "trace/GraphScaling.h"
 

@@ -1,11 +1,19 @@
 #include "panel/MenuFill.h"
 
 #include <algorithm>
+#include <cstdint>
+#include <string_view>
 #include <variant>
 #include <vector>
 
+#include "forms/ControllerForm.h"
+#include "model/CodeTables.h"
+#include "model/MirrorField.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
+#include "panel/SoftPositions.h"
 #include "panel/TriggerKey.h"
+#include "platform/Controls.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

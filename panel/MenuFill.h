@@ -1,7 +1,6 @@
 #pragma once
 // Fills the boxes of a menu from the mirror, asking the instrument on the menu's first visit.
 
-#include <cstdint>
 #include <string>
 #include <string_view>
 

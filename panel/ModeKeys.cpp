@@ -1,10 +1,23 @@
 #include "panel/ModeKeys.h"
 
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
+#include "panel/MenuFill.h"
 #include "panel/ModeOptions.h"
 #include "panel/SoftPositions.h"
+#include "platform/Controls.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
 #include "trace/FrequencyLabels.h"
+#include "trace/GraphScaling.h"
+#include "trace/Interlock.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {

@@ -1,11 +1,18 @@
 #pragma once
 // The measurement modes, and the preset.
 
+#include <cstdint>
+
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/MainForm.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
 #include "panel/SoftPanel.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
 #include "trace/GraphScaling.h"
 #include "trace/Interlock.h"
 

@@ -1,5 +1,8 @@
 #include "panel/ModeOptions.h"
 
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
+
 namespace zel {
 namespace {
 

@@ -2,6 +2,7 @@
 // The measurement modes' keys and option buttons on the panel.
 
 #include "forms/ControllerForm.h"
+#include "platform/Controls.h"
 
 namespace zel {
 

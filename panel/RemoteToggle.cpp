@@ -1,6 +1,9 @@
 #include "panel/RemoteToggle.h"
 
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
 #include "platform/Pointer.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 

@@ -3,6 +3,7 @@
 
 #include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
+#include "platform/Event.h"
 #include "trace/Interlock.h"
 
 namespace zel {

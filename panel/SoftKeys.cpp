@@ -1,6 +1,11 @@
 #include "panel/SoftKeys.h"
 
+#include "forms/ControllerForm.h"
+#include "panel/Z9GetCommands.h"
+#include "panel/Z9SetCommands.h"
+#include "platform/Controls.h"
 #include "platform/Pointer.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 

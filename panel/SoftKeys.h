@@ -4,6 +4,7 @@
 #include "forms/ControllerForm.h"
 #include "panel/Z9GetCommands.h"
 #include "panel/Z9SetCommands.h"
+#include "platform/Event.h"
 #include "trace/Interlock.h"
 
 namespace zel {

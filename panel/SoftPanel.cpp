@@ -1,7 +1,16 @@
 #include "panel/SoftPanel.h"
 
+#include <cstdint>
+#include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
+
+#include "forms/ControllerForm.h"
+#include "model/CodeTables.h"
+#include "panel/SoftPositions.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

@@ -1,9 +1,16 @@
 #include "panel/SoftPositions.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <iterator>
+#include <span>
+#include <string>
+#include <string_view>
 
+#include "forms/ControllerForm.h"
+#include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
 #include "panel/MenuFill.h"
 #include "support/NumberText.h"
 

@@ -1,7 +1,6 @@
 #pragma once
 // The soft positions as one table: what each position of each menu shows, asks, sends and stores.
 
-#include <array>
 #include <cstdint>
 #include <optional>
 #include <span>
@@ -11,6 +10,7 @@
 #include "forms/ControllerForm.h"
 #include "model/CodeTables.h"
 #include "model/MirrorField.h"
+#include "model/ZEL3Variables.h"
 
 namespace zel {
 

@@ -1,6 +1,12 @@
 #include "panel/SpectrogramKeys.h"
 
+#include <string>
+
+#include "files/FileOps.h"
 #include "files/OutputFile.h"
+#include "forms/ControllerForm.h"
+#include "platform/MessageBox.h"
+#include "waterfall/SweepHistory.h"
 
 namespace zel {
 

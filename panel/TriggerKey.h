@@ -1,6 +1,8 @@
 #pragma once
 // The last key of the sweep menu: level of the video trigger, or delay.
 
+#include <string>
+
 #include "forms/ControllerForm.h"
 #include "model/CodeTables.h"
 

@@ -1,5 +1,11 @@
 #include "panel/WaterfallKeys.h"
 
+#include <string>
+
+#include "files/FileOps.h"
+#include "forms/WaterfallForm.h"
+#include "platform/MessageBox.h"
+
 namespace zel {
 
 WaterfallKeys::WaterfallKeys(WaterfallForm& form, FileOps& files, MessageBoxes& boxes)

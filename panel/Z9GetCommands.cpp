@@ -3,9 +3,20 @@
 #include <algorithm>
 #include <cmath>
 #include <optional>
+#include <string>
 
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
+#include "model/CodeTables.h"
+#include "model/MirrorField.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
+#include "panel/KeyRoutines.h"
+#include "panel/MarkerReadout.h"
+#include "panel/SoftPositions.h"
 #include "panel/TriggerKey.h"
+#include "platform/Controls.h"
+#include "platform/MessageBox.h"
 #include "support/NumberText.h"
 #include "support/StringOp.h"
 #include "trace/FrequencyLabels.h"

@@ -5,6 +5,7 @@
 
 #include "forms/ControllerForm.h"
 #include "link/CommandExchange.h"
+#include "model/CodeTables.h"
 #include "model/ZEL3Variables.h"
 #include "panel/KeyRoutines.h"
 #include "panel/SoftPositions.h"

@@ -2,15 +2,27 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdint>
 #include <stdexcept>
+#include <string>
 
+#include "forms/ControllerForm.h"
+#include "link/CommandExchange.h"
 #include "model/CodeTables.h"
+#include "model/MirrorField.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
+#include "panel/KeyRoutines.h"
 #include "panel/ModeOptions.h"
+#include "panel/SoftPositions.h"
 #include "panel/TriggerKey.h"
+#include "panel/Z9GetCommands.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
+#include "trace/FrequencyLabels.h"
 
 namespace zel {
 namespace {

@@ -1,8 +1,6 @@
 #pragma once
 // The names that the texts and flags of a graph's annotations have in the picture's data.
 
-#include "trace/ViewAnnotations.h"
-
 namespace zel {
 
 /// Calls `visit(name, text)` for each text; `View` is `ViewAnnotations`, constant or not.

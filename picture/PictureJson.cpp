@@ -1,7 +1,15 @@
 #include "picture/PictureJson.h"
 
+#include <cstdint>
+
+#include "forms/WaterfallForm.h"
 #include "picture/AnnotationFields.h"
+#include "platform/Graph.h"
+#include "platform/Graph3D.h"
 #include "support/JsonWriter.h"
+#include "trace/ViewAnnotations.h"
+#include "waterfall/SweepHistory.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

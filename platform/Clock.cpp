@@ -1,6 +1,10 @@
 #include "platform/Clock.h"
 
 #include <chrono>
+#include <cmath>
+#include <cstddef>
+#include <string>
+#include <utility>
 
 namespace zel {
 namespace {

@@ -1,6 +1,12 @@
 #include "platform/Controls.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "platform/Form.h"
 
 namespace zel {
 

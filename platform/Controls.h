@@ -7,7 +7,9 @@
 #include <utility>
 #include <vector>
 
+#include "platform/Event.h"
 #include "platform/Form.h"
+#include "platform/Property.h"
 
 namespace zel {
 

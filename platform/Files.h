@@ -1,6 +1,7 @@
 #pragma once
 // The files of the machine: looked at, read, and written so that a failure loses nothing.
 
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <span>

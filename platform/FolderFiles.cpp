@@ -1,6 +1,12 @@
 #include "platform/FolderFiles.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "platform/Files.h"
 
 namespace zel {
 namespace {

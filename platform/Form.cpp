@@ -2,6 +2,10 @@
 
 #include <algorithm>
 #include <iterator>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
 namespace zel {
 

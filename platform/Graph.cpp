@@ -1,5 +1,10 @@
 #include "platform/Graph.h"
 
+#include <cstddef>
+#include <vector>
+
+#include "platform/Form.h"
+
 namespace zel {
 
 void Graph::setXRange(double minimum, double maximum) {

@@ -5,7 +5,9 @@
 #include <utility>
 #include <vector>
 
+#include "platform/Event.h"
 #include "platform/Form.h"
+#include "platform/Property.h"
 
 namespace zel {
 

@@ -1,7 +1,12 @@
 #include "platform/Graph3D.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <string>
 #include <utility>
+#include <vector>
+
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

@@ -5,10 +5,12 @@
 #include <cstddef>
 #include <deque>
 #include <string>
-#include <utility>
 #include <vector>
 
+#include "platform/Event.h"
+#include "platform/Form.h"
 #include "platform/Graph.h"
+#include "platform/Property.h"
 
 namespace zel {
 

@@ -1,6 +1,10 @@
 #include "platform/KeyInput.h"
 
+#include <cstddef>
 #include <cstdint>
+#include <string>
+
+#include "platform/Controls.h"
 
 namespace zel {
 namespace {

@@ -1,5 +1,8 @@
 #include "platform/ModalForm.h"
 
+#include "platform/Events.h"
+#include "platform/Form.h"
+
 namespace zel {
 namespace {
 

@@ -1,5 +1,9 @@
 #include "platform/TimerDriver.h"
 
+#include <optional>
+
+#include "platform/Controls.h"
+
 namespace zel {
 
 TimerDriver::~TimerDriver() {

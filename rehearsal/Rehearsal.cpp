@@ -2,15 +2,27 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
 #include <filesystem>
 #include <set>
+#include <string>
+#include <string_view>
 #include <tuple>
+#include <vector>
 
 #include "ZELSim/InProcessPort.h"
+#include "platform/Files.h"
+#include "platform/LinkAddress.h"
+#include "platform/MessageBox.h"
+#include "platform/SerialPort.h"
 #include "platform/virtual/VirtualPlatform.h"
 #include "rehearsal/RehearsalDisk.h"
+#include "script/Executor.h"
+#include "script/Language.h"
 #include "script/LineCheck.h"
 #include "script/ScriptFile.h"
+#include "script/ScriptRun.h"
 #include "script/Scripts.h"
 #include "support/NumberText.h"
 #include "support/Text.h"

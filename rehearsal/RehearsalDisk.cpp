@@ -1,9 +1,17 @@
 #include "rehearsal/RehearsalDisk.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <filesystem>
+#include <memory>
+#include <span>
+#include <string>
+#include <string_view>
 #include <utility>
+#include <vector>
 
+#include "platform/Files.h"
 #include "support/FileText.h"
 
 namespace zel {

@@ -3,7 +3,11 @@
 
 #include <functional>
 #include <map>
+#include <memory>
 #include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
 #include "platform/Files.h"
 

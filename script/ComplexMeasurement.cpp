@@ -1,7 +1,11 @@
 #include "script/ComplexMeasurement.h"
 
+#include <cstddef>
+#include <cstdint>
 #include <limits>
 #include <numeric>
+#include <string>
+#include <vector>
 
 #include "script/ScriptFailure.h"
 #include "script/Statistics.h"

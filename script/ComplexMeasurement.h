@@ -1,8 +1,11 @@
 #pragma once
 // The statement of the complex traces: takes them, reduces each, shows and writes the result.
 
+#include <cstddef>
+#include <vector>
+
 #include "forms/Forms.h"
-#include "platform/Session.h"
+#include "forms/ScriptForms.h"
 #include "script/PhaseDisplay.h"
 #include "script/ResultOutput.h"
 #include "script/ScriptParts.h"

@@ -1,11 +1,22 @@
 #include "script/Executor.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <exception>
+#include <string>
+#include <vector>
 
+#include "forms/Forms.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "script/ComplexMeasurement.h"
+#include "script/Language.h"
+#include "script/ResultOutput.h"
+#include "script/ScriptParts.h"
 #include "support/Text.h"
 #include "support/TimeText.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 namespace {

@@ -1,9 +1,13 @@
 #pragma once
 // Runs the list of the script window from top to bottom, a statement at a time.
 
+#include <cstdint>
 #include <string>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/ScriptForms.h"
+#include "platform/Clock.h"
 #include "platform/Event.h"
 #include "platform/Session.h"
 #include "script/ComplexMeasurement.h"

@@ -2,10 +2,15 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
 #include <limits>
+#include <string>
 
 #include "model/Numeric.h"
+#include "platform/MessageBox.h"
 #include "script/Executor.h"
+#include "script/Language.h"
 #include "script/ScriptFailure.h"
 #include "support/NumberText.h"
 #include "support/Text.h"

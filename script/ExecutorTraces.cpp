@@ -1,13 +1,16 @@
 // The statements of a run that take traces, load them and save them.
 
-#include <algorithm>
 #include <cmath>
 #include <limits>
+#include <string>
 
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "platform/Files.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
 #include "script/Executor.h"
+#include "script/Language.h"
 #include "script/ResultNames.h"
 #include "script/ScriptFailure.h"
 #include "support/CodePage.h"

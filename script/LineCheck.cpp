@@ -1,7 +1,10 @@
 #include "script/LineCheck.h"
 
 #include <cmath>
-#include <optional>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
 #include "model/Numeric.h"
 #include "script/Language.h"

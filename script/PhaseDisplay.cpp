@@ -1,9 +1,13 @@
 #include "script/PhaseDisplay.h"
 
+#include <string>
+
+#include "forms/ScriptForms.h"
 #include "model/Numeric.h"
+#include "platform/Controls.h"
+#include "platform/Events.h"
 #include "script/Statistics.h"
 #include "support/RTFBoxManager.h"
-#include "support/Text.h"
 
 namespace zel {
 namespace {

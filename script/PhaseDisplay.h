@@ -1,8 +1,6 @@
 #pragma once
 // The window of the complex measurements: the figures of the newest one, the rows of all, the unit.
 
-#include <string>
-
 #include "forms/ScriptForms.h"
 #include "platform/Event.h"
 #include "platform/Events.h"

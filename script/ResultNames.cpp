@@ -2,7 +2,10 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <optional>
+#include <string>
 
+#include "platform/Files.h"
 #include "support/CodePage.h"
 #include "support/Text.h"
 

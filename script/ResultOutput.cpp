@@ -2,9 +2,18 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
 
+#include "files/FileOps.h"
 #include "files/OutputFile.h"
+#include "forms/Forms.h"
 #include "model/Numeric.h"
+#include "platform/Clock.h"
+#include "platform/MessageBox.h"
+#include "platform/Session.h"
 #include "script/ResultNames.h"
 #include "support/CodePage.h"
 #include "support/NumberText.h"

@@ -5,7 +5,10 @@
 #include <string>
 
 #include "files/FileOps.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/ScriptForms.h"
+#include "platform/Clock.h"
 #include "platform/Event.h"
 #include "platform/Session.h"
 

@@ -2,7 +2,10 @@
 
 #include <filesystem>
 
+#include "files/FileOps.h"
 #include "files/OutputFile.h"
+#include "forms/ScriptForms.h"
+#include "platform/MessageBox.h"
 #include "script/ScriptFile.h"
 
 namespace zel {

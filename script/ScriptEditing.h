@@ -1,8 +1,6 @@
 #pragma once
 // The editor's buttons: what is written, where, and when the window closes.
 
-#include <string>
-
 #include "files/FileOps.h"
 #include "forms/ScriptForms.h"
 #include "platform/Event.h"

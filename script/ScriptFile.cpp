@@ -1,8 +1,15 @@
 #include "script/ScriptFile.h"
 
+#include <cstddef>
 #include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
 #include <utility>
+#include <vector>
 
+#include "platform/Files.h"
 #include "support/CodePage.h"
 #include "support/FileText.h"
 #include "support/Text.h"

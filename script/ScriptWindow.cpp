@@ -1,9 +1,16 @@
 #include "script/ScriptWindow.h"
 
+#include <cstddef>
 #include <filesystem>
 #include <optional>
+#include <vector>
 
+#include "files/FileOps.h"
+#include "forms/Forms.h"
+#include "platform/MessageBox.h"
 #include "platform/ModalForm.h"
+#include "platform/Services.h"
+#include "platform/Session.h"
 #include "script/Language.h"
 #include "script/ScriptFile.h"
 #include "support/CodePage.h"

@@ -4,8 +4,11 @@
 #include <string>
 
 #include "files/FileOps.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/ScriptForms.h"
 #include "platform/Event.h"
+#include "platform/Services.h"
 #include "platform/Session.h"
 
 namespace zel {

@@ -2,6 +2,7 @@
 // The room's modules together, wired to one another.
 
 #include "forms/Forms.h"
+#include "platform/Services.h"
 #include "platform/Session.h"
 #include "script/ComplexMeasurement.h"
 #include "script/Executor.h"
@@ -10,6 +11,7 @@
 #include "script/ScriptEditing.h"
 #include "script/ScriptParts.h"
 #include "script/ScriptWindow.h"
+#include "trace/Interlock.h"
 
 namespace zel {
 

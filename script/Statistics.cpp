@@ -1,7 +1,10 @@
 #include "script/Statistics.h"
 
 #include <cmath>
+#include <cstddef>
 #include <numeric>
+#include <span>
+#include <vector>
 
 #include "model/Numeric.h"
 

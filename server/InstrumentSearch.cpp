@@ -1,7 +1,16 @@
 #include "server/InstrumentSearch.h"
 
+#include <cstddef>
+#include <string>
+
+#include "forms/ServerForm.h"
 #include "link/AnswerReader.h"
 #include "link/ByteLink.h"
+#include "platform/Clock.h"
+#include "platform/MessageBox.h"
+#include "platform/SerialPort.h"
+#include "platform/Session.h"
+#include "support/RootDebug.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
 

@@ -1,7 +1,14 @@
 #include "server/Networks.h"
 
 #include <algorithm>
+#include <array>
 #include <charconv>
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <string_view>
+#include <system_error>
+#include <vector>
 
 namespace zel {
 namespace {

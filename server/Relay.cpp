@@ -1,9 +1,18 @@
 #include "server/Relay.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
 #include <utility>
 
+#include "forms/ServerForm.h"
 #include "link/TCPIPOps.h"
+#include "platform/SerialPort.h"
+#include "platform/Session.h"
+#include "platform/Socket.h"
+#include "support/RootDebug.h"
 #include "support/Text.h"
 
 namespace zel {

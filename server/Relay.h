@@ -2,10 +2,13 @@
 // Carries bytes between the client and the instrument, unchanged, and groups what comes back: a
 // whole reply to what the client asked goes on at once, all else when the line has been quiet.
 
+#include <cstddef>
 #include <cstdint>
 #include <string>
 
 #include "forms/ServerForm.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
 #include "platform/SerialPort.h"
 #include "platform/Session.h"
 #include "platform/Socket.h"

@@ -1,5 +1,7 @@
 #include "server/ReplyWatch.h"
 
+#include <string_view>
+
 #include "support/Text.h"
 
 namespace zel {

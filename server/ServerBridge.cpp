@@ -1,8 +1,20 @@
 #include "server/ServerBridge.h"
 
+#include <cstdint>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "forms/ServerForm.h"
 #include "link/TCPIPOps.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/SerialPort.h"
+#include "platform/ServerSocket.h"
+#include "platform/Session.h"
+#include "platform/Socket.h"
+#include "server/Networks.h"
 #include "support/NumberText.h"
+#include "support/RootDebug.h"
 #include "support/StringOp.h"
 #include "support/Text.h"
 

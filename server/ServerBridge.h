@@ -7,12 +7,15 @@
 
 #include "forms/ControllerForm.h"
 #include "forms/ServerForm.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
 #include "platform/SerialPort.h"
 #include "platform/ServerSocket.h"
 #include "platform/Session.h"
 #include "server/InstrumentSearch.h"
 #include "server/Networks.h"
 #include "server/Relay.h"
+#include "support/RootDebug.h"
 
 namespace zel {
 

@@ -1,10 +1,21 @@
 #include "server/ServerDialog.h"
 
+#include <cstddef>
+#include <string>
 #include <utility>
+#include <vector>
 
+#include "forms/Forms.h"
 #include "link/RS232Ops.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/ServerSocket.h"
+#include "platform/Session.h"
+#include "server/ServerBridge.h"
 #include "support/NumberText.h"
+#include "support/RootDebug.h"
 #include "support/Text.h"
 #include "support/TimeText.h"
 

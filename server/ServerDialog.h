@@ -2,14 +2,18 @@
 // The server's window: its fields, its buttons, what it keeps, and what it shows of the bridge.
 
 #include <string>
-#include <vector>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/ServerForm.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
 #include "platform/SerialPort.h"
 #include "platform/ServerSocket.h"
 #include "platform/Services.h"
 #include "platform/Session.h"
 #include "server/ServerBridge.h"
+#include "support/RootDebug.h"
 
 namespace zel {
 

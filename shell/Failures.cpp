@@ -1,8 +1,14 @@
 #include "shell/Failures.h"
 
+#include <functional>
+#include <string>
 #include <utility>
+#include <vector>
 
+#include "shell/Logs.h"
 #include "support/AtEnd.h"
+#include "support/ErrorReport.h"
+#include "support/RootDebug.h"
 #include "support/RunTimeError.h"
 
 namespace zel {

@@ -3,7 +3,7 @@
 
 #include <functional>
 
-#include "forms/SupportForms.h"
+#include "platform/Event.h"
 #include "shell/Logs.h"
 #include "support/ErrorReport.h"
 

@@ -1,5 +1,10 @@
 #include "shell/Guards.h"
 
+#include <string>
+#include <utility>
+
+#include "platform/MessageBox.h"
+#include "platform/Platform.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -3,8 +3,8 @@
 // cannot be stored, and the record of what goes over the lines.
 
 #include <functional>
+#include <optional>
 #include <string>
-#include <utility>
 
 #include "platform/MessageBox.h"
 #include "platform/Platform.h"

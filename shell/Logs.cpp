@@ -1,7 +1,10 @@
 #include "shell/Logs.h"
 
 #include <algorithm>
+#include <string>
+#include <string_view>
 
+#include "platform/Platform.h"
 #include "support/Text.h"
 #include "support/Windows1252.h"
 

@@ -5,6 +5,7 @@
 
 #include "platform/Event.h"
 #include "platform/Platform.h"
+#include "platform/Services.h"
 #include "support/DebugIf.h"
 #include "support/RootDebug.h"
 

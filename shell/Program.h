@@ -8,6 +8,9 @@
 #include "forms/Forms.h"
 #include "link/ZELBas.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
+#include "platform/Files.h"
 #include "platform/LinkAddress.h"
 #include "platform/Platform.h"
 

@@ -1,5 +1,9 @@
 #include "shell/ProgramEnd.h"
 
+#include "forms/Forms.h"
+#include "platform/Form.h"
+#include "platform/MessageBox.h"
+
 namespace zel {
 namespace {
 

@@ -1,6 +1,7 @@
 #pragma once
 // The two doors out of the program.
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "platform/Event.h"
 #include "platform/MessageBox.h"

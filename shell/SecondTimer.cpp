@@ -1,5 +1,9 @@
 #include "shell/SecondTimer.h"
 
+#include "connection/SessionClock.h"
+#include "forms/ControllerForm.h"
+#include "server/ServerBridge.h"
+
 namespace zel {
 
 SecondTimer::SecondTimer(ControllerForm& panel, ServerBridge& server, SessionClock& sessionClock)

@@ -1,6 +1,9 @@
 #include "shell/ServerMode.h"
 
+#include "forms/Forms.h"
+#include "platform/Events.h"
 #include "platform/ModalForm.h"
+#include "platform/Services.h"
 
 namespace zel {
 namespace {

@@ -1,6 +1,7 @@
 #pragma once
 // The menu entries around server mode: its window, and running it at the user's start-up.
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "platform/Event.h"
 #include "platform/Events.h"

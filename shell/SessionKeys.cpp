@@ -1,5 +1,12 @@
 #include "shell/SessionKeys.h"
 
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "platform/MessageBox.h"
+#include "platform/Services.h"
+#include "support/SessionLog.h"
+#include "support/SessionText.h"
 #include "support/Text.h"
 
 namespace zel {

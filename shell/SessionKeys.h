@@ -1,7 +1,10 @@
 #pragma once
 // The menu entry that records the session.
 
+#include <string>
+
 #include "forms/ControllerForm.h"
+#include "platform/Event.h"
 #include "platform/MessageBox.h"
 #include "platform/Services.h"
 #include "support/SessionLog.h"

@@ -1,8 +1,16 @@
 #include "shell/StartUp.h"
 
 #include "connection/Profiles.h"
+#include "forms/Forms.h"
+#include "forms/MainForm.h"
+#include "model/ZEL3Variables.h"
+#include "panel/SoftPanel.h"
+#include "platform/Form.h"
+#include "shell/ServerMode.h"
 #include "support/CommandWord.h"
 #include "support/TimeText.h"
+#include "support/VersionInfo.h"
+#include "trace/GraphInteraction.h"
 
 namespace zel {
 namespace {

@@ -1,6 +1,7 @@
 #pragma once
 // What happens from the start of the program until the panel waits for the user.
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
 #include "panel/SoftPanel.h"

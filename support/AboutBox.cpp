@@ -1,9 +1,17 @@
 #include "support/AboutBox.h"
 
+#include <cstdint>
+#include <string>
+
+#include "forms/SupportForms.h"
+#include "platform/Controls.h"
+#include "platform/MessageBox.h"
 #include "platform/ModalForm.h"
 #include "support/RegAccess.h"
+#include "support/SupportReport.h"
 #include "support/Text.h"
 #include "support/VersionInfo.h"
+#include "support/cRegistry.h"
 
 namespace zel {
 namespace {

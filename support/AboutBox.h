@@ -5,7 +5,11 @@
 #include <string>
 
 #include "forms/SupportForms.h"
+#include "platform/Clock.h"
+#include "platform/Event.h"
 #include "platform/Events.h"
+#include "platform/Files.h"
+#include "platform/Machine.h"
 #include "platform/MessageBox.h"
 #include "platform/Services.h"
 #include "support/DriverFolders.h"

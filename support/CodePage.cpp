@@ -1,6 +1,9 @@
 #include "support/CodePage.h"
 
+#include <cstddef>
 #include <optional>
+#include <string>
+#include <string_view>
 
 #include "support/Text.h"
 #include "support/Windows1252.h"

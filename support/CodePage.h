@@ -1,6 +1,7 @@
 #pragma once
 // The single-byte code page of scripts and result files, Windows-1252, beside UTF-8.
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 

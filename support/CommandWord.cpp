@@ -1,5 +1,6 @@
 #include "support/CommandWord.h"
 
+#include "forms/ControllerForm.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -1,7 +1,9 @@
 #include "support/DebugIf.h"
 
 #include <optional>
+#include <string>
 
+#include "platform/Files.h"
 #include "support/FileText.h"
 #include "support/NumberText.h"
 #include "support/Text.h"

@@ -1,7 +1,10 @@
 #include "support/DriverFolders.h"
 
 #include <algorithm>
+#include <string>
 
+#include "platform/FolderFiles.h"
+#include "platform/Machine.h"
 #include "support/RegAccess.h"
 #include "support/Text.h"
 #include "support/cRegistry.h"

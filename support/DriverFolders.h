@@ -5,6 +5,7 @@
 #include <memory>
 #include <string>
 
+#include "platform/FolderFiles.h"
 #include "platform/Machine.h"
 
 namespace zel {

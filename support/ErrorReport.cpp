@@ -1,7 +1,17 @@
 #include "support/ErrorReport.h"
 
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+#include "forms/SupportForms.h"
+#include "platform/Controls.h"
+#include "platform/Files.h"
+#include "platform/MessageBox.h"
 #include "platform/ModalForm.h"
 #include "support/FileText.h"
+#include "support/RootDebug.h"
 #include "support/SupportAddress.h"
 #include "support/Text.h"
 

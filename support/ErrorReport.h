@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "forms/SupportForms.h"
+#include "platform/Event.h"
 #include "platform/Events.h"
 #include "platform/Files.h"
 #include "platform/MessageBox.h"

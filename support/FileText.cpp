@@ -1,9 +1,14 @@
 #include "support/FileText.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <memory>
+#include <optional>
 #include <span>
+#include <string>
 
+#include "platform/Files.h"
 #include "support/NumberText.h"
 
 namespace zel {

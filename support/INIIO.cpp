@@ -3,8 +3,14 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <cstddef>
+#include <cstdint>
 #include <limits>
+#include <optional>
+#include <string>
+#include <variant>
 
+#include "platform/Files.h"
 #include "support/IniFile.h"
 #include "support/NumberText.h"
 #include "support/Text.h"

@@ -1,10 +1,15 @@
 #include "support/IniFile.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <iterator>
+#include <optional>
 #include <string>
+#include <string_view>
 #include <utility>
+#include <vector>
 
+#include "platform/Files.h"
 #include "support/FileText.h"
 #include "support/Text.h"
 

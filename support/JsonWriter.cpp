@@ -1,6 +1,8 @@
 #include "support/JsonWriter.h"
 
 #include <cmath>
+#include <string>
+#include <string_view>
 
 #include "support/NumberText.h"
 #include "support/Text.h"

@@ -2,9 +2,12 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 
+#include "platform/LinkAddress.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -1,5 +1,12 @@
 #include "support/LoggedDialogs.h"
 
+#include <optional>
+#include <string>
+
+#include "platform/MessageBox.h"
+#include "platform/Services.h"
+#include "support/SessionLog.h"
+
 namespace zel {
 namespace {
 

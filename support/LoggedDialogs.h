@@ -1,6 +1,9 @@
 #pragma once
 // Boxes and file dialogs whose answers go into the session log, as lines of a panel session.
 
+#include <optional>
+#include <string>
+
 #include "platform/MessageBox.h"
 #include "platform/Services.h"
 #include "support/SessionLog.h"

@@ -1,7 +1,10 @@
 #include "support/MTStandard.h"
 
 #include <cmath>
+#include <cstdint>
+#include <string>
 
+#include "platform/Clock.h"
 #include "support/RootDebug.h"
 
 namespace zel {

@@ -4,6 +4,11 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <system_error>
 
 #include "support/Text.h"
 

@@ -1,8 +1,12 @@
 #include "support/RTFBoxManager.h"
 
+#include <cstddef>
+#include <string_view>
 #include <utility>
 #include <vector>
 
+#include "platform/Controls.h"
+#include "platform/Form.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 

@@ -1,7 +1,12 @@
 #include "support/RTFGen.h"
 
+#include <cstddef>
 #include <cstdint>
+#include <string>
+#include <vector>
 
+#include "platform/Controls.h"
+#include "platform/Form.h"
 #include "support/ColorsEX.h"
 
 namespace zel {

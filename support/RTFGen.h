@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 

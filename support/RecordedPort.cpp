@@ -1,7 +1,12 @@
 #include "support/RecordedPort.h"
 
+#include <string>
+#include <string_view>
 #include <utility>
 
+#include "platform/SerialPort.h"
+#include "platform/Socket.h"
+#include "support/SessionLog.h"
 #include "support/Text.h"
 
 namespace zel {

@@ -1,8 +1,11 @@
 #pragma once
 // A serial port and a socket whose bytes and events go into the session log.
 
+#include <cstddef>
 #include <string>
+#include <string_view>
 
+#include "platform/Event.h"
 #include "platform/SerialPort.h"
 #include "platform/Socket.h"
 #include "support/SessionLog.h"

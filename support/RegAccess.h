@@ -1,6 +1,7 @@
 #pragma once
 // Reading what is installed on the machine, a value at a time.
 
+#include <cstdint>
 #include <string>
 
 #include "support/cRegistry.h"

@@ -1,7 +1,11 @@
 #include "support/RoboHelp_CSH.h"
 
 #include <filesystem>
+#include <functional>
+#include <string>
+#include <string_view>
 
+#include "platform/MessageBox.h"
 #include "support/Text.h"
 
 namespace zel {

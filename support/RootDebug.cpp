@@ -2,8 +2,15 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <string>
 #include <utility>
+#include <vector>
 
+#include "platform/Clock.h"
+#include "platform/Files.h"
+#include "platform/Services.h"
 #include "support/MTStandard.h"
 #include "support/Text.h"
 

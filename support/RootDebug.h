@@ -1,6 +1,7 @@
 #pragma once
 // The structured log: entries with a level, and the stack of the calls in progress.
 
+#include <cstddef>
 #include <cstdint>
 #include <string>
 #include <vector>

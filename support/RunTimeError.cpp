@@ -1,8 +1,10 @@
 #include "support/RunTimeError.h"
 
+#include <exception>
 #include <new>
 #include <system_error>
 
+#include "support/RootDebug.h"
 #include "support/cRegistry.h"
 
 namespace zel {

@@ -1,6 +1,11 @@
 #include "support/SessionCompare.h"
 
+#include <cstddef>
+#include <string>
+#include <string_view>
+
 #include "platform/ByteText.h"
+#include "support/SessionText.h"
 #include "support/Text.h"
 
 namespace zel {

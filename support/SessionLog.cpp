@@ -1,9 +1,16 @@
 #include "support/SessionLog.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <string>
+#include <string_view>
 #include <utility>
+#include <vector>
 
+#include "platform/Clock.h"
+#include "platform/Files.h"
 #include "support/FileText.h"
+#include "support/SessionText.h"
 #include "support/Text.h"
 
 namespace zel {

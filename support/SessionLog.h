@@ -1,6 +1,8 @@
 #pragma once
 // Writes down a session: each byte each way, the port's events and what the user does.
 
+#include <cstddef>
+#include <cstdint>
 #include <deque>
 #include <string>
 #include <string_view>

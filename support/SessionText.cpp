@@ -1,7 +1,13 @@
 #include "support/SessionText.h"
 
 #include <charconv>
+#include <cstddef>
+#include <cstdint>
 #include <optional>
+#include <string>
+#include <string_view>
+#include <system_error>
+#include <vector>
 
 #include "platform/ByteText.h"
 #include "support/Text.h"

@@ -2,6 +2,10 @@
 
 #include <charconv>
 #include <cmath>
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <system_error>
 
 #include "support/Text.h"
 

@@ -1,5 +1,8 @@
 #include "support/SupportAddress.h"
 
+#include <cstddef>
+#include <string>
+
 namespace zel {
 
 // The build defines the address for this file.

@@ -1,7 +1,11 @@
 #include "support/SupportReport.h"
 
+#include <cstddef>
+#include <string>
 #include <vector>
 
+#include "platform/Clock.h"
+#include "platform/Machine.h"
 #include "platform/MessageBox.h"
 #include "support/DriverFolders.h"
 #include "support/SupportAddress.h"

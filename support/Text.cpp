@@ -2,6 +2,9 @@
 
 #include <cstdint>
 #include <cstring>
+#include <string>
+#include <string_view>
+#include <vector>
 
 #include "support/Windows1252.h"
 

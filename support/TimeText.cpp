@@ -1,6 +1,7 @@
 #include "support/TimeText.h"
 
 #include <cmath>
+#include <string>
 
 #include "platform/Clock.h"
 

@@ -1,5 +1,8 @@
 #include "support/VersionInfo.h"
 
+#include <cstdint>
+#include <string>
+
 namespace zel {
 namespace {
 

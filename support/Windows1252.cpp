@@ -1,7 +1,11 @@
 #include "support/Windows1252.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <iterator>
+#include <optional>
+#include <string>
+#include <string_view>
 
 #include "support/Text.h"
 

@@ -1,7 +1,14 @@
 #include "support/cRegistry.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <utility>
+#include <vector>
 
+#include "platform/Files.h"
+#include "support/IniFile.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-#include "support/IniFile.h"
+#include "platform/Files.h"
 
 namespace zel {
 

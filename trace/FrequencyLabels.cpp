@@ -1,6 +1,9 @@
 #include "trace/FrequencyLabels.h"
 
+#include <string>
+
 #include "model/Numeric.h"
+#include "platform/Controls.h"
 #include "platform/Pointer.h"
 #include "support/NumberText.h"
 

@@ -7,6 +7,7 @@
 #include "forms/MainForm.h"
 #include "link/CommandExchange.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Controls.h"
 #include "platform/Events.h"
 
 namespace zel {

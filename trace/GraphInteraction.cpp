@@ -1,6 +1,12 @@
 #include "trace/GraphInteraction.h"
 
+#include <string>
+
+#include "forms/ControllerForm.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Form.h"
+#include "platform/Graph.h"
 #include "support/NumberText.h"
 #include "trace/GraphScaling.h"
 

@@ -2,12 +2,20 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <string>
 #include <utility>
+#include <vector>
 
+#include "forms/ControllerForm.h"
 #include "model/CodeTables.h"
+#include "model/LevelRange.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Graph.h"
 #include "support/NumberText.h"
 #include "support/TimeText.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {

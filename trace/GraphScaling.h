@@ -2,10 +2,9 @@
 // Which range and format the axes take, and how a trace comes onto the graphs.
 
 #include <string>
-#include <vector>
 
 #include "forms/ControllerForm.h"
-#include "forms/Forms.h"
+#include "forms/WaterfallForm.h"
 #include "model/LevelRange.h"
 #include "model/ZEL3Variables.h"
 #include "platform/Clock.h"

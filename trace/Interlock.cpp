@@ -2,9 +2,19 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
+#include <functional>
+#include <string>
 #include <utility>
+#include <vector>
 
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/ZELBas.h"
+#include "platform/Form.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 
 namespace zel {
 namespace {

@@ -1,6 +1,7 @@
 #pragma once
 // Who may act when: the rules of the panel in one place, for its handlers and for every front.
 
+#include <cstddef>
 #include <cstdint>
 #include <deque>
 #include <functional>
@@ -10,8 +11,12 @@
 #include <string>
 #include <vector>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "link/ZELBas.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
+#include "platform/Form.h"
 #include "platform/Session.h"
 
 namespace zel {

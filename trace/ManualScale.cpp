@@ -2,7 +2,11 @@
 
 #include <cmath>
 
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
 #include "model/Numeric.h"
+#include "platform/Graph.h"
+#include "platform/MessageBox.h"
 #include "support/NumberText.h"
 
 namespace zel {

@@ -1,6 +1,7 @@
 #pragma once
 // The dialog that scales the y axis by hand, until the next trace scales it again.
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "platform/Event.h"
 #include "platform/MessageBox.h"

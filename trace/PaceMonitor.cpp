@@ -1,8 +1,12 @@
 #include "trace/PaceMonitor.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <string>
 
+#include "forms/ControllerForm.h"
+#include "platform/Clock.h"
 #include "support/NumberText.h"
 #include "trace/ViewAnnotations.h"
 

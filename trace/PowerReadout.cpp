@@ -1,6 +1,12 @@
 #include "trace/PowerReadout.h"
 
+#include <string>
+#include <string_view>
+
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
 #include "model/Numeric.h"
+#include "platform/Events.h"
 #include "platform/Pointer.h"
 
 namespace zel {

@@ -4,6 +4,7 @@
 #include <string>
 #include <string_view>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
 #include "platform/Event.h"

@@ -1,5 +1,9 @@
 #include "trace/Sweep.h"
 
+#include <string>
+
+#include "model/ZEL3Variables.h"
+
 namespace zel {
 
 void followMirror(Sweep& sweep, const ZEL3Variables& mirror) {

@@ -1,8 +1,19 @@
 #include "trace/SweepControl.h"
 
+#include <cstdint>
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "link/CommandExchange.h"
 #include "link/WaitNotice.h"
+#include "platform/Graph3D.h"
+#include "platform/MessageBox.h"
 #include "platform/ModalForm.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
+#include "trace/PowerReadout.h"
+#include "trace/TraceReader.h"
 
 namespace zel {
 namespace {

@@ -3,7 +3,9 @@
 
 #include "forms/Forms.h"
 #include "link/CommandExchange.h"
-#include "model/ZEL3Variables.h"
+#include "platform/Event.h"
+#include "platform/Events.h"
+#include "platform/MessageBox.h"
 #include "platform/Session.h"
 #include "trace/PowerReadout.h"
 #include "trace/TraceReader.h"

@@ -1,10 +1,15 @@
 #include "trace/TraceConversion.h"
 
 #include <cmath>
+#include <cstddef>
+#include <vector>
 
 #include "model/CodeTables.h"
+#include "model/LevelRange.h"
 #include "model/Numeric.h"
 #include "support/NumberText.h"
+#include "trace/Sweep.h"
+#include "trace/VerticalScale.h"
 
 namespace zel {
 namespace {

@@ -1,6 +1,7 @@
 #pragma once
 // Turns the raw samples of a sweep into what the graph draws and what a file keeps.
 
+#include <cstddef>
 #include <vector>
 
 #include "forms/ControllerForm.h"

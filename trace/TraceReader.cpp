@@ -2,13 +2,29 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
 #include <limits>
 #include <utility>
+#include <vector>
 
-#include "model/CodeTables.h"
+#include "forms/Forms.h"
+#include "link/InstrumentLink.h"
+#include "link/RawTrace.h"
+#include "link/ZELBas.h"
+#include "model/LevelRange.h"
+#include "model/UnsureSettings.h"
+#include "model/ZEL3Variables.h"
+#include "platform/MessageBox.h"
 #include "platform/Pointer.h"
+#include "platform/Session.h"
 #include "support/NumberText.h"
 #include "trace/FrequencyLabels.h"
+#include "trace/GraphScaling.h"
+#include "trace/PaceMonitor.h"
+#include "trace/Sweep.h"
+#include "trace/TraceConversion.h"
+#include "trace/TraceOnGraph.h"
 
 namespace zel {
 namespace {

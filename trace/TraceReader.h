@@ -1,15 +1,21 @@
 #pragma once
 // One read cycle: settings, wait for the sweep, samples, conversion, file, graph.
 
-#include <string>
+#include <cstdint>
 
 #include "forms/Forms.h"
+#include "link/BinaryTrace.h"
+#include "link/CommandExchange.h"
 #include "link/InstrumentLink.h"
+#include "link/RawTrace.h"
+#include "link/ZELBas.h"
 #include "model/ZEL3Variables.h"
-#include "platform/Events.h"
+#include "platform/Event.h"
 #include "platform/Session.h"
+#include "trace/GraphScaling.h"
 #include "trace/PaceMonitor.h"
 #include "trace/Sweep.h"
+#include "trace/TraceConversion.h"
 #include "trace/TraceOnGraph.h"
 
 namespace zel {

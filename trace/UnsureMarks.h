@@ -5,7 +5,9 @@
 #include <string>
 
 #include "forms/ControllerForm.h"
+#include "model/UnsureSettings.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Controls.h"
 
 namespace zel {
 

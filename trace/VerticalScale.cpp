@@ -1,5 +1,6 @@
 #include "trace/VerticalScale.h"
 
+#include "model/CodeTables.h"
 #include "model/Numeric.h"
 
 namespace zel {

@@ -1,9 +1,14 @@
 #include "trace/ViewAnnotations.h"
 
 #include <cmath>
+#include <string>
 
+#include "forms/ControllerForm.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "model/UnsureSettings.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Graph.h"
 #include "trace/GraphScaling.h"
 
 namespace zel {

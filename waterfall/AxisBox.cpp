@@ -3,9 +3,17 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstddef>
+#include <string>
+#include <utility>
+#include <vector>
 
+#include "platform/Graph3D.h"
 #include "support/Text.h"
 #include "waterfall/AxisTicks.h"
+#include "waterfall/Camera.h"
+#include "waterfall/RowSurface.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

@@ -1,6 +1,8 @@
 #pragma once
 // The box around the rows: its far walls with their grid, and the axes with ticks and texts.
 
+#include "platform/Graph3D.h"
+#include "waterfall/Camera.h"
 #include "waterfall/WaterfallPicture.h"
 
 namespace zel {

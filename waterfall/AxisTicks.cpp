@@ -2,8 +2,12 @@
 
 #include <algorithm>
 #include <cmath>
+#include <string>
+#include <vector>
 
 #include "model/Numeric.h"
+#include "platform/Graph.h"
+#include "platform/Graph3D.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -4,6 +4,8 @@
 #include <cmath>
 #include <numbers>
 
+#include "platform/Graph3D.h"
+
 namespace zel {
 namespace {
 

@@ -1,7 +1,9 @@
 #include "waterfall/ColourMap.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <cstddef>
 #include <numbers>
 #include <vector>
 

@@ -1,8 +1,12 @@
 #include "waterfall/ColumnCanvas.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <cstddef>
 #include <limits>
+
+#include "waterfall/ColourMap.h"
 
 namespace zel {
 namespace {

@@ -1,7 +1,8 @@
 #pragma once
 // A stripe of the picture, column by column, onto which polygons are drawn from near to far.
 
-#include <optional>
+#include <array>
+#include <cstddef>
 #include <vector>
 
 #include "waterfall/ColourMap.h"

@@ -1,5 +1,10 @@
 #include "waterfall/Graph3dOps.h"
 
+#include <string>
+
+#include "forms/WaterfallForm.h"
+#include "platform/Graph3D.h"
+
 namespace zel {
 namespace {
 

@@ -5,6 +5,7 @@
 
 #include "forms/WaterfallForm.h"
 #include "platform/Event.h"
+#include "platform/Graph3D.h"
 
 namespace zel {
 

@@ -2,12 +2,20 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <iterator>
 #include <optional>
+#include <string>
 
+#include "forms/WaterfallForm.h"
+#include "platform/Controls.h"
+#include "platform/Graph3D.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 #include "waterfall/AxisTicks.h"
+#include "waterfall/ColourMap.h"
+#include "waterfall/SurfaceRenderer.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

@@ -1,8 +1,12 @@
 #pragma once
 // The lists and boxes of the waterfall's window that say how its picture looks.
 
+#include <string>
+
 #include "forms/WaterfallForm.h"
 #include "platform/Event.h"
+#include "platform/Graph3D.h"
+#include "waterfall/SurfaceRenderer.h"
 #include "waterfall/WaterfallPicture.h"
 
 namespace zel {

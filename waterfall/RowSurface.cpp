@@ -2,8 +2,13 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <utility>
+#include <vector>
 
+#include "platform/Graph3D.h"
 #include "waterfall/Camera.h"
+#include "waterfall/ColourMap.h"
 
 namespace zel {
 namespace {

@@ -4,7 +4,6 @@
 #include <vector>
 
 #include "platform/Graph3D.h"
-#include "waterfall/ColourMap.h"
 
 namespace zel {
 

@@ -2,6 +2,10 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+
+#include "waterfall/ColourMap.h"
+#include "waterfall/SweepHistory.h"
 
 namespace zel {
 namespace {

@@ -4,10 +4,17 @@
 #include <array>
 #include <atomic>
 #include <cmath>
+#include <cstddef>
 #include <functional>
+#include <optional>
 #include <thread>
+#include <utility>
+#include <vector>
 
+#include "waterfall/Camera.h"
+#include "waterfall/ColourMap.h"
 #include "waterfall/ColumnCanvas.h"
+#include "waterfall/RowSurface.h"
 
 namespace zel {
 namespace {

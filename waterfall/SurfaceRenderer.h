@@ -1,7 +1,7 @@
 #pragma once
 // Draws rows as solids into an image, from the nearest to the farthest.
 
-#include <cstdint>
+#include <cstddef>
 #include <optional>
 #include <vector>
 

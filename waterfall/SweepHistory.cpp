@@ -4,7 +4,16 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <utility>
+#include <vector>
 
+#include "forms/Forms.h"
+#include "platform/Graph.h"
+#include "platform/Graph3D.h"
 #include "support/NumberText.h"
 
 namespace zel {

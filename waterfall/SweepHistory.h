@@ -1,6 +1,7 @@
 #pragma once
 // The sweeps of the last while, more of them than the graph of the waterfall holds.
 
+#include <cstddef>
 #include <cstdint>
 #include <deque>
 #include <functional>
@@ -8,7 +9,9 @@
 #include <string>
 #include <vector>
 
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/WaterfallForm.h"
 #include "platform/Event.h"
 
 namespace zel {

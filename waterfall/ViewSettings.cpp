@@ -1,6 +1,11 @@
 #include "waterfall/ViewSettings.h"
 
+#include <string>
+#include <string_view>
+
+#include "forms/WaterfallForm.h"
 #include "model/Numeric.h"
+#include "platform/Graph3D.h"
 #include "support/INIIO.h"
 #include "support/IniFile.h"
 #include "support/NumberText.h"

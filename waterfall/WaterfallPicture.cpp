@@ -2,8 +2,14 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
 
+#include "platform/Graph3D.h"
 #include "waterfall/AxisBox.h"
+#include "waterfall/Camera.h"
+#include "waterfall/ColourMap.h"
+#include "waterfall/RowSurface.h"
+#include "waterfall/SurfaceRenderer.h"
 
 namespace zel {
 namespace {

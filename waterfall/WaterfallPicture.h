@@ -6,6 +6,8 @@
 #include <vector>
 
 #include "platform/Graph3D.h"
+#include "waterfall/Camera.h"
+#include "waterfall/ColourMap.h"
 #include "waterfall/RowSurface.h"
 #include "waterfall/SurfaceRenderer.h"
 

@@ -1,6 +1,15 @@
 #include "waterfall/WaterfallView.h"
 
 #include <cstddef>
+#include <string>
+
+#include "forms/Forms.h"
+#include "platform/Controls.h"
+#include "platform/Files.h"
+#include "platform/Form.h"
+#include "platform/Graph3D.h"
+#include "platform/Services.h"
+#include "waterfall/Graph3dOps.h"
 
 namespace zel {
 namespace {

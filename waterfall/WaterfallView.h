@@ -1,11 +1,12 @@
 #pragma once
 // The waterfall's window: its two modes with a camera each, projection, mouse mode, markers.
 
-#include <string>
-
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
+#include "forms/WaterfallForm.h"
 #include "platform/Event.h"
 #include "platform/Files.h"
+#include "platform/Graph3D.h"
 #include "platform/Services.h"
 #include "waterfall/Graph3dOps.h"
 #include "waterfall/ViewSettings.h"

@@ -16,6 +16,7 @@
 #include "desktop/platform/QtPlatform.h"
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
+#include "platform/LinkAddress.h"
 #include "shell/Program.h"
 #include "support/NumberText.h"
 

@@ -5,11 +5,17 @@
 #include <QStyle>
 #include <QVariant>
 #include <algorithm>
+#include <functional>
+#include <string>
+#include <unordered_set>
+#include <utility>
 
 #include "desktop/binders/EventGuards.h"
 #include "desktop/binders/OwnTexts.h"
 #include "desktop/binders/ShortcutTable.h"
 #include "desktop/binders/ToolTips.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

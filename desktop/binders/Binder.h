@@ -20,10 +20,11 @@
 #include <string>
 #include <unordered_map>
 #include <unordered_set>
-#include <vector>
+#include <utility>
 
 #include "desktop/platform/KeyCodes.h"
 #include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 

@@ -3,7 +3,11 @@
 #include <QObject>
 #include <QRegularExpression>
 #include <algorithm>
+#include <cstddef>
+#include <string>
 #include <vector>
+
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

@@ -1,8 +1,13 @@
 #include <QKeyEvent>
 #include <QStyle>
 #include <QToolTip>
+#include <functional>
+#include <string>
+#include <utility>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/platform/KeyCodes.h"
+#include "platform/Controls.h"
 
 namespace zel {
 namespace {

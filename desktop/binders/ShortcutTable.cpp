@@ -1,5 +1,9 @@
 #include "desktop/binders/ShortcutTable.h"
 
+#include <vector>
+
+#include "platform/Form.h"
+
 namespace zel {
 
 const std::vector<ShortcutRow>& shortcutTable() {

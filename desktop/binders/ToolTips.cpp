@@ -3,8 +3,10 @@
 #include <QObject>
 #include <algorithm>
 #include <cmath>
+#include <string>
 
 #include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

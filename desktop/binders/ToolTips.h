@@ -3,6 +3,7 @@
 
 #include <QColor>
 #include <QString>
+#include <string>
 
 #include "platform/Form.h"
 

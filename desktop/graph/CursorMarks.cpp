@@ -1,8 +1,12 @@
 #include "desktop/graph/CursorMarks.h"
 
+#include <algorithm>
 #include <cmath>
+#include <cstddef>
 
 #include "desktop/graph/AxisText.h"
+#include "desktop/graph/GraphColors.h"
+#include "platform/Graph.h"
 
 namespace zel {
 namespace {

@@ -4,6 +4,7 @@
 #include <qcustomplot.h>
 
 #include <array>
+#include <cstddef>
 #include <functional>
 #include <string>
 

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <string>
 
 #include "model/Numeric.h"
 #include "support/NumberText.h"

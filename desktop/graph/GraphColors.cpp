@@ -1,5 +1,7 @@
 #include "desktop/graph/GraphColors.h"
 
+#include "platform/Form.h"
+
 namespace zel {
 
 GraphColors darkGraph() { return {}; }

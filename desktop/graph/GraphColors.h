@@ -3,7 +3,7 @@
 
 #include <QColor>
 
-#include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 

@@ -7,9 +7,14 @@
 #include <QPdfWriter>
 #include <QSvgGenerator>
 
+#include "desktop/graph/GraphColors.h"
 #include "desktop/graph/GraphPlot.h"
 #include "desktop/graph/MetafileEngine.h"
 #include "desktop/graph/PictureFile.h"
+#include "desktop/graph/TraceOverlay.h"
+#include "platform/Form.h"
+#include "platform/Graph.h"
+#include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {

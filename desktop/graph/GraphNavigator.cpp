@@ -1,7 +1,12 @@
 #include "desktop/graph/GraphNavigator.h"
 
 #include <cmath>
+#include <cstddef>
 #include <utility>
+
+#include "forms/ControllerForm.h"
+#include "platform/Form.h"
+#include "platform/Graph.h"
 
 namespace zel {
 namespace {

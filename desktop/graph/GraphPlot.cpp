@@ -2,14 +2,23 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <limits>
+#include <memory>
+#include <string>
+#include <utility>
+#include <vector>
 
-#include "desktop/graph/AxisText.h"
+#include "desktop/graph/AnnotationText.h"
 #include "desktop/graph/BandGraph.h"
+#include "desktop/graph/CursorMarks.h"
 #include "desktop/graph/DivisionTicker.h"
+#include "desktop/graph/GraphColors.h"
 #include "desktop/graph/PolylineClip.h"
+#include "platform/Graph.h"
 #include "support/NumberText.h"
 #include "trace/PointPairs.h"
+#include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {

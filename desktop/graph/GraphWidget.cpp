@@ -5,9 +5,17 @@
 #include <QRubberBand>
 #include <algorithm>
 #include <cmath>
+#include <functional>
+#include <memory>
+#include <optional>
+#include <string>
+#include <utility>
 
+#include "desktop/graph/GraphPlot.h"
 #include "desktop/platform/KeyCodes.h"
+#include "platform/Graph.h"
 #include "support/NumberText.h"
+#include "trace/ViewAnnotations.h"
 
 namespace zel {
 namespace {

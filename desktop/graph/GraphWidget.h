@@ -7,6 +7,7 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <string>
 
 #include "desktop/graph/GraphNavigator.h"
 #include "desktop/graph/GraphPlot.h"

@@ -6,7 +6,13 @@
 #include <QtMath>
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
 
+#include "desktop/graph/MetafileWriter.h"
 #include "desktop/graph/PolylineClip.h"
 #include "support/Windows1252.h"
 

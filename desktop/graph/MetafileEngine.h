@@ -7,6 +7,7 @@
 #include <QPaintEngine>
 #include <QPen>
 #include <QTransform>
+#include <vector>
 
 #include "desktop/graph/MetafileWriter.h"
 

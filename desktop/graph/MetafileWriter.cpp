@@ -1,8 +1,12 @@
 #include "desktop/graph/MetafileWriter.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <limits>
 #include <optional>
+#include <string>
+#include <vector>
 
 #include "support/Windows1252.h"
 

@@ -7,8 +7,11 @@
 #include <QPageSize>
 #include <QPdfWriter>
 #include <QSvgGenerator>
+#include <cstddef>
+#include <functional>
 
 #include "desktop/platform/SystemFiles.h"
+#include "platform/Files.h"
 
 namespace zel {
 namespace {

@@ -3,12 +3,17 @@
 #include <algorithm>
 #include <cstring>
 
+#include "desktop/graph/GraphColors.h"
 #include "desktop/graph/PictureFile.h"
 #include "desktop/graph/WaterfallDrawing.h"
 #include "desktop/graph/WaterfallImage.h"
+#include "forms/WaterfallForm.h"
+#include "platform/Graph.h"
 #include "support/Text.h"
 #include "waterfall/AxisTicks.h"
+#include "waterfall/ColourMap.h"
 #include "waterfall/SpectrogramImage.h"
+#include "waterfall/SweepHistory.h"
 
 namespace zel {
 namespace {

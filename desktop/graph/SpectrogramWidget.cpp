@@ -6,9 +6,16 @@
 #include <QWheelEvent>
 #include <algorithm>
 #include <cstring>
+#include <functional>
+#include <utility>
 
+#include "desktop/graph/GraphColors.h"
 #include "desktop/graph/WaterfallDrawing.h"
+#include "forms/Forms.h"
+#include "platform/Graph.h"
 #include "support/Text.h"
+#include "waterfall/ColourMap.h"
+#include "waterfall/SweepHistory.h"
 
 namespace zel {
 namespace {

@@ -6,9 +6,9 @@
 #include <functional>
 #include <utility>
 
-#include "desktop/graph/GraphPlot.h"
 #include "forms/Forms.h"
 #include "waterfall/SpectrogramImage.h"
+#include "waterfall/SweepHistory.h"
 
 namespace zel {
 

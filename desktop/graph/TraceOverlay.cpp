@@ -1,6 +1,7 @@
 #include "desktop/graph/TraceOverlay.h"
 
 #include <array>
+#include <cstddef>
 
 #include "desktop/graph/PolylineClip.h"
 

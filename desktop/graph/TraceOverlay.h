@@ -3,6 +3,7 @@
 
 #include <qcustomplot.h>
 
+#include <cstddef>
 #include <vector>
 
 namespace zel {

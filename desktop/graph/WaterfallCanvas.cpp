@@ -7,7 +7,13 @@
 #include <algorithm>
 #include <cmath>
 
+#include "desktop/graph/GraphColors.h"
 #include "desktop/graph/WaterfallDrawing.h"
+#include "forms/WaterfallForm.h"
+#include "platform/Graph3D.h"
+#include "waterfall/Camera.h"
+#include "waterfall/PictureOptions.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

@@ -4,9 +4,9 @@
 #include <QTimer>
 #include <QWidget>
 
-#include "desktop/graph/GraphPlot.h"
+#include "desktop/graph/GraphColors.h"
 #include "forms/WaterfallForm.h"
-#include "waterfall/PictureOptions.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 

@@ -1,6 +1,13 @@
 #include "desktop/graph/WaterfallDrawing.h"
 
 #include <QFontMetricsF>
+#include <algorithm>
+#include <vector>
+
+#include "desktop/graph/GraphColors.h"
+#include "waterfall/ColourMap.h"
+#include "waterfall/SurfaceRenderer.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

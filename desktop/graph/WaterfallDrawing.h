@@ -3,7 +3,8 @@
 
 #include <QPainter>
 
-#include "desktop/graph/GraphPlot.h"
+#include "desktop/graph/GraphColors.h"
+#include "waterfall/ColourMap.h"
 #include "waterfall/WaterfallPicture.h"
 
 namespace zel {

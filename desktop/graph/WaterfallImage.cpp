@@ -1,8 +1,17 @@
 #include "desktop/graph/WaterfallImage.h"
 
+#include <algorithm>
+#include <cstdlib>
+#include <string>
+
+#include "desktop/graph/GraphColors.h"
 #include "desktop/graph/PictureFile.h"
 #include "desktop/graph/WaterfallDrawing.h"
+#include "forms/WaterfallForm.h"
+#include "platform/Graph3D.h"
 #include "waterfall/AxisTicks.h"
+#include "waterfall/RowSurface.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QFileInfo>
+#include <utility>
 
 #include "desktop/help/HelpWindow.h"
 

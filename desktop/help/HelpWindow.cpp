@@ -16,6 +16,9 @@
 #include <QTextDocument>
 #include <QToolBar>
 #include <QVBoxLayout>
+#include <algorithm>
+#include <memory>
+#include <utility>
 
 #include "desktop/windows/ThemeIcons.h"
 

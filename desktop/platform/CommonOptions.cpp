@@ -1,7 +1,9 @@
 #include "desktop/platform/CommonOptions.h"
 
-#include <vector>
+#include <optional>
+#include <ostream>
 
+#include "support/ExitStatus.h"
 #include "support/VersionInfo.h"
 
 namespace zel {

@@ -6,8 +6,6 @@
 #include <ostream>
 #include <string>
 
-#include "support/ExitStatus.h"
-
 namespace zel {
 
 struct CommonOptions {

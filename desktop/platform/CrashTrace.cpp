@@ -2,12 +2,16 @@
 
 #include <execinfo.h>
 #include <fcntl.h>
+#include <signal.h>
+#include <sys/types.h>
 #include <unistd.h>
 
 #include <algorithm>
 #include <array>
 #include <csignal>
 #include <cstring>
+#include <string>
+#include <vector>
 
 namespace zel {
 namespace {

@@ -3,6 +3,8 @@
 #include <QDesktopServices>
 #include <QFileInfo>
 #include <QUrl>
+#include <string>
+#include <vector>
 
 namespace zel {
 

@@ -2,6 +2,8 @@
 // Starts programs, and opens documents by what the desktop has for them.
 
 #include <functional>
+#include <string>
+#include <vector>
 
 #include "desktop/platform/QtServices.h"
 

@@ -1,8 +1,10 @@
 #include "desktop/platform/DeviceName.h"
 
 #include <filesystem>
+#include <string>
 #include <system_error>
 
+#include "platform/LinkAddress.h"
 #include "support/Text.h"
 
 namespace zel {

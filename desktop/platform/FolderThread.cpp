@@ -3,13 +3,16 @@
 #include <chrono>
 #include <condition_variable>
 #include <exception>
+#include <memory>
 #include <mutex>
 #include <optional>
+#include <string>
 #include <system_error>
 #include <thread>
 #include <utility>
 
 #include "desktop/platform/SystemFiles.h"
+#include "platform/FolderFiles.h"
 
 namespace zel {
 namespace {

@@ -1,11 +1,14 @@
 #include "desktop/platform/Language.h"
 
+#include <locale.h>
+
 #include <QCoreApplication>
 #include <QFileInfo>
 #include <QLibraryInfo>
 #include <QLocale>
 #include <QTranslator>
 #include <clocale>
+#include <span>
 
 namespace zel {
 namespace {

@@ -4,6 +4,8 @@
 #include <QLocale>
 #include <chrono>
 #include <cmath>
+#include <cstdint>
+#include <ctime>
 #include <string>
 #include <utility>
 

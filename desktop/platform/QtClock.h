@@ -1,7 +1,9 @@
 #pragma once
 // The computer's clocks.
 
+#include <cstdint>
 #include <ctime>
+#include <string>
 
 #include "platform/Clock.h"
 

@@ -10,6 +10,11 @@
 #include <QMainWindow>
 #include <QMessageBox>
 #include <QStandardPaths>
+#include <optional>
+#include <string>
+
+#include "platform/MessageBox.h"
+#include "platform/Services.h"
 
 namespace zel {
 namespace {

@@ -2,7 +2,8 @@
 // Message boxes, prompts, file dialogs and the clipboard, as windows.
 
 #include <QWidget>
-#include <functional>
+#include <optional>
+#include <string>
 
 #include "platform/MessageBox.h"
 #include "platform/Services.h"

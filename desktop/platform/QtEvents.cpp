@@ -7,7 +7,14 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <memory>
 #include <utility>
+
+#include "platform/Clock.h"
+#include "platform/Events.h"
 
 namespace zel {
 namespace {

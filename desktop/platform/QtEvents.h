@@ -2,6 +2,7 @@
 // The event loop over Qt's, with a short way for answers that come within microseconds.
 
 #include <QTimer>
+#include <cstdint>
 #include <functional>
 #include <map>
 #include <memory>

@@ -4,7 +4,9 @@
 #include "desktop/platform/QtDialogs.h"
 #include "desktop/platform/QtSystem.h"
 #include "desktop/platform/SimulatorChild.h"
+#include "platform/MessageBox.h"
 #include "platform/Platform.h"
+#include "platform/Services.h"
 
 namespace zel {
 

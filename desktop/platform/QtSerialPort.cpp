@@ -11,7 +11,13 @@
 #include <QSerialPortInfo>
 #include <algorithm>
 #include <array>
+#include <cstddef>
+#include <string>
+#include <string_view>
 #include <tuple>
+#include <vector>
+
+#include "platform/SerialPort.h"
 
 namespace zel {
 namespace {

@@ -5,7 +5,11 @@
 #include <QSerialPort>
 #include <QString>
 #include <QTimer>
+#include <cstddef>
 #include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
 #include "desktop/platform/QtEvents.h"
 #include "platform/SerialPort.h"

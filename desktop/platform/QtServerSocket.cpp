@@ -4,8 +4,11 @@
 #include <QNetworkInterface>
 #include <QSslSocket>
 #include <QTimer>
+#include <memory>
 
 #include "desktop/platform/Tls.h"
+#include "platform/ServerSocket.h"
+#include "platform/Socket.h"
 
 namespace zel {
 namespace {

@@ -6,9 +6,11 @@
 #include <map>
 #include <memory>
 #include <optional>
+#include <string>
 
 #include "desktop/platform/QtSocket.h"
 #include "platform/ServerSocket.h"
+#include "platform/Socket.h"
 
 namespace zel {
 

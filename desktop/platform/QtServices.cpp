@@ -8,7 +8,11 @@
 #include <QProcess>
 #include <QSaveFile>
 #include <QStandardPaths>
+#include <string>
+#include <vector>
 
+#include "platform/Files.h"
+#include "platform/Services.h"
 #include "support/IniFile.h"
 
 /// The linker takes the resources of a library only when they are asked for.

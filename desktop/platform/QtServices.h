@@ -3,6 +3,7 @@
 
 #include <QString>
 #include <string>
+#include <vector>
 
 #include "platform/Files.h"
 #include "platform/Services.h"

@@ -1,11 +1,14 @@
 #include "desktop/platform/QtSignals.h"
 
 #include <fcntl.h>
+#include <signal.h>
 #include <unistd.h>
 
 #include <QCoreApplication>
 #include <array>
 #include <cerrno>
+#include <csignal>
+#include <memory>
 
 namespace zel {
 namespace {

@@ -1,6 +1,8 @@
 #pragma once
 // The signals of the operating system that ask a program to end.
 
+#include <signal.h>
+
 #include <QSocketNotifier>
 #include <csignal>
 #include <map>

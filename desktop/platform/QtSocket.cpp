@@ -8,8 +8,11 @@
 #include <QSslCertificate>
 #include <QSslConfiguration>
 #include <QSslSocket>
+#include <cstddef>
+#include <string_view>
 
 #include "desktop/platform/Tls.h"
+#include "platform/Socket.h"
 
 namespace zel {
 namespace {

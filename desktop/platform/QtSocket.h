@@ -2,8 +2,10 @@
 // A TCP connection of the computer, in the clear or over TLS.
 
 #include <QTcpSocket>
+#include <cstddef>
 #include <memory>
 #include <string>
+#include <string_view>
 
 #include "desktop/platform/QtEvents.h"
 #include "platform/Socket.h"

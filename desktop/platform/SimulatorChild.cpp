@@ -1,5 +1,6 @@
 #include "desktop/platform/SimulatorChild.h"
 
+#include <linux/prctl.h>
 #include <signal.h>
 #include <sys/prctl.h>
 
@@ -7,6 +8,11 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QStandardPaths>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "desktop/platform/DesktopLauncher.h"
 
 namespace zel {
 namespace {

@@ -6,6 +6,8 @@
 #include <QTimer>
 #include <functional>
 #include <memory>
+#include <string>
+#include <vector>
 
 #include "desktop/platform/DesktopLauncher.h"
 

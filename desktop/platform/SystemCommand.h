@@ -3,6 +3,10 @@
 
 #include <sys/types.h>
 
+#include <optional>
+#include <string>
+#include <vector>
+
 #include "platform/Command.h"
 
 namespace zel {

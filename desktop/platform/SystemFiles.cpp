@@ -2,21 +2,29 @@
 
 #include <dirent.h>
 #include <fcntl.h>
+#include <string.h>
+#include <sys/stat.h>
+#include <sys/types.h>
 #include <unistd.h>
 
 #include <array>
 #include <cerrno>
 #include <climits>
+#include <cstdint>
 #include <cstdio>
 #include <cstring>
 #include <ctime>
 #include <filesystem>
+#include <memory>
 #include <random>
+#include <span>
+#include <string>
 #include <string_view>
-#include <system_error>
 #include <utility>
+#include <vector>
 
 #include "desktop/platform/QtClock.h"
+#include "platform/Files.h"
 
 namespace zel {
 namespace {

@@ -4,7 +4,11 @@
 #include <sys/stat.h>
 
 #include <functional>
+#include <memory>
 #include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
 #include "platform/Files.h"
 

@@ -1,6 +1,7 @@
 #include "desktop/platform/SystemMachine.h"
 
 #include <fcntl.h>
+#include <linux/stat.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -10,8 +11,13 @@
 #include <QSysInfo>
 #include <clocale>
 #include <ctime>
+#include <memory>
+#include <string>
+#include <vector>
 
 #include "desktop/platform/FolderThread.h"
+#include "platform/FolderFiles.h"
+#include "platform/Machine.h"
 #include "support/Text.h"
 
 namespace zel {

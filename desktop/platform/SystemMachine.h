@@ -1,6 +1,10 @@
 #pragma once
 // The machine that the program runs on.
 
+#include <memory>
+#include <string>
+
+#include "platform/FolderFiles.h"
 #include "platform/Machine.h"
 
 namespace zel {

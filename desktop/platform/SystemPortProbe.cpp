@@ -6,16 +6,23 @@
 #include <sys/ioctl.h>
 #include <sys/stat.h>
 #include <sys/sysmacros.h>
-#include <termios.h>
+#include <sys/types.h>
 #include <unistd.h>
 
 #include <QSerialPortInfo>
 #include <algorithm>
-#include <array>
+#include <cstddef>
 #include <filesystem>
 #include <fstream>
 #include <locale>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <system_error>
+#include <utility>
+#include <vector>
 
+#include "platform/PortProbe.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -1,6 +1,10 @@
 #pragma once
 // The serial ports of this machine: their makers, their rights, who holds them.
 
+#include <optional>
+#include <string>
+#include <vector>
+
 #include "platform/PortProbe.h"
 
 namespace zel {

@@ -5,6 +5,9 @@
 #include <QSslKey>
 #include <QSslSocket>
 #include <QStringList>
+#include <string>
+
+#include "platform/ServerSocket.h"
 
 namespace zel {
 namespace {

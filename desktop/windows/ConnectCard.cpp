@@ -5,9 +5,15 @@
 #include <QPointer>
 #include <QRegularExpression>
 #include <QVBoxLayout>
+#include <algorithm>
+#include <string>
+#include <utility>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
 #include "desktop/platform/SimulatorChild.h"
+#include "forms/Forms.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

@@ -7,9 +7,11 @@
 #include <QProgressBar>
 #include <QPushButton>
 #include <functional>
+#include <string>
 
 #include "desktop/binders/Binder.h"
 #include "forms/Forms.h"
+#include "platform/Controls.h"
 
 namespace zel {
 

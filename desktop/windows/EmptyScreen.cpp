@@ -3,6 +3,9 @@
 #include <QFrame>
 #include <QLabel>
 #include <QVBoxLayout>
+#include <cstddef>
+#include <functional>
+#include <utility>
 
 #include "desktop/windows/ThemeIcons.h"
 

@@ -2,11 +2,22 @@
 
 #include <QComboBox>
 #include <QPointer>
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <iterator>
+#include <optional>
+#include <string>
 #include <utility>
 
+#include "desktop/binders/Binder.h"
+#include "forms/ControllerForm.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "model/UnsureSettings.h"
 #include "platform/Controls.h"
+#include "platform/Form.h"
+#include "shell/Program.h"
 
 namespace zel {
 namespace {

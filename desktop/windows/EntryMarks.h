@@ -4,9 +4,13 @@
 #include <QLabel>
 #include <QObject>
 #include <array>
+#include <cstdint>
 #include <optional>
+#include <string>
 
 #include "desktop/binders/Binder.h"
+#include "forms/ControllerForm.h"
+#include "model/ZEL3Variables.h"
 #include "shell/Program.h"
 
 namespace zel {

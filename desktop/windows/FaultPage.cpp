@@ -2,8 +2,15 @@
 
 #include <QGridLayout>
 #include <QHeaderView>
+#include <cstddef>
+#include <optional>
+#include <vector>
 
 #include "analysis/Correction.h"
+#include "analysis/Peaks.h"
+#include "analysis/TraceAnalysis.h"
+#include "analysis/TraceTools.h"
+#include "desktop/windows/TracePage.h"
 #include "support/NumberText.h"
 
 namespace zel {

@@ -6,6 +6,7 @@
 #include <QLineEdit>
 #include <QTableWidget>
 
+#include "analysis/TraceTools.h"
 #include "desktop/windows/TracePage.h"
 
 namespace zel {

@@ -3,6 +3,9 @@
 #include <QDropEvent>
 #include <QFileInfo>
 #include <QUrl>
+#include <functional>
+#include <optional>
+#include <utility>
 
 namespace zel {
 

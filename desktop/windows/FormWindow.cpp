@@ -6,12 +6,18 @@
 #include <QKeyEvent>
 #include <QPointer>
 #include <QVBoxLayout>
+#include <algorithm>
+#include <functional>
+#include <optional>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
-#include "desktop/binders/ToolTips.h"
 #include "desktop/windows/ConnectCard.h"
 #include "forms/MainForm.h"
 #include "panel/EntryText.h"
+#include "panel/SoftPositions.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
 #include "platform/LinkAddress.h"
 #include "platform/Pointer.h"
 #include "support/NumberText.h"

@@ -3,8 +3,12 @@
 
 #include <QDialog>
 #include <QProgressBar>
+#include <functional>
+#include <vector>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/platform/KeyCodes.h"
+#include "platform/Controls.h"
 #include "platform/Form.h"
 
 namespace zel {

@@ -1,9 +1,15 @@
 #include "desktop/windows/GraphMenu.h"
 
 #include <QMenu>
+#include <functional>
 
+#include "desktop/binders/Binder.h"
+#include "desktop/graph/GraphNavigator.h"
+#include "desktop/graph/GraphWidget.h"
 #include "desktop/windows/MainMenus.h"
 #include "desktop/windows/ThemeIcons.h"
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
 
 namespace zel {
 namespace {

@@ -5,11 +5,24 @@
 #include <QFileInfo>
 #include <QShortcut>
 #include <QVBoxLayout>
+#include <memory>
+#include <string>
+#include <utility>
 
+#include "desktop/binders/Binder.h"
+#include "desktop/graph/GraphWidget.h"
 #include "desktop/graph/SpectrogramWidget.h"
+#include "desktop/windows/ConnectCard.h"
+#include "desktop/windows/EmptyScreen.h"
 #include "desktop/windows/GraphMenu.h"
 #include "desktop/windows/PlaybackBar.h"
+#include "desktop/windows/PointerText.h"
+#include "desktop/windows/PowerDisplay.h"
+#include "desktop/windows/Readouts.h"
 #include "desktop/windows/ReconnectBar.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Form.h"
+#include "shell/Program.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {

@@ -7,12 +7,15 @@
 #include <memory>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/graph/GraphNavigator.h"
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/windows/ConnectCard.h"
 #include "desktop/windows/EmptyScreen.h"
 #include "desktop/windows/PointerText.h"
 #include "desktop/windows/PowerDisplay.h"
 #include "desktop/windows/Readouts.h"
+#include "forms/ControllerForm.h"
+#include "platform/Event.h"
 #include "shell/Program.h"
 
 namespace zel {

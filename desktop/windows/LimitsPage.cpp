@@ -3,9 +3,17 @@
 #include <QHBoxLayout>
 #include <QPushButton>
 #include <QVBoxLayout>
+#include <optional>
 #include <stdexcept>
+#include <utility>
+#include <vector>
 
+#include "analysis/Correction.h"
+#include "analysis/Mask.h"
+#include "analysis/TraceAnalysis.h"
+#include "analysis/TraceTools.h"
 #include "desktop/binders/OwnTexts.h"
+#include "desktop/windows/TracePage.h"
 
 namespace zel {
 namespace {

@@ -4,6 +4,8 @@
 #include <QLabel>
 #include <QPlainTextEdit>
 
+#include "analysis/Correction.h"
+#include "analysis/TraceTools.h"
 #include "desktop/windows/TracePage.h"
 
 namespace zel {

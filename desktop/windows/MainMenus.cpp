@@ -5,6 +5,11 @@
 #include <map>
 #include <set>
 
+#include "desktop/binders/Binder.h"
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
+
 namespace zel {
 namespace {
 

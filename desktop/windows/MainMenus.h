@@ -6,6 +6,7 @@
 
 #include "desktop/binders/Binder.h"
 #include "forms/ControllerForm.h"
+#include "platform/Controls.h"
 
 namespace zel {
 

@@ -2,7 +2,9 @@
 // The panel's window: the graph and its readouts, the keys, the tools, the menus, the state.
 
 #include <QMainWindow>
+#include <functional>
 #include <memory>
+#include <string>
 #include <vector>
 
 #include "desktop/binders/Binder.h"
@@ -16,6 +18,10 @@
 #include "desktop/windows/Theme.h"
 #include "desktop/windows/ToolStrip.h"
 #include "desktop/windows/WindowMemory.h"
+#include "forms/ControllerForm.h"
+#include "platform/Form.h"
+#include "platform/LinkAddress.h"
+#include "platform/Services.h"
 #include "shell/Program.h"
 
 namespace zel {

@@ -7,10 +7,20 @@
 #include <QPointer>
 #include <QStyle>
 #include <QVBoxLayout>
+#include <cstddef>
+#include <utility>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
+#include "desktop/windows/FoldGroup.h"
 #include "desktop/windows/KeyPictures.h"
+#include "desktop/windows/Terminators.h"
+#include "forms/ControllerForm.h"
+#include "model/ZEL3Variables.h"
 #include "panel/EntryText.h"
+#include "panel/SoftPositions.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

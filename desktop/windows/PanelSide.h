@@ -10,6 +10,7 @@
 #include "desktop/windows/Terminators.h"
 #include "forms/ControllerForm.h"
 #include "model/ZEL3Variables.h"
+#include "platform/Controls.h"
 
 class QVBoxLayout;
 

@@ -8,8 +8,17 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 #include <algorithm>
+#include <cstddef>
+#include <functional>
 #include <limits>
+#include <utility>
+#include <vector>
 
+#include "analysis/HostMarkers.h"
+#include "analysis/Peaks.h"
+#include "analysis/TraceAnalysis.h"
+#include "analysis/TraceTools.h"
+#include "desktop/windows/TracePage.h"
 #include "support/NumberText.h"
 
 namespace zel {

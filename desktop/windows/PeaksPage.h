@@ -6,7 +6,11 @@
 #include <QLineEdit>
 #include <QTableWidget>
 #include <array>
+#include <cstddef>
+#include <functional>
 
+#include "analysis/HostMarkers.h"
+#include "analysis/TraceTools.h"
 #include "desktop/windows/TracePage.h"
 
 namespace zel {

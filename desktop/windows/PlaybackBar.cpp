@@ -6,7 +6,11 @@
 #include <QPointer>
 #include <QStyleOptionSlider>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/windows/ThemeIcons.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "platform/Controls.h"
 
 namespace zel {
 namespace {

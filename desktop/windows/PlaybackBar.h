@@ -5,6 +5,7 @@
 
 #include "desktop/binders/Binder.h"
 #include "forms/Forms.h"
+#include "forms/ScriptForms.h"
 
 namespace zel {
 

@@ -1,8 +1,14 @@
 #include "desktop/windows/PointerText.h"
 
 #include <cmath>
+#include <optional>
 
 #include "desktop/graph/AxisText.h"
+#include "desktop/graph/GraphWidget.h"
+#include "desktop/windows/Readouts.h"
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
+#include "platform/Graph.h"
 
 namespace zel {
 

@@ -7,6 +7,7 @@
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/windows/Readouts.h"
 #include "forms/ControllerForm.h"
+#include "platform/Form.h"
 
 namespace zel {
 

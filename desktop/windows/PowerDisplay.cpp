@@ -5,9 +5,12 @@
 #include <QPainterPath>
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <string>
 
 #include "desktop/graph/AxisText.h"
-#include "desktop/graph/GraphPlot.h"
+#include "desktop/graph/GraphColors.h"
 #include "support/NumberText.h"
 
 namespace zel {

@@ -1,6 +1,14 @@
 #include "desktop/windows/PowerPage.h"
 
 #include <QGridLayout>
+#include <cstddef>
+#include <optional>
+#include <string>
+
+#include "analysis/HostMarkers.h"
+#include "analysis/TraceAnalysis.h"
+#include "analysis/TraceTools.h"
+#include "desktop/windows/TracePage.h"
 
 namespace zel {
 namespace {

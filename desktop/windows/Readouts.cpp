@@ -3,9 +3,13 @@
 #include <QFrame>
 #include <QGridLayout>
 #include <QHBoxLayout>
+#include <string>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
 #include "desktop/windows/StillLabel.h"
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
 
 namespace zel {
 namespace {

@@ -5,7 +5,6 @@
 #include <QWidget>
 
 #include "desktop/binders/Binder.h"
-#include "desktop/graph/GraphWidget.h"
 #include "forms/ControllerForm.h"
 
 namespace zel {

@@ -1,7 +1,14 @@
 #include "desktop/windows/RecentConnections.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <string>
+#include <vector>
 
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
+#include "platform/LinkAddress.h"
+#include "platform/Services.h"
 #include "support/NumberText.h"
 #include "support/Text.h"
 

@@ -6,7 +6,10 @@
 #include <QPointer>
 #include <QPushButton>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/ToolTips.h"
+#include "forms/ControllerForm.h"
+#include "platform/Controls.h"
 
 namespace zel {
 

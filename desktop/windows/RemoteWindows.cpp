@@ -14,9 +14,12 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 #include <algorithm>
+#include <string>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/windows/FormWindow.h"
 #include "forms/Forms.h"
+#include "platform/Controls.h"
 #include "support/NumberText.h"
 
 namespace zel {

@@ -3,6 +3,7 @@
 
 #include <QSystemTrayIcon>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/windows/FormWindow.h"
 
 class QLabel;

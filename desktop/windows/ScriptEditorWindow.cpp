@@ -10,7 +10,14 @@
 #include <QShortcut>
 #include <QSignalBlocker>
 #include <QVBoxLayout>
+#include <string>
+#include <string_view>
+#include <utility>
 
+#include "desktop/binders/Binder.h"
+#include "desktop/windows/FormWindow.h"
+#include "desktop/windows/ScriptLexer.h"
+#include "forms/ScriptForms.h"
 #include "script/Language.h"
 #include "script/LineCheck.h"
 #include "support/Text.h"

@@ -8,6 +8,8 @@
 #include <QTimer>
 #include <vector>
 
+#include "desktop/binders/Binder.h"
+#include "desktop/platform/KeyCodes.h"
 #include "desktop/windows/FormWindow.h"
 #include "desktop/windows/ScriptLexer.h"
 #include "forms/ScriptForms.h"

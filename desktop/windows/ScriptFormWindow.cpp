@@ -8,6 +8,13 @@
 #include <QTextCursor>
 #include <QTextOption>
 #include <QVBoxLayout>
+#include <string>
+#include <vector>
+
+#include "desktop/binders/Binder.h"
+#include "desktop/windows/FormWindow.h"
+#include "forms/ScriptForms.h"
+#include "platform/Controls.h"
 
 namespace zel {
 namespace {

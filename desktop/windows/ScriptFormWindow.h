@@ -6,8 +6,10 @@
 #include <string>
 #include <vector>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/windows/FormWindow.h"
 #include "forms/ScriptForms.h"
+#include "platform/Controls.h"
 
 namespace zel {
 

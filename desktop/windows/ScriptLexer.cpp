@@ -4,9 +4,10 @@
 
 #include <QFontDatabase>
 #include <QPalette>
+#include <algorithm>
+#include <string>
 
 #include "script/Language.h"
-#include "support/Text.h"
 
 namespace zel {
 namespace {

@@ -2,9 +2,13 @@
 
 #include <QShortcut>
 #include <map>
+#include <vector>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/ShortcutTable.h"
 #include "desktop/windows/FoldGroup.h"
+#include "forms/ControllerForm.h"
+#include "platform/Form.h"
 
 namespace zel {
 namespace {

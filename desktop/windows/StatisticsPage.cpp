@@ -3,10 +3,16 @@
 #include <QHBoxLayout>
 #include <QPushButton>
 #include <QVBoxLayout>
+#include <cstddef>
+#include <optional>
+#include <vector>
 
+#include "analysis/SpectrumTrace.h"
+#include "analysis/TraceTools.h"
 #include "desktop/graph/DivisionTicker.h"
-#include "desktop/graph/GraphPlot.h"
+#include "desktop/graph/GraphColors.h"
 #include "desktop/graph/TraceOverlay.h"
+#include "desktop/windows/TracePage.h"
 #include "support/NumberText.h"
 
 namespace zel {

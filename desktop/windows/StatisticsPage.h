@@ -7,6 +7,7 @@
 #include <QLabel>
 #include <QLineEdit>
 
+#include "analysis/TraceTools.h"
 #include "desktop/windows/TracePage.h"
 
 namespace zel {

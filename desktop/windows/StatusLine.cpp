@@ -4,9 +4,13 @@
 #include <QPointer>
 #include <QStatusBar>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
 #include "desktop/platform/SimulatorChild.h"
 #include "desktop/windows/StillLabel.h"
+#include "forms/Forms.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Controls.h"
 #include "platform/Pointer.h"
 #include "support/NumberText.h"
 

@@ -7,6 +7,7 @@
 #include <QTimer>
 
 #include "desktop/binders/Binder.h"
+#include "forms/ControllerForm.h"
 #include "forms/Forms.h"
 #include "model/ZEL3Variables.h"
 

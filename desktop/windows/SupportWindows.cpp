@@ -8,7 +8,12 @@
 #include <QScrollBar>
 #include <QStyle>
 #include <QVBoxLayout>
+#include <string>
 
+#include "desktop/binders/Binder.h"
+#include "desktop/windows/FormWindow.h"
+#include "forms/SupportForms.h"
+#include "platform/Controls.h"
 #include "support/SupportAddress.h"
 #include "support/Text.h"
 

@@ -5,6 +5,7 @@
 #include <QListWidget>
 #include <QPlainTextEdit>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/windows/FormWindow.h"
 #include "forms/SupportForms.h"
 

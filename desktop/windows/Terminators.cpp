@@ -5,10 +5,18 @@
 #include <QKeyEvent>
 #include <QRegularExpression>
 #include <QShortcut>
+#include <cstddef>
+#include <string_view>
+#include <vector>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/binders/ShortcutTable.h"
+#include "forms/ControllerForm.h"
+#include "model/ZEL3Variables.h"
 #include "panel/EntryText.h"
 #include "panel/SoftPositions.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
 #include "support/AtEnd.h"
 
 namespace zel {

@@ -4,6 +4,7 @@
 #include <QPushButton>
 #include <QWidget>
 #include <array>
+#include <cstddef>
 #include <vector>
 
 #include "desktop/binders/Binder.h"

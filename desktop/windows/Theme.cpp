@@ -4,6 +4,7 @@
 #include <QPalette>
 #include <QStyle>
 #include <QStyleFactory>
+#include <utility>
 
 #include "desktop/binders/ToolTips.h"
 #include "desktop/windows/ThemeColors.h"

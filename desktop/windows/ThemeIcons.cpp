@@ -5,6 +5,7 @@
 #include <QPainter>
 #include <QPalette>
 #include <QPixmap>
+#include <utility>
 
 #include "desktop/windows/KeyPictures.h"
 

@@ -6,8 +6,11 @@
 #include <optional>
 #include <utility>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/windows/MainMenus.h"
 #include "desktop/windows/ThemeIcons.h"
+#include "forms/ControllerForm.h"
+#include "forms/Forms.h"
 
 namespace zel {
 namespace {

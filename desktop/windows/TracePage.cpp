@@ -5,6 +5,9 @@
 #include <QFileInfo>
 #include <QMessageBox>
 #include <QSaveFile>
+#include <optional>
+#include <string>
+#include <utility>
 
 #include "model/Numeric.h"
 #include "support/NumberText.h"

@@ -3,8 +3,8 @@
 
 #include <QString>
 #include <QWidget>
-#include <functional>
 #include <optional>
+#include <string>
 
 #include "analysis/TraceTools.h"
 

@@ -6,15 +6,32 @@
 #include <QScrollArea>
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
+#include <optional>
+#include <utility>
 
+#include "analysis/Correction.h"
+#include "analysis/Hold.h"
+#include "analysis/HostMarkers.h"
+#include "analysis/HostTraces.h"
+#include "analysis/Mask.h"
+#include "analysis/TraceTools.h"
 #include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
+#include "desktop/graph/GraphWidget.h"
+#include "desktop/graph/TraceOverlay.h"
 #include "desktop/windows/FaultPage.h"
+#include "desktop/windows/LimitsPage.h"
+#include "desktop/windows/PeaksPage.h"
 #include "desktop/windows/PowerPage.h"
 #include "desktop/windows/StatisticsPage.h"
+#include "desktop/windows/TracePage.h"
+#include "desktop/windows/TracesPage.h"
 #include "desktop/windows/WatchPage.h"
 #include "model/CodeTables.h"
 #include "model/Numeric.h"
+#include "model/ZEL3Variables.h"
+#include "shell/Program.h"
 #include "support/NumberText.h"
 #include "trace/Sweep.h"
 

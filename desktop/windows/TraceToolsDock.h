@@ -4,16 +4,18 @@
 #include <QDockWidget>
 #include <QTabWidget>
 #include <QTimer>
-#include <array>
-#include <memory>
+#include <optional>
 
 #include "analysis/MaskWatch.h"
+#include "analysis/SpectrumTrace.h"
+#include "analysis/TraceTools.h"
 #include "desktop/graph/GraphWidget.h"
 #include "desktop/graph/TraceOverlay.h"
 #include "desktop/platform/SystemCommand.h"
 #include "desktop/windows/LimitsPage.h"
 #include "desktop/windows/PeaksPage.h"
 #include "desktop/windows/TracesPage.h"
+#include "forms/ControllerForm.h"
 #include "shell/Program.h"
 
 class QMenu;

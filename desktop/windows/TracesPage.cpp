@@ -4,10 +4,19 @@
 #include <QFile>
 #include <QFileDialog>
 #include <QPainter>
+#include <cstddef>
+#include <functional>
+#include <optional>
 #include <stdexcept>
+#include <utility>
 
+#include "analysis/Hold.h"
+#include "analysis/HostTraces.h"
 #include "analysis/SavedTraces.h"
+#include "analysis/SpectrumTrace.h"
+#include "analysis/TraceTools.h"
 #include "desktop/graph/TraceOverlay.h"
+#include "desktop/windows/TracePage.h"
 
 namespace zel {
 namespace {

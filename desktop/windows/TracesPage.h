@@ -7,7 +7,12 @@
 #include <QPushButton>
 #include <QToolButton>
 #include <array>
+#include <cstddef>
+#include <functional>
+#include <optional>
 
+#include "analysis/HostTraces.h"
+#include "analysis/TraceTools.h"
 #include "desktop/windows/TracePage.h"
 
 namespace zel {

@@ -3,6 +3,12 @@
 #include <QFileDialog>
 #include <QGridLayout>
 #include <QPushButton>
+#include <cstddef>
+#include <utility>
+
+#include "analysis/MaskWatch.h"
+#include "analysis/TraceTools.h"
+#include "desktop/windows/TracePage.h"
 
 namespace zel {
 namespace {

@@ -7,6 +7,7 @@
 #include <QSpinBox>
 
 #include "analysis/MaskWatch.h"
+#include "analysis/TraceTools.h"
 #include "desktop/windows/TracePage.h"
 
 namespace zel {

@@ -8,9 +8,20 @@
 #include <QPalette>
 #include <QVBoxLayout>
 #include <map>
+#include <string>
 
+#include "desktop/binders/Binder.h"
+#include "desktop/graph/GraphColors.h"
+#include "desktop/graph/WaterfallCanvas.h"
 #include "desktop/graph/WaterfallDrawing.h"
 #include "desktop/graph/WaterfallImage.h"
+#include "desktop/windows/FormWindow.h"
+#include "forms/Forms.h"
+#include "forms/WaterfallForm.h"
+#include "platform/Controls.h"
+#include "platform/Form.h"
+#include "waterfall/PictureOptions.h"
+#include "waterfall/WaterfallPicture.h"
 
 namespace zel {
 namespace {

@@ -3,9 +3,11 @@
 
 #include <QMenuBar>
 
+#include "desktop/binders/Binder.h"
 #include "desktop/graph/WaterfallCanvas.h"
 #include "desktop/windows/FormWindow.h"
 #include "forms/Forms.h"
+#include "forms/WaterfallForm.h"
 
 namespace zel {
 

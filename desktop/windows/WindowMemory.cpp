@@ -2,6 +2,10 @@
 
 #include <QGuiApplication>
 #include <QScreen>
+#include <string>
+
+#include "desktop/windows/FoldGroup.h"
+#include "desktop/windows/PanelSide.h"
 
 namespace zel {
 namespace {

@@ -1,9 +1,17 @@
 #include "platform/virtual/Dialogue.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <functional>
 #include <memory>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
 
 #include "platform/ByteText.h"
+#include "platform/Events.h"
+#include "platform/virtual/LineFaults.h"
 
 namespace zel {
 

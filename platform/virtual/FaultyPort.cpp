@@ -1,6 +1,11 @@
 #include "platform/virtual/FaultyPort.h"
 
+#include <string_view>
 #include <utility>
+
+#include "platform/Events.h"
+#include "platform/SerialPort.h"
+#include "platform/virtual/LineFaults.h"
 
 namespace zel {
 namespace {

@@ -3,7 +3,6 @@
 
 #include <string>
 #include <string_view>
-#include <vector>
 
 #include "platform/Events.h"
 #include "platform/SerialPort.h"

@@ -2,12 +2,16 @@
 // A machine and serial ports of the tests' own making.
 
 #include <algorithm>
+#include <cstdint>
 #include <map>
 #include <memory>
+#include <optional>
 #include <string>
 #include <utility>
 #include <vector>
 
+#include "platform/Files.h"
+#include "platform/FolderFiles.h"
 #include "platform/Machine.h"
 #include "platform/PortProbe.h"
 #include "platform/virtual/VirtualTime.h"

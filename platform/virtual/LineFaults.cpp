@@ -1,5 +1,9 @@
 #include "platform/virtual/LineFaults.h"
 
+#include <cstddef>
+#include <optional>
+#include <string>
+
 namespace zel {
 
 char garbled(char byte) {

@@ -1,5 +1,12 @@
 #include "platform/virtual/RecordedBoxes.h"
 
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "platform/MessageBox.h"
+
 namespace zel {
 
 BoxAnswer affirmativeOf(BoxButtons buttons) {

@@ -1,5 +1,12 @@
 #include "platform/virtual/ScriptedPort.h"
 
+#include <string>
+#include <string_view>
+#include <utility>
+
+#include "platform/Events.h"
+#include "platform/SerialPort.h"
+
 namespace zel {
 namespace {
 

@@ -4,11 +4,13 @@
 //     port.expect("GET\r").answer("0\r");
 //     port.expect("FREQ\r").answer("0\r").answer("1500000000\r").after(20);
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 #include <utility>
 #include <vector>
 
+#include "platform/Events.h"
 #include "platform/SerialPort.h"
 #include "platform/virtual/Dialogue.h"
 

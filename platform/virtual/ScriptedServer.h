@@ -6,7 +6,9 @@
 #include <string>
 #include <utility>
 
+#include "platform/Events.h"
 #include "platform/ServerSocket.h"
+#include "platform/Socket.h"
 #include "platform/virtual/ScriptedSocket.h"
 
 namespace zel {

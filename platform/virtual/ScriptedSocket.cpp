@@ -1,6 +1,10 @@
 #include "platform/virtual/ScriptedSocket.h"
 
-#include <utility>
+#include <string>
+#include <string_view>
+
+#include "platform/Events.h"
+#include "platform/Socket.h"
 
 namespace zel {
 

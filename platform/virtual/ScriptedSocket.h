@@ -1,8 +1,10 @@
 #pragma once
 // A TCP socket whose far end is a script.
 
+#include <cstddef>
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "platform/Events.h"
 #include "platform/Socket.h"

@@ -1,7 +1,17 @@
 #include "platform/virtual/VirtualFiles.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <limits>
+#include <memory>
+#include <span>
+#include <string>
+#include <string_view>
 #include <utility>
+#include <vector>
+
+#include "platform/Files.h"
 
 namespace zel {
 namespace {

@@ -1,11 +1,15 @@
 #pragma once
 // A disk in memory that can fill up, vanish and refuse.
 
+#include <cstddef>
 #include <cstdint>
 #include <limits>
 #include <map>
+#include <memory>
 #include <set>
 #include <string>
+#include <string_view>
+#include <vector>
 
 #include "platform/Clock.h"
 #include "platform/Files.h"

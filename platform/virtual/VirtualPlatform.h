@@ -1,7 +1,10 @@
 #pragma once
 // The whole platform of tests and of the built-in simulator: virtual time, scripts and memory.
 
+#include "platform/Files.h"
 #include "platform/Platform.h"
+#include "platform/SerialPort.h"
+#include "platform/Signals.h"
 #include "platform/virtual/FixedMachine.h"
 #include "platform/virtual/MemoryServices.h"
 #include "platform/virtual/RecordedBoxes.h"

@@ -3,7 +3,12 @@
 #include <algorithm>
 #include <chrono>
 #include <cmath>
+#include <cstdint>
+#include <functional>
+#include <utility>
 #include <vector>
+
+#include "platform/Events.h"
 
 namespace zel {
 namespace {

@@ -1,6 +1,7 @@
 #pragma once
 // Time that passes only when somebody waits for it, and the event loop over it.
 
+#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <map>

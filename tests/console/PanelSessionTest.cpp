@@ -9,6 +9,7 @@
 #include <string>
 
 #include "ZELSim/InProcessPort.h"
+#include "console/Address.h"
 #include "console/ConsoleDialogs.h"
 #include "console/PanelSession.h"
 #include "platform/virtual/VirtualPlatform.h"

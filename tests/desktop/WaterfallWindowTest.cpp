@@ -9,6 +9,7 @@
 #include "desktop/graph/WaterfallImage.h"
 #include "desktop/windows/WaterfallWindow.h"
 #include "tests/desktop/WindowTest.h"
+#include "waterfall/PictureOptions.h"
 
 namespace zel {
 namespace {
