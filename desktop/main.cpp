@@ -12,6 +12,7 @@
 #include "desktop/platform/CrashTrace.h"
 #include "desktop/platform/Language.h"
 #include "desktop/platform/QtPlatform.h"
+#include "desktop/style/FontsAhead.h"
 #include "desktop/windows/GuardedApplication.h"
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
@@ -42,6 +43,7 @@ int main(int argc, char** argv) {
     if (zel::asksForHelp(argc, argv))
         return zel::parseStartOptions(argc, argv, options, std::cout, std::cerr).value_or(0);
     zel::GuardedApplication application(argc, argv);  // takes the toolkit's own options away
+    zel::FontsAhead fonts;
     zel::useEnglishMessages();
     QApplication::setApplicationName("ZELRemote");
     QGuiApplication::setDesktopFileName("example.zelremote.ZELRemote");
@@ -52,7 +54,7 @@ int main(int argc, char** argv) {
     zel::QtPlatform platform(QString::fromStdString(options.home));
     const zel::ThemeChoice theme = options.theme.value_or(zel::themeFromText(
         QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Theme", ""))));
-    const bool dark = zel::prepareTheme(application, theme);
+    zel::applyTheme(application, theme);
     const QString language =
         options.language.empty()
             ? QString::fromStdString(platform.settings.get("ZELRemote", "Desktop", "Language", ""))
@@ -82,7 +84,6 @@ int main(int argc, char** argv) {
         [&program](int context) { program.forms().controller.ShowHelp(context); });
     application.installEventFilter(&helpKey);
     zel::MainWindow window(program);
-    zel::dressTheme(application, dark);
     window.useSettings(platform.settings);
     platform.launcher.ready = [&] { window.simulatorReady(platform.launcher.link()); };
     platform.launcher.ended = [&](const QString& why) { window.simulatorEnded(why); };
@@ -98,6 +99,7 @@ int main(int argc, char** argv) {
     const auto run = [&] {
         program.start();
         if (program.ended()) return;
+        fonts.wait();
         window.show();
         if (const std::string trace = program.takeCrash(); !trace.empty())
             program.errorReport().displayCrash(trace);

@@ -14,6 +14,8 @@
 #include "bench/Figures.h"
 #include "bench/windows/FirstPaint.h"
 #include "desktop/platform/QtPlatform.h"
+#include "desktop/style/FontsAhead.h"
+#include "desktop/windows/GuardedApplication.h"
 #include "desktop/windows/MainWindow.h"
 #include "desktop/windows/Theme.h"
 #include "platform/LinkAddress.h"
@@ -53,15 +55,16 @@ int idleShare(zel::Program& program, const std::string& device, int seconds) {
 }  // namespace
 
 int main(int argc, char** argv) {
-    QApplication application(argc, argv);
-    const bool dark = zel::prepareTheme(application, zel::ThemeChoice::System);
+    zel::GuardedApplication application(argc, argv);
+    zel::FontsAhead fonts;
+    zel::applyTheme(application, zel::ThemeChoice::System);
     const QTemporaryDir home;
     zel::QtPlatform platform(home.path());
     zel::Program program(platform.bundle(), "");
     zel::MainWindow window(program);
-    zel::dressTheme(application, dark);
     if (argc == 3) {
         program.start();
+        fonts.wait();
         window.show();
         return idleShare(program, argv[1], zel::wholeNumber(argv[2]).value_or(1));
     }
@@ -71,6 +74,7 @@ int main(int argc, char** argv) {
     });
     QTimer::singleShot(0, &application, [&] {
         program.start();
+        fonts.wait();
         window.show();
     });
     return QApplication::exec();

@@ -2,7 +2,6 @@
 
 #include <QMenu>
 #include <QSignalBlocker>
-#include <QStyle>
 #include <QVariant>
 #include <algorithm>
 #include <functional>
@@ -14,6 +13,7 @@
 #include "desktop/binders/OwnTexts.h"
 #include "desktop/binders/ShortcutTable.h"
 #include "desktop/binders/ToolTips.h"
+#include "desktop/style/PanelStyle.h"
 #include "platform/Controls.h"
 #include "platform/Form.h"
 
@@ -51,15 +51,20 @@ QString faceOf(Color color) {
 void setMark(QWidget* widget, const char* name, bool on) {
     if (widget->property(name).toBool() == on) return;
     widget->setProperty(name, on);
-    widget->style()->unpolish(widget);
-    widget->style()->polish(widget);
+    restyle(*widget);
 }
 
 void setFace(QWidget* widget, const QString& face) {
     if (widget->property("face").toString() == face) return;
     widget->setProperty("face", face);
-    widget->style()->unpolish(widget);
-    widget->style()->polish(widget);
+    restyle(*widget);
+}
+
+void setInk(QWidget* widget, Color color) {
+    const QColor ink = color == kWindowText ? QColor() : inkOf(color);
+    if (widget->property("ink").value<QColor>() == ink) return;
+    widget->setProperty("ink", ink.isValid() ? QVariant(ink) : QVariant());
+    restyle(*widget);
 }
 
 Binder::Binder(QObject* parent) : QObject(parent) {
@@ -218,9 +223,7 @@ void Binder::bind(TextBox& control, PanelLineEdit* widget) {
         widget->setEnabled(control.Enabled && usable(control));
         widget->setVisible(control.Visible);
         setFace(widget, control.Locked ? "locked" : "entry");
-        const Color ink = control.ForeColor;
-        widget->setStyleSheet(ink == kWindowText ? QString()
-                                                 : QString("color: %1").arg(inkOf(ink).name()));
+        setInk(widget, control.ForeColor);
     });
 }
 
@@ -228,11 +231,8 @@ void Binder::bind(Label& control, QLabel* widget) {
     follow(control, widget, [&control, widget] {
         widget->setText(labelText(control, control.Caption));
         widget->setVisible(control.Visible);
-        const Color ink = control.ForeColor;
-        QString style;
-        if (ink != kWindowText) style = QString("color: %1;").arg(inkOf(ink).name());
-        if (control.Struck) style += "text-decoration: line-through;";
-        widget->setStyleSheet(style);
+        setInk(widget, control.ForeColor);
+        setMark(widget, "struck", control.Struck);
     });
 }
 

@@ -1,5 +1,4 @@
 #include <QKeyEvent>
-#include <QStyle>
 #include <QToolTip>
 #include <functional>
 #include <string>
@@ -7,6 +6,7 @@
 
 #include "desktop/binders/Binder.h"
 #include "desktop/platform/KeyCodes.h"
+#include "desktop/style/PanelStyle.h"
 #include "platform/Controls.h"
 
 namespace zel {
@@ -96,8 +96,7 @@ void PanelLineEdit::showProblem(const QString& problem) {
     if (!marked_) ownTip_ = toolTip();
     marked_ = marked;
     setProperty("refused", marked);
-    style()->unpolish(this);
-    style()->polish(this);
+    restyle(*this);
     setToolTip(marked ? problem : ownTip_);
     // What was mended needs its reason no more.
     if (!marked) QToolTip::hideText();

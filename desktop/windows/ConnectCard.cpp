@@ -21,6 +21,8 @@ namespace {
 constexpr int kWidth = 440;
 constexpr int kBarHeight = 6;
 constexpr int kStepLines = 3;
+constexpr int kKeyWidth = 96;    // px, at least
+constexpr int kAroundText = 28;  // px
 
 }  // namespace
 
@@ -56,19 +58,13 @@ ConnectCard::ConnectCard(Forms& forms, Binder& binder, Ways ways, QWidget* paren
         layout->addWidget(label);
     }
     step_->setAlignment(Qt::AlignLeft | Qt::AlignTop);
-    step_->setMinimumHeight(kStepLines * step_->fontMetrics().lineSpacing());
     wait_->setTextVisible(false);
     wait_->setFixedHeight(kBarHeight);
     wait_->setAccessibleName(QObject::tr("Progress of the connection"));
     layout->addWidget(wait_);
     auto* keys = new QHBoxLayout;
     keys->addStretch(1);
-    for (QPushButton* key : {again_, search_, close_, cancel_}) {
-        constexpr int kAroundText = 28;  // px
-        key->setMinimumWidth(
-            std::max(96, key->fontMetrics().horizontalAdvance(key->text()) + kAroundText));
-        keys->addWidget(key);
-    }
+    for (QPushButton* key : {again_, search_, close_, cancel_}) keys->addWidget(key);
     layout->addLayout(keys);
     connect(cancel_, &QPushButton::clicked, this, [this] { cancel(); });
     connect(again_, &QPushButton::clicked, this, [this] { ways_.again(); });
@@ -106,6 +102,15 @@ QString ConnectCard::heading() const {
         .arg(port, QString::fromStdString(forms_.main.BaudList.Text()));
 }
 
+/// Once, and not at the start: the first text that is measured waits for the fonts.
+void ConnectCard::giveRoom() {
+    if (std::exchange(roomGiven_, true)) return;
+    step_->setMinimumHeight(kStepLines * step_->fontMetrics().lineSpacing());
+    for (QPushButton* key : {again_, search_, close_, cancel_})
+        key->setMinimumWidth(
+            std::max(kKeyWidth, key->fontMetrics().horizontalAdvance(key->text()) + kAroundText));
+}
+
 void ConnectCard::take() {
     const bool work = connecting();
     const QWidget* at = window()->focusWidget();
@@ -117,6 +122,7 @@ void ConnectCard::take() {
                         !form.AdviceLabel.Caption.get().empty();
     const bool wanted = !forms_.controller.isConnected && !dialog && (work || failed);
     if (wanted) {
+        giveRoom();
         const bool tcp = forms_.controller.ConnectionState == ControllerForm::TCPCON;
         const std::string step =
             tcp ? forms_.tcpConnection.AdviceLabel.Caption : form.AdviceLabel.Caption;

@@ -30,6 +30,7 @@ class ConnectCard : public QFrame {
     ConnectCard(Forms& forms, Binder& binder, Ways ways, QWidget* parent);
 
     /// As the forms have it.
+    void giveRoom();
     void take();
     bool wanted() const { return wanted_; }
 
@@ -56,6 +57,7 @@ class ConnectCard : public QFrame {
     QPushButton* close_;
     bool wanted_ = false;
     bool failed_ = false;
+    bool roomGiven_ = false;
     bool putAway_ = false;  ///< the failure was read
 };
 

@@ -108,6 +108,8 @@ PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder&
     }
     groups_ = {markers, modes, command};
     layout_->addStretch(1);
+    column_->resize(kWidth,
+                    0);  // else its layout is asked for a size, in vain: the window gives it
     setWidget(column_);
 }
 
@@ -125,6 +127,12 @@ FoldGroup* PanelSide::addGroup(const QString& name, const QString& caption, QWid
 void PanelSide::resizeEvent(QResizeEvent* event) {
     QScrollArea::resizeEvent(event);
     foldByRoom();
+}
+
+/// The bars come and go by a posted event; taken now, the panel is drawn once at the start.
+void PanelSide::showEvent(QShowEvent* event) {
+    QScrollArea::showEvent(event);
+    QCoreApplication::sendPostedEvents(this, QEvent::MetaCall);
 }
 
 void PanelSide::showState(bool viewRuns, bool fileShown) {

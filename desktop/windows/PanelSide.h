@@ -41,6 +41,7 @@ class PanelSide : public QScrollArea {
 
   protected:
     void resizeEvent(QResizeEvent* event) override;
+    void showEvent(QShowEvent* event) override;
 
   private:
     QWidget* runKeys();

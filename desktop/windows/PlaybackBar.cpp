@@ -123,8 +123,6 @@ PlaybackBar::PlaybackBar(Forms& forms, Binder& binder, QWidget* parent)
     slider->setFixedWidth(kSpeedWidth);
     second->addWidget(word(QObject::tr("Speed:")));
     second->addWidget(slider);
-    pace_->setMinimumWidth(
-        pace_->fontMetrics().horizontalAdvance(QObject::tr("%1 traces/s").arg("10.0")) + kSpacing);
     second->addWidget(pace_);
     second->addWidget(box(panel.PlaybackRealTime, binder));
     second->addWidget(box(panel.PlaybackRepeat, binder));
@@ -145,6 +143,13 @@ PlaybackBar::PlaybackBar(Forms& forms, Binder& binder, QWidget* parent)
     });
     showPace();
     setVisible(panel.PlaybackFrame.Visible);
+}
+
+void PlaybackBar::showEvent(QShowEvent* event) {
+    // Not before: the start of the window would wait for the fonts.
+    pace_->setMinimumWidth(
+        pace_->fontMetrics().horizontalAdvance(QObject::tr("%1 traces/s").arg("10.0")) + kSpacing);
+    QWidget::showEvent(event);
 }
 
 void PlaybackBar::showPace() {

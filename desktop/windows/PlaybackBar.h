@@ -14,6 +14,9 @@ class PlaybackBar : public QWidget {
   public:
     PlaybackBar(Forms& forms, Binder& binder, QWidget* parent = nullptr);
 
+  protected:
+    void showEvent(QShowEvent* event) override;
+
   private:
     void showPace();
 

@@ -111,12 +111,11 @@ void ScriptEditorWindow::setUpEditor() {
     text_->setWrapMode(QsciScintilla::WrapNone);
     text_->setScrollWidthTracking(true);
     text_->setScrollWidth(1);
-    auto* words = new QsciAPIs(lexer_);
+    words_ = new QsciAPIs(lexer_);
     for (const Statement& statement : statements()) {
         const std::string word = trimmed(statement.word);
-        if (word.size() > 1) words->add(QString::fromStdString(word));
+        if (word.size() > 1) words_->add(QString::fromStdString(word));
     }
-    words->prepare();
     text_->setAutoCompletionSource(QsciScintilla::AcsAPIs);
     text_->setAutoCompletionThreshold(2);
     text_->setAutoCompletionCaseSensitivity(false);
@@ -126,6 +125,12 @@ void ScriptEditorWindow::setUpEditor() {
                 if (const Statement* statement = statementOf(word))
                     sentence_->setText(helpOf(*statement));
             });
+}
+
+/// A thread of its own gets the words ready; a window that nobody sees needs none.
+void ScriptEditorWindow::showEvent(QShowEvent* event) {
+    if (!std::exchange(prepared_, true)) words_->prepare();
+    FormWindow::showEvent(event);
 }
 
 void ScriptEditorWindow::takeColors() {

@@ -15,6 +15,8 @@
 #include "forms/ScriptForms.h"
 #include "script/LineCheck.h"
 
+class QsciAPIs;
+
 namespace zel {
 
 class ScriptEditorWindow : public FormWindow {
@@ -24,6 +26,7 @@ class ScriptEditorWindow : public FormWindow {
 
   protected:
     void changeEvent(QEvent* event) override;
+    void showEvent(QShowEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void reject() override;
 
@@ -42,6 +45,7 @@ class ScriptEditorWindow : public FormWindow {
     ScriptEditor& script_;
     QsciScintilla* text_;
     ScriptLexer* lexer_;
+    QsciAPIs* words_ = nullptr;
     QLabel* sentence_;
     QWidget* findBar_ = nullptr;
     QLineEdit* findText_ = nullptr;
@@ -51,6 +55,7 @@ class ScriptEditorWindow : public FormWindow {
     QString file_;
     bool showing_ = false;
     bool changed_ = false;
+    bool prepared_ = false;
 };
 
 }  // namespace zel

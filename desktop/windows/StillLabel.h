@@ -11,20 +11,23 @@ namespace zel {
 /// needs more of it. A window at rest does hardly anything then.
 class StillLabel : public QLabel {
   public:
-    /// `least` is the width in pixels that it has always, `padding` what the style sheet adds at
+    /// `least` is the width in pixels that it has always, `padding` what the style adds at
     /// most, both sides.
     explicit StillLabel(int least = 0, int lines = 1, int padding = 12)
-        : least_(least), lines_(lines), padding_(padding) {
-        fit({});
-    }
+        : least_(least), lines_(lines), padding_(padding) {}
 
     void showText(const QString& text) {
         if (text == this->text()) return;
-        fit(text);
+        if (testAttribute(Qt::WA_WState_Polished)) fit(text);
         setText(text);
     }
 
   protected:
+    bool event(QEvent* event) override {
+        const bool done = QLabel::event(event);
+        if (event->type() == QEvent::Polish) fit(text());
+        return done;
+    }
     void changeEvent(QEvent* event) override {
         QLabel::changeEvent(event);
         if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange)

@@ -2,12 +2,14 @@
 
 #include <QCheckBox>
 #include <QFontDatabase>
+#include <QFontInfo>
 #include <QFormLayout>
 #include <QHBoxLayout>
 #include <QPushButton>
 #include <QScrollBar>
 #include <QStyle>
 #include <QVBoxLayout>
+#include <cmath>
 #include <string>
 
 #include "desktop/binders/Binder.h"
@@ -84,9 +86,10 @@ QLabel* words(Binder& binder, Label& control) {
 }
 
 void setCaptionSize(QLabel* label, double factor) {
-    // The theme's style sheet decides over a font that is set.
-    label->setStyleSheet(QString("font-weight: bold; font-size: %1pt;")
-                             .arg(static_cast<int>(label->font().pointSizeF() * factor)));
+    QFont font = label->font();
+    font.setBold(true);
+    font.setPixelSize(static_cast<int>(std::lround(QFontInfo(font).pixelSize() * factor)));
+    label->setFont(font);
 }
 
 }  // namespace

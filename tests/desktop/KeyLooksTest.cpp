@@ -159,12 +159,14 @@ TEST_F(WindowTest, ManualAnswers_AlternateInColour) {
     panel().ManualCommandText.Text = "CMD";
     panel().SendButton.Click();
     window->binder().flush();
-    const QString first = answer->styleSheet();
+    const QColor first = answer->palette().color(QPalette::Text);
     panel().ManualCommandText.Text = "CMD";
     panel().SendButton.Click();
     window->binder().flush();
-    EXPECT_FALSE(first.isEmpty());
-    EXPECT_NE(answer->styleSheet(), first);
+    EXPECT_NE(first, QApplication::palette().color(QPalette::Text));
+    EXPECT_NE(answer->palette().color(QPalette::Text), first);
+    EXPECT_NE(answer->palette().color(QPalette::Text),
+              QApplication::palette().color(QPalette::Text));
     EXPECT_FALSE(answer->text().isEmpty());
 }
 

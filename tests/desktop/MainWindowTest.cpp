@@ -8,6 +8,7 @@
 #include <QToolBar>
 #include <algorithm>
 
+#include "desktop/binders/ToolTips.h"
 #include "desktop/windows/FoldGroup.h"
 #include "tests/desktop/WindowTest.h"
 
@@ -345,13 +346,19 @@ TEST_F(WindowTest, ThemeMenu_DrawsColouredTextsAnew) {
         applyTheme(testApplication(), theme);
     });
     panel().DeltaLabel.ForeColor = 65280;
-    const auto* label = widgetOf<QLabel>(panel().DeltaLabel);
-    const QString dark = label->styleSheet();
+    panel().DeltaLabel.Caption = "+2.4 dB";
+    show();
+    auto* label = widgetOf<QLabel>(panel().DeltaLabel);
+    const QColor dark = label->palette().color(QPalette::WindowText);
+    EXPECT_EQ(dark, inkOf(65280));
+    const QImage before = label->grab().toImage();
     for (QAction* action : window->findChildren<QAction*>())
         if (action->text() == "Light Theme") action->trigger();
     window->binder().flush();
     EXPECT_EQ(chosen, std::vector<ThemeChoice>{ThemeChoice::Light});
-    EXPECT_NE(label->styleSheet(), dark);
+    EXPECT_EQ(label->palette().color(QPalette::WindowText), inkOf(65280));
+    EXPECT_NE(label->palette().color(QPalette::WindowText), dark);
+    EXPECT_NE(label->grab().toImage(), before);
 }
 
 }  // namespace
