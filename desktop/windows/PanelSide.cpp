@@ -129,9 +129,12 @@ void PanelSide::resizeEvent(QResizeEvent* event) {
     foldByRoom();
 }
 
-/// The bars come and go by a posted event; taken now, the panel is drawn once at the start.
+/// The parts have their fonts, and with them their sizes, from now on. What would be laid out by
+/// posted events is taken at once, so that the panel is drawn once at the start.
 void PanelSide::showEvent(QShowEvent* event) {
     QScrollArea::showEvent(event);
+    foldByRoom();
+    layout_->activate();
     QCoreApplication::sendPostedEvents(this, QEvent::MetaCall);
 }
 

@@ -84,7 +84,6 @@ StatusLine::StatusLine(QMainWindow& window, Forms& forms, const ZEL3Variables& m
     state_->setTextFormat(Qt::PlainText);
     state_->setAccessibleName(QObject::tr("State of the connection"));
     auto* clock = new StillLabel;
-    clock->setObjectName("caption");
     clock->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
     for (QLabel* label : {activity_, state_, static_cast<QLabel*>(clock)})
         bar->addPermanentWidget(label);
