@@ -164,7 +164,7 @@ void PanelStyle::drawKey(const QStyleOptionButton& option, QPainter& painter,
     frame.edge = color(face.edge);
     if (!has(option, State_Enabled)) {
         frame.ground = color(&ThemeColors::window);
-        frame.edge = color(&ThemeColors::border);
+        frame.edge = color(preset ? &ThemeColors::accent : &ThemeColors::border);
     } else if (has(option, State_Sunken)) {
         const bool own = face.groundUnderPointer == nullptr && face.ground != &ThemeColors::yellow;
         frame.ground = own ? frame.ground.darker(kPressedDarker) : color(&ThemeColors::accent);

@@ -88,6 +88,7 @@ PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder&
     column_->setObjectName("column");
     layout_->setSpacing(kBetween);
     layout_->setContentsMargins(8, 6, 8, 6);
+    setWidget(column_);  // while it is empty: of a full one all sizes would be asked for
     layout_->addWidget(runKeys());
     layout_->addWidget(softPositions(), 5);
     layout_->addWidget(hardKeys(), 3);
@@ -108,9 +109,6 @@ PanelSide::PanelSide(ControllerForm& panel, const ZEL3Variables& mirror, Binder&
     }
     groups_ = {markers, modes, command};
     layout_->addStretch(1);
-    column_->resize(kWidth,
-                    0);  // else its layout is asked for a size, in vain: the window gives it
-    setWidget(column_);
 }
 
 FoldGroup* PanelSide::addGroup(const QString& name, const QString& caption, QWidget* content) {

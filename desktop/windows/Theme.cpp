@@ -2,10 +2,7 @@
 
 #include <QApplication>
 #include <QPalette>
-#include <QStyle>
-#include <QStyleFactory>
 #include <QToolTip>
-#include <utility>
 
 #include "desktop/binders/ToolTips.h"
 #include "desktop/style/PanelStyle.h"
