@@ -240,6 +240,27 @@ TEST_F(DoctorTest, ServerWithoutAnAnswer_IsAFault) {
                          "fault server: nothing answers at host:2277; Check"));
 }
 
+TEST_F(DoctorTest, EachAnswer_IsAwaitedForItsOwnTime) {
+    const auto duration = [this](const LinkAddress& address) {
+        const std::int64_t begun = platform.clock.micros();
+        look(platform.port, address);
+        return (platform.clock.micros() - begun) / 1000;
+    };
+    const LinkAddress server{LinkAddress::Kind::Tcp, "host", 2277};
+    platform.tcpSocket.expect("\r");
+    platform.tcpSocket.expect("GET\r").silence();
+    EXPECT_EQ(duration(server), 300 + 600);
+    platform.tcpSocket.expect("\r");
+    platform.tcpSocket.expect("GET\r").answer("0\r");
+    platform.tcpSocket.expect("IDN?\r").silence();
+    EXPECT_EQ(duration(server), 300 + 1500);
+    // Five speeds, and nothing at any of them.
+    EXPECT_EQ(duration({LinkAddress::Kind::Serial, kPath, 57600}), 5 * (300 + 600));
+    EXPECT_EQ(duration({LinkAddress::Kind::TwoModems, kPath, 57600, "123", {}}), 2000);
+    platform.tcpSocket.connectsTo(SocketState::Connecting);
+    EXPECT_EQ(duration(server), 5000);
+}
+
 TEST_F(DoctorTest, BytesThatAreNoAnswer_AreShownTwelveAtMost) {
     const auto came = [this](const char* bytes) {
         platform.tcpSocket.expect("\r").answer(bytes);

@@ -1,6 +1,14 @@
 #include <gtest/gtest.h>
 
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <utility>
+
 #include "link/CommandExchange.h"
+#include "platform/Socket.h"
+#include "platform/virtual/VirtualPlatform.h"
+#include "shell/Program.h"
 #include "support/Text.h"
 #include "tests/connection/Bench.h"
 #include "trace/TraceReader.h"
@@ -180,6 +188,29 @@ TEST_F(TcpDialogTest, Servers_AreRememberedNewestFirst) {
     EXPECT_EQ(tcp.IPAdressTextBox.Text.get(), "b");
 }
 
+TEST_F(TcpDialogTest, StoredServers_AreListedWhenTheDialogOpens) {
+    platform.settings.set("ZELRemote", "TCPCON", "Recent1", "a:1");
+    platform.settings.set("ZELRemote", "TCPCON", "Recent3", "c:3");
+    platform.settings.set("ZELRemote", "TCPCON", "Recent8", "h:8");
+    platform.settings.set("ZELRemote", "TCPCON", "Recent9", "i:9");
+    tcp.unload(1);
+    tcp.load();
+    EXPECT_EQ(tcp.RecentServersList.items(), (Texts{"a:1", "c:3", "h:8"}));
+}
+
+TEST_F(TcpDialogTest, Servers_BeyondTheEighth_AreForgotten) {
+    for (int i = 1; i <= 9; ++i) {
+        socket.expect("\r").silence();
+        tcp.IPAdressTextBox.Text = std::string(1, static_cast<char>('a' + i - 1));
+        tcp.ConnectTCPButton.Click();
+    }
+    const Texts kept = {"i:2277", "h:2277", "g:2277", "f:2277",
+                        "e:2277", "d:2277", "c:2277", "b:2277"};
+    EXPECT_EQ(tcp.RecentServersList.items(), kept);
+    EXPECT_EQ(stored("Recent8"), "b:2277");
+    EXPECT_EQ(stored("Recent9"), "absent");
+}
+
 TEST_F(TcpDialogTest, Tls_PassesTheFingerprintOn) {
     socket.connectsTo(SocketState::Error);
     tcp.chkTls.setValue(true);
@@ -351,6 +382,47 @@ TEST_F(TcpDialogTest, ProbeAnsweredWithoutALineEnd_IsTakenAfterAQuarterOfASecond
     EXPECT_TRUE(connectTcp());
     EXPECT_EQ(sentBefore, "\r");
     EXPECT_EQ(socket.failure(), "");
+}
+
+/// A server that never ends sending: an answer first, then pieces of 64 KiB.
+class FloodingSocket : public Socket {
+  public:
+    int pieces = 0;
+
+    void connectTo(const std::string&, int) override { state_ = SocketState::Connected; }
+    void connectTls(const std::string&, int, const std::string&) override {}
+    void close() override { state_ = SocketState::Closed; }
+    SocketState state() const override { return state_; }
+    /// The flood ends where the handshake begins.
+    bool sendData(std::string_view) override {
+        if (!answered_) return true;
+        state_ = SocketState::Error;
+        return false;
+    }
+    std::string peekData() override { return state_ == SocketState::Connected ? "0" : ""; }
+    std::string getData() override {
+        if (state_ != SocketState::Connected) return "";
+        if (!std::exchange(answered_, true)) return "0\r";
+        return ++pieces > 100 ? std::string() : std::string(1U << 16, 'x');
+    }
+    std::size_t bytesToWrite() const override { return 0; }
+    std::string problem() const override { return "The end."; }
+
+  private:
+    SocketState state_ = SocketState::Closed;
+    bool answered_ = false;
+};
+
+TEST(FloodedTcpDialogTest, WhatAServerHadWaiting_IsTakenUpToAMillionBytes) {
+    VirtualPlatform v;
+    FloodingSocket socket;
+    Program program({v.clock, v.events, v.boxes, v.port, v.ports, socket, v.serverPort,
+                     v.serverSocket, v.settings, v.debug, v.clipboard, v.launcher, v.startup,
+                     v.folder, v.fileDialogs, v.files, v.endSignals, v.machine, v.portProbe},
+                    "");
+    program.start();
+    EXPECT_FALSE(program.connect({LinkAddress::Kind::Tcp, "host", 2277}, false));
+    EXPECT_EQ(socket.pieces, 17);  // 16 are 2^20 bytes, which are not yet too many
 }
 
 }  // namespace
