@@ -92,6 +92,10 @@ constexpr Row kRows[] = {
     {QT_TRANSLATE_NOOP("QObject", "Of comma and point only one can be the decimal mark")},
     {QT_TRANSLATE_NOOP("QObject", "%1 can be %2 or %3: write it without the comma")},
     {QT_TRANSLATE_NOOP("QObject", "A small m is a thousandth: write %1 MHz")},
+    {QT_TRANSLATE_NOOP("QObject", "Not listening")},
+    {QT_TRANSLATE_NOOP("QObject", "Looking for the instrument")},
+    {QT_TRANSLATE_NOOP("QObject", "A client is connected")},
+    {QT_TRANSLATE_NOOP("QObject", "Waiting for a client")},
     {QT_TRANSLATE_NOOP("QObject", "Held traces ended: frequency changed")},
     {QT_TRANSLATE_NOOP("QObject", "Held traces ended: span changed")},
     {QT_TRANSLATE_NOOP("QObject", "Held traces ended: sweep time changed")},
@@ -104,8 +108,8 @@ constexpr Row kRows[] = {
 constexpr const char* kSeconds = QT_TRANSLATE_NOOP("QObject", "%1, %2 of %3 s");
 
 /// Labels whose texts are sentences of the program's own.
-constexpr const char* kLabels[] = {"ReconnectLabel", "AdviceLabel", "lblReason",    "FileLabel",
-                                   "WaitLabel",      "PaceLabel",   "PlaybackLabel"};
+constexpr const char* kLabels[] = {"ReconnectLabel", "AdviceLabel", "lblReason",     "FileLabel",
+                                   "WaitLabel",      "PaceLabel",   "PlaybackLabel", "lblState"};
 
 QRegularExpression patternOf(const char* text) {
     QString pattern = QRegularExpression::escape(QString::fromUtf8(text));

@@ -156,6 +156,12 @@ const Tip kOwn[] = {
     {"UtilityDoctor", QT_TRANSLATE_NOOP("QObject", "Connection Doctor...")},
     {"UtilityRecord", QT_TRANSLATE_NOOP("QObject", "Record Session...")},
     {"RecentMenu", QT_TRANSLATE_NOOP("QObject", "Recent Files")},
+    {"SearchRatesButton", QT_TRANSLATE_NOOP("QObject", "Search Baud Rates")},
+    {"chkTls", QT_TRANSLATE_NOOP("QObject", "Encrypt the connection (TLS)")},
+    {"chkKeep", QT_TRANSLATE_NOOP("QObject", "Keep the client at work: refuse newcomers")},
+    {"cmdCopyAddress", QT_TRANSLATE_NOOP("QObject", "Copy address")},
+    {"cmdDisconnectClient", QT_TRANSLATE_NOOP("QObject", "Disconnect client")},
+    {"cmdRehearse", QT_TRANSLATE_NOOP("QObject", "Check")},
 };
 
 /// "1" of "SoftKey(0)": people count from one.

@@ -1239,7 +1239,7 @@ oder eine Aufzeichnung laden</translation>
     </message>
     <message>
         <source>of the server&apos;s certificate; empty: by its authority</source>
-        <translation>des Zertifikats des Servers; leer: nach dessen Aussteller</translation>
+        <translation>des Server-Zertifikats; leer: nach Aussteller</translation>
     </message>
     <message>
         <source>Fingerprint</source>
@@ -1792,6 +1792,43 @@ oder eine Aufzeichnung laden</translation>
     <message>
         <source>%1 (before: %2)</source>
         <translation>%1 (vorher: %2)</translation>
+    </message>
+    <message>
+        <source>Search Baud Rates</source>
+        <translation>Baudraten durchsuchen</translation>
+    </message>
+    <message>
+        <source>Encrypt the connection (TLS)</source>
+        <translation>Verbindung verschlüsseln (TLS)</translation>
+    </message>
+    <message>
+        <source>Keep the client at work: refuse newcomers</source>
+        <translation>Client bei der Arbeit lassen: Neue abweisen</translation>
+    </message>
+    <message>
+        <source>Copy address</source>
+        <translation>Adresse kopieren</translation>
+    </message>
+    <message>
+        <source>Disconnect client</source>
+        <translation>Client trennen</translation>
+    </message>
+    <message>
+        <source>Check</source>
+        <translation>Prüfen</translation>
+    </message>
+    <message>
+        <source>Port</source>
+        <comment>of TCP</comment>
+        <translation>Port</translation>
+    </message>
+    <message>
+        <source>Not listening</source>
+        <translation>Kein Serverbetrieb</translation>
+    </message>
+    <message>
+        <source>A client is connected</source>
+        <translation>Ein Client ist verbunden</translation>
     </message>
 </context>
 </TS>

@@ -11,6 +11,7 @@
 
 #include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
+#include "desktop/binders/ToolTips.h"
 #include "desktop/platform/SimulatorChild.h"
 #include "forms/Forms.h"
 #include "platform/Form.h"
@@ -43,7 +44,8 @@ ConnectCard::ConnectCard(Forms& forms, Binder& binder, Ways ways, QWidget* paren
       wait_(new QProgressBar),
       cancel_(new QPushButton(QObject::tr("Cancel"))),
       again_(new QPushButton(QObject::tr("Try Again"))),
-      search_(new QPushButton(QString::fromStdString(forms.main.SearchRatesButton.Caption))),
+      search_(new QPushButton(
+          ownCaption(forms.main.SearchRatesButton, forms.main.SearchRatesButton.Caption))),
       close_(new QPushButton(QObject::tr("Close"))) {
     setObjectName("card");
     setFixedWidth(kWidth);

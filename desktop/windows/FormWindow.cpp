@@ -12,6 +12,7 @@
 
 #include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
+#include "desktop/binders/ToolTips.h"
 #include "desktop/windows/ConnectCard.h"
 #include "forms/MainForm.h"
 #include "panel/EntryText.h"
@@ -257,7 +258,7 @@ ConnectionWindow::ConnectionWindow(MainForm& form, Binder& binder, QWidget* pare
         auto* key = new QPushButton;
         key->setAutoDefault(false);
         constexpr int kAroundText = 28;  // px
-        const QString words = QString::fromStdString(control.Caption.get());
+        const QString words = ownCaption(control, control.Caption);
         key->setMinimumWidth(
             std::max(100, key->fontMetrics().horizontalAdvance(words) + kAroundText));
         binder.bind(control, key);

@@ -17,6 +17,7 @@
 #include <string>
 
 #include "desktop/binders/Binder.h"
+#include "desktop/binders/ToolTips.h"
 #include "desktop/windows/FormWindow.h"
 #include "forms/Forms.h"
 #include "platform/Controls.h"
@@ -50,7 +51,7 @@ QPushButton* button(Binder& binder, Button& control) {
     auto* key = new QPushButton;
     key->setAutoDefault(false);
     constexpr int kAroundText = 28;  // px
-    const QString text = QString::fromStdString(control.Caption.get());
+    const QString text = ownCaption(control, control.Caption);
     const int wide = key->fontMetrics().horizontalAdvance(text) + kAroundText;
     key->setMinimumWidth(std::max(kButtonWidth, wide));
     binder.bind(control, key);
@@ -118,7 +119,7 @@ TcpWindow::TcpWindow(TCPConnectionForm& form, Binder& binder, QWidget* parent)
     PanelLineEdit* port = box(binder, form.RemotePortTextBox);
     setAccept(form.ConnectTCPButton);
     checkField(*port, portProblem);
-    fields->addRow(QObject::tr("Port"), port);
+    fields->addRow(QObject::tr("Port", "of TCP"), port);
     fields->addRow("", check(binder, form.chkTls));
     PanelLineEdit* pinned = box(binder, form.FingerprintTextBox);
     pinned->setPlaceholderText(QObject::tr("of the server's certificate; empty: by its authority"));

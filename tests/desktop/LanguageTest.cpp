@@ -8,6 +8,7 @@
 #include "desktop/binders/OwnTexts.h"
 #include "desktop/binders/ToolTips.h"
 #include "desktop/platform/Language.h"
+#include "forms/MainForm.h"
 #include "tests/desktop/WindowTest.h"
 
 namespace zel {
@@ -32,6 +33,11 @@ TEST_F(LanguageTest, German_TranslatesTheWindowsOwnTexts) {
     EXPECT_EQ(toolTipOf(panel.PlaySingleButton), "Einen Sweep lesen");
     EXPECT_EQ(accessibleNameOf(panel.CWGraph1), "Diagramm");
     EXPECT_EQ(ownCaption(panel.PlaybackPlay, "Pause"), "Anhalten");
+    MainForm dialog;
+    EXPECT_EQ(ownCaption(dialog.SearchRatesButton, dialog.SearchRatesButton.Caption),
+              "Baudraten durchsuchen");
+    EXPECT_EQ(ownCaption(dialog.ZELButton, dialog.ZELButton.Caption), "Connect") << "a panel text";
+    EXPECT_EQ(QObject::tr("Port", "of TCP"), "Port");
 }
 
 TEST_F(LanguageTest, German_LeavesThePanelsTexts) {
