@@ -288,7 +288,8 @@ std::string MainWindow::reasonHere(const Control& control) const {
                                        &panel_.ChannelPowerCheck, &panel_.OccBWButton,
                                        &panel_.OccBWCheck,        &panel_.TDMAButton,
                                        &panel_.TDMAPowerCheck,    &panel_.DistFaultButton,
-                                       &panel_.DistFaultCheck};
+                                       &panel_.DistFaultCheck,    &panel_.MarkerCheckBox,
+                                       &panel_.DeltaCheckBox};
     const bool instrument =
         std::find(std::begin(needLine), std::end(needLine), &control) != std::end(needLine);
     if (instrument && !panel_.isConnected)

@@ -213,7 +213,8 @@ TEST_F(WindowTest, PlaceWithoutABox_HasNoCaptionOfAnotherMenu) {
 TEST_F(WindowTest, KeysOfTheInstrument_AreGreyWithoutOne) {
     ControllerForm& p = panel();
     const std::vector<const Control*> keys = {&p.ResetButton,     &p.AnalyzerButton, &p.PwrButton,
-                                              &p.DistFaultButton, &p.TDMAPowerCheck, &p.OccBWCheck};
+                                              &p.DistFaultButton, &p.TDMAPowerCheck, &p.OccBWCheck,
+                                              &p.MarkerCheckBox};
     const auto usable = [&] {
         show();
         return std::count_if(keys.begin(), keys.end(), [this](const Control* key) {
