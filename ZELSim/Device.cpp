@@ -103,6 +103,8 @@ void Device::enterMode(Mode mode) {
         case Mode::DistanceToFault:
             settings_.unit = static_cast<double>(Unit::DB);
             settings_.referenceLevel = 0;
+            // Distances come out of a sweep over frequencies.
+            if (span == 0) span = kHighestHz;
             break;
         case Mode::TrackingGenerator:
             if (settings_.transmissionCal + settings_.reflectionCal +

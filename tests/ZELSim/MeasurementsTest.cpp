@@ -140,6 +140,14 @@ TEST(Measurements, DistanceToFault_ShowsTheFaultsAtTheirPlaces) {
     EXPECT_NEAR(static_cast<double>(highestPoint(levels)) * step, 12.6, 0.1);
 }
 
+TEST(Measurements, DistanceToFault_SweepsFrequenciesAlsoFromZeroSpan) {
+    Host host;
+    host.setUp({"SPAN,0", "MEAS,7"});
+    EXPECT_EQ(host.value("SPAN"), "3000000000");
+    host.setUp({"MEAS,1"});
+    EXPECT_EQ(host.value("SPAN"), "0");
+}
+
 TEST(Measurements, LeavingAMode_BringsSpanUnitAndReferenceBack) {
     Host host;
     host.setUp({"SPAN,1000000000", "REFLVL,-10", "MEAS,7"});
