@@ -17,6 +17,7 @@
 #include "forms/ControllerForm.h"
 #include "platform/Event.h"
 #include "shell/Program.h"
+#include "trace/ViewAnnotations.h"
 
 namespace zel {
 
@@ -26,6 +27,8 @@ class GraphSide : public QWidget {
 
     GraphWidget& graph() { return *graph_; }
     EmptyScreen& empty() { return *empty_; }
+    /// The texts around the trace, as they are drawn.
+    ViewAnnotations annotations() const;
     /// For the menu of the graph.
     std::function<void()> copyPicture;
     /// The ways to begin, while there is neither a connection nor a trace.
@@ -54,6 +57,7 @@ class GraphSide : public QWidget {
     Readouts* readouts_;
     GraphNavigator navigator_;
     std::int16_t shownMode_ = 0;
+    std::int16_t levelMode_ = 0;  ///< in which the reference level was asked last; 0: never
     std::unique_ptr<PointerText> pointer_;
     Handlers readings_;
 };

@@ -9,6 +9,7 @@
 #include <QMessageBox>
 #include <QPushButton>
 #include <QTimer>
+#include <QToolButton>
 #include <algorithm>
 #include <cstddef>
 #include <functional>
@@ -390,9 +391,9 @@ void MainWindow::addLanguageMenu(const QString& now,
 void MainWindow::drawImage(const std::string& path, std::string& problem) {
     QString error;
     graph().drawNow();
-    saveGraphImage(panel_.CWGraph1, annotateSweep(panel_, program_.variables(), program_.sweep()),
-                   QString::fromStdString(path), &error, graph().size().expandedTo(kSmallestImage),
-                   true, findChild<TraceToolsDock*>()->picture());
+    saveGraphImage(panel_.CWGraph1, graphSide_->annotations(), QString::fromStdString(path), &error,
+                   graph().size().expandedTo(kSmallestImage), true,
+                   findChild<TraceToolsDock*>()->picture());
     problem = error.toStdString();
 }
 
@@ -407,8 +408,10 @@ void MainWindow::copyPicture() {
 void MainWindow::keyPressEvent(QKeyEvent* event) {
     // Enter presses the button that has the focus, here as in the dialogs.
     const bool enters = event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
-    if (auto* focused = qobject_cast<QPushButton*>(focusWidget());
-        enters && focused != nullptr && focused->isEnabled() && !event->isAutoRepeat())
+    auto* focused = qobject_cast<QAbstractButton*>(focusWidget());
+    const bool pressed = qobject_cast<QPushButton*>(focused) != nullptr ||
+                         qobject_cast<QToolButton*>(focused) != nullptr;
+    if (enters && pressed && focused->isEnabled() && !event->isAutoRepeat())
         return focused->click();
     if (!terminators_->typeAhead(*event)) QMainWindow::keyPressEvent(event);
 }

@@ -142,6 +142,18 @@ TEST_F(WindowTest, ToolOfSingle_WorksTheSameControl) {
     EXPECT_EQ(panel().CWGraph1.plotSerial(), before + 1);
 }
 
+TEST_F(WindowTest, EnterWorksTheToolThatHasTheFocus) {
+    connect();
+    show();
+    QToolButton* single = toolOf(*window, "Single");
+    ASSERT_NE(single, nullptr);
+    const unsigned long before = panel().CWGraph1.plotSerial();
+    single->setFocus();
+    QTest::keyClick(single, Qt::Key_Return);
+    show();
+    EXPECT_GT(panel().CWGraph1.plotSerial(), before);
+}
+
 TEST_F(WindowTest, ToolOfStop_CanBeUsedWhileTheKeyIsShown) {
     show();
     QToolButton* stop = toolOf(*window, "Stop");

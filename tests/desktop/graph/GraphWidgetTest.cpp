@@ -267,6 +267,30 @@ TEST_F(GraphWidgetTest, SettingsSince_StrikeTheTextsOfTheTraceAndChangeNone) {
     EXPECT_EQ(texts().substr(texts().size() - 8), "struck: ");
 }
 
+TEST_F(GraphWidgetTest, LevelOfAnotherMode_IsStruckUntilItIsAsked) {
+    const auto struck = [this] {
+        platform.events.runFor(100);
+        window->binder().flush();
+        QList<QCPTextElement*> found;
+        collectTexts(*window->graph().plotLayout(), found);
+        QStringList parts;
+        for (QCPTextElement* element : found)
+            parts += dynamic_cast<AnnotationText&>(*element).struck();
+        return parts.join("|").toStdString();
+    };
+    panel().DistFaultButton.Click();
+    panel().PlaySingleButton.Click();
+    EXPECT_EQ(struck(), "");
+    panel().AnalyzerButton.Click();
+    panel().SpanButton.Click();
+    panel().SoftKey(2).Click();  // reads a sweep, and no level
+    EXPECT_EQ(struck(), "Ref 0 dB");
+    EXPECT_TRUE(window->graph().yAxis->tickLabelFont().strikeOut());
+    panel().PlaySingleButton.Click();
+    EXPECT_EQ(struck(), "");
+    EXPECT_FALSE(window->graph().yAxis->tickLabelFont().strikeOut());
+}
+
 TEST_F(GraphWidgetTest, UnsureLevel_IsStruckWithTheLabelsOfItsAxis) {
     ZEL3Variables& mirror = program->variables();
     mirror.ReferenceLevel = -20;
