@@ -85,6 +85,8 @@ TEST_F(Connection, Direct_AfterTheDialog_HidesWhatBelongsToDialling) {
     EXPECT_FALSE(dialog.LoadSettingsButton.Visible);
     EXPECT_FALSE(dialog.SaveSettingsButton.Visible);
     EXPECT_FALSE(dialog.CancelConnButton.Visible);
+    EXPECT_TRUE(dialog.CancelConnButton1.Visible);
+    EXPECT_TRUE(dialog.DisconnectButton.Visible);
     EXPECT_TRUE(dialog.ZELButton.Visible);
 }
 
@@ -140,6 +142,19 @@ TEST_F(Connection, Connect_BadField_LeavesTheDialogOpen) {
     panel.Direct.Click();
     EXPECT_EQ(shown(), Texts{"plain | ZELRemote | Please enter a valid COM port!"});
     EXPECT_EQ(port.written(), "");
+}
+
+TEST_F(Connection, Connect_InVain_LeavesTheKeysOfTheFrequencyMenu) {
+    panel.FrequencyButton.Picture = "freq_y";
+    panel.SpanButton.Picture = "span_b";
+    later(10, [this] {
+        dialog.COMList.setText("COM");
+        dialog.ZELButton.Click();
+        dialog.CancelConnButton1.Click();
+    });
+    panel.Direct.Click();
+    EXPECT_EQ(panel.FrequencyButton.Picture.get(), "freq_b");
+    EXPECT_EQ(panel.SpanButton.Picture.get(), "span_y");
 }
 
 TEST_F(Connection, Close_ClearsTheErrorFlag) {

@@ -118,5 +118,27 @@ TEST_F(DevicesTest, BadPortOrBaud_IsTold) {
     EXPECT_TRUE(port.openings().empty());
 }
 
+TEST_F(DevicesTest, Baud_IsTakenFromTheLowestToTheHighest) {
+    form.load();
+    form.DevicesPortList.setText("COM3");
+    port.failOpen("held");
+    const Texts refused = {"plain | ZELRemote | Please enter a valid baud rate!"};
+    for (const char* baud : {"", "0", "0.5", "-9600", "10000001", "1e300"}) {
+        boxes.clear();
+        form.DevicesBaudList.setText(baud);
+        form.SetDeviceButton.Click();
+        EXPECT_EQ(shown(), refused) << baud;
+    }
+    EXPECT_TRUE(port.openings().empty());
+    for (const char* baud : {"1", " 9600 ", "10000000"}) {
+        form.DevicesBaudList.setText(baud);
+        form.SetDeviceButton.Click();
+    }
+    ASSERT_EQ(port.openings().size(), 3U);
+    EXPECT_EQ(port.openings()[0].Settings, "1,N,8,1");
+    EXPECT_EQ(port.openings()[1].Settings, "9600,N,8,1");
+    EXPECT_EQ(port.openings()[2].Settings, "10000000,N,8,1");
+}
+
 }  // namespace
 }  // namespace zel

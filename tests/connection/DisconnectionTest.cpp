@@ -53,6 +53,13 @@ TEST_F(Connected, Disconnect_Cancel_SendsRemoteAndStays) {
     EXPECT_EQ(panel.MousePointer.get(), 0);
 }
 
+TEST_F(Connection, Disconnect_WithoutASession_GivesThePointerBack) {
+    panel.MousePointer = 11;
+    panel.Disconnect.Click();
+    EXPECT_EQ(shown(), Texts{"information | ZELRemote | Not Connected"});
+    EXPECT_EQ(panel.MousePointer.get(), 0);
+}
+
 TEST_F(Connected, Disconnect_EachOfItsButtons_Asks) {
     boxes.answer(BoxAnswer::Cancel);
     boxes.answer(BoxAnswer::Cancel);
@@ -245,6 +252,13 @@ TEST_F(Dialled, HangUp_SilentModem_TakesALittleOver11AndAHalfSeconds) {
     EXPECT_GE(ms, 11'502);
     EXPECT_LE(ms, 11'600);
     EXPECT_EQ(shown(), Texts{});
+}
+
+TEST_F(Dialled, HangUp_AnswerAtTheVeryEnd_ComesTooLate) {
+    port.expect("+++").answer("O").after(5001);
+    port.expect("ATH0\r").answer("OK\r");
+    EXPECT_EQ(time([this] { disconnection.HangUpModem(); }), 1000 + 5001 + 500);
+    expectPlayed();
 }
 
 TEST_F(Dialled, HangUp_ModemThatAnswers_TakesTheSilencesOnly) {

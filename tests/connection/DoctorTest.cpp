@@ -184,6 +184,18 @@ TEST_F(DoctorTest, NoDeviceAndNoAddress_IsAWarning) {
     EXPECT_TRUE(well);
 }
 
+TEST_F(DoctorTest, OfManyPorts_AllAreNamedAndFourAreExamined) {
+    platform.portProbe.known.clear();
+    for (const char* path : {"/dev/a", "/dev/b", "/dev/c", "/dev/d", "/dev/e"}) {
+        platform.portProbe.known.push_back({path, "", "", ""});
+        platform.portProbe.rights[path] = platform.portProbe.rights[kPath];
+    }
+    const std::string text = look(platform.port, std::nullopt);
+    EXPECT_TRUE(contains(text, "ok device: /dev/e: no maker is known, no serial number\n"));
+    EXPECT_TRUE(contains(text, "ok rights: /dev/d may be read and written\n"));
+    EXPECT_FALSE(contains(text, "ok rights: /dev/e"));
+}
+
 TEST_F(DoctorTest, ServerThatAnswers_IsFound) {
     platform.tcpSocket.expect("\r");
     platform.tcpSocket.expect("GET\r").answer("0\r");

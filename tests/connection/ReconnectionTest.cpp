@@ -145,6 +145,26 @@ TEST_F(SerialReconnection, PortThatGoes_IsSaidAndThatItIsBack_IsOffered) {
     EXPECT_EQ(shown(), Texts{});
 }
 
+TEST_P(ReconnectionTest, ButtonWhileAnAttemptIsUnderWay_IsHidden) {
+    ASSERT_TRUE(connect());
+    goAway();
+    pass(1500);
+    switchInstrument(false);
+    comeBack();
+    pass(1500);
+    ASSERT_TRUE(panel.ReconnectButton.Visible);
+    bool visible = true;
+    std::string said;
+    platform.events.schedule(100, [&] {
+        visible = panel.ReconnectButton.Visible;
+        said = bar();
+    });
+    panel.ReconnectButton.Click();
+    EXPECT_FALSE(visible);
+    EXPECT_EQ(said, std::string("Connecting to ") + name() + " again");
+    EXPECT_TRUE(panel.ReconnectButton.Visible);
+}
+
 TEST_F(SerialReconnection, SettingsThatDiffer_AreNamed) {
     ASSERT_TRUE(connect());
     goAway();
