@@ -54,6 +54,8 @@ int PanelStyle::pixelMetric(PixelMetric metric, const QStyleOption* option,
 
 int PanelStyle::styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
                           QStyleHintReturn* more) const {
+    // A second, lighter text under a disabled one blurs it on a dark menu.
+    if (hint == SH_EtchDisabledText) return 0;
     return QProxyStyle::styleHint(hint, option, widget, more);
 }
 

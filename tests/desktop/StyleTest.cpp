@@ -6,6 +6,7 @@
 #include <QPushButton>
 #include <QRadioButton>
 #include <QScrollBar>
+#include <QStyle>
 #include <QToolTip>
 
 #include "desktop/binders/Binder.h"
@@ -48,6 +49,10 @@ TEST_P(Style, EachFaceOfAKey_HasItsGround) {
         key.setEnabled(false);
         EXPECT_EQ(groundOf(key), QColor(colors().window)) << face;
     }
+}
+
+TEST_P(Style, DisabledTextOfAMenu_IsDrawnOnce) {
+    EXPECT_EQ(testApplication().style()->styleHint(QStyle::SH_EtchDisabledText), 0);
 }
 
 TEST_P(Style, FaceOfAKeyThatIsShown_ChangesAtOnce) {
