@@ -43,8 +43,8 @@ int main(int argc, char** argv) {
     if (zel::asksForHelp(argc, argv))
         return zel::parseStartOptions(argc, argv, options, std::cout, std::cerr).value_or(0);
     zel::GuardedApplication application(argc, argv);  // takes the toolkit's own options away
-    zel::FontsAhead fonts;
     zel::useEnglishMessages();
+    zel::FontsAhead fonts;  // reads the locale, which nobody sets from here on
     QApplication::setApplicationName("ZELRemote");
     QGuiApplication::setDesktopFileName("example.zelremote.ZELRemote");
     QApplication::setApplicationVersion(QString::fromStdString(zel::versionText(zel::kVersion)));

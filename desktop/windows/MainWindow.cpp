@@ -4,6 +4,7 @@
 #include <QApplication>
 #include <QClipboard>
 #include <QCloseEvent>
+#include <QCoreApplication>
 #include <QFileInfo>
 #include <QHBoxLayout>
 #include <QMessageBox>
@@ -426,6 +427,14 @@ void MainWindow::changeEvent(QEvent* event) {
 void MainWindow::showNow() {
     binder_.flush();
     graph().drawNow();
+}
+
+/// All parts know their fonts, and so their sizes, from here on. Laid out now and not by the posted
+/// events after this one, the window is painted once at the start.
+void MainWindow::showEvent(QShowEvent* event) {
+    QMainWindow::showEvent(event);
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::LayoutRequest);
+    side_->settle();
 }
 
 void MainWindow::closeEvent(QCloseEvent* event) {

@@ -54,6 +54,7 @@ class MainWindow : public QMainWindow {
 
   protected:
     void closeEvent(QCloseEvent* event) override;
+    void showEvent(QShowEvent* event) override;
     /// Digits that nobody took begin an entry.
     void keyPressEvent(QKeyEvent* event) override;
     void changeEvent(QEvent* event) override;

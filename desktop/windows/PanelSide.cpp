@@ -127,10 +127,7 @@ void PanelSide::resizeEvent(QResizeEvent* event) {
     foldByRoom();
 }
 
-/// The parts have their fonts, and with them their sizes, from now on. What would be laid out by
-/// posted events is taken at once, so that the panel is drawn once at the start.
-void PanelSide::showEvent(QShowEvent* event) {
-    QScrollArea::showEvent(event);
+void PanelSide::settle() {
     foldByRoom();
     layout_->activate();
     QCoreApplication::sendPostedEvents(this, QEvent::MetaCall);

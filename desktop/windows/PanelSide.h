@@ -29,6 +29,8 @@ class PanelSide : public QScrollArea {
     const std::vector<FoldGroup*>& groups() const { return groups_; }
     /// Opens and folds the groups that the user has not chosen for, so that the rest fits.
     void foldByRoom();
+    /// Lays the panel out at once, and takes what it has posted to itself for later.
+    void settle();
     /// A line says why keys are grey while the continuous view runs, else that the boxes show the
     /// instrument while the graph shows a file.
     void showState(bool viewRuns, bool fileShown);
@@ -41,7 +43,6 @@ class PanelSide : public QScrollArea {
 
   protected:
     void resizeEvent(QResizeEvent* event) override;
-    void showEvent(QShowEvent* event) override;
 
   private:
     QWidget* runKeys();
