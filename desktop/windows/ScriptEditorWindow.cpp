@@ -1,6 +1,6 @@
 #include "desktop/windows/ScriptEditorWindow.h"
 
-#include <Qsci/qsciapis.h>
+#include <Qsci/qsciabstractapis.h>
 
 #include <QEvent>
 #include <QFontDatabase>
@@ -46,6 +46,27 @@ QString helpOf(const Statement& statement) {
            " - " +
            QString::fromUtf8(statement.help.data(), static_cast<int>(statement.help.size()));
 }
+
+/// The words of statements that begin as what is typed. The editor's own list of words is got ready
+/// by a thread, which a window that is closed at once does not survive.
+class StatementWords : public QsciAbstractAPIs {
+  public:
+    using QsciAbstractAPIs::QsciAbstractAPIs;
+
+    void updateAutoCompletionList(const QStringList& context, QStringList& list) override {
+        if (context.isEmpty() || context.back().isEmpty()) return;
+        for (const Statement& statement : statements()) {
+            const QString word = QString::fromStdString(trimmed(statement.word));
+            if (word.size() > 1 && word.startsWith(context.back(), Qt::CaseInsensitive) &&
+                !list.contains(word))
+                list.append(word);
+        }
+    }
+    QStringList callTips(const QStringList&, int, QsciScintilla::CallTipsStyle,
+                         QList<int>&) override {
+        return {};
+    }
+};
 
 }  // namespace
 
@@ -117,11 +138,7 @@ void ScriptEditorWindow::setUpEditor() {
     text_->setWrapMode(QsciScintilla::WrapNone);
     text_->setScrollWidthTracking(true);
     text_->setScrollWidth(1);
-    words_ = new QsciAPIs(lexer_);
-    for (const Statement& statement : statements()) {
-        const std::string word = trimmed(statement.word);
-        if (word.size() > 1) words_->add(QString::fromStdString(word));
-    }
+    new StatementWords(lexer_);
     text_->setAutoCompletionSource(QsciScintilla::AcsAPIs);
     text_->setAutoCompletionThreshold(2);
     text_->setAutoCompletionCaseSensitivity(false);
@@ -131,12 +148,6 @@ void ScriptEditorWindow::setUpEditor() {
                 if (const Statement* statement = statementOf(word))
                     sentence_->setText(helpOf(*statement));
             });
-}
-
-/// A thread of its own gets the words ready; a window that nobody sees needs none.
-void ScriptEditorWindow::showEvent(QShowEvent* event) {
-    if (!std::exchange(prepared_, true)) words_->prepare();
-    FormWindow::showEvent(event);
 }
 
 void ScriptEditorWindow::takeColors() {

@@ -15,8 +15,6 @@
 #include "forms/ScriptForms.h"
 #include "script/LineCheck.h"
 
-class QsciAPIs;
-
 namespace zel {
 
 class ScriptEditorWindow : public FormWindow {
@@ -27,7 +25,6 @@ class ScriptEditorWindow : public FormWindow {
 
   protected:
     void changeEvent(QEvent* event) override;
-    void showEvent(QShowEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void reject() override;
 
@@ -46,7 +43,6 @@ class ScriptEditorWindow : public FormWindow {
     ScriptEditor& script_;
     QsciScintilla* text_;
     ScriptLexer* lexer_;
-    QsciAPIs* words_ = nullptr;
     QLabel* sentence_;
     QWidget* findBar_ = nullptr;
     QLineEdit* findText_ = nullptr;
@@ -56,7 +52,6 @@ class ScriptEditorWindow : public FormWindow {
     QString file_;
     bool showing_ = false;
     bool changed_ = false;
-    bool prepared_ = false;
 };
 
 }  // namespace zel

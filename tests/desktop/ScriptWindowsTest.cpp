@@ -156,6 +156,23 @@ TEST_F(ScriptWindowsTest, Editor_EditsMarksAndCompletes) {
     EXPECT_EQ(linesOf(folder.read("night.txt")).size(), 7U);
 }
 
+TEST_F(ScriptWindowsTest, Editor_OffersTheWordsThatBeginAsTyped) {
+    platform.fileDialogs.answer(folder.write("s.txt", "# empty\r\n"));
+    form.cmdOpenCommandsFile.Click();
+    platform.events.schedule(10, [&] {
+        window->binder().flush();
+        auto* text = widgetOf<QsciScintilla>(editor.txtNotepad);
+        text->setCursorPosition(1, 0);
+        QTest::keyClicks(text, "sav");
+        EXPECT_TRUE(text->isListActive());
+        QTest::keyClick(text, Qt::Key_Return);
+        EXPECT_EQ(text->text(1).trimmed(), "SAVERESULTS");
+        while (text->isUndoAvailable()) text->undo();
+        widgetOf<QPushButton>(editor.cmdClose)->click();
+    });
+    form.cmdEdit.Click();
+}
+
 TEST_F(ScriptWindowsTest, Editor_KeepsEveryByteOfATextWithMixedLineEnds) {
     const std::string bytes = "DO\nLOOP\r\n\rPAUSE \xE4";
     platform.fileDialogs.answer(folder.write("s.txt", bytes));
