@@ -116,12 +116,6 @@ ScriptEditorWindow::ScriptEditorWindow(ScriptEditor& form, Binder& binder, QWidg
     followForm();
 }
 
-/// The words' thread asks the lexer: it ends while that is whole.
-ScriptEditorWindow::~ScriptEditorWindow() {
-    lexer_->setAPIs(nullptr);
-    delete words_;
-}
-
 void ScriptEditorWindow::setUpEditor() {
     text_->setUtf8(true);
     text_->setLexer(lexer_);

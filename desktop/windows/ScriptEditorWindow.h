@@ -21,7 +21,6 @@ class ScriptEditorWindow : public FormWindow {
   public:
     ScriptEditorWindow(ScriptEditor& form, Binder& binder, QWidget* parent);
     QsciScintilla& editor() { return *text_; }
-    ~ScriptEditorWindow() override;
 
   protected:
     void changeEvent(QEvent* event) override;

@@ -143,6 +143,7 @@ TEST_F(WindowTest, WheelOverAListWithoutTheFocus_ChangesNothing) {
 }
 
 TEST_F(WindowTest, FocusOfAKey_CanBeSeen) {
+    connect();
     show();
     auto* key = widgetOf<QPushButton>(panel().AnalyzerButton);
     window->activateWindow();
