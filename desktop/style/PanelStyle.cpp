@@ -85,7 +85,6 @@ void PanelStyle::polish(QWidget* widget) {
         widget->setFont(font);
         widget->setProperty("styledFont", font.resolveMask());
     }
-    if (!text) return;
     const QColor own = widget->property("ink").value<QColor>();
     const Ink ink = inkOfText(*widget);
     const bool inked = own.isValid() || ink != nullptr;

@@ -152,6 +152,11 @@ QFont fontOf(const QWidget& widget) {
 }
 
 Ink inkOfText(const QWidget& widget) {
+    // A key with a picture draws its text itself, by its palette.
+    if (qobject_cast<const QPushButton*>(&widget) != nullptr) {
+        const Ink ink = faceOfKey(&widget, false).ink;
+        return ink == &C::text ? nullptr : ink;
+    }
     const bool label = qobject_cast<const QLabel*>(&widget) != nullptr;
     if (label && isMarked(&widget, "problem")) return &C::problem;
     if (label && isMarked(&widget, "file")) return &C::file;

@@ -67,6 +67,17 @@ TEST_P(Style, FaceOfAKeyThatIsShown_ChangesAtOnce) {
     EXPECT_FALSE(key.font().bold());
 }
 
+TEST_P(Style, KeyThatDrawsItsTextItself_FindsTheInkInItsPalette) {
+    QPushButton key;
+    setFace(&key, "blue");
+    key.ensurePolished();
+    EXPECT_EQ(key.palette().color(QPalette::ButtonText), QColor(colors().accentText));
+    setFace(&key, "yellow");
+    EXPECT_EQ(key.palette().color(QPalette::ButtonText), QColor(colors().yellowText));
+    setFace(&key, "plain");
+    EXPECT_EQ(key.palette().color(QPalette::ButtonText), QColor(colors().text));
+}
+
 TEST_P(Style, DefaultKeyOfADialog_HasTheAccent) {
     QDialog dialog;
     QPushButton key(&dialog);
