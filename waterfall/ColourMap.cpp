@@ -4,7 +4,9 @@
 #include <array>
 #include <cmath>
 #include <cstddef>
+#include <iterator>
 #include <numbers>
+#include <string_view>
 #include <vector>
 
 namespace zel {
@@ -109,25 +111,49 @@ Table cubehelix() {
     return table;
 }
 
+struct Row {
+    std::string_view name;
+    Table (*make)();
+};
+
 /// The map of style n is the nth.
+constexpr Row kRows[] = {
+    {"Aurora",
+     [] {
+         return through({{0.22, 0.10, 290},
+                         {0, 0.13, 253},
+                         {0, 0.10, 216},
+                         {0, 0.11, 179},
+                         {0, 0.15, 142},
+                         {0.95, 0.16, 105}});
+     }},
+    {"Grey",
+     [] {
+         return through({{0.16, 0, 0}, {0.98, 0, 0}});
+     }},
+    {"Cubehelix", cubehelix},
+    {"Ember",
+     [] {
+         return through({{0.15, 0.08, 290},
+                         {0, 0.17, 310},
+                         {0, 0.20, 365},
+                         {0, 0.19, 400},
+                         {0, 0.16, 432},
+                         {0.97, 0.10, 462}});
+     }},
+    {"Ice",
+     [] {
+         return through({{0.15, 0.05, 280}, {0, 0.14, 265}, {0, 0.12, 235}, {0.98, 0.02, 200}});
+     }},
+};
+
+/// Made when the first picture asks for a colour.
 const std::vector<ColourMap>& maps() {
-    static const std::vector<ColourMap> all{
-        {"Aurora", through({{0.22, 0.10, 290},
-                            {0, 0.13, 253},
-                            {0, 0.10, 216},
-                            {0, 0.11, 179},
-                            {0, 0.15, 142},
-                            {0.95, 0.16, 105}})},
-        {"Grey", through({{0.16, 0, 0}, {0.98, 0, 0}})},
-        {"Cubehelix", cubehelix()},
-        {"Ember", through({{0.15, 0.08, 290},
-                           {0, 0.17, 310},
-                           {0, 0.20, 365},
-                           {0, 0.19, 400},
-                           {0, 0.16, 432},
-                           {0.97, 0.10, 462}})},
-        {"Ice", through({{0.15, 0.05, 280}, {0, 0.14, 265}, {0, 0.12, 235}, {0.98, 0.02, 200}})},
-    };
+    static const std::vector<ColourMap> all = [] {
+        std::vector<ColourMap> made;
+        for (const Row& row : kRows) made.emplace_back(row.name, row.make());
+        return made;
+    }();
     return all;
 }
 
@@ -138,7 +164,11 @@ const ColourMap& ColourMap::ofStyle(int style) {
     return map != nullptr ? *map : maps().front();
 }
 
-int ColourMap::count() { return static_cast<int>(maps().size()); }
+int ColourMap::count() { return static_cast<int>(std::size(kRows)); }
+
+std::string_view ColourMap::nameAt(int index) {
+    return index >= 0 && index < count() ? kRows[index].name : std::string_view();
+}
 
 const ColourMap* ColourMap::at(int index) {
     return index >= 0 && index < count() ? &maps()[static_cast<std::size_t>(index)] : nullptr;

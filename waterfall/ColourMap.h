@@ -19,6 +19,8 @@ class ColourMap {
     /// map of its own gets the first one.
     static const ColourMap& ofStyle(int style);
     static int count();
+    /// 0-based; empty outside. Makes no table: a list of names costs nothing.
+    static std::string_view nameAt(int index);
     /// 0-based; null outside.
     static const ColourMap* at(int index);
 

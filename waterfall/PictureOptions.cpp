@@ -32,7 +32,7 @@ std::optional<double> number(const std::string& text) {
 PictureOptions::PictureOptions(WaterfallForm& form) : form_(form) {
     form_.ColourMapList.AddItem("Automatic");
     for (int i = 0; i < ColourMap::count(); ++i)
-        form_.ColourMapList.AddItem(std::string(ColourMap::at(i)->name()));
+        form_.ColourMapList.AddItem(std::string(ColourMap::nameAt(i)));
     for (const int rows : kDepths)
         form_.DepthList.AddItem(rows == 0 ? "As recorded" : std::to_string(rows) + " rows");
     for (const char* source : {"Reference level", "Automatic", "By hand"})

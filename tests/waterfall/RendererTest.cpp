@@ -437,6 +437,14 @@ TEST(ColourMapTest, UnknownStyle_HasTheFirstMap) {
     EXPECT_EQ(ColourMap::at(-1), nullptr);
 }
 
+TEST(ColourMapTest, NameInTheList_IsThatOfTheMap) {
+    for (int i = 0; i < ColourMap::count(); ++i)
+        EXPECT_EQ(ColourMap::nameAt(i), ColourMap::at(i)->name()) << i;
+    EXPECT_EQ(ColourMap::nameAt(0), "Aurora");
+    EXPECT_EQ(ColourMap::nameAt(-1), "");
+    EXPECT_EQ(ColourMap::nameAt(ColourMap::count()), "");
+}
+
 TEST(LevelScaleTest, EndsAndNoNumbers) {
     const LevelScale scale(-100, 0);
     EXPECT_EQ(scale.index(-100), 0);
