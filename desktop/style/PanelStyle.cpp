@@ -212,10 +212,10 @@ void PanelStyle::drawKeyLabel(const QStyleOptionButton& option, QPainter& painte
             text.adjust(own.direction == Qt::LeftToRight ? size.width() + kGap : 0, 0,
                         own.direction == Qt::LeftToRight ? 0 : -size.width() - kGap, 0);
         }
-        drawItemText(
-            &painter, text,
-            visualAlignment(own.direction, Qt::AlignLeft) | Qt::AlignVCenter | Qt::TextShowMnemonic,
-            own.palette, enabled, own.text, QPalette::ButtonText);
+        const Qt::Alignment side = visualAlignment(own.direction, Qt::AlignLeft);
+        drawItemText(&painter, text,
+                     static_cast<int>(side.toInt()) | Qt::AlignVCenter | Qt::TextShowMnemonic,
+                     own.palette, enabled, own.text, QPalette::ButtonText);
     }
     painter.restore();
 }
