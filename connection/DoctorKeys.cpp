@@ -25,9 +25,9 @@ DoctorKeys::DoctorKeys(Forms& forms, Doctor& doctor, Clipboard& clipboard, Event
     handlers_.on(forms.controller.UtilityDoctor.Clicked, [this] { UtilityDoctor_Click(); });
     handlers_.on(form_.cmdRunAgain.Clicked, [this] { cmdRunAgain_Click(); });
     handlers_.on(form_.cmdCopy.Clicked, [this] { clipboard_.setText(form_.FindingsBox.Text); });
-    handlers_.on(form_.cmdClose.Clicked, [this] { close(); });
-    handlers_.on(form_.QueryUnload, [this](int&) { close(); });
-    // The end of the program hides the form: the examination has to end as well.
+    handlers_.on(form_.cmdClose.Clicked, [this] { form_.Hide(); });
+    handlers_.on(form_.QueryUnload, [this](int&) { form_.Hide(); });
+    // Whoever hides the form, such as the end of the program, ends the examination as well.
     handlers_.on(form_.Changed, [this] {
         if (!form_.Visible && form_.Examining) doctor_.stop();
     });
@@ -47,11 +47,6 @@ void DoctorKeys::UtilityDoctor_Click() {
         cmdRunAgain_Click();
     });
     showModalForm(form_, events_);
-}
-
-void DoctorKeys::close() {
-    doctor_.stop();
-    form_.Hide();
 }
 
 void DoctorKeys::cmdRunAgain_Click() {

@@ -21,7 +21,6 @@ class DoctorKeys {
   private:
     void UtilityDoctor_Click();
     void cmdRunAgain_Click();
-    void close();
 
     DoctorForm& form_;
     MainForm& dialog_;

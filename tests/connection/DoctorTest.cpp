@@ -207,6 +207,15 @@ TEST_F(DoctorTest, ServerThatAnswers_IsFound) {
     EXPECT_EQ(platform.tcpSocket.state(), SocketState::Closed);
 }
 
+TEST_F(DoctorTest, AnswerToAnExchangeOfSomebodyElse_IsAskedOnceMore) {
+    platform.tcpSocket.expect("\r");
+    platform.tcpSocket.expect("GET\r").answer("2\r");
+    platform.tcpSocket.expect("GET\r").answer("0\r");
+    platform.tcpSocket.expect("IDN?\r").answer("0\rMarlow&Tenby,9102,1,V1\r");
+    EXPECT_TRUE(contains(look(platform.port, LinkAddress{LinkAddress::Kind::Tcp, "host", 2277}),
+                         "ok server: a server with an instrument answers: Marlow"));
+}
+
 TEST_F(DoctorTest, ServerThatCannotBeReached_IsAFault) {
     platform.tcpSocket.connectsTo(SocketState::Error);
     platform.tcpSocket.setProblem("Connection refused.");
