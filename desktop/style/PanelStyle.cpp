@@ -80,15 +80,15 @@ void PanelStyle::polish(QWidget* widget) {
     if (const int least = leastHeightOf(*widget); least > 0 && widget->minimumHeight() == 0)
         widget->setMinimumHeight(least);
     const QFont font = fontOf(*widget);
-    if (const uint known = widget->property("styledFont").toUInt();
+    if (const uint known = givenProperty(*widget, "styledFont").toUInt();
         font.resolveMask() != 0 || known != 0) {
         widget->setFont(font);
         widget->setProperty("styledFont", font.resolveMask());
     }
-    const QColor own = widget->property("ink").value<QColor>();
+    const QColor own = givenProperty(*widget, "ink").value<QColor>();
     const Ink ink = inkOfText(*widget);
     const bool inked = own.isValid() || ink != nullptr;
-    if (!inked && !widget->property("styledInk").toBool()) return;
+    if (!inked && !givenProperty(*widget, "styledInk").toBool()) return;
     QPalette palette;
     if (inked) {
         const QColor shown = own.isValid() ? own : color(ink);
@@ -172,7 +172,7 @@ void PanelStyle::drawKey(const QStyleOptionButton& option, QPainter& painter,
         frame.edge = color(face.edgeUnderPointer);
     }
     if (has(option, State_HasFocus)) {
-        const bool bound = widget != nullptr && widget->property("face").isValid();
+        const bool bound = widget != nullptr && givenProperty(*widget, "face").isValid();
         frame.width = kFocusEdge;
         frame.edge = color(bound || preset ? &ThemeColors::text : &ThemeColors::focus);
     }

@@ -8,7 +8,6 @@
 #include <QStatusBar>
 #include <QToolBar>
 #include <QToolButton>
-#include <QVariant>
 
 namespace zel {
 namespace {
@@ -72,12 +71,16 @@ QFont fontOfKey(const QWidget& key) {
 
 }  // namespace
 
+QVariant givenProperty(const QWidget& widget, const char* name) {
+    return widget.dynamicPropertyNames().contains(name) ? widget.property(name) : QVariant();
+}
+
 bool isMarked(const QWidget* widget, const char* property) {
-    return widget != nullptr && widget->property(property).toBool();
+    return widget != nullptr && givenProperty(*widget, property).toBool();
 }
 
 bool hasFace(const QWidget* widget, const char* face) {
-    return widget != nullptr && widget->property("face").toString() == QLatin1String(face);
+    return widget != nullptr && givenProperty(*widget, "face").toString() == QLatin1String(face);
 }
 
 bool isTool(const QWidget* widget) {
@@ -133,7 +136,7 @@ const KeyFace& faceOfKey(const QWidget* key, bool preset) {
     const QString name = key == nullptr ? QString()
                          : key->objectName() == QLatin1String("StopButton")
                              ? QString("red")
-                             : key->property("face").toString();
+                             : givenProperty(*key, "face").toString();
     for (const KeyFace& face : kFaces)
         if (name == QLatin1String(face.name)) return face;
     return preset ? kPreset : kPlain;

@@ -3,6 +3,7 @@
 // around the contents, colours of the faces, fonts.
 
 #include <QFont>
+#include <QVariant>
 #include <QWidget>
 
 #include "desktop/windows/ThemeColors.h"
@@ -55,6 +56,9 @@ QFont fontOf(const QWidget& widget);
 /// The ink of a label or an entry; null where it has the common one.
 Ink inkOfText(const QWidget& widget);
 
+/// A property that a window gave the widget; invalid where it did not. The class has a long list of
+/// its own ones, which would be searched first, many times for each control.
+QVariant givenProperty(const QWidget& widget, const char* name);
 bool isMarked(const QWidget* widget, const char* property);
 bool hasFace(const QWidget* widget, const char* face);
 /// A key of a toolbar.
