@@ -15,20 +15,10 @@
 namespace zel {
 namespace {
 
-constexpr int kFocusEdge = 2;
 constexpr int kPanelRadius = 6;
 constexpr int kPressedDarker = 115;  // percent, where a face has its own colour
 
 bool has(const QStyleOption& option, QStyle::StateFlag flag) { return (option.state & flag) != 0; }
-
-/// The option of the toolkit's own drawing with another colour for its text.
-template <class Option>
-Option inked(const Option& option, const QColor& ink) {
-    Option own(option);
-    for (const auto role : {QPalette::ButtonText, QPalette::WindowText, QPalette::Text})
-        own.palette.setColor(role, ink);
-    return own;
-}
 
 /// Rounded frames are the same but for their corners.
 QPixmap cornersOf(const StyleFrame& frame, int side, qreal scale) {

@@ -11,6 +11,18 @@
 
 namespace zel {
 
+constexpr int kFocusEdge = 2;  // pixels
+constexpr int kListKey = 18;   // the place of a list's arrow
+
+/// The option of the toolkit's own drawing with another colour for its text.
+template <class Option>
+Option inked(const Option& option, const QColor& ink) {
+    Option own(option);
+    for (const auto role : {QPalette::ButtonText, QPalette::WindowText, QPalette::Text})
+        own.palette.setColor(role, ink);
+    return own;
+}
+
 /// A frame with its ground. One without a width has no edge.
 struct StyleFrame {
     QColor ground;
@@ -61,8 +73,7 @@ class PanelStyle : public QProxyStyle {
                   const QWidget* widget) const;
     void drawTool(const QStyleOptionComplex& option, QPainter& painter,
                   const QWidget* widget) const;
-    void drawScrollBar(const QStyleOptionComplex& option, QPainter& painter,
-                       const QWidget* widget) const;
+    void drawScrollBar(const QStyleOptionComplex& option, QPainter& painter) const;
     void drawMenuTitle(const QStyleOption& option, QPainter& painter, const QWidget* widget) const;
     void drawListEntry(const QStyleOption& option, QPainter& painter) const;
     void drawTab(const QStyleOption& option, QPainter& painter, const QWidget* widget) const;

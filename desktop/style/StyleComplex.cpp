@@ -11,7 +11,6 @@
 namespace zel {
 namespace {
 
-constexpr int kListKey = 18;  // the place of a list's arrow
 constexpr int kMenuKey = 16;  // of the arrow beside a key that opens a menu
 constexpr int kListEdge = 1;
 constexpr int kEntryGap = 7;
@@ -109,15 +108,13 @@ void PanelStyle::drawTool(const QStyleOptionComplex& option, QPainter& painter,
         }
         frame.ground = color(enabled ? ground : &ThemeColors::window);
         if (is(State_HasFocus)) {
-            frame.width = 2;
+            frame.width = kFocusEdge;
             frame.edge = color(&ThemeColors::focus);
         }
         drawFrame(painter, option.rect, frame);
     }
     if (!enabled) ink = &ThemeColors::dim;
-    QStyleOptionToolButton label(*tool);
-    for (const auto role : {QPalette::ButtonText, QPalette::WindowText, QPalette::Text})
-        label.palette.setColor(role, color(ink));
+    QStyleOptionToolButton label = inked(*tool, color(ink));
     label.rect = toolPart(option, SC_ToolButton, widget);
     label.state &= ~State_HasFocus;
     proxy()->drawControl(CE_ToolButtonLabel, &label, &painter, widget);
@@ -125,8 +122,7 @@ void PanelStyle::drawTool(const QStyleOptionComplex& option, QPainter& painter,
         drawArrow(painter, toolPart(option, SC_ToolButtonMenu, widget), color(ink));
 }
 
-void PanelStyle::drawScrollBar(const QStyleOptionComplex& option, QPainter& painter,
-                               const QWidget*) const {
+void PanelStyle::drawScrollBar(const QStyleOptionComplex& option, QPainter& painter) const {
     const QRect handle = scrollPart(option, SC_ScrollBarSlider);
     if (handle.isEmpty()) return;
     drawFrame(painter, handle, {color(&ThemeColors::border), {}, 0, kHandleRadius});
@@ -141,8 +137,7 @@ void PanelStyle::drawComplexControl(ComplexControl control, const QStyleOptionCo
             if (isTool(widget) || isHeading(widget)) return drawTool(*option, *painter, widget);
             break;
         case CC_ScrollBar:
-            if ((option->state & State_Horizontal) == 0)
-                return drawScrollBar(*option, *painter, widget);
+            if ((option->state & State_Horizontal) == 0) return drawScrollBar(*option, *painter);
             break;
         default:
             break;

@@ -10,8 +10,7 @@ namespace {
 constexpr int kIndicator = 14;
 constexpr int kChoiceGap = 6;
 constexpr int kChoiceEdge = 1;  // the frame of the focus
-constexpr int kListKey = 18;
-constexpr int kListGap = 2;  // the toolkit keeps it free beside a list's text
+constexpr int kListGap = 2;     // the toolkit keeps it free beside a list's text
 constexpr int kToolGap = 3;
 constexpr int kToolMenu = 12;  // more than the room beside the words
 constexpr int kStatusGap = 6;
@@ -56,6 +55,8 @@ int PanelStyle::styleHint(StyleHint hint, const QStyleOption* option, const QWid
                           QStyleHintReturn* more) const {
     // A second, lighter text under a disabled one blurs it on a dark menu.
     if (hint == SH_EtchDisabledText) return 0;
+    // A press beside the handle of a slider takes it to the pointer, from where it can be dragged.
+    if (hint == SH_Slider_AbsoluteSetButtons) return Qt::LeftButton;
     return QProxyStyle::styleHint(hint, option, widget, more);
 }
 

@@ -2,9 +2,7 @@
 
 #include <QGridLayout>
 #include <QHBoxLayout>
-#include <QMouseEvent>
 #include <QPointer>
-#include <QStyleOptionSlider>
 
 #include "desktop/binders/Binder.h"
 #include "desktop/windows/ThemeIcons.h"
@@ -20,52 +18,6 @@ constexpr int kSpacing = 4;
 constexpr int kPageOfTraces = 10;
 constexpr int kSpeedWidth = 120;
 constexpr double kMsPerSecond = 1000;
-
-/// A press beside the handle takes it to the pointer, from where it can be dragged on.
-class ScrubSlider : public QSlider {
-  public:
-    ScrubSlider() : QSlider(Qt::Horizontal) {}
-
-  protected:
-    void mousePressEvent(QMouseEvent* event) override {
-        const QStyleOptionSlider option = options();
-        const QRect handle =
-            style()->subControlRect(QStyle::CC_Slider, &option, QStyle::SC_SliderHandle, this);
-        follows_ =
-            event->button() == Qt::LeftButton && !handle.contains(event->position().toPoint());
-        if (!follows_) return QSlider::mousePressEvent(event);
-        setSliderDown(true);
-        moveTo(qRound(event->position().x()));
-    }
-    void mouseMoveEvent(QMouseEvent* event) override {
-        follows_ ? moveTo(qRound(event->position().x())) : QSlider::mouseMoveEvent(event);
-    }
-    void mouseReleaseEvent(QMouseEvent* event) override {
-        if (!follows_) return QSlider::mouseReleaseEvent(event);
-        follows_ = false;
-        setSliderDown(false);
-    }
-
-  private:
-    QStyleOptionSlider options() const {
-        QStyleOptionSlider option;
-        initStyleOption(&option);
-        return option;
-    }
-    void moveTo(int x) {
-        const QStyleOptionSlider option = options();
-        const auto place = [&](QStyle::SubControl part) {
-            return style()->subControlRect(QStyle::CC_Slider, &option, part, this);
-        };
-        const QRect groove = place(QStyle::SC_SliderGroove);
-        const int handle = place(QStyle::SC_SliderHandle).width();
-        setSliderPosition(
-            QStyle::sliderValueFromPosition(minimum(), maximum(), x - groove.left() - handle / 2,
-                                            groove.width() - handle, option.upsideDown));
-    }
-
-    bool follows_ = false;  ///< the pointer, until its button is let go
-};
 
 QLabel* word(const QString& text) {
     auto* label = new QLabel(text);
@@ -106,7 +58,7 @@ PlaybackBar::PlaybackBar(Forms& forms, Binder& binder, QWidget* parent)
     play->setMinimumWidth(kPlayWidth);
     first->addWidget(play);
     first->addWidget(key(panel.PlaybackForward, "forward", binder));
-    auto* position = new ScrubSlider;
+    auto* position = new QSlider(Qt::Horizontal);
     position->setPageStep(kPageOfTraces);
     binder.bind(panel.PlaybackPosition, position);
     first->addWidget(position, 1);

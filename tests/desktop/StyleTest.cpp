@@ -3,10 +3,12 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPainter>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QScrollBar>
 #include <QStyle>
+#include <QStyleOptionSlider>
 #include <QToolTip>
 
 #include "desktop/binders/Binder.h"
@@ -53,6 +55,25 @@ TEST_P(Style, EachFaceOfAKey_HasItsGround) {
 
 TEST_P(Style, DisabledTextOfAMenu_IsDrawnOnce) {
     EXPECT_EQ(testApplication().style()->styleHint(QStyle::SH_EtchDisabledText), 0);
+}
+
+TEST_P(Style, SliderWithTheFocus_ShowsIt) {
+    const auto drawn = [](QStyle::State state) {
+        QStyleOptionSlider option;
+        option.rect = QRect(0, 0, 120, 24);
+        option.maximum = 10;
+        option.sliderPosition = 5;
+        option.sliderValue = 5;
+        option.subControls = QStyle::SC_SliderGroove | QStyle::SC_SliderHandle;
+        option.state = state | QStyle::State_Enabled | QStyle::State_Horizontal |
+                       QStyle::State_KeyboardFocusChange;
+        QImage image(option.rect.size(), QImage::Format_RGB32);
+        image.fill(Qt::black);
+        QPainter painter(&image);
+        testApplication().style()->drawComplexControl(QStyle::CC_Slider, &option, &painter);
+        return image;
+    };
+    EXPECT_NE(drawn(QStyle::State_HasFocus), drawn(QStyle::State_None));
 }
 
 TEST_P(Style, FaceOfAKeyThatIsShown_ChangesAtOnce) {
