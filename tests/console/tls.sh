@@ -78,7 +78,10 @@ client() {
 start_server --tls-certificate set/server.pem --tls-key set/server.key
 client 0 Marlow "$fingerprint"
 client 0 Marlow "$(tr 'A-F' 'a-f' <<< "${fingerprint//:/}")"
-client 1 "shows another certificate, with the fingerprint" "00${fingerprint:2}"
+# One of 256 certificates has a fingerprint that begins with zeros.
+other=00
+[ "${fingerprint:0:2}" != "$other" ] || other=11
+client 1 "shows another certificate, with the fingerprint" "$other${fingerprint:2}"
 client 1 "of no authority that this computer knows"
 export ZELREMOTE_TLS_CA=set/ca.pem
 client 0 Marlow
