@@ -120,7 +120,6 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
             chunk.erase(0, passed);
             ofStatus -= passed;
             result += chunk;
-            cut();
             chunk = link_.takeBytes();
             if (chunk.empty() && result.size() + 3 < wanted) chunk = ReadBinaryChunk(kChunkSeconds);
             session_.events.pump();

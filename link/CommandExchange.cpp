@@ -134,7 +134,6 @@ bool CommandExchange::CmdInstrument(const std::string& keyword) {
     link_.drain(kDrainReads);
     link_.WriteToLink("cmd\r");
     delay(DelayPlace::AfterModeWord);
-    state_.InputBuffer.clear();
     const Stopwatch firstAnswer(session_.clock);
     std::string answer = reader_.ReadModeStatus();
     const auto over = [this] {
@@ -166,7 +165,6 @@ bool CommandExchange::triggeredDialogue(const std::string& keyword, std::int32_t
     beginLine("CMD", keyword, t0);
     link_.WriteToLink("cmd\r");
     delay(DelayPlace::AfterModeWord);
-    state_.InputBuffer.clear();
     const std::string answer = reader_.ReadAnswerTriggered(timeoutSeconds);
     if (!reader_.answered()) return false;
     const int status = answer.empty() ? -1 : statusNumber(answer);

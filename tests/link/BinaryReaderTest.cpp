@@ -116,7 +116,7 @@ TEST_F(Bytes, PausesBelowFiveSeconds_AreBridged) {
 
 TEST_F(Bytes, MoreThanAskedFor_IsCutAtTheLength) {
     comes(0, "0\rabcdefghijKLMN");
-    read(10);
+    EXPECT_EQ(read(10), 0) << "no wait for last bytes";
     EXPECT_EQ(got, "abcdefghij");
     EXPECT_TRUE(state.RestFound);
     EXPECT_TRUE(state.AnswerOverdue);

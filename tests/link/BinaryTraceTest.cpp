@@ -246,6 +246,16 @@ TEST_F(Trace, RefusalWith2To7_IsReportedAndFalse) {
     }
 }
 
+TEST_F(Trace, TwoBytesThatAreNoRefusal_AreTheBeginningOfAShortTransfer) {
+    for (const char* bytes : {"8\r", "0\r", "/\r", "5\n"}) {
+        TraceSetup rig;
+        rig.script("0\r" + std::string(bytes));
+        EXPECT_TRUE(rig.read()) << bytes;
+        EXPECT_EQ(rig.trace.came, 0U) << bytes;
+        EXPECT_EQ(rig.shown(), Texts{}) << bytes;
+    }
+}
+
 /// An instrument that goes on refusing, and something that happens half a second later.
 struct Refused : Trace {
     Refused() {

@@ -1,5 +1,9 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <functional>
+#include <string>
+
 #include "platform/virtual/VirtualTime.h"
 #include "tests/link/Line.h"
 
@@ -63,6 +67,30 @@ TEST_F(Line, Cmd_LeftOvers_AreDrainedAheadOfTheModeWord) {
     port.arrive("7\r");
     exchangeOf("cmd", "INIT", "0\r");
     EXPECT_TRUE(exchange.CmdInstrument("INIT"));
+}
+
+TEST_F(Line, Exchange_LineThatNeverFallsSilent_IsReadFiveTimesBeforeTheModeWord) {
+    const std::function<void()> exchanges[] = {
+        [this] { exchange.CmdInstrument("INIT"); },
+        [this] { exchange.SetInstrument("RBW,1"); },
+        [this] {
+            std::string value;
+            exchange.GetInstrument("FREQ", value);
+        },
+    };
+    debug.whenSpoken = [this](const std::string& text) {
+        if (text == "<-x") port.arrive("x");
+    };
+    for (const auto& run : exchanges) {
+        port.arrive("x");
+        debug.entries.clear();
+        const auto isModeWord = [](const auto& entry) { return entry.text.rfind("->", 0) == 0; };
+        run();
+        const auto word = std::find_if(debug.entries.begin(), debug.entries.end(), isModeWord);
+        ASSERT_NE(word, debug.entries.end());
+        EXPECT_EQ(word - debug.entries.begin(), 5);
+        link.takeBytes();
+    }
 }
 
 TEST_F(Line, Cmd_ModeWordRefused_EndsWithTheBox) {

@@ -140,6 +140,16 @@ TEST_F(Complex, BytesAheadOfTheReRequest_AreDropped) {
     EXPECT_EQ(binary.ReadLiteralBytes(4), "cdef");
 }
 
+TEST_F(Complex, ReRequest_GoesOutAsSoonAsTenSecondsHavePassed) {
+    for (const int first : {1, 19, 20}) {  // of a byte, and so of each look at the clock
+        LineSetup rig;
+        rig.events.schedule(first, [&] { rig.port.arrive("a"); });
+        rig.events.schedule(12'000, [&] { rig.port.arrive("bcde"); });
+        EXPECT_EQ(rig.binary.ReadLiteralBytes(4), "bcde");
+        EXPECT_EQ(rig.debug.momentOf("-> get\r"), 10'000 + first) << first;
+    }
+}
+
 TEST_F(Complex, SilentInstrument_IsAskedEvery11AndAHalfSecondsUntilThePortCloses) {
     round("0\r");
     events.schedule(60'000, [this] { port.close(); });
