@@ -111,7 +111,7 @@ void SweepControl::RunContinuousView() {
         if (good) panel_.ContinuosLoopActive = false;
     }
     if (!good && exchange_.ExchangeFailed()) showLoss();
-    if (good || !panel_.STOPFlag) {  // a wait that Stop has left is a stop as well
+    if (!panel_.STOPFlag) {  // also where Stop has left a wait
         panel_.Connection.Enabled = true;
         panel_.Utility.Enabled = true;
         forms_.waterfall.styleLastRow();

@@ -40,7 +40,9 @@ const Typed kRead[] = {
     {",5G", U::Hertz, ".5 GHz", 0.5e9},
     {"+3", U::Hertz, "3", 3},
     {"-30 dBm", U::Level, "-30", -30},
+    {"-30.50 dBm", U::Level, "-30.50", -30.5},  // the digits as they were typed
     {"50 %", U::Percent, "50", 50},
+    {"007.0 s", U::WholeSeconds, "007.0", 7},
     {"- 30DBM", U::Level, "-30", -30},
     {"\u221230,5", U::Level, "-30.5", -30.5},
     {"3 dB", U::Decibels, "3", 3},
@@ -116,6 +118,10 @@ const Refused kRefused[] = {
     {"5 dBm", U::Percent, "no unit of a height"},
     {"5 ms", U::WholeSeconds, "no unit of a time"},
     {"e9", U::Hertz, "is not a frequency"},
+    {"-", U::Hertz, "\"-\" is not a frequency"},
+    {"+", U::Level, "\"+\" is not a level"},
+    {"- GHz", U::Hertz, "is not a frequency"},
+    {"-x", U::Metres, "is not a length"},
     {"12 m", U::Enter, "no unit of a number"},
 };
 

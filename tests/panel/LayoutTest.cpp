@@ -407,6 +407,23 @@ TEST_F(LayoutTest, NotConnected_HardKeysLayOutTheirMenuAndSendNothing) {
     EXPECT_EQ(boxes.texts(), Texts{});
 }
 
+TEST_F(LayoutTest, ChoiceBoxes_OfAnotherMenu_AreHiddenEmptiedAndUnlocked) {
+    SoftPanel soft(panel);
+    for (int i = 0; i < 5; ++i) {
+        panel.ChoiceBox(i).setItems({"one", "two"});
+        panel.ChoiceBox(i).Visible = true;
+        panel.ChoiceBox(i).Locked = true;
+        panel.SoftTextBox(i).Visible = false;
+    }
+    soft.SetTextFieldsAndFrames(0);  // of no menu: no position is laid out
+    for (int i = 0; i < 5; ++i) {
+        EXPECT_FALSE(panel.ChoiceBox(i).Visible) << i;
+        EXPECT_FALSE(panel.ChoiceBox(i).Locked) << i;
+        EXPECT_EQ(panel.ChoiceBox(i).ListCount(), 0) << i;
+        EXPECT_TRUE(panel.SoftTextBox(i).Visible) << i;
+    }
+}
+
 TEST_F(LayoutTest, SetButtonColor_UnknownWord_LeavesTheKey) {
     SoftPanel soft(panel);
     soft.SetButtonColor(1, "green");

@@ -75,6 +75,19 @@ TEST_F(SweepControlTest, Single_InTheTdmaMenu_ReadsATrace) {
     expectPlayed();
 }
 
+TEST_F(SweepControlTest, Continuous_OfTraces_OpensNoDialog) {
+    fullCycle();
+    stopAtPlot(1);
+    bool opened = false;
+    platform.events.schedule(1, [&] {
+        opened = forms.powerAndRefl.Visible;
+        if (opened) forms.powerAndRefl.unload(1);
+    });
+    panel.PlayContinuousButton.Click();
+    EXPECT_FALSE(opened);
+    expectPlayed();
+}
+
 TEST_F(SweepControlTest, Continuous_NotConnected_TellsItAndDoesNotLoop) {
     panel.isConnected = false;
     panel.PlayContinuousButton.Click();
@@ -221,7 +234,10 @@ TEST_F(SweepControlTest, StopInALongSweep_LeavesTheWaitAfterASecond) {
     port.expect("cmd\r").answer("0\r");
     port.expect("WAIT\r").silence();
     platform.events.schedule(3000, [this] { panel.StopButton.Click(); });
+    forms.waterfall.Graph3D.plotCurve({4, 4}, {1, 2}, {-50, -40}, {0, 100});
+    forms.waterfall.Graph3D.plots().back().lineVisible = true;
     panel.PlayContinuousButton.Click();
+    EXPECT_FALSE(forms.waterfall.Graph3D.plots().back().lineVisible) << "the last row is styled";
     EXPECT_NEAR(static_cast<double>(platform.clock.micros()) / 1e6, 4, 0.2);
     EXPECT_EQ(boxes.texts(), Texts{});
     EXPECT_TRUE(panel.PlayContinuousButton.Visible);
@@ -342,6 +358,15 @@ TEST_F(PowerReadoutTest, Single_WithReflection_ReadsItIntoTheLastBox) {
     EXPECT_EQ(panel.SoftTextBox(4).Text.get(), "500 mdBm");
     EXPECT_EQ(panel.LastReflectionText, "0.5");
     EXPECT_EQ(panel.LastReadingText, "0.5");
+}
+
+TEST_F(PowerReadoutTest, Reading_RunsWhatIsDueBeforeItAsks) {
+    std::string sent = "nothing ran";
+    platform.events.schedule(0, [&] { sent = port.written(); });
+    get("PWR", "3");
+    panel.PlaySingleButton.Click();
+    expectPlayed();
+    EXPECT_EQ(sent, "");
 }
 
 TEST_F(PowerReadoutTest, Single_InTheModeAlone_ReadsThePowerToo) {
