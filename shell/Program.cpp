@@ -226,6 +226,11 @@ struct Program::Rooms {
         handlers.on(panel.ShowHelp, [this](int context) { help.showTopic(context); });
         timers.attach(panel.PaceTimer);
         handlers.on(exchange.SettingBegins, [this] { keepSettings(onGraph, mirror); });
+        handlers.on(exchange.Answered, [this](const std::string& word, const std::string&) {
+            if (word == "REFLVL") onGraph.levelMode = panel.InstrumentMode;
+        });
+        handlers.on(panel.ResetButton.Clicked,
+                    [this] { onGraph.levelMode = panel.InstrumentMode; });
         timers.attach(forms.time.X);
         handlers.on(viewReader.FileLoaded, [this](const std::string& path) { recent.add(path); });
         handlers.on(panel.UtilityTrouble.Clicked, [this] {

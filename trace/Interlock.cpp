@@ -64,9 +64,9 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
     // Their handlers refuse by the step at hand; here it only counts that they do.
     for (int i = 0; i < p.SoftTextBox.count(); ++i)
         rule({&p.SoftTextBox(i), &p.ChoiceBox(i)}, {Rule::Connected, Rule::NoContinuousView});
-    rule({&p.MarkerCheckBox, &p.DeltaCheckBox, &p.ManualCommandText, &p.AnalyzerCheck,
-          &p.TrackingGenCheck, &p.PowerSensorCheck, &p.ChannelPowerCheck, &p.OccBWCheck,
-          &p.TDMAPowerCheck, &p.DistFaultCheck},
+    rule({&p.MarkerCheckBox, &p.DeltaCheckBox}, {Rule::NoPowerSensor, Rule::NoContinuousView});
+    rule({&p.ManualCommandText, &p.AnalyzerCheck, &p.TrackingGenCheck, &p.PowerSensorCheck,
+          &p.ChannelPowerCheck, &p.OccBWCheck, &p.TDMAPowerCheck, &p.DistFaultCheck},
          {Rule::NoContinuousView});
     rule({&p.LoadData}, {Rule::NoViewForFile, Rule::NoRecordingForFile});
     for (int i = 0; i < p.RecentFile.count(); ++i)

@@ -37,6 +37,7 @@ struct Sweep {
     ZEL3Variables settings;           ///< that the sweep was read with
     bool settingsKept = false;        ///< a setting was sent since: they follow the mirror no more
     std::int16_t instrumentMode = 0;  ///< at that moment; 0 for a sweep that was never read
+    std::int16_t levelMode = 0;       ///< in which the reference level was asked last; 0: never
     double time = 0;                  ///< date of the reading, days
 
     bool whole() const { return wanted > 0 && came == wanted; }

@@ -226,6 +226,7 @@ void TraceReader::scaleAndConvert() {
                           LevelRange::ofCode(byteOf(std::nearbyint(mirror_.ReferenceRange))));
     conversion_.ConvertTrace(last_);
     writeForm();
+    last_.levelMode = onGraph_.levelMode;
     onGraph_ = last_;
     if (last_.incomplete()) CutShort(last_);
     if (recordsTraces() && last_.whole()) panel_.SaveView("trace");

@@ -1,6 +1,7 @@
 #include "trace/ViewAnnotations.h"
 
 #include <cmath>
+#include <cstdint>
 #include <string>
 
 #include "forms/ControllerForm.h"
@@ -123,6 +124,12 @@ bool ofAnotherMode(const ControllerForm& panel) {
            shown.instrumentMode != panel.InstrumentMode;
 }
 
+bool levelOfAnotherMode(const ControllerForm& panel, const Sweep& sweep) {
+    const std::int16_t asked = sweep.levelMode;
+    return panel.isConnected && !panel.Shown.fromFile && asked != 0 && sweep.instrumentMode != 0 &&
+           sweep.instrumentMode != asked && panel.InstrumentMode != asked;
+}
+
 ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror) {
     return annotate(panel, mirror, mirror.Unsure);
 }
@@ -130,9 +137,11 @@ ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& m
 ViewAnnotations annotateSweep(const ControllerForm& panel, const ZEL3Variables& mirror,
                               const Sweep& sweep) {
     const ZEL3Variables& then = sweep.settings;
-    if (panel.Shown.fromFile || sweep.wanted == 0 || !sweep.settingsKept)
-        return annotateView(panel, mirror);
-    ViewAnnotations view = annotate(panel, then, mirror.Unsure);
+    const bool keeps = !panel.Shown.fromFile && sweep.wanted != 0 && sweep.settingsKept;
+    ViewAnnotations view =
+        keeps ? annotate(panel, then, mirror.Unsure) : annotateView(panel, mirror);
+    if (levelOfAnotherMode(panel, sweep)) view.refLevelUnsure = view.yUnsure = true;
+    if (!keeps) return view;
     if (!view.ok) return view;
     // The axes stay those of the trace: they are right for it.
     view.refLevelUnsure |=

@@ -38,6 +38,9 @@ struct ViewAnnotations {
 double shownRangeCode(const ControllerForm& panel, const ZEL3Variables& mirror);
 /// The trace on the graph is one of a mode that the instrument has left.
 bool ofAnotherMode(const ControllerForm& panel);
+/// The level that is known belongs to a mode which neither the sweep nor the instrument is in: each
+/// mode has a level and a unit of its own, and not every sweep asks for them.
+bool levelOfAnotherMode(const ControllerForm& panel, const Sweep& sweep);
 /// From the mirror and from the axes as they are shown, zoomed or not.
 ViewAnnotations annotateView(const ControllerForm& panel, const ZEL3Variables& mirror);
 /// The same for the sweep that is on the graph: what was set since does not change what it was read

@@ -23,7 +23,6 @@
 #include "model/ZEL3Variables.h"
 #include "platform/Form.h"
 #include "shell/Program.h"
-#include "trace/Sweep.h"
 #include "trace/ViewAnnotations.h"
 
 namespace zel {
@@ -31,7 +30,6 @@ namespace {
 
 constexpr int kSpacing = 6;
 constexpr const char* kPowerReading = "PWR";
-constexpr const char* kLevel = "REFLVL";
 
 }  // namespace
 
@@ -61,9 +59,7 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
     binder_.bindShow(panel_.CWGraph1, graph_, [this] { refreshGraph(); });
     readings_.on(program_.Answered, [this](const std::string& word, const std::string& value) {
         if (word == kPowerReading && showsPower()) power_->take(value);
-        if (word == kLevel) levelMode_ = panel_.InstrumentMode;
     });
-    readings_.on(panel_.ResetButton.Clicked, [this] { levelMode_ = panel_.InstrumentMode; });
     // A setting makes the texts around the trace those of an earlier one.
     panel_.DebugTextBox.Changed.connect([self = QPointer<GraphSide>(this)] {
         if (self && self->program_.sweep().settingsKept)
@@ -84,14 +80,7 @@ GraphSide::GraphSide(Program& program, Binder& binder, EmptyScreen::Ways ways, Q
 }
 
 ViewAnnotations GraphSide::annotations() const {
-    const Sweep& sweep = program_.sweep();
-    ViewAnnotations view = annotateSweep(panel_, program_.variables(), sweep);
-    // Each mode has a level and a unit of its own, and not every sweep asks for them.
-    const bool ofAnotherMode = !panel_.Shown.fromFile && levelMode_ != 0 &&
-                               sweep.instrumentMode != 0 && sweep.instrumentMode != levelMode_ &&
-                               panel_.InstrumentMode != levelMode_;
-    if (panel_.isConnected && ofAnotherMode) view.refLevelUnsure = view.yUnsure = true;
-    return view;
+    return annotateSweep(panel_, program_.variables(), program_.sweep());
 }
 
 QWidget* GraphSide::spectrogram() {

@@ -57,7 +57,6 @@ class GraphSide : public QWidget {
     Readouts* readouts_;
     GraphNavigator navigator_;
     std::int16_t shownMode_ = 0;
-    std::int16_t levelMode_ = 0;  ///< in which the reference level was asked last; 0: never
     std::unique_ptr<PointerText> pointer_;
     Handlers readings_;
 };

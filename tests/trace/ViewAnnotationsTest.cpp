@@ -72,6 +72,37 @@ TEST_F(ViewAnnotationsTest, SettingSentSince_StrikesTheTextAndLeavesItThatOfTheS
     EXPECT_EQ(annotateSweep(panel, mirror, sweep).refLevel, annotateView(panel, mirror).refLevel);
 }
 
+TEST_F(ViewAnnotationsTest, LevelOfAnotherMode_IsUnsure) {
+    Sweep sweep;
+    sweep.wanted = sweep.came = 301;
+    sweep.settings = mirror;
+    panel.isConnected = true;
+    panel.InstrumentMode = sweep.instrumentMode = ControllerForm::ANALYZER;
+    const auto unsure = [&] {
+        const ViewAnnotations view = annotateSweep(panel, mirror, sweep);
+        EXPECT_EQ(view.refLevelUnsure, view.yUnsure);
+        return view.refLevelUnsure;
+    };
+    EXPECT_FALSE(unsure()) << "never asked";
+    sweep.levelMode = ControllerForm::ANALYZER;
+    EXPECT_FALSE(unsure());
+    sweep.levelMode = ControllerForm::DISTTOFAULTMEASURE;
+    EXPECT_TRUE(unsure());
+    sweep.settingsKept = true;
+    EXPECT_TRUE(unsure());
+    sweep.instrumentMode = ControllerForm::DISTTOFAULTMEASURE;
+    EXPECT_FALSE(unsure()) << "the trace is of the mode of its level";
+    sweep.instrumentMode = ControllerForm::ANALYZER;
+    panel.InstrumentMode = ControllerForm::DISTTOFAULTMEASURE;
+    EXPECT_FALSE(unsure()) << "so is the instrument";
+    panel.InstrumentMode = ControllerForm::ANALYZER;
+    panel.Shown.fromFile = true;
+    EXPECT_FALSE(unsure());
+    panel.Shown.fromFile = false;
+    panel.isConnected = false;
+    EXPECT_FALSE(unsure());
+}
+
 TEST_F(ViewAnnotationsTest, Axis_HasItsEndsAndItsMiddle) {
     EXPECT_EQ(view().left, "Start 900 MHz");
     EXPECT_EQ(view().center, "Center 950 MHz");
