@@ -1830,5 +1830,49 @@ oder eine Aufzeichnung laden</translation>
         <source>A client is connected</source>
         <translation>Ein Client ist verbunden</translation>
     </message>
+    <message>
+        <source>%1 is no number: %2</source>
+        <translation>%1 ist keine Zahl: %2</translation>
+    </message>
+    <message>
+        <source>The channel&apos;s stop lies below its start</source>
+        <translation>Das Ende des Kanals liegt unter seinem Anfang</translation>
+    </message>
+    <message>
+        <source>The bandwidth takes dB above 0</source>
+        <translation>Die Bandbreite nimmt dB über 0</translation>
+    </message>
+    <message>
+        <source>The occupied bandwidth takes percent above 0, 100 at most</source>
+        <translation>Die belegte Bandbreite nimmt Prozent über 0, höchstens 100</translation>
+    </message>
+    <message>
+        <source>%1, %2 to %3</source>
+        <translation>%1, %2 bis %3</translation>
+    </message>
+    <message>
+        <source>Channel %1</source>
+        <translation>Kanal %1</translation>
+    </message>
+    <message>
+        <source>%1: lower %2, upper %3</source>
+        <translation>%1: unten %2, oben %3</translation>
+    </message>
+    <message>
+        <source>Tables (*.csv *.txt);;All Files (*)</source>
+        <translation>Tabellen (*.csv *.txt);;Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <source>The file %1 cannot be read: %2</source>
+        <translation>Die Datei %1 kann nicht gelesen werden: %2</translation>
+    </message>
+    <message>
+        <source>it is too long</source>
+        <translation>sie ist zu lang</translation>
+    </message>
+    <message>
+        <source>The file %1 cannot be written: %2</source>
+        <translation>Die Datei %1 kann nicht geschrieben werden: %2</translation>
+    </message>
 </context>
 </TS>

@@ -113,7 +113,7 @@ void LimitsPage::showState() {
         verdict = result.mask->pass ? QObject::tr("Pass") : QObject::tr("FAIL");
         verdict += result.mask->margin ? QObject::tr(", margin %1 at %2")
                                              .arg(levelText(result.mask->margin, "dB"),
-                                                  placeText(result.mask->x, result.xUnit))
+                                                  placeText(result.mask->x, tools_.trace()))
                                        : QObject::tr(", no sample covered");
     }
     if (tools_.maskCount().sweeps > 0) verdict += "; " + ownText(tools_.maskCount().text());

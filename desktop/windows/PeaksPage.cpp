@@ -140,13 +140,13 @@ void PeaksPage::showState() {
         const Peak& peak = result.peaks[order[row]];
         const int at = static_cast<int>(row);
         put(*table_, at, 0, QString::number(order[row] + 1));
-        put(*table_, at, 1, placeText(peak.x, result.xUnit));
+        put(*table_, at, 1, placeText(peak.x, tools_.trace()));
         put(*table_, at, 2, levelText(peak.level, result.unit));
     }
 }
 
 QString PeaksPage::asText() const {
-    QString text = "Peak\tx\tLevel\n";
+    QString text = QObject::tr("Peak") + "\tx\t" + QObject::tr("Level") + "\n";
     for (int row = 0; row < table_->rowCount(); ++row)
         text += table_->item(row, 0)->text() + "\t" + table_->item(row, 1)->text() + "\t" +
                 table_->item(row, 2)->text() + "\n";
@@ -205,7 +205,7 @@ void MarkersPage::takePlace(int row, const QString& text) {
     if (!x) {
         word_->setText(QObject::tr("This is no place: %1; 935.2M is one").arg(text));
     } else if (trace && !trace->x.empty() && (*x < trace->x.front() || *x > trace->x.back())) {
-        word_->setText(QObject::tr("The sweep does not reach %1").arg(placeText(x, trace->xUnit)));
+        word_->setText(QObject::tr("The sweep does not reach %1").arg(placeText(x, trace)));
     } else {
         HostMarker& marker = tools_.markers.at(static_cast<std::size_t>(row));
         marker.on = true;
@@ -265,7 +265,7 @@ void MarkersPage::showState() {
         const QString sign = delta ? QString::fromUtf8("Δ ") : QString();
         const auto shown = [&marker](const QString& text) { return marker.on ? text : QString(); };
         put(*table_, row, 3,
-            shown(sign + placeText(delta ? reading.deltaX : reading.x, result.xUnit)));
+            shown(sign + placeText(delta ? reading.deltaX : reading.x, tools_.trace())));
         put(*table_, row, 4,
             shown(sign + (delta ? levelText(reading.deltaLevel, "dB")
                                 : levelText(reading.level, result.unit))));

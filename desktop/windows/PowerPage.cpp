@@ -42,12 +42,12 @@ PowerPage::PowerPage(TraceTools& tools) : TracePage(tools) {
     auto* grid = new QGridLayout(this);
     grid->setColumnStretch(1, 1);
     grid->setColumnStretch(2, 1);
-    const auto row = [this, grid](const char* name, QLineEdit*& one, const char* hint,
-                                  QLineEdit** two, const char* twoName, const char* twoHint,
-                                  QLabel*& found) {
+    const auto row = [this, grid](const char* name, const char* unit, QLineEdit*& one,
+                                  const char* hint, QLineEdit** two, const char* twoName,
+                                  const char* twoHint, QLabel*& found) {
         const int at = grid->rowCount();
         one = field(name, hint);
-        auto* caption = new QLabel(QObject::tr(name));
+        auto* caption = new QLabel(QObject::tr(name) + unit);
         caption->setBuddy(one);
         grid->addWidget(caption, at, 0);
         grid->addWidget(one, at, 1);
@@ -60,15 +60,15 @@ PowerPage::PowerPage(TraceTools& tools) : TracePage(tools) {
         found = finding(name);
         grid->addWidget(found, at + 1, 1, 1, 2);
     };
-    row(QT_TRANSLATE_NOOP("QObject", "Bandwidth"), down_,
+    row(QT_TRANSLATE_NOOP("QObject", "Bandwidth"), ", dB", down_,
         QT_TRANSLATE_NOOP("QObject", "dB down, as 3"), nullptr, "", "", bandwidth_);
-    row(QT_TRANSLATE_NOOP("QObject", "Channel"), start_,
+    row(QT_TRANSLATE_NOOP("QObject", "Channel"), "", start_,
         QT_TRANSLATE_NOOP("QObject", "start, as 935M"), &stop_,
         QT_TRANSLATE_NOOP("QObject", "Channel stop"), QT_TRANSLATE_NOOP("QObject", "stop, as 960M"),
         channel_);
-    row(QT_TRANSLATE_NOOP("QObject", "Occupied"), percent_,
+    row(QT_TRANSLATE_NOOP("QObject", "Occupied"), ", %", percent_,
         QT_TRANSLATE_NOOP("QObject", "percent, as 99"), nullptr, "", "", occupied_);
-    row(QT_TRANSLATE_NOOP("QObject", "Adjacent"), width_,
+    row(QT_TRANSLATE_NOOP("QObject", "Adjacent"), "", width_,
         QT_TRANSLATE_NOOP("QObject", "width, as 5M"), &spacing_,
         QT_TRANSLATE_NOOP("QObject", "Channel spacing"),
         QT_TRANSLATE_NOOP("QObject", "spacing, as 5M"), adjacent_);
@@ -102,13 +102,14 @@ void PowerPage::takeSettings() {
         tools_.adjacent = TraceTools::Adjacent{{}, *width, *spacing, 2};
     QString word;
     for (const QLineEdit* box : {down_, start_, stop_, percent_, width_, spacing_})
-        if (isWrong(*box)) word = box->accessibleName() + " is no number: " + box->text();
+        if (isWrong(*box))
+            word = QObject::tr("%1 is no number: %2").arg(box->accessibleName(), box->text());
     if (word.isEmpty() && start && stop && *stop < *start)
-        word = "The channel's stop lies below its start";
+        word = QObject::tr("The channel's stop lies below its start");
     if (word.isEmpty() && !down_->text().trimmed().isEmpty() && !request.bandwidth)
-        word = "The bandwidth takes dB above 0";
+        word = QObject::tr("The bandwidth takes dB above 0");
     if (word.isEmpty() && !percent_->text().trimmed().isEmpty() && !request.occupied)
-        word = "The occupied bandwidth takes percent above 0, 100 at most";
+        word = QObject::tr("The occupied bandwidth takes percent above 0, 100 at most");
     word_->setText(word);
     tools_.refresh();
 }
@@ -116,28 +117,30 @@ void PowerPage::takeSettings() {
 void PowerPage::showState() {
     const AnalysisResult& result = tools_.result();
     const AnalysisRequest& request = tools_.request;
-    const std::string& x = result.xUnit;
-    const auto fromTo = [&x](std::optional<double> low, std::optional<double> high) {
-        return ", " + placeText(low, x) + " to " + placeText(high, x);
+    const auto& trace = tools_.trace();
+    const auto stretch = [&trace](std::optional<double> width, std::optional<double> low,
+                                  std::optional<double> high) {
+        return QObject::tr("%1, %2 to %3")
+            .arg(placeText(width, trace), placeText(low, trace), placeText(high, trace));
     };
-    const bool there = tools_.trace().has_value();
-    bandwidth_->setText(!request.bandwidth || !there
-                            ? QString()
-                            : placeText(result.width.width(), x) +
-                                  fromTo(result.width.low, result.width.high));
+    const bool there = trace.has_value();
+    const PeakWidth& width = result.width;
+    bandwidth_->setText(
+        !request.bandwidth || !there ? QString() : stretch(width.width(), width.low, width.high));
     channel_->setText(result.channels.empty() ? QString()
                                               : levelText(result.channels[0].power, result.unit));
-    occupied_->setText(!result.occupied ? QString()
-                                        : placeText(result.occupied->width(), x) +
-                                              fromTo(result.occupied->low, result.occupied->high));
+    const auto& occupied = result.occupied;
+    occupied_->setText(occupied ? stretch(occupied->width(), occupied->low, occupied->high)
+                                : QString());
     QString beside;
     const AdjacentChannels& found = tools_.adjacentFound();
     if (tools_.adjacent && there) {
-        beside = "Channel " + levelText(found.power, result.unit);
+        beside = QObject::tr("Channel %1").arg(levelText(found.power, result.unit));
         for (std::size_t i = 0; i < found.sides.size(); ++i)
-            beside += "\n" + QString::number(i + 1) + ": lower " +
-                      levelText(found.sides[i].lower, "dB") + ", upper " +
-                      levelText(found.sides[i].upper, "dB");
+            beside += "\n" + QObject::tr("%1: lower %2, upper %3")
+                                 .arg(i + 1)
+                                 .arg(levelText(found.sides[i].lower, "dB"),
+                                      levelText(found.sides[i].upper, "dB"));
     }
     adjacent_->setText(beside);
 }

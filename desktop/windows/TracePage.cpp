@@ -5,32 +5,37 @@
 #include <QFileInfo>
 #include <QMessageBox>
 #include <QSaveFile>
+#include <cmath>
 #include <optional>
 #include <string>
 #include <utility>
 
-#include "model/Numeric.h"
+#include "desktop/graph/AxisText.h"
 #include "support/NumberText.h"
 
 namespace zel {
 namespace {
 
-constexpr int kPlaceDecimals = 6;
+constexpr double kShareOfStep = 0.1;
+constexpr double kShareOfOne = 1e-6;  // where there is one sample alone
 constexpr int kLevelDecimals = 2;
 constexpr qint64 kLargestTable = 10'000'000;
-const char* const kTables = "Tables (*.csv *.txt);;All Files (*)";
+
+QString none() { return QString::fromUtf8("–"); }
+
+QString kindsOfTable() { return QObject::tr("Tables (*.csv *.txt);;All Files (*)"); }
 
 }  // namespace
 
-QString placeText(std::optional<double> x, const std::string& unit) {
-    if (!x) return QString::fromUtf8("–");
-    return QString::fromStdString(FormatValue(*x, unit, "", true, true, kPlaceDecimals));
+QString placeText(std::optional<double> x, const std::optional<SpectrumTrace>& trace) {
+    if (!x || !trace) return none();
+    const double step = trace->step();
+    const double resolution = step > 0 ? step * kShareOfStep : std::fabs(*x) * kShareOfOne;
+    return QString::fromStdString(axisText(*x, resolution, trace->xUnit));
 }
 
 QString levelText(std::optional<double> level, const std::string& unit) {
-    if (!level) return QString::fromUtf8("–");
-    const std::string number = generalNumber(roundHalfEven(*level, kLevelDecimals));
-    return QString::fromStdString(number + (unit.empty() ? "" : " " + unit));
+    return level ? QString::fromStdString(levelText(*level, unit, kLevelDecimals)) : none();
 }
 
 std::optional<double> quantityOf(const QString& text) {
@@ -52,13 +57,14 @@ std::optional<double> quantityOf(const QString& text) {
 }
 
 std::optional<QString> readTable(QWidget& over, const QString& title, QString* name) {
-    const QString path = QFileDialog::getOpenFileName(&over, title, {}, kTables);
+    const QString path = QFileDialog::getOpenFileName(&over, title, {}, kindsOfTable());
     if (path.isEmpty()) return std::nullopt;
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly) || file.size() > kLargestTable) {
-        QMessageBox::warning(&over, title,
-                             "The file " + path + " cannot be read: " +
-                                 (file.isOpen() ? "it is too long" : file.errorString()));
+        QMessageBox::warning(
+            &over, title,
+            QObject::tr("The file %1 cannot be read: %2")
+                .arg(path, file.isOpen() ? QObject::tr("it is too long") : file.errorString()));
         return std::nullopt;
     }
     if (name != nullptr) *name = QFileInfo(path).completeBaseName();
@@ -66,12 +72,13 @@ std::optional<QString> readTable(QWidget& over, const QString& title, QString* n
 }
 
 void saveTable(QWidget& over, const QString& title, const QString& text) {
-    const QString path = QFileDialog::getSaveFileName(&over, title, {}, kTables);
+    const QString path = QFileDialog::getSaveFileName(&over, title, {}, kindsOfTable());
     if (path.isEmpty()) return;
     QSaveFile file(path);
     if (file.open(QIODevice::WriteOnly) && file.write(text.toUtf8()) >= 0 && file.commit()) return;
-    QMessageBox::warning(&over, title,
-                         "The file " + path + " cannot be written: " + file.errorString());
+    QMessageBox::warning(
+        &over, title,
+        QObject::tr("The file %1 cannot be written: %2").arg(path, file.errorString()));
 }
 
 }  // namespace zel

@@ -6,6 +6,7 @@
 #include <optional>
 #include <string>
 
+#include "analysis/SpectrumTrace.h"
 #include "analysis/TraceTools.h"
 
 namespace zel {
@@ -20,9 +21,10 @@ class TracePage : public QWidget {
     TraceTools& tools_;
 };
 
-/// "1.50999 GHz" with 6 decimals at most; a dash where there is none.
-QString placeText(std::optional<double> x, const std::string& unit);
-/// "-29.99 dBm"; a dash where there is none.
+/// "1.510 GHz" for samples that lie 10 MHz from each other: what lies between two samples is known
+/// to a tenth of their distance. A dash where there is none.
+QString placeText(std::optional<double> x, const std::optional<SpectrumTrace>& trace);
+/// "-30.00 dBm"; a dash where there is none.
 QString levelText(std::optional<double> level, const std::string& unit);
 /// "935M", "1.2 GHz", "-20": a number that may have a prefix and a unit; nothing for other texts.
 std::optional<double> quantityOf(const QString& text);

@@ -274,7 +274,7 @@ OverlayPicture TraceToolsDock::picture() const {
                                   .arg(picture.failed ? QObject::tr("FAIL") : QObject::tr("pass"));
             verdict += result.mask->margin ? QObject::tr(", margin %1 at %2")
                                                  .arg(levelText(result.mask->margin, "dB"),
-                                                      placeText(result.mask->x, result.xUnit))
+                                                      placeText(result.mask->x, tools.trace()))
                                            : QObject::tr(", no sample covered");
             if (tools.maskCount().sweeps > 0) verdict += "; " + ownText(tools.maskCount().text());
             foot << verdict;

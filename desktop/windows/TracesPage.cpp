@@ -15,6 +15,7 @@
 #include "analysis/SavedTraces.h"
 #include "analysis/SpectrumTrace.h"
 #include "analysis/TraceTools.h"
+#include "desktop/binders/OwnTexts.h"
 #include "desktop/graph/TraceOverlay.h"
 #include "desktop/windows/TracePage.h"
 
@@ -23,6 +24,7 @@ namespace {
 
 constexpr QSize kSwatch(20, 20);
 constexpr int kSwatchLine = 4;
+constexpr int kEdgeOfBox = 1;
 constexpr qint64 kLargestView = 100'000'000;
 
 /// `about` is read with the text.
@@ -67,7 +69,12 @@ TracesPage::TracesPage(TraceTools& tools, std::function<void()> scale) : TracePa
     const int last = static_cast<int>(kHolds + kMemories);
     grid->addWidget(swatch(kColors - 1, "Corrected sweep", QObject::tr("Corrected sweep")), last,
                     0);
-    grid->addWidget(new QLabel(QObject::tr("Corrected sweep")), last, 1);
+    // In line with the words of the boxes over it.
+    auto* corrected = new QLabel(QObject::tr("Corrected sweep"));
+    corrected->setObjectName("CorrectedLabel");
+    corrected->setIndent(style()->pixelMetric(QStyle::PM_IndicatorWidth) +
+                         style()->pixelMetric(QStyle::PM_CheckBoxLabelSpacing) + kEdgeOfBox);
+    grid->addWidget(corrected, last, 1);
     grid->addWidget(fit, last, 2, 1, 4);
     word_ = new QLabel;
     word_->setWordWrap(true);
@@ -196,8 +203,9 @@ void TracesPage::showState() {
                              static_cast<QWidget*>(memories_.at(i).clear)})
             key->setEnabled(there);
     }
-    const QString word = QString::fromStdString(
-        tools_.problem().empty() ? tools_.traces().ended() : "No figures: " + tools_.problem());
+    const QString word = tools_.problem().empty()
+                             ? ownText(tools_.traces().ended())
+                             : QObject::tr("No figures: %1").arg(ownText(tools_.problem()));
     word_->setText(fileWord_.isEmpty() ? word : fileWord_);
 }
 

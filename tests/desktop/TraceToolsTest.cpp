@@ -126,7 +126,7 @@ TEST_F(TraceToolsWindow, PeaksTable_ShowsTheToolsFiguresAndAClickSetsAMarker) {
     auto* table = peaks->findChild<QTableWidget*>("PeaksTable");
     const AnalysisResult& found = dock().tools().result();
     ASSERT_EQ(static_cast<std::size_t>(table->rowCount()), found.peaks.size());
-    EXPECT_EQ(table->item(0, 1)->text(), placeText(found.peaks[0].x, "Hz"));
+    EXPECT_EQ(table->item(0, 1)->text(), placeText(found.peaks[0].x, dock().tools().trace()));
     EXPECT_EQ(table->item(0, 2)->text(), levelText(found.peaks[0].level, "dBm"));
     emit table->cellClicked(1, 0);
     EXPECT_TRUE(dock().tools().markers[0].on);
@@ -134,6 +134,34 @@ TEST_F(TraceToolsWindow, PeaksTable_ShowsTheToolsFiguresAndAClickSetsAMarker) {
     for (auto* key : peaks->findChildren<QPushButton*>())
         if (key->text() == "Copy Table") key->click();
     EXPECT_TRUE(QApplication::clipboard()->text().startsWith("Peak\tx\tLevel\n1\t"));
+}
+
+TEST_F(TraceToolsWindow, Places_HaveTheDigitsOfTheSweepAndNoMore) {
+    SpectrumTrace trace;
+    trace.xUnit = "Hz";
+    for (int i = 0; i < 301; ++i) trace.x.push_back(i * 1e7);
+    EXPECT_EQ(placeText(946.706878e6, trace), "947 MHz");
+    EXPECT_EQ(placeText(1.499995e9, trace), "1.500 GHz");
+    for (double& x : trace.x) x = 1.5e9 + x / 1e3;
+    EXPECT_EQ(placeText(1.500123456e9, trace), "1.500123 GHz");
+    EXPECT_EQ(placeText(std::nullopt, trace), QString::fromUtf8("–"));
+    EXPECT_EQ(placeText(1e9, std::nullopt), QString::fromUtf8("–"));
+    trace.x = {1.2345678e9};
+    EXPECT_EQ(placeText(1.2345678e9, trace), "1.234568 GHz") << "one sample has no step";
+    EXPECT_EQ(levelText(-28.0, "dBm"), "-28.00 dBm");
+}
+
+TEST_F(TraceToolsWindow, WordsOfTheTraces_StandInOneLine) {
+    page(Traces);
+    dock().resize(530, 430);
+    QApplication::processEvents();
+    auto* box = dock().findChild<QCheckBox*>("Max hold");
+    auto* label = dock().findChild<QLabel*>("CorrectedLabel");
+    QStyleOptionButton option;
+    option.initFrom(box);
+    const QRect words = box->style()->subElementRect(QStyle::SE_CheckBoxContents, &option, box);
+    EXPECT_EQ(label->mapTo(&dock(), QPoint(label->contentsRect().left() + label->indent(), 0)).x(),
+              box->mapTo(&dock(), words.topLeft()).x());
 }
 
 TEST_F(TraceToolsWindow, BadMask_IsNamedAndTheOldOneStays) {
@@ -210,7 +238,8 @@ TEST_F(TraceToolsWindow, TypedPlace_PutsTheMarkerThere) {
     table->item(2, 3)->setText("90 GHz");
     EXPECT_EQ(dock().tools().markers[2].x, 1.2e9) << "outside of the sweep";
     dock().showNow();
-    EXPECT_EQ(table->item(2, 3)->text(), placeText(dock().tools().readings()[2].x, "Hz"));
+    EXPECT_EQ(table->item(2, 3)->text(),
+              placeText(dock().tools().readings()[2].x, dock().tools().trace()));
 }
 
 TEST_F(TraceToolsWindow, MouseDragsAMarker) {
