@@ -44,6 +44,16 @@ QPixmap cornersOf(const StyleFrame& frame, int side, qreal scale) {
 
 }  // namespace
 
+QIcon inkedIcon(const QIcon& icon, const QSize& size, qreal scale, const QColor& ink) {
+    QPixmap picture = icon.pixmap(size, scale);
+    if (picture.isNull()) return icon;
+    QPainter painter(&picture);
+    painter.setCompositionMode(QPainter::CompositionMode_SourceIn);
+    painter.fillRect(QRect(QPoint(), size), ink);
+    painter.end();
+    return QIcon(picture);
+}
+
 PanelStyle::PanelStyle(const ThemeColors& colors)
     : QProxyStyle(QStringLiteral("Fusion")), colors_(colors) {}
 
@@ -181,6 +191,9 @@ void PanelStyle::drawKeyLabel(const QStyleOptionButton& option, QPainter& painte
         ink = &ThemeColors::accentText;
     if (!enabled) ink = &ThemeColors::dim;
     QStyleOptionButton own = inked(option, color(ink));
+    if (ink == &ThemeColors::accentText && !own.icon.isNull())
+        own.icon =
+            inkedIcon(own.icon, own.iconSize, painter.device()->devicePixelRatioF(), color(ink));
     painter.save();
     if (face.bold && !enabled) {
         QFont font = painter.font();

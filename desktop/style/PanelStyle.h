@@ -3,6 +3,7 @@
 // itself: a style sheet would be worked out for each widget at the start.
 
 #include <QHash>
+#include <QIcon>
 #include <QPixmap>
 #include <QProxyStyle>
 #include <QStyleOptionButton>
@@ -22,6 +23,9 @@ Option inked(const Option& option, const QColor& ink) {
         own.palette.setColor(role, ink);
     return own;
 }
+
+/// The same drawing in another ink, for a face of which the common one does not stand out.
+QIcon inkedIcon(const QIcon& icon, const QSize& size, qreal scale, const QColor& ink);
 
 /// A frame with its ground. One without a width has no edge.
 struct StyleFrame {

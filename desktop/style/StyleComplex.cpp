@@ -115,6 +115,9 @@ void PanelStyle::drawTool(const QStyleOptionComplex& option, QPainter& painter,
     }
     if (!enabled) ink = &ThemeColors::dim;
     QStyleOptionToolButton label = inked(*tool, color(ink));
+    if (ink == &ThemeColors::accentText && !label.icon.isNull())
+        label.icon = inkedIcon(label.icon, label.iconSize, painter.device()->devicePixelRatioF(),
+                               color(ink));
     label.rect = toolPart(option, SC_ToolButton, widget);
     label.state &= ~State_HasFocus;
     proxy()->drawControl(CE_ToolButtonLabel, &label, &painter, widget);

@@ -1,5 +1,6 @@
 // What the style draws, pixel by pixel, and the sizes that it gives.
 
+#include <QAction>
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
@@ -9,11 +10,13 @@
 #include <QScrollBar>
 #include <QStyle>
 #include <QStyleOptionSlider>
+#include <QToolBar>
 #include <QToolTip>
 
 #include "desktop/binders/Binder.h"
 #include "desktop/style/FontsAhead.h"
 #include "desktop/style/StyleTables.h"
+#include "desktop/windows/ThemeIcons.h"
 #include "tests/desktop/WindowTest.h"
 
 namespace zel {
@@ -51,6 +54,25 @@ TEST_P(Style, EachFaceOfAKey_HasItsGround) {
         key.setEnabled(false);
         EXPECT_EQ(groundOf(key), QColor(colors().window)) << face;
     }
+}
+
+TEST_P(Style, IconOfAChosenKey_HasTheInkOfItsFace) {
+    QToolBar bar;
+    QAction* action = bar.addAction(themeIcon("stop"), "Stop");
+    action->setCheckable(true);
+    QWidget& tool = *bar.widgetForAction(action);
+    tool.resize(40, 40);
+    const auto middle = [](QWidget& key) {
+        return key.grab().toImage().pixelColor(key.rect().center());
+    };
+    EXPECT_EQ(middle(tool), QColor(colors().text));
+    action->setChecked(true);
+    EXPECT_EQ(middle(tool), QColor(colors().accentText));
+    QPushButton key;
+    key.setIcon(themeIcon("stop"));
+    setFace(&key, "green");
+    key.resize(40, 40);
+    EXPECT_EQ(middle(key), QColor(colors().accentText));
 }
 
 TEST_P(Style, DisabledTextOfAMenu_IsDrawnOnce) {
