@@ -9,16 +9,22 @@
 #include <QHelpEngine>
 #include <QHelpIndexWidget>
 #include <QHelpLink>
+#include <QImage>
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QListWidget>
 #include <QSplitter>
+#include <QTextBlock>
+#include <QTextCursor>
 #include <QTextDocument>
+#include <QTextFragment>
+#include <QTextImageFormat>
 #include <QToolBar>
 #include <QVBoxLayout>
 #include <algorithm>
 #include <memory>
 #include <utility>
+#include <vector>
 
 #include "desktop/windows/ThemeIcons.h"
 
@@ -45,6 +51,38 @@ void HelpPage::doSetSource(const QUrl& url, QTextDocument::ResourceType type) {
         QDesktopServices::openUrl(url);
     else
         QTextBrowser::doSetSource(url, type);
+    fitPictures();
+}
+
+void HelpPage::resizeEvent(QResizeEvent* event) {
+    QTextBrowser::resizeEvent(event);
+    fitPictures();
+}
+
+void HelpPage::fitPictures() {
+    const double room = viewport()->width() - 2 * document()->documentMargin();
+    if (room <= 0) return;
+    std::vector<std::pair<int, QTextImageFormat>> pictures;
+    for (QTextBlock block = document()->begin(); block.isValid(); block = block.next())
+        for (auto part = block.begin(); !part.atEnd(); ++part) {
+            const QTextFragment fragment = part.fragment();
+            if (fragment.charFormat().isImageFormat())
+                pictures.emplace_back(fragment.position(), fragment.charFormat().toImageFormat());
+        }
+    for (auto& [place, format] : pictures) {
+        const QUrl url = source().resolved(QUrl(format.name()));
+        const QImage image =
+            QImage::fromData(loadResource(QTextDocument::ImageResource, url).toByteArray());
+        if (image.isNull()) continue;
+        const double width = std::min<double>(image.width(), room);
+        if (width == format.width()) continue;
+        format.setWidth(width);
+        format.setHeight(width * image.height() / image.width());
+        QTextCursor cursor(document());
+        cursor.setPosition(place);
+        cursor.movePosition(QTextCursor::NextCharacter, QTextCursor::KeepAnchor);
+        cursor.setCharFormat(format);
+    }
 }
 
 HelpWindow::HelpWindow(const QString& book, const QString& home, QWidget* parent)

@@ -21,8 +21,12 @@ class HelpPage : public QTextBrowser {
   protected:
     QVariant loadResource(int type, const QUrl& url) override;
     void doSetSource(const QUrl& url, QTextDocument::ResourceType type) override;
+    void resizeEvent(QResizeEvent* event) override;
 
   private:
+    /// Pictures that are wider than the page are shown as wide as it is.
+    void fitPictures();
+
     QHelpEngine& engine_;
 };
 

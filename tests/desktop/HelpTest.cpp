@@ -1,10 +1,13 @@
 // The help book: topics, links, what it describes, and its window.
 
+#include <QHelpContentModel>
 #include <QHelpEngine>
 #include <QHelpLink>
 #include <QListWidget>
 #include <QRegularExpression>
+#include <QScrollBar>
 #include <QTemporaryDir>
+#include <QTest>
 #include <QTextBlock>
 #include <cstdlib>
 #include <set>
@@ -174,10 +177,33 @@ TEST(HelpViewerTest, WithoutTheBook_NothingOpens) {
     EXPECT_EQ(viewer.window(), nullptr);
 }
 
+TEST_F(Help, PictureOfAPage_IsAsWideAsThePageAtMost) {
+    HelpWindow& window = opened();
+    for (const int width : {960, 700, 2200}) {
+        window.resize(width, 640);
+        QApplication::processEvents();
+        EXPECT_FALSE(window.page().horizontalScrollBar()->isVisible()) << width;
+        QTextImageFormat picture;
+        for (QTextBlock block = window.page().document()->begin(); block.isValid();
+             block = block.next())
+            for (auto part = block.begin(); !part.atEnd(); ++part)
+                if (part.fragment().charFormat().isImageFormat())
+                    picture = part.fragment().charFormat().toImageFormat();
+        EXPECT_GT(picture.width(), std::min(width / 2.5, 1000.0)) << width;
+        EXPECT_LE(picture.width(), 1280) << "larger than it is";
+        EXPECT_NEAR(picture.width() / picture.height(), 1280.0 / 760, 0.01);
+    }
+}
+
 TEST_F(Help, LinksAndTexts_CanBeReadInEachTheme) {
     for (const ThemeChoice theme : {ThemeChoice::Light, ThemeChoice::Dark}) {
         applyTheme(testApplication(), theme);
         HelpWindow& window = opened();
+        // The contents are read beside the page.
+        EXPECT_TRUE(QTest::qWaitFor([&] {
+            const QHelpContentModel* contents = window.engine().contentModel();
+            return !contents->isCreatingContents() && contents->rowCount() > 0;
+        }));
         QApplication::processEvents();
         const QPalette palette = window.page().palette();
         const int ground = palette.color(QPalette::Base).lightness();
