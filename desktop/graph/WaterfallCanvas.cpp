@@ -105,12 +105,21 @@ void WaterfallCanvas::paintEvent(QPaintEvent*) {
     painter.fillRect(rect(), colors_.background);
     painter.setFont(waterfallFont());
     const WaterfallPicture& seen = picture(painter.fontMetrics().height());
-    paintWaterfall(painter, rect(), seen, colors_);
     waits_ = waits_ && rest_.isActive() && changed_;
-    if (form_.Graph3D.hasRows()) return;
+    if (form_.Graph3D.hasRows()) return paintWaterfall(painter, rect(), seen, colors_);
+    // The numbers along the axes mean nothing yet.
+    WaterfallPicture box = seen;
+    box.texts.clear();
+    paintWaterfall(painter, rect(), box, colors_);
+    const QString words =
+        QObject::tr("No sweeps yet: start the continuous view\nor load a recording");
+    constexpr int kAround = 6;
+    const QRect place = painter.fontMetrics()
+                            .boundingRect(rect(), Qt::AlignCenter, words)
+                            .adjusted(-kAround, -kAround, kAround, kAround);
+    painter.fillRect(place, colors_.background);
     painter.setPen(colors_.text);
-    painter.drawText(rect(), Qt::AlignCenter,
-                     QObject::tr("No sweeps yet: start the continuous view\nor load a recording"));
+    painter.drawText(rect(), Qt::AlignCenter, words);
 }
 
 void WaterfallCanvas::rotate(double right, double down) {

@@ -1,6 +1,7 @@
 #include "desktop/windows/WaterfallWindow.h"
 
 #include <QClipboard>
+#include <QEvent>
 #include <QGuiApplication>
 #include <QHBoxLayout>
 #include <QKeyEvent>
@@ -113,6 +114,12 @@ WaterfallWindow::WaterfallWindow(Forms& forms, Binder& binder, QWidget* parent)
     });
     canvas_->setFocus();
     followForm();
+}
+
+void WaterfallWindow::changeEvent(QEvent* event) {
+    FormWindow::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange)
+        canvas_->setColors(isDark(*this) ? darkGraph() : lightGraph());
 }
 
 void WaterfallWindow::showScreen() {

@@ -19,6 +19,8 @@ class WaterfallWindow : public FormWindow {
   protected:
     void focusFirst() override { canvas_->setFocus(); }
     void reject() override;
+    /// Another theme has other colours for the graph as well.
+    void changeEvent(QEvent* event) override;
 
   private:
     QMenuBar* menus();

@@ -34,6 +34,7 @@ struct WaterfallWindowTest : WindowTest {
         form().lblMAX.Caption = "-20 dBm";
         form().lblMin.Caption = "-120 dBm";
         panel().CWGraph1.setXRange(900e6, 1.2e9);
+        panel().Shown.xUnit = "Hz";
         panel().CWGraph1.setYRange(-120, -20);
         std::vector<double> x(301);
         std::vector<double> levels(301);
@@ -58,6 +59,12 @@ struct WaterfallWindowTest : WindowTest {
         QMouseEvent move(QEvent::MouseMove, place, canvas().mapToGlobal(place), Qt::NoButton,
                          Qt::NoButton, Qt::NoModifier);
         QApplication::sendEvent(&canvas(), &move);
+    }
+    /// Until what has changed is drawn.
+    void settle() {
+        const int before = canvas().drawings();
+        flush();
+        EXPECT_TRUE(QTest::qWaitFor([&] { return canvas().drawings() > before; }));
     }
     void open(int rows) {
         show();
@@ -95,7 +102,7 @@ TEST_F(WaterfallWindowTest, Pictures) {
     open(100);
     EXPECT_TRUE(savePicture(waterfall(), "waterfall"));
     form().ViewSpectrogram.Click();
-    flush();
+    settle();
     EXPECT_TRUE(savePicture(waterfall(), "waterfall-from-above"));
     applyTheme(testApplication(), ThemeChoice::Light);
     window->binder().refreshAll();
@@ -103,7 +110,7 @@ TEST_F(WaterfallWindowTest, Pictures) {
     form().ActionMarkers.Click();
     form().Graph3D.CursorPlaced(20, 101);
     waterfall().resize(1024, 560);
-    flush();
+    settle();
     EXPECT_TRUE(savePicture(waterfall(), "waterfall-light"));
     panel().SpectrogramShow.Click();
     window->resize(1280, 760);
@@ -116,6 +123,18 @@ TEST_F(WaterfallWindowTest, Pictures) {
     flush();
     flush();
     EXPECT_TRUE(savePicture(*window, "spectrogram-small"));
+}
+
+TEST_F(WaterfallWindowTest, OtherTheme_RecoloursTheWindowThatIsOpen) {
+    open(3);
+    const auto corner = [this] { return canvas().grab().toImage().pixelColor(2, 2); };
+    EXPECT_LT(corner().lightness(), 60);
+    applyTheme(testApplication(), ThemeChoice::Light);
+    QApplication::processEvents();
+    EXPECT_GT(corner().lightness(), 200);
+    applyTheme(testApplication(), ThemeChoice::Dark);
+    QApplication::processEvents();
+    EXPECT_LT(corner().lightness(), 60);
 }
 
 TEST_F(WaterfallWindowTest, PicturesOfSmallAndLargeScreens) {
