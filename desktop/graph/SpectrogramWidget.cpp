@@ -102,10 +102,13 @@ void SpectrogramWidget::paintEvent(QPaintEvent*) {
 
     painter.setPen(colors.text);
     const int line = painter.fontMetrics().height();
+    QString last;
     for (int y = 0; y + line <= place.height(); y += kLabelGap * line) {
         const int back = first + y / kRowHeight;
         if (back >= image_.rows()) break;
         const QString time = QString::fromStdString(trimmed(history_.row(back).time)).left(8);
+        if (time == last) continue;  // quick sweeps: many in a second
+        last = time;
         painter.drawText(QRect(0, place.top() + y, place.left() - 4, line),
                          Qt::AlignRight | Qt::AlignTop, time);
     }

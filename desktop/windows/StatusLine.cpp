@@ -143,7 +143,8 @@ void StatusLine::showState() {
     state_->setText(stateText());
     if (panel_.LinkLost) activityOff_.stop();
     showActivity(activityOff_.isActive());
-    const bool shown = busy() && !panel_.ContinuosLoopActive;
+    // A view and a playback show by themselves that they are at work.
+    const bool shown = busy() && !panel_.ContinuosLoopActive && !panel_.SeriesPlays;
     busy_->setVisible(shown);
     window_.setCursor(shown ? Qt::BusyCursor : Qt::ArrowCursor);
 }

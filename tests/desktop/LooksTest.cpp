@@ -38,12 +38,12 @@ const Scene kScenes[] = {
 class Looks : public WindowTest, public testing::WithParamInterface<Look> {
   protected:
     void SetUp() override {
-        applyTheme(testApplication(), GetParam().theme);
+        putOn(GetParam(), *program, window);
         connect();
         window->resize(GetParam().size);
         show();
     }
-    ~Looks() override { applyTheme(testApplication(), ThemeChoice::Dark); }
+    ~Looks() override { takeOff(); }
 
     /// The controls that can be seen, of the kinds that have a place of their own.
     std::vector<QWidget*> seen() {
@@ -195,7 +195,7 @@ TEST_P(Looks, Dialogs_ArePictures) {
 class BareLooks : public Looks {
   protected:
     void SetUp() override {
-        applyTheme(testApplication(), GetParam().theme);
+        putOn(GetParam(), *program, window);
         window->resize(GetParam().size);
         show();
     }

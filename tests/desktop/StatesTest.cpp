@@ -3,6 +3,8 @@
 #include <QAction>
 #include <QDialog>
 #include <QDockWidget>
+#include <QProgressBar>
+#include <QStatusBar>
 #include <QTest>
 #include <QToolBar>
 
@@ -33,15 +35,20 @@ std::string recordingOf(int count) {
 class LooksOfStates : public WindowTest, public testing::WithParamInterface<Look> {
   protected:
     void SetUp() override {
-        applyTheme(testApplication(), GetParam().theme);
+        putOn(GetParam(), *program, window);
         window->resize(GetParam().size);
         show();
     }
-    ~LooksOfStates() override { applyTheme(testApplication(), ThemeChoice::Dark); }
+    ~LooksOfStates() override { takeOff(); }
 
     void picture(QWidget& widget, const char* state) {
         show();
         EXPECT_TRUE(savePicture(widget, QString(GetParam().name) + "-" + state));
+    }
+    QAction* tool(const char* text) {
+        for (QAction* action : window->findChildren<QToolBar*>().first()->actions())
+            if (action->text() == QObject::tr(text)) return action;
+        return nullptr;
     }
     void sweeps(int count) {
         for (int i = 0; i < count; ++i) panel().PlaySingleButton.Click();
@@ -116,13 +123,20 @@ TEST_P(LooksOfStates, PlayingRecording_HasTheBarAtWork) {
     platform.events.schedule(4 * pause + pause / 2, [this] {
         picture(*window, "playback");
         EXPECT_TRUE(panel().SeriesPlays);
-        EXPECT_EQ(widgetOf<QPushButton>(panel().PlaybackPlay)->text(), "Pause");
-        EXPECT_EQ(widgetOf<QLabel>(panel().PlaybackLabel)->text(), "16 of 40   10:25:00");
+        const bool english = GetParam().english();
+        EXPECT_EQ(widgetOf<QPushButton>(panel().PlaybackPlay)->text(),
+                  english ? "Pause" : "Anhalten");
+        EXPECT_EQ(widgetOf<QLabel>(panel().PlaybackLabel)->text(),
+                  english ? "16 of 40   10:25:00" : "16 von 40   10:25:00");
         EXPECT_EQ(widgetOf<QSlider>(panel().PlaybackPosition)->value(), 16);
+        EXPECT_FALSE(tool("Connect")->isEnabled()) << "it does nothing now";
+        EXPECT_FALSE(window->statusBar()->findChild<QProgressBar*>()->isVisible()) << "of nothing";
         panel().PlaybackPlay.Click();
     });
     panel().PlaybackPlay.Click();
     EXPECT_FALSE(panel().SeriesPlays);
+    show();
+    EXPECT_TRUE(tool("Connect")->isEnabled());
 }
 
 TEST_P(LooksOfStates, PowerReading_IsLarge) {
@@ -148,10 +162,7 @@ TEST_P(LooksOfStates, Recording_HasTheRedLamp) {
     panel().FileLabel.Caption = "trace.csv: 5 traces, 52 kB, 00:00:03, next in 0 s";
     picture(*window, "recording");
     const auto lamp = [this] {
-        for (QAction* action : window->findChildren<QToolBar*>().first()->actions())
-            if (action->text() == "Record")
-                return action->icon().pixmap(20, QIcon::Disabled).toImage().pixelColor(10, 10);
-        return QColor();
+        return tool("Record")->icon().pixmap(20, QIcon::Disabled).toImage().pixelColor(10, 10);
     };
     EXPECT_GT(lamp().red(), 2 * lamp().blue());
     panel().RecordData.Checked = false;
