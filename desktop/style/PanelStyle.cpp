@@ -12,6 +12,8 @@
 #include <QToolButton>
 #include <cmath>
 
+#include "desktop/style/StyleIcons.h"
+
 namespace zel {
 namespace {
 
@@ -381,6 +383,13 @@ void PanelStyle::drawControl(ControlElement element, const QStyleOption* option,
             break;
     }
     QProxyStyle::drawControl(element, option, painter, widget);
+}
+
+QIcon PanelStyle::standardIcon(StandardPixmap icon, const QStyleOption* option,
+                               const QWidget* widget) const {
+    if (icon == SP_ToolBarHorizontalExtensionButton) return moreEntriesIcon(Qt::Horizontal);
+    if (icon == SP_ToolBarVerticalExtensionButton) return moreEntriesIcon(Qt::Vertical);
+    return QProxyStyle::standardIcon(icon, option, widget);
 }
 
 }  // namespace zel

@@ -62,6 +62,8 @@ class PanelStyle : public QProxyStyle {
                     const QWidget* widget) const override;
     int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
                   QStyleHintReturn* more) const override;
+    QIcon standardIcon(StandardPixmap icon, const QStyleOption* option,
+                       const QWidget* widget) const override;
 
   private:
     QColor color(Ink ink) const { return QColor(QLatin1String(colors_.*ink)); }

@@ -178,6 +178,20 @@ TEST_P(Style, Labels_HaveFontAndInkOfTheirPart) {
     EXPECT_EQ(readout.palette().color(QPalette::WindowText), QColor(colors().text));
 }
 
+TEST_P(Style, KeyOfABarWithoutRoom_IsDrawnInTheInkOfTheKeys) {
+    for (const auto icon :
+         {QStyle::SP_ToolBarHorizontalExtensionButton, QStyle::SP_ToolBarVerticalExtensionButton}) {
+        const QImage picture =
+            testApplication().style()->standardIcon(icon).pixmap(QSize(24, 24)).toImage();
+        int inked = 0;
+        for (int x = 0; x < picture.width(); ++x)
+            for (int y = 0; y < picture.height(); ++y)
+                inked += picture.pixelColor(x, y) == QColor(colors().text);
+        EXPECT_GT(inked, 10);
+        EXPECT_EQ(picture.pixelColor(0, 0).alpha(), 0);
+    }
+}
+
 TEST_P(Style, ThemeThatChanges_ReachesAWidgetThatIsShown) {
     QLabel caption("Span");
     caption.setObjectName("caption");
