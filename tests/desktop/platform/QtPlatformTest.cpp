@@ -391,6 +391,29 @@ TEST_F(OnQt, Settings_ThatAreStoredAlready_AreNotWrittenAgain) {
     EXPECT_NE(bytes(), spaced);
 }
 
+TEST_F(OnQt, ApplicationFolder_GetsTheDevices_AndKeepsThoseOfTheUser) {
+    const auto fileOf = [](const QString& path) {
+        QFile file(path);
+        EXPECT_TRUE(file.open(QIODevice::ReadOnly)) << path.toStdString();
+        return file.readAll();
+    };
+    const QString path = home.filePath("settings.ini");
+    const QByteArray given = fileOf(":/defaults/settings.ini");
+    ASSERT_FALSE(given.isEmpty());
+    EXPECT_EQ(fileOf(path), given);
+    const auto startAgainWith = [&](const QByteArray& text) {
+        QFile file(path);
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(text);
+        file.close();
+        const QtApplicationFolder again(home.path());
+        return fileOf(path);
+    };
+    EXPECT_EQ(startAgainWith("[DEVICES]\n"), "[DEVICES]\n");
+    EXPECT_EQ(startAgainWith(""), given);  // a computer that lost its power after the first start
+    EXPECT_TRUE(QFile::permissions(path).testFlag(QFile::WriteOwner));
+}
+
 TEST(QtSerialPortList, NamesThePortsOfTheKernelsList) {
     QTemporaryDir folder;
     const auto add = [&](const QString& name, const char* type) {
