@@ -57,6 +57,33 @@ function(zel_strict target)
         -Wnon-virtual-dtor -Woverloaded-virtual)
 endfunction()
 
+# zel_late_library(TARGET NAME COMPONENT)
+#
+# A library that the programs load when they first need it. It stands beside them, and is installed
+# with their companions.
+function(zel_late_library target name component)
+    set_target_properties(${target} PROPERTIES
+        PREFIX "" OUTPUT_NAME ${name} SUFFIX ".so" CXX_VISIBILITY_PRESET hidden
+        LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}")
+    target_include_directories(${target} PRIVATE "${PROJECT_SOURCE_DIR}")
+    zel_strict(${target})
+    install(TARGETS ${target} LIBRARY DESTINATION "${CMAKE_INSTALL_LIBDIR}/zelremote"
+        COMPONENT ${component})
+endfunction()
+
+# zel_window_libraries_first(TARGET)
+#
+# At its start a program looks for each name in its libraries one by one, in the order in which they
+# were linked: those come first that have most of the names.
+function(zel_window_libraries_first target)
+    set(files "")
+    foreach(library QCustomPlotQt6::QCustomPlotQt6 Qt6::Widgets Qt6::Core Qt6::Gui)
+        list(APPEND files "$<TARGET_FILE:${library}>")
+    endforeach()
+    target_link_options(${target} PRIVATE
+        "LINKER:--push-state,--no-as-needed" ${files} "LINKER:--pop-state")
+endfunction()
+
 # zel_precompile(TARGET HEADERS...)
 #
 # Headers of libraries, never of this tree: a source names all that it uses, and a change of ours

@@ -7,12 +7,13 @@
 #include <map>
 #include <memory>
 
+#include "desktop/platform/ArrivalSources.h"
 #include "platform/Clock.h"
 #include "platform/Events.h"
 
 namespace zel {
 
-class QtEvents : public Events {
+class QtEvents : public Events, public ArrivalSources {
   public:
     explicit QtEvents(const Clock& clock);
     ~QtEvents() override;
@@ -23,19 +24,10 @@ class QtEvents : public Events {
     TaskId schedule(double ms, std::function<void()> task) override;
     void cancel(TaskId id) override;
 
-    /// A port or socket whose bytes end a wait: its file descriptor (-1 while closed), and
-    /// whether bytes wait in its buffer already.
-    struct Source {
-        std::function<int()> descriptor;
-        std::function<bool()> bytesWait;
-    };
-    int addSource(Source source);
-    void removeSource(int id);
-    /// New bytes have come into the buffer of a source: the wait under way, or else the next one,
-    /// ends at once. Bytes that nobody takes end no further wait.
-    void bytesArrived(int id);
-    /// Somebody has read from a source what a wait ended for.
-    void bytesTaken() { offered_ = false; }
+    int addSource(Source source) override;
+    void removeSource(int id) override;
+    void bytesArrived(int id) override;
+    void bytesTaken() override { offered_ = false; }
     /// A descriptor that ends a delay as soon as it can be read; -1 for none.
     void setWakeDescriptor(int descriptor) { wakeDescriptor_ = descriptor; }
 

@@ -96,7 +96,7 @@ QtApplicationFolder::QtApplicationFolder(const QString& home) {
     fillFromDefaults(folder);
 }
 
-std::string QtApplicationFolder::programPath() {
+std::string companionFolder() {
     // The build says where the companions are installed, seen from the program.
     const QDir program(QCoreApplication::applicationDirPath());
     const QDir companions(program.absoluteFilePath(ZEL_COMPANIONS));

@@ -10,13 +10,17 @@
 
 namespace zel {
 
+/// The folder of what belongs to the program: where it is installed with it, else beside the
+/// program.
+std::string companionFolder();
+
 /// `home` when it is not empty, else $ZELREMOTE_HOME, else the user's application data folder. It
 /// is made when it is missing.
 class QtApplicationFolder : public ApplicationFolder {
   public:
     explicit QtApplicationFolder(const QString& home = {});
     std::string path() override { return path_; }
-    std::string programPath() override;
+    std::string programPath() override { return companionFolder(); }
 
   private:
     std::string path_;

@@ -3,13 +3,12 @@
 
 #include <QString>
 
+#include "desktop/platform/LateSocket.h"
 #include "desktop/platform/QtClock.h"
 #include "desktop/platform/QtEvents.h"
 #include "desktop/platform/QtSerialPort.h"
-#include "desktop/platform/QtServerSocket.h"
 #include "desktop/platform/QtServices.h"
 #include "desktop/platform/QtSignals.h"
-#include "desktop/platform/QtSocket.h"
 #include "desktop/platform/SystemFiles.h"
 #include "desktop/platform/SystemMachine.h"
 #include "desktop/platform/SystemPortProbe.h"
@@ -27,9 +26,9 @@ struct QtSystem {
     QtEvents events{clock};
     QtSerialPort serialPort{events};
     QtSerialPortList serialPorts;
-    QtSocket tcpSocket{events};
+    LateSocket tcpSocket{events};
     QtSerialPort serverPort{events, false};
-    QtServerSocket serverSocket{events};
+    LateServerSocket serverSocket{events};
     QtApplicationFolder folder;
     SystemFiles files;
     QtSettingsStore settings{folder, files};

@@ -27,6 +27,14 @@ env PATH=/nowhere "$scratch/zelctl" --connect sim: --home "$scratch/home" \
 grep -q 'install the package zelremote-draw' "$scratch/errors" ||
     { cat "$scratch/errors"; echo "it does not say what to install"; exit 1; }
 
+# Over a serial line nothing of TCP is loaded; what is missing is named when it is needed.
+if grep -q 'libQt6Network' <<< "$needs"; then echo "zelctl loads the sockets at once"; exit 1; fi
+status=0
+"$scratch/zelctl" --connect tcp:127.0.0.1:2277 --home "$scratch/home" info \
+    > "$scratch/rows" 2> "$scratch/errors" || status=$?
+[ "$status" = 1 ] && grep -q 'A part of the program cannot be loaded (.*zelremote-network' \
+    "$scratch/errors" || { cat "$scratch/errors"; echo "missing sockets are not named"; exit 1; }
+
 # A session goes on; its picture is refused in words.
 printf '%s\n' connect "answer $scratch/graph.png" 'click MenuFileSaveImage' 'show State' |
     env PATH=/nowhere "$scratch/zelctl" --connect sim: --home "$scratch/home" panel \

@@ -309,9 +309,9 @@ TEST_F(OnQt, ScheduledTasks_RunByTheirTime) {
 }
 
 TEST_F(OnQt, Sockets_CarryBytesBothWaysAndTellTheirState) {
-    QtServerSocket& listener = platform.serverSocket;
+    ServerSocket& listener = platform.serverSocket;
     Socket& server = listener.client();
-    QtSocket& client = platform.tcpSocket;
+    Socket& client = platform.tcpSocket;
     listener.listen("127.0.0.1", 0);
     ASSERT_EQ(listener.state(), SocketState::Listening) << listener.problem();
     const int port = listener.port();
@@ -337,6 +337,26 @@ TEST_F(OnQt, Sockets_CarryBytesBothWaysAndTellTheirState) {
     for (int i = 0; i < 200 && server.state() == SocketState::Connected; ++i)
         platform.events.wait(20);
     EXPECT_NE(server.state(), SocketState::Connected);
+}
+
+TEST_F(OnQt, Sockets_BeforeTheirFirstUse_AreClosed) {
+    Socket& client = platform.tcpSocket;
+    ServerSocket& server = platform.serverSocket;
+    EXPECT_EQ(client.state(), SocketState::Closed);
+    EXPECT_FALSE(client.sendData("ID?"));
+    EXPECT_EQ(client.peekData() + client.getData() + client.problem(), "");
+    EXPECT_EQ(client.bytesToWrite(), 0U);
+    client.close();
+    EXPECT_EQ(client.state(), SocketState::Closed);
+    EXPECT_EQ(server.state(), SocketState::Closed);
+    EXPECT_EQ(server.client().state(), SocketState::Closed);
+    EXPECT_EQ(server.peer(1) + server.problem(), "");
+    EXPECT_FALSE(server.prove(1));
+    server.accept(1);
+    server.refuse(1);
+    server.close();
+    EXPECT_EQ(server.state(), SocketState::Closed);
+    EXPECT_FALSE(server.localIP().empty());
 }
 
 TEST_F(OnQt, Socket_ToAPortWhereNobodyListens_EndsInError) {

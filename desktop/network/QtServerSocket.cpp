@@ -1,4 +1,4 @@
-#include "desktop/platform/QtServerSocket.h"
+#include "desktop/network/QtServerSocket.h"
 
 #include <QHostAddress>
 #include <QNetworkInterface>
@@ -6,7 +6,7 @@
 #include <QTimer>
 #include <memory>
 
-#include "desktop/platform/Tls.h"
+#include "desktop/network/Tls.h"
 #include "platform/ServerSocket.h"
 #include "platform/Socket.h"
 
@@ -46,7 +46,7 @@ class QtServerSocket::Listener : public QTcpServer {
     QtServerSocket& owner_;
 };
 
-QtServerSocket::QtServerSocket(QtEvents& events)
+QtServerSocket::QtServerSocket(ArrivalSources& events)
     : listener_(std::make_unique<Listener>(*this)), client_(events, false) {
     QObject::connect(listener_.get(), &QTcpServer::acceptError, listener_.get(), [this] {
         problem_ = listener_->errorString().toStdString() + ".";

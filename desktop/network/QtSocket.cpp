@@ -1,4 +1,4 @@
-#include "desktop/platform/QtSocket.h"
+#include "desktop/network/QtSocket.h"
 
 #include <netinet/in.h>
 #include <netinet/tcp.h>
@@ -11,7 +11,7 @@
 #include <cstddef>
 #include <string_view>
 
-#include "desktop/platform/Tls.h"
+#include "desktop/network/Tls.h"
 #include "platform/Socket.h"
 
 namespace zel {
@@ -34,7 +34,7 @@ void keepAlive(QTcpSocket& socket) {
 
 }  // namespace
 
-QtSocket::QtSocket(QtEvents& events, bool quick) : events_(events) {
+QtSocket::QtSocket(ArrivalSources& events, bool quick) : events_(events) {
     if (!quick) return;
     source_ = events_.addSource(
         {[this] {

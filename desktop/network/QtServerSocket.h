@@ -8,7 +8,7 @@
 #include <optional>
 #include <string>
 
-#include "desktop/platform/QtSocket.h"
+#include "desktop/network/QtSocket.h"
 #include "platform/ServerSocket.h"
 #include "platform/Socket.h"
 
@@ -16,7 +16,7 @@ namespace zel {
 
 class QtServerSocket : public ServerSocket {
   public:
-    explicit QtServerSocket(QtEvents& events);
+    explicit QtServerSocket(ArrivalSources& events);
     ~QtServerSocket() override;
 
     void listen(const std::string& address, int port) override;

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-#include "desktop/platform/QtEvents.h"
+#include "desktop/platform/ArrivalSources.h"
 #include "platform/Socket.h"
 
 class QSslSocket;
@@ -17,7 +17,7 @@ namespace zel {
 class QtSocket : public Socket {
   public:
     /// A `quick` socket wakes a wait on the short way, for loops that take the data themselves.
-    explicit QtSocket(QtEvents& events, bool quick = true);
+    explicit QtSocket(ArrivalSources& events, bool quick = true);
     ~QtSocket() override;
 
     void connectTo(const std::string& host, int port) override;
@@ -39,7 +39,7 @@ class QtSocket : public Socket {
     void fetch();
     bool usable() const;
 
-    QtEvents& events_;
+    ArrivalSources& events_;
     std::unique_ptr<QTcpSocket> socket_;
     QSslSocket* secured_ = nullptr;  ///< the same, where it is TLS
     bool failed_ = false;

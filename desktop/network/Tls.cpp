@@ -1,4 +1,4 @@
-#include "desktop/platform/Tls.h"
+#include "desktop/network/Tls.h"
 
 #include <QFile>
 #include <QSslCertificate>
