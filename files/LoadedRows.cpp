@@ -78,12 +78,8 @@ int LoadedRows::ReadDataRows(const FieldList& lines, bool autoPeak, int startInd
     int i = startIndex;
     while (rows < kRows) {
         while (i <= last && lines[i] == kBlank) ++i;
-        // A line end after the last row makes an entry of its own, which is no row.
-        if (i > last || (i == last && lines[i].empty())) {
-            i = last + 1;
-            break;
-        }
-        if (i + static_cast<int>(perRow) > last) {  // the file ends in the middle of this row
+        // The file ends in the middle of this row, or with the entry that a last line end makes.
+        if (i + static_cast<int>(perRow) > last) {
             i = last + 1;
             break;
         }

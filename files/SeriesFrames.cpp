@@ -37,12 +37,10 @@ int secondOfDay(std::string_view time) {
     const char* at = time.data();
     const char* const end = at + time.size();
     for (std::size_t i = 0; i < parts.size(); ++i) {
+        if (i > 0 && (at == end || *at++ != ':')) return -1;
         const auto [stop, problem] = std::from_chars(at, end, parts[i]);
         if (problem != std::errc() || parts[i] < 0 || parts[i] >= (i == 0 ? 24 : 60)) return -1;
         at = stop;
-        if (i + 1 == parts.size()) break;
-        if (at == end || *at != ':') return -1;
-        ++at;
     }
     const std::string_view rest(at, static_cast<std::size_t>(end - at));
     if (rest.find("PM") != std::string_view::npos && parts[0] < kNoon) parts[0] += kNoon;

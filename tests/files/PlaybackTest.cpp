@@ -79,8 +79,10 @@ TEST_F(PlaybackTest, Scrub_ShowsTheTraceAndTheWaterfallUpToIt) {
     scrub(2);
     EXPECT_EQ(levels, Levels{-31});
     EXPECT_EQ(rows(), all - 3);
+    EXPECT_FALSE(forms.waterfall.Graph3D.plots().back().lineVisible) << "the last row is styled";
     scrub(4);
     EXPECT_EQ(levels, (Levels{-31, -33}));
+    EXPECT_FALSE(forms.waterfall.Graph3D.plots().back().lineVisible);
     EXPECT_EQ(rows(), all - 1);
     EXPECT_EQ(panel.PlaybackLabel.Caption.get(), "4 of 5   10:00:04");
 }
@@ -201,7 +203,16 @@ TEST(SecondOfDay, ReadsBothClocksAndRefusesTheRest) {
     EXPECT_EQ(secondOfDay("10:00:01"), 36001);
     EXPECT_EQ(secondOfDay("02:03:04 PM"), 14 * 3600 + 3 * 60 + 4);
     EXPECT_EQ(secondOfDay("12:00:00 AM"), 0);
+    EXPECT_EQ(secondOfDay("12:00:00 PM"), 12 * 3600);
+    EXPECT_EQ(secondOfDay("23:59:59"), 86399);
+    EXPECT_EQ(secondOfDay("9:5:1"), 9 * 3600 + 5 * 60 + 1);
     EXPECT_EQ(secondOfDay("24:00:00"), -1);
+    EXPECT_EQ(secondOfDay("10:60:00"), -1);
+    EXPECT_EQ(secondOfDay("10:00:60"), -1);
+    EXPECT_EQ(secondOfDay("10:-1:00"), -1);
+    EXPECT_EQ(secondOfDay("10:00"), -1);
+    EXPECT_EQ(secondOfDay("10:00:"), -1);
+    EXPECT_EQ(secondOfDay("10.00.00"), -1);
     EXPECT_EQ(secondOfDay("noon"), -1);
     EXPECT_EQ(secondOfDay(""), -1);
 }

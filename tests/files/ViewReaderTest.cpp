@@ -438,7 +438,10 @@ TEST_F(ViewReaderTest, OldZeroSpanLog_SetsTheStop) {
     load(logText("Data(ZeroSpan) at;", rowsText(301)));
     EXPECT_TRUE(panel.Shown.fromFile);
     EXPECT_EQ(panel.ViewStop, 3100);
+    EXPECT_EQ(panel.ViewSpan, 0);
     EXPECT_EQ(panel.SpanLabel.Caption.get(), "Span: 0 Hz");
+    load(logText("Data at;", rowsText(301)));
+    EXPECT_EQ(panel.ViewSpan, 3000);
 }
 
 TEST_F(ViewReaderTest, OldLog_StopsAtTheRowsThatAreThere) {

@@ -81,6 +81,23 @@ TEST_F(ViewWriterTest, Noheader_LeavesAPlainTable) {
     EXPECT_EQ(lines[0], "1499500000.000;-35.25; ");
 }
 
+TEST_F(ViewWriterTest, IncompleteTrace_IsRefusedWithItsSamplesAndNoFile) {
+    sweepOf(ramp(-35250, 0));
+    program.sweep().came = 150;
+    platform.fileDialogs.answer(folder.file("view.csv"));
+    panel.SaveCurrentView.Click();
+    EXPECT_EQ(boxes.texts(), Texts{"The trace is incomplete, 150 of 301 samples came, and is not "
+                                   "saved. Read a new one first."});
+    EXPECT_TRUE(platform.fileDialogs.saves.empty());
+    EXPECT_FALSE(folder.has("view.csv"));
+    // A reading of the power sensor has nothing to do with the trace that stands there.
+    panel.InstrumentMode = CF::POWERSENSOR;
+    panel.SaveCurrentView.Click();
+    EXPECT_EQ(platform.fileDialogs.saves.size(), 1U);
+    EXPECT_TRUE(folder.has("view.csv"));
+    EXPECT_EQ(boxes.texts().size(), 1U);
+}
+
 TEST_F(ViewWriterTest, SecondSave_ReplacesTheFile) {
     sweepOf(ramp(-35250, 0));
     const std::string first = save("view.csv");
