@@ -1,6 +1,5 @@
 #include "desktop/graph/DivisionTicker.h"
 
-#include <algorithm>
 #include <cmath>
 #include <string>
 
@@ -13,13 +12,6 @@ namespace {
 constexpr int kDivisions = 10;
 constexpr int kFewTicks = 7;  // that all have room for a text
 constexpr double kClose = 1e-6;
-
-/// A tick of a range does not show what lies far below the range's own steps.
-double tidy(double value, double step) {
-    if (step <= 0) return value;
-    const double unit = std::pow(10.0, std::floor(std::log10(step)) - 3);
-    return std::nearbyint(value / unit) * unit;
-}
 
 /// The smallest of 1, 2, 5 and their tenfolds that is not below the value.
 double roundStep(double value) {
@@ -39,7 +31,7 @@ double divisionOf(double lower, double upper) {
 }
 
 double DivisionTicker::getTickStep(const QCPRange& range) {
-    return std::max(divisionOf(range.lower, range.upper), range.size() * 1e-3);
+    return divisionOf(range.lower, range.upper);
 }
 
 QVector<double> DivisionTicker::createTickVector(double tickStep, const QCPRange& range) {
@@ -62,10 +54,7 @@ QVector<QString> DivisionTicker::createLabelVector(const QVector<double>& ticks,
             labels << QString();
             continue;
         }
-        double value = tidy(tick, step);
-        if (std::fabs(value) < step * 1e-6) value = 0;
-        const std::string text =
-            unit_.empty() ? generalNumber(roundHalfEven(value, 6)) : FormatValue(value, unit_);
+        const std::string text = unit_.empty() ? generalNumber(tick) : FormatValue(tick, unit_);
         labels << QString::fromStdString(text);
     }
     return labels;
