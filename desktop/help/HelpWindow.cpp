@@ -78,6 +78,11 @@ void HelpPage::fitPictures() {
         if (width == format.width()) continue;
         format.setWidth(width);
         format.setHeight(width * image.height() / image.width());
+        // The page itself would leave pixels out.
+        const QSizeF dots = QSizeF(format.width(), format.height()) * devicePixelRatioF();
+        document()->addResource(QTextDocument::ImageResource, url,
+                                image.scaled(dots.toSize().boundedTo(image.size()),
+                                             Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
         QTextCursor cursor(document());
         cursor.setPosition(place);
         cursor.movePosition(QTextCursor::NextCharacter, QTextCursor::KeepAnchor);
