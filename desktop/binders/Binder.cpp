@@ -290,7 +290,7 @@ void Binder::bind(DropDownList& control, QComboBox* widget) {
     follow(control, widget, [this, &control, widget] {
         const QSignalBlocker quiet(widget);
         QStringList items;
-        for (const std::string& item : control.items()) items << text(item);
+        for (const std::string& item : control.items()) items << ownCaption(control, item);
         bool same = items.size() == widget->count();
         for (int i = 0; same && i < items.size(); ++i) same = widget->itemText(i) == items[i];
         if (!same) {

@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "desktop/binders/ToolTips.h"
 #include "platform/Form.h"
 
 namespace zel {
@@ -160,7 +161,7 @@ QString ownText(const std::string& sentence) { return ownText(QString::fromStdSt
 QString labelText(const Control& label, const std::string& caption) {
     const bool own = std::any_of(std::begin(kLabels), std::end(kLabels),
                                  [&label](const char* name) { return label.name() == name; });
-    return own ? ownText(caption) : QString::fromStdString(caption);
+    return own ? ownText(caption) : ownCaption(label, caption);
 }
 
 }  // namespace zel

@@ -1874,5 +1874,45 @@ oder eine Aufzeichnung laden</translation>
         <source>The file %1 cannot be written: %2</source>
         <translation>Die Datei %1 kann nicht geschrieben werden: %2</translation>
     </message>
+    <message>
+        <source>Run again</source>
+        <translation>Noch einmal</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <translation>Automatisch</translation>
+    </message>
+    <message>
+        <source>As recorded</source>
+        <translation>Wie aufgezeichnet</translation>
+    </message>
+    <message>
+        <source>25 rows</source>
+        <translation>25 Zeilen</translation>
+    </message>
+    <message>
+        <source>50 rows</source>
+        <translation>50 Zeilen</translation>
+    </message>
+    <message>
+        <source>100 rows</source>
+        <translation>100 Zeilen</translation>
+    </message>
+    <message>
+        <source>Reference level</source>
+        <translation>Referenzpegel</translation>
+    </message>
+    <message>
+        <source>By hand</source>
+        <translation>Von Hand</translation>
+    </message>
+    <message>
+        <source>Save report...</source>
+        <translation>Bericht speichern...</translation>
+    </message>
+    <message>
+        <source>Attach the last 200 lines of the session</source>
+        <translation>Die letzten 200 Zeilen der Sitzung anhängen</translation>
+    </message>
 </context>
 </TS>

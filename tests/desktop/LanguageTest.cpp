@@ -9,6 +9,8 @@
 #include "desktop/binders/ToolTips.h"
 #include "desktop/platform/Language.h"
 #include "forms/MainForm.h"
+#include "forms/SupportForms.h"
+#include "forms/WaterfallForm.h"
 #include "tests/desktop/WindowTest.h"
 
 namespace zel {
@@ -36,6 +38,12 @@ TEST_F(LanguageTest, German_TranslatesTheWindowsOwnTexts) {
     MainForm dialog;
     EXPECT_EQ(ownCaption(dialog.SearchRatesButton, dialog.SearchRatesButton.Caption),
               "Baudraten durchsuchen");
+    DoctorForm doctor;
+    EXPECT_EQ(ownCaption(doctor.cmdRunAgain, doctor.cmdRunAgain.Caption), "Noch einmal");
+    EXPECT_EQ(labelText(doctor.AddressCaption, doctor.AddressCaption.Caption), "Verbindung");
+    WaterfallForm waterfall;
+    EXPECT_EQ(ownCaption(waterfall.DepthList, "As recorded"), "Wie aufgezeichnet");
+    EXPECT_EQ(ownCaption(waterfall.VewClear, waterfall.VewClear.Caption), "Clear");
     EXPECT_EQ(ownCaption(dialog.ZELButton, dialog.ZELButton.Caption), "Connect") << "a panel text";
     EXPECT_EQ(QObject::tr("Port", "of TCP"), "Port");
 }
