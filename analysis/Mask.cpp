@@ -69,6 +69,7 @@ Mask readMask(const std::string& text) {
     const std::string bytes = replaceAll(replaceAll(text, kCrLf, "\n"), "\r", "\n");
     const std::vector<std::string> lines = split(bytes, '\n');
     bool header = false;
+    std::size_t columns = 0;
     double lastX = 0;
     bool first = true;
     for (std::size_t i = 0; i < lines.size(); ++i) {
@@ -84,8 +85,13 @@ Mask readMask(const std::string& text) {
                     lowerCase(trimmed(fields[column])) != kColumnNames[column])
                     complain(i + 1, "the header x;upper;lower is missing");
             header = true;
+            columns = fields.size();
             continue;
         }
+        // Two rows in one line are no row.
+        for (std::size_t column = columns; column < fields.size(); ++column)
+            if (!trimmed(fields[column]).empty())
+                complain(i + 1, "the row has more fields than the header");
         const double x = number(fields[0], i + 1, kColumnNames[0]);
         if (!first && x < lastX) complain(i + 1, "x is below that of the row before");
         first = false;

@@ -42,6 +42,10 @@ TEST(ReadMask, WrongTables_AreRefusedWithTheLine) {
     EXPECT_EQ(complaint("x;upper;lower\n;1;\n"), "line 2: \"\" in the column x is no number");
     EXPECT_EQ(complaint("x;upper;lower\n2;1;\n1;1;\n"),
               "line 3: x is below that of the row before");
+    EXPECT_EQ(complaint("x;upper;lower\n0;-25;1e9;-25;\n"),
+              "line 2: the row has more fields than the header");
+    EXPECT_EQ(readMask("x;upper;lower\n0;-25;;\n").upper.x.size(), 1U) << "empty ones at the end";
+    EXPECT_EQ(readMask("x;upper;lower;why\n0;-25;;a note\n").upper.x.size(), 1U);
 }
 
 TEST(CheckMask, Margin_IsTheSmallestDistanceWithItsX) {
