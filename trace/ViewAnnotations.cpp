@@ -15,14 +15,18 @@
 namespace zel {
 namespace {
 
+/// "Auto Peak" of "Auto Peak (Auto)": a caption that queries and files write has more than a list.
+std::string withoutBracket(std::string caption) {
+    const auto bracket = caption.rfind(" (");
+    return bracket == std::string::npos ? caption : caption.substr(0, bracket);
+}
+
 std::string choiceText(CodeTable table, double code) {
     const CodeRow* row = findCode(table, code);
     if (row == nullptr) return "";
-    if (!row->choice.empty()) return std::string(row->choice);
-    // A code that no list offers still has the caption that queries write.
-    std::string caption(row->caption);
-    const auto bracket = caption.rfind(" (");
-    return bracket == std::string::npos ? caption : caption.substr(0, bracket);
+    // A code that no list offers still has a caption.
+    return row->choice.empty() ? withoutBracket(std::string(row->caption))
+                               : std::string(row->choice);
 }
 
 std::string verticalUnit(const ZEL3Variables& mirror, double range) {
@@ -42,7 +46,7 @@ void annotateFile(const ShownView& shown, ViewAnnotations& view) {
     view.rbw = fileText("RBW ", shown.rbw, "Hz");
     view.vbw = fileText("VBW ", shown.vbw, "Hz");
     view.sweepTime = fileText("SWT ", shown.sweepTime, "s");
-    view.detector = shown.detector.empty() ? "" : "Det " + shown.detector;
+    view.detector = shown.detector.empty() ? "" : "Det " + withoutBracket(shown.detector);
     view.mode = shown.mode;
 }
 

@@ -191,6 +191,8 @@ TEST_F(ViewAnnotationsTest, File_SaysWhatOnlyItKnows) {
     EXPECT_EQ(shown.vbw, "");
     EXPECT_EQ(shown.sweepTime, "SWT 500 ms");
     EXPECT_EQ(shown.detector, "Det RMS");
+    panel.Shown.detector = "Auto Peak (Auto)";
+    EXPECT_EQ(view().detector, "Det Auto Peak") << "as of the instrument";
     EXPECT_EQ(shown.mode, "Receiver");
 }
 
