@@ -328,14 +328,22 @@ void PanelStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* opt
                 *painter, option->rect,
                 {element == PE_PanelMenu ? color(&ThemeColors::panel) : QColor(Qt::transparent),
                  color(&ThemeColors::border)});
+        case PE_Frame:
+            // A list or a text shows that it has the focus, be it empty.
+            if (!isTextArea(widget)) break;
+            return drawFrame(
+                *painter, option->rect,
+                {Qt::transparent,
+                 color(has(*option, State_HasFocus) ? &ThemeColors::focus : &ThemeColors::border)});
         case PE_FrameTabWidget:
             return drawFrame(*painter, option->rect,
                              {color(&ThemeColors::panel), color(&ThemeColors::hairline)});
         case PE_IndicatorToolBarSeparator:
             return;
         default:
-            return QProxyStyle::drawPrimitive(element, option, painter, widget);
+            break;
     }
+    QProxyStyle::drawPrimitive(element, option, painter, widget);
 }
 
 void PanelStyle::drawControl(ControlElement element, const QStyleOption* option, QPainter* painter,

@@ -55,6 +55,8 @@ int PanelStyle::styleHint(StyleHint hint, const QStyleOption* option, const QWid
                           QStyleHintReturn* more) const {
     // A second, lighter text under a disabled one blurs it on a dark menu.
     if (hint == SH_EtchDisabledText) return 0;
+    // The toolkit's own pictures are of another set than the program's.
+    if (hint == SH_DialogButtonBox_ButtonsHaveIcons) return 0;
     // A press beside the handle of a slider takes it to the pointer, from where it can be dragged.
     if (hint == SH_Slider_AbsoluteSetButtons) return Qt::LeftButton;
     return QProxyStyle::styleHint(hint, option, widget, more);

@@ -1,10 +1,12 @@
 #include "desktop/style/StyleTables.h"
 
+#include <QAbstractScrollArea>
 #include <QAbstractSpinBox>
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QScrollArea>
 #include <QStatusBar>
 #include <QToolBar>
 #include <QToolButton>
@@ -90,6 +92,11 @@ bool isTool(const QWidget* widget) {
 bool isHeading(const QWidget* widget) {
     return widget != nullptr && widget->objectName() == QLatin1String("heading") &&
            qobject_cast<const QToolButton*>(widget) != nullptr;
+}
+
+bool isTextArea(const QWidget* widget) {
+    return qobject_cast<const QAbstractScrollArea*>(widget) != nullptr &&
+           qobject_cast<const QScrollArea*>(widget) == nullptr;
 }
 
 bool isCard(const QWidget* widget) {

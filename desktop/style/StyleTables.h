@@ -65,6 +65,8 @@ bool hasFace(const QWidget* widget, const char* face);
 bool isTool(const QWidget* widget);
 /// The heading of a part that folds.
 bool isHeading(const QWidget* widget);
+/// A list, a table or a text of several lines.
+bool isTextArea(const QWidget* widget);
 /// A frame around things that belong together.
 bool isCard(const QWidget* widget);
 bool isInStatusBar(const QWidget* widget);

@@ -4,9 +4,12 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QListWidget>
+#include <QMessageBox>
 #include <QPainter>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QScrollArea>
 #include <QScrollBar>
 #include <QStyle>
 #include <QStyleOptionSlider>
@@ -73,6 +76,31 @@ TEST_P(Style, IconOfAChosenKey_HasTheInkOfItsFace) {
     setFace(&key, "green");
     key.resize(40, 40);
     EXPECT_EQ(middle(key), QColor(colors().accentText));
+}
+
+TEST_P(Style, ListWithTheFocus_ShowsIt) {
+    const QListWidget list;
+    const QScrollArea area;
+    const auto edge = [](const QWidget& widget, QStyle::State state) {
+        QImage image(20, 20, QImage::Format_RGB32);
+        image.fill(Qt::black);
+        QPainter painter(&image);
+        QStyleOptionFrame option;
+        option.rect = image.rect();
+        option.lineWidth = 1;
+        option.state = state;
+        testApplication().style()->drawPrimitive(QStyle::PE_Frame, &option, &painter, &widget);
+        painter.end();
+        return image.pixelColor(10, 0);
+    };
+    EXPECT_EQ(edge(list, QStyle::State_Enabled), QColor(colors().border));
+    EXPECT_EQ(edge(list, QStyle::State_HasFocus), QColor(colors().focus));
+    EXPECT_NE(edge(area, QStyle::State_HasFocus), QColor(colors().focus));
+}
+
+TEST_P(Style, KeysOfADialog_HaveNoPicturesOfAnotherSet) {
+    QMessageBox box(QMessageBox::Question, "Disconnect", "?", QMessageBox::Ok);
+    EXPECT_TRUE(box.button(QMessageBox::Ok)->icon().isNull());
 }
 
 TEST_P(Style, DisabledTextOfAMenu_IsDrawnOnce) {
