@@ -1914,5 +1914,9 @@ oder eine Aufzeichnung laden</translation>
         <source>Attach the last 200 lines of the session</source>
         <translation>Die letzten 200 Zeilen der Sitzung anhängen</translation>
     </message>
+    <message>
+        <source>Stop the playback first</source>
+        <translation>Erst die Wiedergabe anhalten</translation>
+    </message>
 </context>
 </TS>

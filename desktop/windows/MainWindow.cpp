@@ -85,7 +85,11 @@ MainWindow::MainWindow(Program& program) : program_(program), panel_(program.for
     };
     binder_.reasonAgainst = [this, &interlock](const Control& control) {
         const std::string reason = interlock.reasonAgainst(control);
-        return reason.empty() ? reasonHere(control) : reason;
+        if (!reason.empty()) return reason;
+        // A recording that plays keeps everything else away.
+        if (panel_.SeriesPlays && interlock.turnOf(control) == Interlock::Turn::Never)
+            return QObject::tr("Stop the playback first").toStdString();
+        return reasonHere(control);
     };
     buildMainMenus(*this, panel_, binder_);
     buildCentre();
@@ -307,7 +311,8 @@ void MainWindow::greyWhatRefuses() {
                       (panel_.AcquisitionRunning && panel_.STOPFlag && !panel_.RecordDataFlag);
     const int state = (panel_.isConnected ? 1 : 0) + (view ? 2 : 0) +
                       (panel_.InstrumentMode == ControllerForm::POWERSENSOR ? 4 : 0) +
-                      (panel_.RecordDataFlag ? 8 : 0) + (panel_.CWGraph1.values().empty() ? 0 : 16);
+                      (panel_.RecordDataFlag ? 8 : 0) +
+                      (panel_.CWGraph1.values().empty() ? 0 : 16) + (panel_.SeriesPlays ? 32 : 0);
     side_->showState(view, panel_.isConnected && panel_.Shown.fromFile);
     if (state == lockState_) return;
     lockState_ = state;

@@ -34,13 +34,7 @@ ToolStrip::ToolStrip(Forms& forms, Binder& binder, Own own, QWidget* parent)
     setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
 
     connect_ = add("connect", QObject::tr("Connect"));
-    // While a recording plays, its menu is locked.
-    binder_.twin(panel.Direct, connect_, [this, &panel] {
-        connect_->setEnabled(connect_->isEnabled() && panel.Connection.Enabled);
-    });
-    panel.Connection.Changed.connect([self = QPointer<ToolStrip>(this)] {
-        if (self) self->binder_.refresh(self->forms_.controller.Direct);
-    });
+    binder_.twin(panel.Direct, connect_);
     disconnect_ = add("disconnect", QObject::tr("Disconnect"));
     binder_.twin(panel.Disconnect, disconnect_);
     if (QToolButton* button = buttonOf(connect_); button != nullptr) {

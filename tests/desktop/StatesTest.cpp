@@ -139,6 +139,32 @@ TEST_P(LooksOfStates, PlayingRecording_HasTheBarAtWork) {
     EXPECT_TRUE(tool("Connect")->isEnabled());
 }
 
+TEST_P(LooksOfStates, PlayingRecordingBesideAnInstrument_GreysWhatHasToWait) {
+    connect();
+    load(40);
+    widgetOf<QSlider>(panel().PlaybackPosition)->setValue(12);
+    program->forms().specialMeas.sldSpeed.Value = 5;
+    const int pause = program->forms().specialMeas.seriesPauseMs();
+    const auto enabled = [this](const Control& control) {
+        return widgetOf<QWidget>(control)->isEnabled();
+    };
+    platform.events.schedule(2 * pause + pause / 2, [&, this] {
+        show();
+        EXPECT_FALSE(enabled(panel().PlaySingleButton) || enabled(panel().SoftKey(0)) ||
+                     enabled(panel().AnalyzerButton) || enabled(panel().SpanButton));
+        EXPECT_TRUE(enabled(panel().PlaybackPlay) && enabled(panel().PlaybackPosition) &&
+                    enabled(panel().StopButton));
+        EXPECT_FALSE(tool("Open")->isEnabled());
+        EXPECT_TRUE(tool("Stop")->isEnabled());
+        panel().PlaybackPlay.Click();
+    });
+    panel().PlaybackPlay.Click();
+    show();
+    EXPECT_TRUE(enabled(panel().PlaySingleButton) && enabled(panel().SoftKey(0)) &&
+                enabled(panel().AnalyzerButton) && enabled(panel().SpanButton));
+    EXPECT_TRUE(tool("Open")->isEnabled());
+}
+
 TEST_P(LooksOfStates, PowerReading_IsLarge) {
     connect();
     panel().PwrButton.Click();
