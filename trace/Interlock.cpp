@@ -86,7 +86,7 @@ Interlock::Interlock(Forms& forms, ZELBas& state, const Session& session)
                &forms.specialMeas.chkWaterfall, &forms.specialMeas.chkGetSweep,
                &forms.specialMeas.cmdSave, &forms.std.cmdStop};
     playback_ = {&p.PlaybackBack,   &p.PlaybackPlay,     &p.PlaybackForward, &p.PlaybackPosition,
-                 &p.PlaybackRepeat, &p.PlaybackRealTime, &p.PlaybackClose};
+                 &p.PlaybackRepeat, &p.PlaybackRealTime, &p.PlaybackClose,   &p.cmdZoom};
     quietInView_ = {&p.FrequencyButton, &p.SpanButton,  &p.AmplitudeButton, &p.BWButton,
                     &p.SweepButton,     &p.TraceButton, &p.MeasButton};
     silent_ = {&p.GetOption,

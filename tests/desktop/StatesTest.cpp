@@ -153,7 +153,7 @@ TEST_P(LooksOfStates, PlayingRecordingBesideAnInstrument_GreysWhatHasToWait) {
         EXPECT_FALSE(enabled(panel().PlaySingleButton) || enabled(panel().SoftKey(0)) ||
                      enabled(panel().AnalyzerButton) || enabled(panel().SpanButton));
         EXPECT_TRUE(enabled(panel().PlaybackPlay) && enabled(panel().PlaybackPosition) &&
-                    enabled(panel().StopButton));
+                    enabled(panel().StopButton) && enabled(panel().cmdZoom));
         EXPECT_FALSE(tool("Open")->isEnabled());
         EXPECT_TRUE(tool("Stop")->isEnabled());
         panel().PlaybackPlay.Click();

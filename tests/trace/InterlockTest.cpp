@@ -127,7 +127,7 @@ TEST_F(InterlockTest, WhileARecordingPlays_OnlyItsKeysActInTheBusyProgram) {
     for (const Control* key : std::vector<const Control*>{
              &panel.PlaybackBack, &panel.PlaybackPlay, &panel.PlaybackForward,
              &panel.PlaybackPosition, &panel.PlaybackRepeat, &panel.PlaybackRealTime,
-             &panel.PlaybackClose})
+             &panel.PlaybackClose, &panel.cmdZoom})
         EXPECT_EQ(interlock.turnOf(*key), Turn::Now) << key->name();
     EXPECT_EQ(interlock.turnOf(panel.SpanButton), Turn::Never);
 }
