@@ -1,18 +1,13 @@
-// Names of devices and addresses of the machine, on the real system.
+// Names of devices, on the real system.
 
 #include <gtest/gtest.h>
 #include <unistd.h>
 
-#include <QHostAddress>
-#include <QNetworkInterface>
-#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <string>
 
 #include "desktop/platform/DeviceName.h"
-#include "desktop/platform/QtPlatform.h"
-#include "tests/desktop/WindowTest.h"
 
 namespace zel {
 namespace {
@@ -66,24 +61,6 @@ TEST_F(DeviceNames, HostOfTheNetwork_IsNoDevice) {
     address.kind = LinkAddress::Kind::TwoModems;
     useDevicePath(address);
     EXPECT_EQ(address.port, (folder / "server").string());
-}
-
-TEST(LocalAddress, IsTheMachinesOwnAndNoLoopbackWhereItHasAnother) {
-    testApplication();
-    QtPlatform platform;
-    const QHostAddress shown(QString::fromStdString(platform.serverSocket.localIP()));
-    const QList<QHostAddress> all = QNetworkInterface::allAddresses();
-    const bool others = std::any_of(all.begin(), all.end(),
-                                    [](const QHostAddress& one) { return !one.isLoopback(); });
-    if (!others) {
-        EXPECT_EQ(shown, QHostAddress(QHostAddress::LocalHost));
-        return;
-    }
-    EXPECT_FALSE(shown.isLoopback());
-    EXPECT_TRUE(std::any_of(all.begin(), all.end(), [&](QHostAddress one) {
-        one.setScopeId({});
-        return one == shown;
-    }));
 }
 
 }  // namespace
