@@ -98,6 +98,7 @@ TEST_F(Connection, Connect_FromTheDialog_DoesTheHandshakeStoresTheFieldsAndReads
         dialog.BaudList.pick(2);
         dialog.ZELButton.Click();
     });
+    later(600'000, [this] { dialog.Hide(); });  // an attempt that fails would leave it open
     panel.Direct.Click();
     expectPlayed();
     EXPECT_EQ(shown(), Texts{});

@@ -174,6 +174,19 @@ TEST_F(TcpDialogTest, ProbeInTwoPackets_IsEmptiedWhole) {
     EXPECT_EQ(socket.failure(), "");
 }
 
+TEST_F(TcpDialogTest, ProbeWithoutALineEnd_EndsAQuarterSecondAfterItsFirstByte) {
+    socket.expect("\r").answer("0").answer("0").after(200);
+    Page(socket).whole();
+    std::string before;
+    std::string after;
+    later(240, [&] { before = socket.written(); });
+    later(300, [&] { after = socket.written().substr(0, 2); });
+    EXPECT_TRUE(connectTcp());
+    EXPECT_EQ(before, "\r");
+    EXPECT_EQ(after, "\r\r") << "the handshake has begun";
+    EXPECT_EQ(socket.failure(), "");
+}
+
 TEST_F(TcpDialogTest, Servers_AreRememberedNewestFirst) {
     for (const char* host : {"a", "b", "a"}) {
         socket.expect("\r").silence();
