@@ -3,6 +3,7 @@
 #include <cmath>
 #include <cstddef>
 #include <utility>
+#include <vector>
 
 #include "forms/ControllerForm.h"
 #include "platform/Form.h"

@@ -11,6 +11,7 @@
 #include <QSysInfo>
 #include <clocale>
 #include <ctime>
+#include <initializer_list>
 #include <memory>
 #include <string>
 #include <vector>

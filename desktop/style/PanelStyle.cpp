@@ -10,9 +10,11 @@
 #include <QScrollArea>
 #include <QStyleOptionFrame>
 #include <QToolButton>
+#include <algorithm>
 #include <cmath>
 
 #include "desktop/style/StyleIcons.h"
+#include "desktop/style/StyleTables.h"
 
 namespace zel {
 namespace {

@@ -5,8 +5,10 @@
 #include <QStyleOptionComboBox>
 #include <QStyleOptionSlider>
 #include <QStyleOptionToolButton>
+#include <algorithm>
 
 #include "desktop/style/PanelStyle.h"
+#include "desktop/style/StyleTables.h"
 
 namespace zel {
 namespace {

@@ -1,8 +1,10 @@
 // How much room the controls take, and where their parts lie.
 
 #include <QStyleOptionButton>
+#include <algorithm>
 
 #include "desktop/style/PanelStyle.h"
+#include "desktop/style/StyleTables.h"
 
 namespace zel {
 namespace {

@@ -10,7 +10,6 @@
 #include <QShortcut>
 #include <QSignalBlocker>
 #include <QVBoxLayout>
-#include <string>
 #include <string_view>
 #include <utility>
 

@@ -38,9 +38,9 @@ void buildShortcuts(QWidget& window, ControllerForm& panel, Binder& binder) {
     for (const auto& [keys, controls] : users) {
         auto* shortcut = new QShortcut(QKeySequence(keys), &window);
         shortcut->setAutoRepeat(false);
-        QObject::connect(shortcut, &QShortcut::activated, &window, [&binder, controls = controls] {
+        QObject::connect(shortcut, &QShortcut::activated, &window, [&binder, all = controls] {
             binder.flush();
-            for (Control* control : controls) {
+            for (Control* control : all) {
                 auto* widget = qobject_cast<QWidget*>(binder.widgetOf(*control));
                 if (widget == nullptr || !FoldGroup::offers(*widget) || !widget->isEnabled())
                     continue;

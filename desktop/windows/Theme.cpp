@@ -6,6 +6,7 @@
 
 #include "desktop/binders/ToolTips.h"
 #include "desktop/style/PanelStyle.h"
+#include "desktop/style/StyleTables.h"
 #include "desktop/windows/ThemeColors.h"
 
 namespace zel {

@@ -15,6 +15,7 @@
 #include "analysis/HostMarkers.h"
 #include "analysis/HostTraces.h"
 #include "analysis/Mask.h"
+#include "analysis/TraceAnalysis.h"
 #include "analysis/TraceTools.h"
 #include "desktop/binders/Binder.h"
 #include "desktop/binders/OwnTexts.h"
