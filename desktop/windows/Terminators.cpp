@@ -119,6 +119,8 @@ void TerminatorRow::followPositions() {
         follow(panel_.SoftTextBox(i));
     }
     follow(panel_.StopButton);  // a view that begins or ends has another menu than before
+    // A connection that comes back finds its texts as they were, and gives them their menu again.
+    follow(panel_.ConnectedPic);
 }
 
 // Keys of a grey box are grey with it.

@@ -262,6 +262,10 @@ TEST_F(Connecting, PortThatIsBack_IsOfferedOnALineOverTheGraph) {
     window->showNow();
     QApplication::processEvents();
     EXPECT_FALSE(again->isVisible());
+    // The keys of the units follow the boxes.
+    const auto* units = window->findChild<QWidget*>("TerminatorRow");
+    EXPECT_TRUE(QTest::qWaitFor(
+        [units] { return units->findChildren<QPushButton*>().first()->text() == "GHz"; }));
     savePicture(*window, "port-reconnected");
 }
 
