@@ -153,14 +153,20 @@ void GraphSide::showPower() {
     if (power == power_->isVisibleTo(graph_)) return;
     if (!power) power_->clear();
     power_->setVisible(power);
-    // Of a trace that is not seen.
-    readouts_->setVisible(!power);
+    showReadouts();
     place();
+}
+
+void GraphSide::showReadouts() {
+    // Of nothing, or of a trace that is not seen, there is nothing to read.
+    const bool there = panel_.isConnected || !panel_.CWGraph1.values().empty();
+    readouts_->setVisible(there && !showsPower());
 }
 
 void GraphSide::showEmpty() {
     const bool connecting = connecting_->wanted();
     const bool empty = !panel_.isConnected && panel_.CWGraph1.values().empty() && !connecting;
+    showReadouts();
     if (empty == empty_->isVisibleTo(graph_) && connecting == connecting_->isVisibleTo(graph_))
         return;
     empty_->setVisible(empty);

@@ -46,6 +46,7 @@ class GraphSide : public QWidget {
     void showSource();
     void showChannel();
     bool showsPower() const;
+    void showReadouts();
 
     Program& program_;
     ControllerForm& panel_;

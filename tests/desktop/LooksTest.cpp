@@ -204,6 +204,11 @@ class BareLooks : public Looks {
 TEST_P(BareLooks, WindowWithoutAnInstrument_ShowsTheWaysToBegin) {
     expectSound("empty");
     EXPECT_TRUE(savePicture(*window, QString(GetParam().name) + "-empty"));
+    const auto* readout = widgetOf<QWidget>(panel().CFLabel);
+    EXPECT_FALSE(readout->isVisible()) << "of nothing";
+    connect();
+    show();
+    EXPECT_TRUE(readout->isVisible());
 }
 
 INSTANTIATE_TEST_SUITE_P(Sizes, BareLooks, kLooks, kNameOfLook);
