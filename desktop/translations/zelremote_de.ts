@@ -787,7 +787,7 @@ oder eine Aufzeichnung laden</translation>
     </message>
     <message>
         <source>&amp;Trace</source>
-        <translation>&amp;Kurve</translation>
+        <translation>Kur&amp;ve</translation>
     </message>
     <message>
         <source>Colour by level</source>

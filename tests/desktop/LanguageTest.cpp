@@ -2,10 +2,13 @@
 
 #include <QAction>
 #include <QLabel>
+#include <QMenuBar>
 #include <QStatusBar>
 #include <QTranslator>
+#include <set>
 
 #include "desktop/binders/OwnTexts.h"
+#include "desktop/binders/ShortcutTable.h"
 #include "desktop/binders/ToolTips.h"
 #include "desktop/platform/Language.h"
 #include "forms/MainForm.h"
@@ -152,6 +155,21 @@ TEST_P(WindowIn, ReadoutsOfTheSmallestWindow_AreWhole) {
             << label->text().toStdString();
     }
     EXPECT_TRUE(savePicture(*window, QString("readouts-") + GetParam()));
+}
+
+TEST_P(WindowIn, LettersOfTheMenus_AreTheirsAlone) {
+    // Those of the keys of the units.
+    std::set<QString> taken;
+    for (const char* letter = kTerminatorLetters; *letter != 0; ++letter)
+        taken.insert(QKeySequence(QString("Alt+") + QLatin1Char(*letter)).toString());
+    int count = 0;
+    for (const QAction* menu : window->menuBar()->actions()) {
+        const QString letter = QKeySequence::mnemonic(menu->text()).toString();
+        EXPECT_FALSE(letter.isEmpty()) << menu->text().toStdString();
+        EXPECT_TRUE(taken.insert(letter).second) << menu->text().toStdString();
+        ++count;
+    }
+    EXPECT_GE(count, 5);
 }
 
 INSTANTIATE_TEST_SUITE_P(Languages, WindowIn, testing::Values("en", "de"));
