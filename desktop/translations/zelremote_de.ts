@@ -1918,5 +1918,9 @@ oder eine Aufzeichnung laden</translation>
         <source>Stop the playback first</source>
         <translation>Erst die Wiedergabe anhalten</translation>
     </message>
+    <message>
+        <source>Save Statistics</source>
+        <translation>Statistik speichern</translation>
+    </message>
 </context>
 </TS>

@@ -5,7 +5,6 @@
 #include <QHBoxLayout>
 #include <QHeaderView>
 #include <QLabel>
-#include <QPushButton>
 #include <QVBoxLayout>
 #include <algorithm>
 #include <cstddef>
@@ -91,11 +90,11 @@ PeaksPage::PeaksPage(TraceTools& tools, std::function<void(std::size_t)> goTo) :
     table_->setToolTip(QObject::tr("A click puts a marker on the peak"));
     layout->addWidget(table_, 1);
     auto* keys = new QHBoxLayout;
-    auto* copy = new QPushButton(QObject::tr("Copy Table"));
-    connect(copy, &QPushButton::clicked, this,
+    copy_ = new QPushButton(QObject::tr("Copy Table"));
+    connect(copy_, &QPushButton::clicked, this,
             [this] { QApplication::clipboard()->setText(asText()); });
-    auto* save = new QPushButton(QObject::tr("Save Table..."));
-    connect(save, &QPushButton::clicked, this, [this] {
+    save_ = new QPushButton(QObject::tr("Save Table..."));
+    connect(save_, &QPushButton::clicked, this, [this] {
         QString text = "peak;x;level\r\n";
         int number = 0;
         for (const Peak& peak : tools_.result().peaks)
@@ -105,8 +104,8 @@ PeaksPage::PeaksPage(TraceTools& tools, std::function<void(std::size_t)> goTo) :
                 "\r\n";
         saveTable(*this, QObject::tr("Save Peaks"), text);
     });
-    keys->addWidget(copy);
-    keys->addWidget(save);
+    keys->addWidget(copy_);
+    keys->addWidget(save_);
     keys->addStretch();
     layout->addLayout(keys);
     showState();
@@ -135,6 +134,8 @@ void PeaksPage::showState() {
         std::sort(order.begin(), order.end(), [&result](std::size_t one, std::size_t other) {
             return result.peaks[one].x < result.peaks[other].x;
         });
+    copy_->setEnabled(!order.empty());
+    save_->setEnabled(!order.empty());
     table_->setRowCount(static_cast<int>(order.size()));
     for (std::size_t row = 0; row < order.size(); ++row) {
         const Peak& peak = result.peaks[order[row]];

@@ -4,6 +4,7 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPushButton>
 #include <QTableWidget>
 #include <array>
 #include <cstddef>
@@ -31,6 +32,8 @@ class PeaksPage : public TracePage {
     QLineEdit* threshold_;
     QLineEdit* excursion_;
     QComboBox* order_;
+    QPushButton* copy_;
+    QPushButton* save_;
 };
 
 class MarkersPage : public TracePage {

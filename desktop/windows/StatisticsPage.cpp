@@ -38,12 +38,12 @@ StatisticsPage::StatisticsPage(TraceTools& tools) : TracePage(tools) {
     auto* caption = new QLabel(QObject::tr("Occupied at or over"));
     caption->setBuddy(threshold_);
     count_ = new QLabel;
-    auto* save = new QPushButton(QObject::tr("Save Table..."));
+    save_ = new QPushButton(QObject::tr("Save Table..."));
     row->addWidget(on_);
     row->addWidget(caption);
     row->addWidget(threshold_);
     row->addWidget(count_, 1);
-    row->addWidget(save);
+    row->addWidget(save_);
     layout->addLayout(row);
     plot_ = new QCustomPlot;
     plot_->setMinimumHeight(150);
@@ -74,9 +74,9 @@ StatisticsPage::StatisticsPage(TraceTools& tools) : TracePage(tools) {
     layout->addWidget(plot_, 1);
     connect(on_, &QCheckBox::toggled, this, [this] { takeSettings(); });
     connect(threshold_, &QLineEdit::editingFinished, this, [this] { takeSettings(); });
-    connect(save, &QPushButton::clicked, this, [this] {
+    connect(save_, &QPushButton::clicked, this, [this] {
         if (tools_.statistics())
-            saveTable(*this, "Save Statistics",
+            saveTable(*this, QObject::tr("Save Statistics"),
                       QString::fromStdString(tools_.statistics()->table()));
     });
     showState();
@@ -93,9 +93,13 @@ void StatisticsPage::takeSettings() {
 void StatisticsPage::showState() {
     const auto& statistics = tools_.statistics();
     const bool there = statistics && statistics->count() > 0;
-    count_->setText(!statistics ? QString()
-                                : QString::number(statistics->count()) +
-                                      (statistics->count() == 1 ? " sweep" : " sweeps"));
+    const auto count = statistics ? static_cast<qulonglong>(statistics->count()) : 0;
+    count_->setText(!statistics  ? QString()
+                    : count == 1 ? QObject::tr("1 sweep")
+                                 : QObject::tr("%1 sweeps").arg(count));
+    save_->setEnabled(there);
+    // Without a sweep the numbers along the axes mean nothing.
+    for (QCPAxis* axis : {plot_->xAxis, plot_->yAxis}) axis->setTickLabels(there);
     if (!there) {
         for (int i = 0; i < kCurves; ++i) plot_->graph(i)->data()->clear();
     } else {

@@ -6,6 +6,7 @@
 #include <QCheckBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPushButton>
 
 #include "analysis/TraceTools.h"
 #include "desktop/windows/TracePage.h"
@@ -23,6 +24,7 @@ class StatisticsPage : public TracePage {
     QCheckBox* on_;
     QLineEdit* threshold_;
     QLabel* count_;
+    QPushButton* save_;
     QCustomPlot* plot_;
 };
 

@@ -1,5 +1,7 @@
 // The trace tools in the window: the same figures as from the file, drawn on the graph, in words.
 
+#include <qcustomplot.h>
+
 #include <QApplication>
 #include <QCheckBox>
 #include <QClipboard>
@@ -149,6 +151,24 @@ TEST_F(TraceToolsWindow, Places_HaveTheDigitsOfTheSweepAndNoMore) {
     trace.x = {1.2345678e9};
     EXPECT_EQ(placeText(1.2345678e9, trace), "1.234568 GHz") << "one sample has no step";
     EXPECT_EQ(levelText(-28.0, "dBm"), "-28.00 dBm");
+}
+
+TEST_F(TraceToolsWindow, PagesWithoutFigures_OfferNoTables) {
+    const auto offered = [](QWidget* page) {
+        int count = 0;
+        for (const auto* key : page->findChildren<QPushButton*>())
+            count += key->isEnabled() ? 1 : 0;
+        return count;
+    };
+    EXPECT_EQ(offered(page(Peaks)), 0);
+    EXPECT_EQ(offered(page(Statistics)), 0);
+    EXPECT_FALSE(page(Statistics)->findChild<QCustomPlot*>()->xAxis->tickLabels());
+    connect();
+    dock().tools().countStatistics(-80);
+    sweep();
+    EXPECT_EQ(offered(page(Peaks)), 2);
+    EXPECT_EQ(offered(page(Statistics)), 1);
+    EXPECT_TRUE(page(Statistics)->findChild<QCustomPlot*>()->xAxis->tickLabels());
 }
 
 TEST_F(TraceToolsWindow, WordsOfTheTraces_StandInOneLine) {
