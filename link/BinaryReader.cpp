@@ -21,9 +21,9 @@ constexpr int kPollMs = 20;
 constexpr int kTailMs = 200;  // for the last bytes of a slow line
 constexpr std::size_t kStatusBytes = 2;
 
-/// A status digit and CR with nothing behind it.
-bool isBareStatus(const std::string& bytes) {
-    return bytes.size() == kStatusBytes && bytes[1] == '\r' && bytes[0] >= '0' && bytes[0] <= '7';
+/// A status digit but 0 and CR with nothing behind it.
+bool isRefusal(const std::string& bytes) {
+    return bytes.size() == kStatusBytes && bytes[1] == '\r' && bytes[0] >= '1' && bytes[0] <= '7';
 }
 
 }  // namespace
@@ -102,7 +102,7 @@ std::string BinaryReader::ReadBinaryBytes(std::int16_t length) {
         PrependBytes(chunk, 1, status);
     }
     StopwatchB_.Reset();
-    if (isBareStatus(chunk) && chunk[0] != '0') {
+    if (isRefusal(chunk)) {
         // A refusal has nothing after it: samples there show that the digit itself is wrong.
         session_.events.wait(kPollMs);
         const std::string behind = link_.takeBytes();

@@ -182,6 +182,14 @@ TEST_F(Bytes, Buffer_ClosedPort_IsToldAndEmpty) {
     EXPECT_EQ(status(), "BIN-BUFFER-LEN: -1");
 }
 
+TEST_F(Bytes, Buffer_RunsWhatIsDueBeforeItsLine) {
+    port.close();
+    std::string line = "nothing ran";
+    events.schedule(0, [&] { line = status(); });
+    byteReader.ReadBinaryBuffer(1205);
+    EXPECT_EQ(line, "");
+}
+
 TEST_F(Bytes, Buffer_LineShowsTheLastIndex) {
     comes(0, "0\rabcdefghij");
     EXPECT_EQ(byteReader.ReadBinaryBuffer(10), "abcdefghij");

@@ -82,6 +82,10 @@ TEST(StatusNumber, Prefix_IsTheNumberAndJunkIs0) {
     EXPECT_EQ(statusNumber(""), 0);
     EXPECT_EQ(statusNumber("junk"), 0);
     EXPECT_EQ(statusNumber("1e300"), 0);
+    EXPECT_EQ(statusNumber("32767"), 32767);
+    EXPECT_EQ(statusNumber("32768"), 0);
+    EXPECT_EQ(statusNumber("-32767"), -32767);
+    EXPECT_EQ(statusNumber("-32768"), 0);
 }
 
 }  // namespace

@@ -1,5 +1,8 @@
 // A wait for the instrument says how long it may last and can be left, and the line works again.
 
+#include <string>
+#include <utility>
+
 #include "link/WaitNotice.h"
 #include "tests/link/Line.h"
 
@@ -53,6 +56,20 @@ TEST_F(LeftWait, AnswerWithinTheGrace_StillCounts) {
     EXPECT_TRUE(exchange.CmdInstrument("WAIT"));
     EXPECT_FALSE(state.BareCrFirst);
     expectPlayed();
+}
+
+TEST_F(LeftWait, StepOfTheDialog_NamesTheSecondsRoundedUp) {
+    whileConnecting();
+    WaitNotice notice(forms);
+    const std::pair<int, const char*> rows[] = {
+        {1000, "1 s"}, {1001, "2 s"}, {119'000, "119 s"}, {119'001, "2 min"}, {120'001, "3 min"}};
+    for (const auto& [timeoutMs, length] : rows) {
+        notice.tell(999, timeoutMs);
+        EXPECT_EQ(dialog.AdviceLabel.Caption.get(),
+                  "Waiting for the instrument, 0 of " + std::string(length));
+    }
+    notice.clear();
+    EXPECT_EQ(dialog.AdviceLabel.Caption.get(), "");
 }
 
 TEST_F(LeftWait, WithNothingUnderWay_LeavesNothing) {

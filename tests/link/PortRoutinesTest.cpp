@@ -107,8 +107,18 @@ TEST_F(PortRoutines, ListenOnPort_Text_GivesTheLocalPort) {
 }
 
 TEST_F(PortRoutines, ListenOnPort_NumberBeyondAllPorts_DoesNotListen) {
-    ListenOnPort(server, "65536");
-    EXPECT_EQ(server.state(), SocketState::Closed);
+    for (const char* text : {"65536", "-1"}) {
+        ListenOnPort(server, text);
+        EXPECT_EQ(server.state(), SocketState::Closed) << text;
+    }
+}
+
+TEST_F(PortRoutines, ListenOnPort_LowestAndHighest_Listen) {
+    for (const char* text : {"0", "65535"}) {  // 0 is any that is free
+        server.close();
+        ListenOnPort(server, text);
+        EXPECT_EQ(server.state(), SocketState::Listening) << text;
+    }
 }
 
 TEST_F(PortRoutines, CloseIfOpen_OtherStates_AreLeftAlone) {

@@ -253,6 +253,16 @@ TEST_F(ManualScaleTest, Accept_ReadsThousandsSeparators) {
     EXPECT_EQ(panel.CWGraph1.yAxis().Maximum, 1234.5);
 }
 
+TEST_F(ManualScaleTest, Accept_TakesTheLargestBounds) {
+    panel.UtilityGraphSettings.Click();
+    dialog.manualSizeMin.Text = "-1000000000000000";
+    dialog.manualSizeMax.Text = "1000000000000000";
+    dialog.cmdAccept.Click();
+    EXPECT_EQ(boxes.texts().size(), 0U);
+    EXPECT_EQ(panel.CWGraph1.yAxis().Minimum, -1e15);
+    EXPECT_EQ(panel.CWGraph1.yAxis().Maximum, 1e15);
+}
+
 TEST_F(ManualScaleTest, Cancel_LeavesTheRange) {
     panel.UtilityGraphSettings.Click();
     dialog.manualSizeMin.Text = "-80";
@@ -291,7 +301,9 @@ TEST_P(BadManualScale, Accept_TellsItAndLeavesTheRange) {
 INSTANTIATE_TEST_SUITE_P(Entries, BadManualScale,
                          ::testing::Values(BadScale{"", ""}, BadScale{"abc", "é"},
                                            BadScale{"10", "10"}, BadScale{"10", "-10"},
-                                           BadScale{"-1e300", "1e300"}));
+                                           BadScale{"-1e300", "1e300"},
+                                           BadScale{"0", "1000000000000001"},
+                                           BadScale{"-1000000000000001", "0"}));
 
 }  // namespace
 }  // namespace zel

@@ -153,6 +153,20 @@ TEST_F(InterlockTest, FormThatIsShownAgain_IsWorkOfTheUser) {
     interlock.endCommand();
 }
 
+TEST_F(InterlockTest, EndOfWhatRuns_StopsAScriptAndItsWait) {
+    int stops = 0;
+    int releases = 0;
+    forms.specialMeas.cmdStop.Clicked.connect([&] { ++stops; });
+    forms.specialMeas.ReleaseWait.connect([&] { ++releases; });
+    interlock.endLiveStates();
+    EXPECT_EQ(stops + releases, 0);
+    forms.specialMeas.RunsActive = 1;
+    interlock.endLiveStates();
+    EXPECT_EQ(stops, 1);
+    EXPECT_EQ(releases, 1);
+    forms.specialMeas.RunsActive = 0;
+}
+
 TEST_F(InterlockTest, RuleThatIsMet_ShowsNothing) {
     EXPECT_FALSE(interlock.refuses(panel.MarkPkButton));
     EXPECT_FALSE(interlock.refuses(panel.PlaySingleButton));

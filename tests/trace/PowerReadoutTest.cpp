@@ -22,6 +22,8 @@ struct PowerReadoutTest : SweepControlTest {
         platform.events.schedule(0, [this, reflection] {
             if (reflection) forms.powerAndRefl.PowerAndLeflOption.Click();
             forms.powerAndRefl.ClosePwrForm.Click();
+            EXPECT_FALSE(forms.powerAndRefl.Visible);
+            if (forms.powerAndRefl.Visible) forms.powerAndRefl.unload(1);  // else no end
         });
     }
     void stopAtReading(const std::string& text) {
@@ -113,6 +115,13 @@ TEST_F(PowerReadoutTest, Dialog_Options_SetTheTwoFlags) {
     forms.powerAndRefl.PowerOnlyOption.Click();
     EXPECT_TRUE(forms.powerAndRefl.ReadPowerOnly);
     EXPECT_FALSE(forms.powerAndRefl.ReadPowerAndRefl);
+}
+
+TEST_F(PowerReadoutTest, Dialog_Close_TakesItAway) {
+    forms.powerAndRefl.Show();
+    forms.powerAndRefl.ClosePwrForm.Click();
+    EXPECT_FALSE(forms.powerAndRefl.Visible);
+    EXPECT_FALSE(forms.powerAndRefl.loaded());
 }
 
 TEST_F(PowerReadoutTest, Continuous_AsksInTheDialogAndReadsUntilStop) {

@@ -129,7 +129,9 @@ TEST_F(ViewAnnotationsTest, Unit_IsThatOfTheRangeAndOfTheReference) {
     mirror.ReferenceUnit = UNITDBUV;
     EXPECT_EQ(view().unit, "dB\u00B5V");
     mirror.ReferenceUnit = UNITDB;
+    mirror.ReferenceLevel = 0.5;
     EXPECT_EQ(view().unit, "dB");
+    EXPECT_EQ(view().refLevel, "Ref 0.5 dB") << "decibels have no prefix";
     mirror.ReferenceUnit = UNITV;
     mirror.ReferenceLevel = 0.005;
     EXPECT_EQ(view().unit, "dBm");
