@@ -42,7 +42,9 @@ if grep -qiE 'widgets|gui|svg|qcustomplot|qscintilla' \
     <(grep '^Depends' "$scratch/zelremote-cli.control"); then
     fail "the console depends on a library of windows"
 fi
-grep -q '^Depends:.*libqt6core6' "$scratch/zelremote-cli.control" || fail "libraries are not named"
+for library in libqt6core6 libqt6network6; do
+    grep -q "^Depends:.*$library" "$scratch/zelremote-cli.control" || fail "$library is not named"
+done
 grep -q '^Depends:.*zelremote-cli' "$scratch/zelremote.control" || fail "the desktop lacks the console"
 grep -q '^Depends:.*zelremote-cli' "$scratch/zelremote-server.control" || fail "the server lacks it"
 
@@ -91,6 +93,20 @@ run_simulator "$companion" "$scratch/port"
 QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --connect "serial:$scratch/port@57600" \
     --home "$scratch/home2" --screenshot "$scratch/window.png"
 [ -s "$scratch/window.png" ] || fail "the window cannot be drawn"
+
+# The sockets are loaded from the companions' folder.
+"$root/bin/zelctl" --home "$scratch/home4" serve --serial "$scratch/port" --listen 127.0.0.1:0 \
+    > "$scratch/served" 2>&1 &
+server=$!
+for _ in $(seq 100); do
+    ! grep -q "^instrument" "$scratch/served" || break
+    sleep 0.1
+done
+address=$(sed -n 's/^listening //p' "$scratch/served")
+[ -n "$address" ] || { cat "$scratch/served"; fail "nothing is served"; }
+"$root/bin/zelctl" --connect "tcp:$address" --home "$scratch/home5" info > "$scratch/info"
+kill "$server"
+grep -q '^Model: ' "$scratch/info" || fail "no instrument was found over TCP"
 
 [ -n "$(find "$root/" -path '*/zelremote/translations/zelremote_de.qm' -size +8k)" ] ||
     fail "the German texts are missing"
