@@ -59,15 +59,15 @@ endfunction()
 
 # zel_late_library(TARGET NAME COMPONENT)
 #
-# A library that the programs load when they first need it. It stands beside them, and is installed
-# with their companions.
+# A library that the programs load when they first need it. It stands in the folder "parts" beside
+# them, and is installed with their companions.
 function(zel_late_library target name component)
     set_target_properties(${target} PROPERTIES
         PREFIX "" OUTPUT_NAME ${name} SUFFIX ".so" CXX_VISIBILITY_PRESET hidden
-        LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}")
+        LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/parts")
     target_include_directories(${target} PRIVATE "${PROJECT_SOURCE_DIR}")
     zel_strict(${target})
-    install(TARGETS ${target} LIBRARY DESTINATION "${CMAKE_INSTALL_LIBDIR}/zelremote"
+    install(TARGETS ${target} LIBRARY DESTINATION "${CMAKE_INSTALL_LIBDIR}/zelremote/parts"
         COMPONENT ${component})
 endfunction()
 

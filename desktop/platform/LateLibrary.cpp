@@ -8,7 +8,7 @@
 namespace zel {
 
 QFunctionPointer lateFunction(const QString& library, const char* symbol, std::string& problem) {
-    const QString path = QString::fromStdString(companionFolder()) + "/" + library + ".so";
+    const QString path = QString::fromStdString(companionFolder()) + "/parts/" + library + ".so";
     QLibrary file(path);
     const QFunctionPointer found = file.resolve(symbol);
     problem = found != nullptr

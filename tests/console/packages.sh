@@ -95,6 +95,7 @@ QT_QPA_PLATFORM=offscreen "$root/bin/zelremote" --connect "serial:$scratch/port@
 [ -s "$scratch/window.png" ] || fail "the window cannot be drawn"
 
 # The sockets are loaded from the companions' folder.
+: > "$scratch/served"
 "$root/bin/zelctl" --home "$scratch/home4" serve --serial "$scratch/port" --listen 127.0.0.1:0 \
     > "$scratch/served" 2>&1 &
 server=$!

@@ -1,6 +1,7 @@
 #include <QCheckBox>
 #include <QLabel>
 #include <QListWidget>
+#include <QTest>
 #include <QTextEdit>
 
 #include "desktop/windows/ScriptEditorWindow.h"
