@@ -1,6 +1,7 @@
 #include "server/ServerDialog.h"
 
 #include <cstddef>
+#include <initializer_list>
 #include <string>
 #include <utility>
 #include <vector>
