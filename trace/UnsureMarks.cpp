@@ -1,5 +1,11 @@
 #include "trace/UnsureMarks.h"
 
+#include <string>
+
+#include "forms/ControllerForm.h"
+#include "model/UnsureSettings.h"
+#include "model/ZEL3Variables.h"
+#include "platform/Controls.h"
 #include "trace/GraphScaling.h"
 
 namespace zel {

@@ -11,6 +11,7 @@
 #include "model/ZEL3Variables.h"
 #include "platform/Graph.h"
 #include "trace/GraphScaling.h"
+#include "trace/Sweep.h"
 
 namespace zel {
 namespace {
