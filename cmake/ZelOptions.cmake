@@ -60,10 +60,11 @@ endfunction()
 # zel_late_library(TARGET NAME COMPONENT)
 #
 # A library that the programs load when they first need it. It stands in the folder "parts" beside
-# them, and is installed with their companions.
+# them with their version in its name, and is installed with their companions.
 function(zel_late_library target name component)
+    string(REGEX REPLACE "^([0-9]+[.][0-9]+)[.]0$" "\\1" version "${PROJECT_VERSION}")
     set_target_properties(${target} PROPERTIES
-        PREFIX "" OUTPUT_NAME ${name} SUFFIX ".so" CXX_VISIBILITY_PRESET hidden
+        PREFIX "" OUTPUT_NAME "${name}-${version}" SUFFIX ".so" CXX_VISIBILITY_PRESET hidden
         LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/parts")
     target_include_directories(${target} PRIVATE "${PROJECT_SOURCE_DIR}")
     zel_strict(${target})

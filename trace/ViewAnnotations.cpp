@@ -146,8 +146,7 @@ ViewAnnotations annotateSweep(const ControllerForm& panel, const ZEL3Variables& 
     ViewAnnotations view =
         keeps ? annotate(panel, then, mirror.Unsure) : annotateView(panel, mirror);
     if (levelOfAnotherMode(panel, sweep)) view.refLevelUnsure = view.yUnsure = true;
-    if (!keeps) return view;
-    if (!view.ok) return view;
+    if (!keeps || !view.ok) return view;
     // The axes stay those of the trace: they are right for it.
     view.refLevelUnsure |=
         then.ReferenceLevel != mirror.ReferenceLevel || then.ReferenceUnit != mirror.ReferenceUnit;

@@ -33,7 +33,7 @@ void haveSocketParts(const SocketParts& own) { parts = &own; }
 
 LateSocket::~LateSocket() = default;
 
-void LateSocket::stand(Socket& socket) {
+void LateSocket::forwardTo(Socket& socket) {
     socket_ = &socket;
     socket.DataArrival.connect([this] { DataArrival(); });
     socket.PeerClosed.connect([this] { PeerClosed(); });
@@ -44,7 +44,7 @@ bool LateSocket::made() {
     if (events_ == nullptr) return false;
     if (const SocketParts* found = loadedParts(problem_)) {
         own_ = found->socket(*events_);
-        stand(*own_);
+        forwardTo(*own_);
     }
     return socket_ != nullptr;
 }
@@ -93,7 +93,7 @@ ServerSocket* LateServerSocket::made() const {
     if (socket_) return socket_.get();
     if (const SocketParts* found = loadedParts(problem_)) {
         socket_ = found->serverSocket(events_);
-        client_.stand(socket_->client());
+        client_.forwardTo(socket_->client());
         socket_->ConnectionRequest.connect([this](int id) { ConnectionRequest(id); });
         socket_->ProofFailed.connect(
             [this](int id, const std::string& reason) { ProofFailed(id, reason); });

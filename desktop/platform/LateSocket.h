@@ -17,7 +17,7 @@ class LateSocket : public Socket {
   public:
     /// Makes its socket when it is to connect.
     explicit LateSocket(ArrivalSources& events) : events_(&events) {}
-    /// Waits for `stand` to name one.
+    /// Waits for `forwardTo` to name one.
     LateSocket() = default;
     ~LateSocket() override;
 
@@ -32,7 +32,7 @@ class LateSocket : public Socket {
     std::string problem() const override;
 
     /// The socket that all goes to from now on. It outlives this one's last use.
-    void stand(Socket& socket);
+    void forwardTo(Socket& socket);
 
   private:
     bool made();

@@ -13,8 +13,8 @@
 #include <algorithm>
 #include <cmath>
 
-#include "desktop/style/StyleIcons.h"
 #include "desktop/style/StyleTables.h"
+#include "desktop/windows/ThemeIcons.h"
 
 namespace zel {
 namespace {
@@ -397,8 +397,10 @@ void PanelStyle::drawControl(ControlElement element, const QStyleOption* option,
 
 QIcon PanelStyle::standardIcon(StandardPixmap icon, const QStyleOption* option,
                                const QWidget* widget) const {
-    if (icon == SP_ToolBarHorizontalExtensionButton) return moreEntriesIcon(Qt::Horizontal);
-    if (icon == SP_ToolBarVerticalExtensionButton) return moreEntriesIcon(Qt::Vertical);
+    // The toolkit's own comes from a file, for which it loads its readers of all kinds of pictures,
+    // as soon as there is a menu bar.
+    if (icon == SP_ToolBarHorizontalExtensionButton) return themeIcon("more");
+    if (icon == SP_ToolBarVerticalExtensionButton) return themeIcon("moredown");
     return QProxyStyle::standardIcon(icon, option, widget);
 }
 

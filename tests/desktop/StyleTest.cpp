@@ -210,7 +210,7 @@ TEST_P(Style, KeyOfABarWithoutRoom_IsDrawnInTheInkOfTheKeys) {
     for (const auto icon :
          {QStyle::SP_ToolBarHorizontalExtensionButton, QStyle::SP_ToolBarVerticalExtensionButton}) {
         const QImage picture =
-            testApplication().style()->standardIcon(icon).pixmap(QSize(24, 24)).toImage();
+            testApplication().style()->standardIcon(icon).pixmap(QSize(48, 48)).toImage();
         int inked = 0;
         for (int x = 0; x < picture.width(); ++x)
             for (int y = 0; y < picture.height(); ++y)
